@@ -1,0 +1,84 @@
+#ifndef QRX_FOUNDATION_COW_COUNTEDHLD_H
+#define QRX_FOUNDATION_COW_COUNTEDHLD_H
+
+#include "foundation/mem_Allocation.h"
+
+#include <utility>
+
+/// A plain integer reference count; not for use by several threads.
+class cow_Counter : public QRXBasCowAllocator {
+public:
+    explicit cow_Counter(int count = 1) : count_(count) {}
+    void Increment() { ++count_; }
+    /// True when the count falls to zero.
+    bool Decrement() { return --count_ == 0; }
+    int Count() const { return count_; }
+
+private:
+    int count_;
+};
+
+/// A counted handle on a T of its own on the heap, which the last holder deletes. May be null.
+template <class T>
+class cow_CountedHld {
+public:
+    cow_CountedHld() = default;
+    /// Takes over `referent`, also when the count can't be allocated.
+    explicit cow_CountedHld(T* referent) : referent_(referent) {
+        if (referent_ == nullptr) return;
+        try {
+            count_ = new cow_Counter(1);
+        } catch (...) {
+            DeleteReferent();
+            throw;
+        }
+    }
+    cow_CountedHld(const cow_CountedHld& other) noexcept : count_(other.count_), referent_(other.referent_) {
+        if (count_ != nullptr) count_->Increment();
+    }
+    cow_CountedHld(cow_CountedHld&& other) noexcept
+        : count_(std::exchange(other.count_, nullptr)), referent_(std::exchange(other.referent_, nullptr)) {}
+    cow_CountedHld& operator=(const cow_CountedHld& other) noexcept {
+        cow_CountedHld copy(other);
+        Swap(copy);
+        return *this;
+    }
+    cow_CountedHld& operator=(cow_CountedHld&& other) noexcept {
+        cow_CountedHld moved(std::move(other));
+        Swap(moved);
+        return *this;
+    }
+    ~cow_CountedHld() {
+        if (count_ != nullptr && count_->Decrement()) Delete();
+    }
+
+    /// Drops the old referent and takes over the new one.
+    void Reset(T* referent) { *this = cow_CountedHld(referent); }
+
+    bool IsNull() const { return referent_ == nullptr; }
+    T* Referent() const { return referent_; }
+    T& operator*() const { return *referent_; }
+    T* operator->() const { return referent_; }
+    int HolderCount() const { return count_ == nullptr ? 0 : count_->Count(); }
+    friend bool operator==(const cow_CountedHld& a, const cow_CountedHld& b) {
+        return a.referent_ == b.referent_;
+    }
+
+protected:
+    void Swap(cow_CountedHld& other) noexcept {
+        std::swap(count_, other.count_);
+        std::swap(referent_, other.referent_);
+    }
+
+private:
+    void Delete() noexcept {
+        delete count_;
+        DeleteReferent();
+    }
+    void DeleteReferent() noexcept { delete referent_; }
+
+    cow_Counter* count_ = nullptr;
+    T* referent_ = nullptr;
+};
+
+#endif

@@ -1,0 +1,182 @@
+#ifndef QRX_FOUNDATION_COW_MAP_H
+#define QRX_FOUNDATION_COW_MAP_H
+
+#include "foundation/cow_COW.h"
+#include "foundation/cow_String.h"
+
+#include <memory>
+#include <vector>
+
+/// Raises the failure of a key that a container doesn't hold.
+[[noreturn]] void cow_RaiseNoSuchKey(const char* container, const cow_String& key);
+inline void cow_RaiseNoSuchKey(const char* container, int key) {
+    cow_RaiseNoSuchKey(container, cow_String(key));
+}
+
+template <class K, class V>
+class cow_MapNode;
+
+template <class K, class V>
+using cow_MapNodeHandle = cow_COW<cow_MapNode<K, V>, cow_Direct<cow_MapNode<K, V>>>;
+
+template <class K, class V>
+class cow_MapNode : public mem_AllocationOperators {
+public:
+    cow_MapNode(const K& nodeKey, const V& nodeValue) : key(nodeKey), value(nodeValue) {}
+
+    K key;
+    V value;
+    cow_MapNodeHandle<K, V> left;
+    cow_MapNodeHandle<K, V> right;
+};
+
+/// The path of a text key: at even depth the lowest bit of a byte counted from the key's head (the
+/// terminating zero byte included), at odd depth that of a byte counted from its tail, beyond the key 0.
+/// The walk order of every map, and with it the order of some deck lines, rests on this rule.
+inline bool cow_MapGoesRight(const cow_String& key, int depth) {
+    const int length = key.Length();
+    if (depth > length) return false;
+    const int place = (depth & 1) != 0 ? length - (depth >> 1) - 1 : depth >> 1;
+    return (static_cast<unsigned char>(key.CStr()[place]) & 1U) != 0;
+}
+
+/// Integer keys go by their bits, the lowest first; no deck order depends on it.
+inline bool cow_MapGoesRight(int key, int depth) {
+    return depth < 32 && ((static_cast<unsigned>(key) >> depth) & 1U) != 0;
+}
+
+/// A digital search tree, NOT a sorted map: it is walked in pre-order (node, left, right), which depends on
+/// the order of insertion and on single bits of the keys. Copies share all subtrees until one is written.
+template <class K, class V>
+class cow_Map {
+public:
+    /// Adds the pair, or overwrites the value of an existing key, which keeps its place. Always true.
+    bool Insert(const K& key, const V& value) {
+        Handle* place = PrivatePlace(key);
+        if (place->IsNull()) {
+            place->Reset(new Node(key, value));
+            ++count_;
+        } else {
+            place->Referent()->value = value;
+        }
+        return true;
+    }
+    bool IsMember(const K& key) const { return FindNode(key) != nullptr; }
+    /// The value; an absent key raises "cow_Map: no entry ...".
+    const V& ConstGet(const K& key) const {
+        const Node* node = FindNode(key);
+        if (node == nullptr) cow_RaiseNoSuchKey("cow_Map", key);
+        return node->value;
+    }
+    /// The value for writing; an absent key raises as in ConstGet.
+    V& Get(const K& key) {
+        if (!IsMember(key)) cow_RaiseNoSuchKey("cow_Map", key);
+        return PrivatePlace(key)->Referent()->value;
+    }
+    /// The value for writing, a default one at the key's first use.
+    V& GetOrInsert(const K& key) {
+        Handle* place = PrivatePlace(key);
+        if (place->IsNull()) {
+            place->Reset(new Node(key, V()));
+            ++count_;
+        }
+        return place->Referent()->value;
+    }
+    /// The value, or null for an absent key.
+    const V* Find(const K& key) const {
+        const Node* node = FindNode(key);
+        return node == nullptr ? nullptr : &node->value;
+    }
+    /// True if the key was there. All other keys stay reachable; the walk order of those below the removed
+    /// node may change.
+    bool Remove(const K& key) {
+        if (!IsMember(key)) return false;
+        Handle* place = PrivatePlace(key);
+        // Any leaf below may stand in the removed node's place: its path leads through it.
+        Handle* leaf = place;
+        for (;;) {
+            Node& node = leaf->Get();
+            if (!node.left.IsNull()) {
+                leaf = &node.left;
+            } else if (!node.right.IsNull()) {
+                leaf = &node.right;
+            } else {
+                break;
+            }
+        }
+        Node& top = place->Get();
+        if (leaf != place) {
+            std::swap(top.key, leaf->Referent()->key);
+            std::swap(top.value, leaf->Referent()->value);
+        }
+        leaf->Reset(nullptr);
+        --count_;
+        return true;
+    }
+    int Count() const { return count_; }
+
+private:
+    template <class, class>
+    friend class cow_ConstMapIterator;
+    using Node = cow_MapNode<K, V>;
+    using Handle = cow_MapNodeHandle<K, V>;
+
+    const Node* FindNode(const K& key) const {
+        const Node* node = root_.Referent();
+        for (int depth = 0; node != nullptr && !(node->key == key); ++depth) {
+            node = (cow_MapGoesRight(key, depth) ? node->right : node->left).Referent();
+        }
+        return node;
+    }
+
+    // The handle where the key's node is or would hang; every node on the way is this map's own.
+    Handle* PrivatePlace(const K& key) {
+        Handle* place = &root_;
+        for (int depth = 0; !place->IsNull(); ++depth) {
+            Node& node = place->Get();
+            if (node.key == key) break;
+            place = cow_MapGoesRight(key, depth) ? &node.right : &node.left;
+        }
+        return place;
+    }
+
+    Handle root_;
+    int count_ = 0;
+};
+
+/// A snapshot of a map's walk in pre-order. The map must not be changed while it is in use.
+template <class K, class V>
+class cow_ConstMapIterator {
+public:
+    explicit cow_ConstMapIterator(const cow_Map<K, V>& map) : map_(map) { First(); }
+
+    void First() {
+        nodes_.clear();
+        nodes_.reserve(static_cast<std::size_t>(map_.count_) + 1);
+        // Not recursive: equal bits make long chains.
+        std::vector<const Node*> open;
+        if (!map_.root_.IsNull()) open.push_back(map_.root_.Referent());
+        while (!open.empty()) {
+            const Node* node = open.back();
+            open.pop_back();
+            nodes_.push_back(node);
+            if (!node->right.IsNull()) open.push_back(node->right.Referent());
+            if (!node->left.IsNull()) open.push_back(node->left.Referent());
+        }
+        nodes_.push_back(nullptr);
+        position_ = 0;
+    }
+    void Next() { ++position_; }
+    bool IsDone() const { return nodes_[position_] == nullptr; }
+    const K& CurrentKey() const { return nodes_[position_]->key; }
+    const V& CurrentValue() const { return nodes_[position_]->value; }
+
+private:
+    using Node = cow_MapNode<K, V>;
+
+    const cow_Map<K, V>& map_;
+    std::vector<const Node*> nodes_;
+    std::size_t position_ = 0;
+};
+
+#endif
