@@ -1,0 +1,15 @@
+#!/usr/bin/env bash
+# Configures a preset and builds a target on all cores: build.sh PRESET TARGET [-DNAME=VALUE ...]
+set -euo pipefail
+
+if [ $# -lt 2 ]; then
+    echo "usage: build.sh PRESET TARGET [-DNAME=VALUE ...]" >&2
+    exit 2
+fi
+preset=$1
+target=$2
+shift 2
+
+cd "$(dirname "${BASH_SOURCE[0]}")/.."
+cmake --preset "$preset" -DCMAKE_CXX_COMPILER_LAUNCHER="$(command -v ccache || true)" "$@"
+cmake --build --preset "$preset" --target "$target" --parallel "$(nproc)"

@@ -1,0 +1,61 @@
+#!/usr/bin/env bash
+# Installs what is missing of the Debian packages that a task needs; touches nothing when all are there.
+set -euo pipefail
+
+usage() {
+    cat <<'END'
+usage: install-dependencies.sh [build|test|bench|dev] ...
+
+  build   compiler, build tools and libraries of qrxdeck (default)
+  test    build, and what the tests need
+  bench   build, and what the benchmarks need
+  dev     all of these, and the clang tools
+END
+}
+
+build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev)
+test=(libgtest-dev librapidcheck-dev pkg-config python3)
+bench=(libbenchmark-dev libfmt-dev)
+dev=(clang clang-tidy clang-format)
+
+[ $# -gt 0 ] || set -- build
+packages=("${build[@]}")
+for task in "$@"; do
+    case $task in
+        build) ;;
+        test) packages+=("${test[@]}") ;;
+        bench) packages+=("${bench[@]}") ;;
+        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
+        -h | --help) usage; exit 0 ;;
+        *) usage >&2; exit 2 ;;
+    esac
+done
+
+if ! command -v dpkg-query >/dev/null; then
+    echo "install-dependencies: not a Debian system; make sure that these are there: ${packages[*]}" >&2
+    exit 0
+fi
+
+missing=()
+for package in "${packages[@]}"; do
+    status=$(dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null || true)
+    [ "$status" = installed ] || missing+=("$package")
+done
+[ ${#missing[@]} -gt 0 ] || exit 0
+
+as_root=()
+if [ "$(id -u)" -ne 0 ]; then
+    if ! command -v sudo >/dev/null; then
+        echo "install-dependencies: needs root or sudo; run as root: apt-get install ${missing[*]}" >&2
+        exit 1
+    fi
+    as_root=(sudo)
+fi
+
+apt() {
+    ${as_root[@]+"${as_root[@]}"} env DEBIAN_FRONTEND=noninteractive apt-get -q -o DPkg::Lock::Timeout=300 "$@"
+}
+
+echo "installing: ${missing[*]}"
+apt update
+apt install -y --no-install-recommends "${missing[@]}"
