@@ -1,0 +1,63 @@
+#include "store_interface/model/ddb_Assembly.h"
+
+namespace {
+
+const cow_CountedHld<odiK_Mesh>& EmptyMesh() {
+    static const cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
+    return mesh;
+}
+
+} // namespace
+
+ddb_Part ddb_PartContainer::get(const cow_String& name) const {
+    const auto place = model_->Parts().find(name);
+    if (place == model_->Parts().end()) cow_RaiseNoSuchKey("ddb_PartContainer", name);
+    return ddb_Part(place->second);
+}
+
+unsigned ddb_BaseInstance::DynTypeId() const {
+    return IsPartInstance() ? ddb_PartInstance::TypeId() : TypeId();
+}
+
+cow_List<float> ddb_BaseInstance::transform() const {
+    cow_List<float> values;
+    for (const float value : instance_->translation) values.Append(value);
+    for (const float value : instance_->rotation) values.Append(value);
+    return values;
+}
+
+ddb_PartInstance::ddb_PartInstance(const ddb_BaseInstance& instance) : ddb_BaseInstance(instance) {
+    nex_CheckCast(instance.DynTypeId(), TypeId(), NEX_HERE);
+}
+
+ddb_Mesh ddb_PartInstance::mesh() const {
+    const cow_CountedHld<odiK_Mesh> mesh = instance_->Mesh();
+    return {mesh.IsNull() ? EmptyMesh() : mesh, model_, instance_->name, instance_->meshIndex};
+}
+
+ddb_MaterialOrientationContainer ddb_PartInstance::materialOrientations() const {
+    return {instance_, instance_->attributes.materialOrientations};
+}
+
+ddb_BeamOrientationContainer ddb_PartInstance::beamOrientations() const {
+    return {instance_, instance_->attributes.beamOrientations};
+}
+
+ddr_ShortcutTo<odiK_PartInstance> ddb_PartInstance::Shortcut() const {
+    return {cow_String("rootAssembly.instance[") + cow_String(instance_->meshIndex) + "]", instance_->name,
+            instance_->attributes};
+}
+
+ddb_Mesh ddb_Assembly::mesh() const {
+    return {hasMesh() ? model_->ConstAssemblyMesh() : EmptyMesh(), model_, cow_String(), 0};
+}
+
+ddb_Set ddb_Assembly::nset(const cow_String& name) const {
+    const rgnC_Region region = model_->FindRegion(cow_String(), name);
+    if (!region.HasValue() || region.FlagWord() != 1) cow_RaiseNoSuchKey("ddb_Assembly::nset", name);
+    return {region.ConstSet().Id(), region};
+}
+
+ddr_ShortcutTo<odiK_Assembly> ddb_Assembly::Shortcut() const {
+    return {"rootAssembly", name(), model_->AssemblyObject()};
+}

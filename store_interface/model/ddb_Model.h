@@ -1,0 +1,145 @@
+#ifndef QRX_STORE_DDB_MODEL_H
+#define QRX_STORE_DDB_MODEL_H
+
+#include "store_interface/model/ddb_Assembly.h"
+#include "store_interface/model/ddb_Datum.h"
+
+/// A container object of the model; container() gives what it holds.
+template <class Container>
+class ddb_Container {
+public:
+    ddb_Container(const cow_CountedHld<odiK_Model>& model, const Container& container)
+        : model_(model), container_(&container) {}
+    const Container& container() const { return *container_; }
+
+private:
+    cow_CountedHld<odiK_Model> model_;
+    const Container* container_;
+};
+
+/// View on one step.
+class ddb_DdbStep {
+public:
+    explicit ddb_DdbStep(const kprC_Step& step) : step_(&step) {}
+    bool isExplicit() const { return step_->Explicit(); }
+
+private:
+    const kprC_Step* step_;
+};
+
+class ddb_DdbStepIT {
+public:
+    explicit ddb_DdbStepIT(const kprC_StepContainer& steps) : steps_(&steps) {}
+    void first() { index_ = 0; }
+    void next() { ++index_; }
+    bool isDone() const { return index_ >= steps_->Size(); }
+    const cow_String& currentKey() const { return steps_->NameAt(index_); }
+    ddb_DdbStep currentValue() const { return ddb_DdbStep(steps_->StepAt(index_)); }
+
+private:
+    const kprC_StepContainer* steps_;
+    int index_ = 0;
+};
+
+/// The steps of the model.
+class ddb_DdbStepContainer : public ddb_Container<kprC_StepContainer> {
+public:
+    ddb_DdbStepContainer(const cow_CountedHld<odiK_Model>& model, int analysisProduct)
+        : ddb_Container(model, model->steps), analysisProduct_(analysisProduct) {}
+    int size() const { return container().Size(); }
+    /// The model's own when it is set; else EXPLICIT when a step behind the first is explicit, else IMPLICIT.
+    kprC_AnalysisProductEnm AnalysisProduct() const;
+    ddb_DdbStepIT createIterator() const { return ddb_DdbStepIT(container()); }
+
+private:
+    int analysisProduct_;
+};
+
+/// What the model's shortcut leads to: the attributes that are held apart from the tree.
+class ddr_Model {
+public:
+    explicit ddr_Model(const odiK_Model& model) : model_(&model) {}
+    /// The sections, as a repository; a mdl_MapString2ObjCow<kseC_Section>.
+    const mdl_Repository& ConstGetSections() const { return model_->sections; }
+
+private:
+    const odiK_Model* model_;
+};
+
+/// View on a model: the entry to everything in it.
+class ddb_Model {
+public:
+    explicit ddb_Model(const cow_CountedHld<odiK_Model>& model) : model_(model), attributes_(*model) {}
+
+    ddb_Assembly rootAssembly() const { return ddb_Assembly(model_); }
+    ddb_PartContainer part() const { return ddb_PartContainer(model_); }
+    ddb_DdbStepContainer step() const { return {model_, model_->analysisProduct}; }
+    /// The mesh of an index: 0 the assembly's, else a part instance's. Another index raises.
+    ddb_Mesh mesh(int meshIndex) const;
+    /// The datum of an id from 1; another id raises.
+    ddb_Datum datum(const int& id) const;
+    /// The object of the model under a key; there is one, under "rootAssembly". Another key raises.
+    const odiK_Assembly& Object(const cow_String& key) const;
+    /// Leads to the model's attributes. Must not outlive this view.
+    ddr_ShortcutTo<ddr_Model> Shortcut() const { return {"model", model_->Name(), attributes_}; }
+
+    const cow_String& solverInput() const { return model_->solverInput; }
+    const cow_String& topLevelSolverInput() const { return model_->topLevelSolverInput; }
+    double absoluteZero() const { return model_->absoluteZero; }
+    double stefanBoltzmann() const { return model_->stefanBoltzmann; }
+    const cow_String& waveFormulation() const { return model_->waveFormulation; }
+    const cow_String& restartJob() const { return model_->restartJob; }
+    const cow_String& restartStep() const { return model_->restartStep; }
+    int restartIncrement() const { return model_->restartIncrement; }
+    bool endRestartStep() const { return model_->endRestartStep; }
+    const cow_String& globalJob() const { return model_->globalJob; }
+    bool shellToSolid() const { return model_->shellToSolid; }
+    /// Whether the model, called by its name, has a cyclic sector definition.
+    bool hasCyclicSymmetry(const cow_String& modelName) const;
+    /// The sector definition; raises when there is none.
+    const ddb_ModelSectorDefinition& modelSectorForCyclicSymmetry() const;
+
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kmaC_Material>> material() const {
+        return {"materials", "materials", model_->materials};
+    }
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kamC_Amplitude>> amplitudes() const {
+        return {"amplitudes", "amplitudes", model_->amplitudes};
+    }
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kbpC_BeamProfile>> beamProfile() const {
+        return {"beamProfiles", "beamProfiles", model_->beamProfiles};
+    }
+
+    template <class T>
+    using Named = ddb_Container<mdl_MapString2ObjCow<T>>;
+    template <class T>
+    using Propagating = ddb_Container<kprC_PropagatingContainer<T>>;
+    Named<kcoC_Constraint> constraints() const { return {model_, model_->constraints}; }
+    Named<kinC_ContactControls> contactControls() const { return {model_, model_->contactControls}; }
+    Named<kinC_ContactInitialization> contactInitializations() const {
+        return {model_, model_->contactInitializations};
+    }
+    Named<kinC_InteractionProperty> interactionProperties() const {
+        return {model_, model_->interactionProperties};
+    }
+    Named<kprC_TimePoint> timePoints() const { return {model_, model_->timePoints}; }
+    Named<kadC_AdptMeshCtrl> adaptiveMeshControls() const { return {model_, model_->adaptiveMeshControls}; }
+    Propagating<kbcC_BC> boundaryConditions() const { return {model_, model_->boundaryConditions}; }
+    Propagating<kloC_Load> loads() const { return {model_, model_->loads}; }
+    Propagating<kpfC_Field> fields() const { return {model_, model_->fields}; }
+    Propagating<kinC_Interaction> interactions() const { return {model_, model_->interactions}; }
+    Propagating<korC_FieldOutput> fieldOutputRequests() const {
+        return {model_, model_->fieldOutputRequests};
+    }
+    Propagating<korC_HistoryOutput> historyOutputRequests() const {
+        return {model_, model_->historyOutputRequests};
+    }
+    Propagating<kprC_AdptMeshCons> adaptiveMeshConstraints() const {
+        return {model_, model_->adaptiveMeshConstraints};
+    }
+
+private:
+    cow_CountedHld<odiK_Model> model_;
+    ddr_Model attributes_;
+};
+
+#endif

@@ -1,0 +1,242 @@
+#include "store_interface/model/odiK_Model.h"
+
+#include "foundation/nex_Exception.h"
+
+#include <cmath>
+
+namespace {
+
+[[noreturn]] void Raise(const std::string& text) {
+    nex_Raise(atr_String(std::string_view(text)));
+}
+
+std::string Quoted(const cow_String& name) {
+    return "'" + std::string(name.View()) + "'";
+}
+
+void NormalizeAxis(gsl_Vector& axis, const cow_String& datum, const char* member) {
+    const double length = axis.ComputeMagnitude();
+    if (!(length > 0.0)) Raise("datum " + Quoted(datum) + ": " + member + " has no length");
+    axis.Normalize();
+}
+
+void Place(odiK_Datum& datum) {
+    const bool csys = datum.type == dtu_DatumType::CSYS;
+    if (csys || datum.type == dtu_DatumType::AXIS) NormalizeAxis(datum.xAxis, datum.name, "xAxis");
+    if (csys) {
+        NormalizeAxis(datum.yAxis, datum.name, "yAxis");
+        if (datum.zAxis == gsl_Vector()) datum.zAxis = gsl_Cross(datum.xAxis, datum.yAxis);
+        const gsl_Vector normal = gsl_Cross(datum.xAxis, datum.yAxis);
+        if (!(normal.ComputeMagnitude() > gsl_Util::Instance().AngleTolerance())) {
+            Raise("datum " + Quoted(datum.name) + ": xAxis and yAxis are parallel");
+        }
+    }
+    if (csys || datum.type == dtu_DatumType::PLANE) NormalizeAxis(datum.zAxis, datum.name, "zAxis");
+}
+
+std::string PathOfSet(const cow_String& owner, int id) {
+    return std::string(owner.View()) + ".setData[" + std::to_string(id) + "]";
+}
+
+} // namespace
+
+void odiK_Assembly::AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation) {
+    ptoC_ConnectorOrientation named(orientation);
+    if (named.name.IsEmpty()) named.name = cow_String("ConnOri-") + cow_String(connectorOrientations.Size());
+    connectorOrientations.Append(named);
+}
+
+dtmC_DatumRef odiK_Model::AddDatum(odiK_Datum datum) {
+    if (!FindDatum(datum.name).IsNullRef())
+        Raise("a datum named " + Quoted(datum.name) + " is there already");
+    Place(datum);
+    datums_.push_back(datum);
+    return dtmC_DatumRef(static_cast<int>(datums_.size()));
+}
+
+dtmC_DatumRef odiK_Model::FindDatum(const cow_String& name) const {
+    for (std::size_t i = 0; i < datums_.size(); ++i) {
+        if (datums_[i].name == name) return dtmC_DatumRef(static_cast<int>(i) + 1);
+    }
+    return {};
+}
+
+template <class Entry>
+void odiK_Model::CheckNewName(const std::map<cow_String, cow_CountedHld<Entry>>& entries,
+                              const cow_String& name, const char* kind) const {
+    if (entries.count(name) != 0) Raise(std::string(kind) + " named " + Quoted(name) + " is there already");
+}
+
+odiK_Part& odiK_Model::AddPart(const cow_String& name) {
+    CheckNewName(parts_, name, "a part");
+    cow_CountedHld<odiK_Part> part(new odiK_Part());
+    part->name = name;
+    return *parts_.emplace(name, part).first->second;
+}
+
+odiK_Instance& odiK_Model::AddInstance(const cow_String& name, const cow_String& partName) {
+    if (parts_.count(partName) == 0)
+        Raise("instance " + Quoted(name) + ": there is no part named " + Quoted(partName));
+    return AddOtherEntry(name, partName).isPartInstance = true, *FindInstance(name);
+}
+
+odiK_Instance& odiK_Model::AddOtherEntry(const cow_String& name, const cow_String& partName) {
+    CheckNewName(instances_, name, "an instance");
+    if (sealed_)
+        Raise("instance " + Quoted(name) + ": instances must be added before the first set or region");
+    cow_CountedHld<odiK_Instance> instance(new odiK_Instance());
+    instance->name = name;
+    instance->partName = partName;
+    instance->isPartInstance = false;
+    const auto part = parts_.find(partName);
+    if (part != parts_.end()) instance->part = part->second;
+    return *instances_.emplace(name, instance).first->second;
+}
+
+odiK_Instance* odiK_Model::FindInstance(const cow_String& name) const {
+    const auto place = instances_.find(name);
+    return place == instances_.end() ? nullptr : place->second.Referent();
+}
+
+void odiK_Model::SealInstances() {
+    if (sealed_) return;
+    int others = 0;
+    for (const auto& [name, instance] : instances_) {
+        if (instance->isPartInstance) {
+            instanceOfMesh_.push_back(instance);
+            instance->meshIndex = static_cast<int>(instanceOfMesh_.size());
+        } else {
+            instance->meshIndex = -++others;
+        }
+    }
+    sealed_ = true;
+}
+
+cow_CountedHld<odiK_Instance> odiK_Model::InstanceOfMesh(int meshIndex) const {
+    if (meshIndex < 1 || meshIndex > static_cast<int>(instanceOfMesh_.size())) return {};
+    return instanceOfMesh_[static_cast<std::size_t>(meshIndex) - 1];
+}
+
+odiK_Mesh& odiK_Model::AssemblyMesh() {
+    if (assemblyMesh_.IsNull()) assemblyMesh_.Reset(new odiK_Mesh());
+    return *assemblyMesh_;
+}
+
+int odiK_Model::FindAssemblySet(const cow_String& name) const {
+    const auto place = assemblySetIndex_.find(name.View());
+    return place == assemblySetIndex_.end() ? -1 : place->second;
+}
+
+void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type, bool internal,
+                                std::span<const odiK_MemberInput> members, odiK_Problems& problems) {
+    SealInstances();
+    if (FindAssemblySet(name) >= 0) {
+        problems.Error("/name", "found a second set named " + Quoted(name) +
+                                    ", expected names that are unique in the assembly");
+        return;
+    }
+    cow_CountedHld<odiK_Set> set(new odiK_Set());
+    set->name = name;
+    set->type = type;
+    set->internal = internal;
+    for (std::size_t i = 0; i < members.size(); ++i) {
+        const std::string place = "/members/" + std::to_string(i);
+        const odiK_MemberInput& member = members[i];
+        const odiK_Instance* instance = FindInstance(member.instanceName);
+        if (!member.instanceName.IsEmpty() && instance == nullptr) {
+            problems.Error(place + "/instance",
+                           "found " + Quoted(member.instanceName) + ", expected the name of an instance");
+            continue;
+        }
+        const cow_CountedHld<odiK_Mesh> mesh = instance == nullptr ? assemblyMesh_ : instance->Mesh();
+        static const odiK_Mesh none;
+        (mesh.IsNull() ? none : *mesh)
+            .AppendSubsets({name, type, internal, member.labels, member.facets},
+                           instance == nullptr ? 0 : instance->meshIndex, set->subsets, place, problems);
+    }
+    assemblySets_.push_back(set);
+    assemblySetIndex_.emplace(set->name.View(), static_cast<int>(assemblySets_.size()) - 1);
+}
+
+void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type,
+                                std::span<const odiK_MemberInput> members, bool internal) {
+    odiK_RaiseProblems problems;
+    AddAssemblySet(name, type, internal, members, problems);
+}
+
+rgnC_Region odiK_Model::FindRegion(const cow_String& instanceName, const cow_String& setName) {
+    SealInstances();
+    if (instanceName.IsEmpty()) {
+        const int id = FindAssemblySet(setName);
+        if (id < 0) return {};
+        const rgnC_SetData data(assemblySets_[static_cast<std::size_t>(id)]);
+        return {ddr_Shortcut(PathOfSet("rootAssembly", id), setName), instanceName, rgnC_Set(id, data)};
+    }
+    const odiK_Instance* instance = FindInstance(instanceName);
+    if (instance == nullptr || instance->Mesh().IsNull()) return {};
+    const int id = instance->Mesh()->FindSet(setName);
+    if (id < 0) return {};
+    const rgnC_SetData data(instance->Mesh()->Sets()[static_cast<std::size_t>(id)], instance->meshIndex);
+    const cow_String owner = cow_String("rootAssembly.mesh[") + cow_String(instance->meshIndex) + "]";
+    return {ddr_Shortcut(PathOfSet(owner, id), setName), instanceName, rgnC_Set(id, data)};
+}
+
+rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String& setName) {
+    rgnC_Region region = FindRegion(instanceName, setName);
+    if (!region.HasValue()) {
+        Raise("there is no set named " + Quoted(setName) +
+              (instanceName.IsEmpty() ? std::string(" in the assembly")
+                                      : " in instance " + Quoted(instanceName)));
+    }
+    return region;
+}
+
+void odiK_Model::CompleteTree(odiK_Problems& problems) {
+    SealInstances();
+    for (const auto& [name, instance] : instances_) {
+        const odiK_AttributeInputs none;
+        const odiK_AttributeInputs& part = instance->part.IsNull() ? none : instance->part->attributes;
+        const auto fill =
+            [&](ptoC_PartAttributeList& list, const std::vector<odiK_AttributeInput>& partInputs,
+                const std::unique_ptr<std::vector<odiK_AttributeInput>>& ownInputs, const char* member) {
+                list = {};
+                const auto& inputs = ownInputs == nullptr ? partInputs : *ownInputs;
+                for (std::size_t i = 0; i < inputs.size(); ++i) {
+                    mdl_ObjCow<ptoC_PartAttribute> record = inputs[i].record;
+                    record.Get().region = FindRegion(name, inputs[i].setName);
+                    if (!record.ConstGet().region.HasValue()) {
+                        problems.Error("/assembly/instances/" + std::string(name.View()) + "/" + member +
+                                           "/" + std::to_string(i) + "/region",
+                                       "found " + Quoted(inputs[i].setName) +
+                                           ", expected the name of a set of the instance's mesh");
+                    }
+                    list.Append(record.ConstGet());
+                }
+            };
+        fill(instance->attributes.sectionAssignments, part.sectionAssignments,
+             instance->ownSectionAssignments, "sectionAssignments");
+        fill(instance->attributes.materialOrientations, part.materialOrientations,
+             instance->ownMaterialOrientations, "materialOrientations");
+        fill(instance->attributes.beamOrientations, part.beamOrientations, instance->ownBeamOrientations,
+             "beamOrientations");
+    }
+}
+
+void odiK_Model::Complete() {
+    odiK_RaiseProblems problems;
+    for (const auto& [name, part] : parts_) {
+        if (!part->mesh.IsNull()) part->mesh->FinishElements(problems);
+    }
+    for (const auto& [name, instance] : instances_) {
+        if (!instance->ownMesh.IsNull()) instance->ownMesh->FinishElements(problems);
+    }
+    if (!assemblyMesh_.IsNull()) assemblyMesh_->FinishElements(problems);
+    CompleteTree(problems);
+    boundaryConditions.Propagate(steps);
+    loads.Propagate(steps);
+    fields.Propagate(steps);
+    interactions.Propagate(steps);
+    fieldOutputRequests.Propagate(steps);
+    historyOutputRequests.Propagate(steps);
+    adaptiveMeshConstraints.Propagate(steps);
+}

@@ -1,0 +1,227 @@
+#ifndef QRX_STORE_ODIK_MODEL_H
+#define QRX_STORE_ODIK_MODEL_H
+
+#include "store_interface/model/odiK_Mesh.h"
+#include "store_interface/records/amplitudes/kamC_Amplitude.h"
+#include "store_interface/records/conditions/kbcC_BC.h"
+#include "store_interface/records/conditions/kloC_Load.h"
+#include "store_interface/records/conditions/kpfC_Field.h"
+#include "store_interface/records/constraints/kcoC_Constraint.h"
+#include "store_interface/records/interactions/kinC_Interaction.h"
+#include "store_interface/records/materials/kmaC_Material.h"
+#include "store_interface/records/output/korC_Output.h"
+#include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
+#include "store_interface/records/sections/kseC_Section.h"
+
+#include <map>
+#include <memory>
+
+/// What hangs behind a part, or behind an instance that differs from its part: attributes on the sets of its
+/// mesh. A later section assignment wins on an element.
+struct odiK_PartInstance {
+    ptoC_PartAttributeList sectionAssignments;
+    ptoC_PartAttributeList materialOrientations;
+    ptoC_PartAttributeList beamOrientations;
+
+    const ptoC_PartAttributeList& ConstGetSectionAssignment() const { return sectionAssignments; }
+};
+
+/// An attribute of a part, given on a set of the mesh by name until the instance is known.
+struct odiK_AttributeInput {
+    cow_String setName;
+    mdl_ObjCow<ptoC_PartAttribute> record;
+};
+
+/// The attributes of a part or an instance, as given.
+struct odiK_AttributeInputs {
+    std::vector<odiK_AttributeInput> sectionAssignments;
+    std::vector<odiK_AttributeInput> materialOrientations;
+    std::vector<odiK_AttributeInput> beamOrientations;
+};
+
+struct odiK_Part {
+    cow_String name;
+    cow_String solverInput;
+    cow_CountedHld<odiK_Mesh> mesh; // null: none
+    odiK_AttributeInputs attributes;
+};
+
+/// An entry of the assembly. What it doesn't have of its own it takes from its part.
+struct odiK_Instance {
+    cow_String name;
+    cow_String partName;
+    cow_CountedHld<odiK_Part> part; // null for an entry that is no part instance and names none
+    bool isPartInstance = true;
+    /// Single precision; the rotation vector's direction is the axis through the origin, its length the angle
+    /// in radians; it is applied before the translation.
+    float translation[3] = {0.0F, 0.0F, 0.0F};
+    float rotation[3] = {0.0F, 0.0F, 0.0F};
+    cow_String solverInput;
+    cow_CountedHld<odiK_Mesh> ownMesh; // null: the part's
+    std::unique_ptr<std::vector<odiK_AttributeInput>> ownSectionAssignments;
+    std::unique_ptr<std::vector<odiK_AttributeInput>> ownMaterialOrientations;
+    std::unique_ptr<std::vector<odiK_AttributeInput>> ownBeamOrientations;
+
+    /// 1, 2, ... in ascending order of the names; negative for entries that are no part instances. Known when
+    /// the instances are sealed.
+    int meshIndex = 0;
+    /// The attributes with their regions; filled when the model is completed.
+    odiK_PartInstance attributes;
+
+    /// The mesh that it shows; null when there is none at all.
+    cow_CountedHld<odiK_Mesh> Mesh() const {
+        return !ownMesh.IsNull() || part.IsNull() ? ownMesh : part->mesh;
+    }
+};
+
+/// The assembly-level object that holds the assembly's attribute lists.
+struct odiK_Assembly {
+    ptoC_PartAttributeList sectionAssignments;
+    ptoC_PartAttributeList connectorOrientations;
+
+    const ptoC_PartAttributeList& ConstGetSectionAssignment() const { return sectionAssignments; }
+    const ptoC_PartAttributeList& ConstGetConnectorOrientation() const { return connectorOrientations; }
+    /// Appends; an orientation without a name gets "ConnOri-" and its place.
+    void AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation);
+};
+
+enum class dtu_DatumType : int { POINT = 1, AXIS = 2, PLANE = 3, CSYS = 4 };
+enum class dtu_DatumCsysType : int { RECTANGULAR = 1, CYLINDRICAL = 2, SPHERICAL = 3 };
+
+/// A datum. Axes are unit vectors. A point has an origin; an axis has its direction in xAxis; a plane its
+/// normal in zAxis.
+struct odiK_Datum {
+    cow_String name;
+    dtu_DatumType type = dtu_DatumType::CSYS;
+    dtu_DatumCsysType csysType = dtu_DatumCsysType::RECTANGULAR;
+    gsl_Point origin;
+    gsl_Vector xAxis{1.0, 0.0, 0.0};
+    gsl_Vector yAxis{0.0, 1.0, 0.0};
+    gsl_Vector zAxis{0.0, 0.0, 1.0};
+};
+
+/// One entry of a set of the assembly: members in the mesh of an instance, or in the assembly's own mesh when
+/// the name is empty.
+struct odiK_MemberInput {
+    cow_String instanceName;
+    std::span<const int> labels;
+    std::span<const odiK_FacetInput> facets;
+};
+
+/// A model in memory: the object behind all views, and the interface through which a program fills a store.
+/// Parts first, then instances, then sets, regions and records; the first region or set of the assembly
+/// seals the instances. Complete() works out what follows from all that; odb_Odb calls it before the model is
+/// read. A model must not change while it is being written.
+class odiK_Model {
+public:
+    explicit odiK_Model(const cow_String& name) : name_(name) {}
+    odiK_Model(const odiK_Model&) = delete;
+    odiK_Model& operator=(const odiK_Model&) = delete;
+
+    const cow_String& Name() const { return name_; }
+
+    cow_String description;
+    cow_String topLevelSolverInput;
+    cow_String solverInput;
+    double absoluteZero = 0.0;
+    double stefanBoltzmann = 0.0;
+    /// "NOT_SET", "SCATTERED" or "TOTAL".
+    cow_String waveFormulation = "NOT_SET";
+    cow_String restartJob;
+    cow_String restartStep;
+    int restartIncrement = 0;
+    bool endRestartStep = false;
+    cow_String globalJob;
+    bool shellToSolid = false;
+    /// Unset: EXPLICIT when an analysis step is explicit, else IMPLICIT.
+    int analysisProduct = cls_UnsetInt;
+    /// Null: none.
+    mdl_ObjCow<ddb_ModelSectorDefinition> cyclicSymmetry;
+
+    kprC_StepContainer steps;
+    mdl_MapString2ObjCow<kmaC_Material> materials;
+    mdl_MapString2ObjCow<kseC_Section> sections;
+    mdl_MapString2ObjCow<kbpC_BeamProfile> beamProfiles;
+    mdl_MapString2ObjCow<kamC_Amplitude> amplitudes;
+    mdl_MapString2ObjCow<kcoC_Constraint> constraints;
+    mdl_MapString2ObjCow<kinC_ContactControls> contactControls;
+    mdl_MapString2ObjCow<kinC_ContactInitialization> contactInitializations;
+    mdl_MapString2ObjCow<kinC_InteractionProperty> interactionProperties;
+    mdl_MapString2ObjCow<kprC_TimePoint> timePoints;
+    mdl_MapString2ObjCow<kadC_AdptMeshCtrl> adaptiveMeshControls;
+    kprC_PropagatingContainer<kbcC_BC> boundaryConditions;
+    kprC_PropagatingContainer<kloC_Load> loads;
+    kprC_PropagatingContainer<kpfC_Field> fields;
+    kprC_PropagatingContainer<kinC_Interaction> interactions;
+    kprC_PropagatingContainer<korC_FieldOutput> fieldOutputRequests;
+    kprC_PropagatingContainer<korC_HistoryOutput> historyOutputRequests;
+    kprC_PropagatingContainer<kprC_AdptMeshCons> adaptiveMeshConstraints;
+
+    /// Adds a datum under a new name; its id is its place from 1. Axes are normalised; `zAxis` may be zero,
+    /// and is then the cross product of the others. A zero length or parallel axes raise.
+    dtmC_DatumRef AddDatum(odiK_Datum datum);
+    /// The reference of the datum, null when there is none of the name.
+    dtmC_DatumRef FindDatum(const cow_String& name) const;
+    const std::vector<odiK_Datum>& Datums() const { return datums_; }
+
+    /// Adds an empty part, or entry of the assembly, under a new name; a name that is taken, or a part that
+    /// is not there, raises.
+    odiK_Part& AddPart(const cow_String& name);
+    odiK_Instance& AddInstance(const cow_String& name, const cow_String& partName);
+    /// Adds an entry that is no part instance, with a part or without ("").
+    odiK_Instance& AddOtherEntry(const cow_String& name, const cow_String& partName);
+    const std::map<cow_String, cow_CountedHld<odiK_Part>>& Parts() const { return parts_; }
+    const std::map<cow_String, cow_CountedHld<odiK_Instance>>& Instances() const { return instances_; }
+    /// The entry, or null.
+    odiK_Instance* FindInstance(const cow_String& name) const;
+    /// The part instance whose mesh index it is, or null.
+    cow_CountedHld<odiK_Instance> InstanceOfMesh(int meshIndex) const;
+    /// Gives the instances their mesh indices. No instance can be added later.
+    void SealInstances();
+    bool InstancesAreSealed() const { return sealed_; }
+
+    cow_String assemblyName = "Assembly";
+    cow_String assemblySolverInput;
+    /// The assembly's own mesh, made at the first use.
+    odiK_Mesh& AssemblyMesh();
+    const cow_CountedHld<odiK_Mesh>& ConstAssemblyMesh() const { return assemblyMesh_; }
+    odiK_Assembly& AssemblyObject() { return assembly_; }
+    const odiK_Assembly& AssemblyObject() const { return assembly_; }
+    const std::vector<cow_CountedHld<odiK_Set>>& AssemblySets() const { return assemblySets_; }
+    int FindAssemblySet(const cow_String& name) const;
+    /// Adds a set of the assembly. Places of problems begin with "/members/<entry>".
+    void AddAssemblySet(const cow_String& name, res_SetTypeEnm type, bool internal,
+                        std::span<const odiK_MemberInput> members, odiK_Problems& problems);
+    void AddAssemblySet(const cow_String& name, res_SetTypeEnm type,
+                        std::span<const odiK_MemberInput> members, bool internal = false);
+
+    /// The region of a set of the assembly (`instanceName` empty) or of an instance; without a value when
+    /// there is no such set. Seals the instances.
+    rgnC_Region FindRegion(const cow_String& instanceName, const cow_String& setName);
+    /// The same; a set that is not there raises.
+    rgnC_Region Region(const cow_String& instanceName, const cow_String& setName);
+
+    /// Works out what follows: attributes of the instances on their own sets, statuses and states in all
+    /// steps. Raises when something can't be.
+    void Complete();
+    /// The same but for what lives across steps.
+    void CompleteTree(odiK_Problems& problems);
+
+private:
+    template <class Entry>
+    void CheckNewName(const std::map<cow_String, cow_CountedHld<Entry>>& entries, const cow_String& name,
+                      const char* kind) const;
+
+    cow_String name_;
+    std::vector<odiK_Datum> datums_;
+    std::map<cow_String, cow_CountedHld<odiK_Part>> parts_;
+    std::map<cow_String, cow_CountedHld<odiK_Instance>> instances_;
+    std::vector<cow_CountedHld<odiK_Instance>> instanceOfMesh_;
+    bool sealed_ = false;
+    cow_CountedHld<odiK_Mesh> assemblyMesh_;
+    odiK_Assembly assembly_;
+    std::vector<cow_CountedHld<odiK_Set>> assemblySets_;
+    std::unordered_map<std::string_view, int> assemblySetIndex_;
+};
+
+#endif

@@ -1,0 +1,234 @@
+#ifndef QRX_STORE_KPRC_PROPAGATINGOBJECT_H
+#define QRX_STORE_KPRC_PROPAGATINGOBJECT_H
+
+#include "store_interface/propagation/mdl_PropAttr.h"
+#include "store_interface/records/steps/kprC_StepContainer.h"
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+/// What the user said of one field of a state.
+enum class mdl_GivenEnm : char {
+    ABSENT,       ///< nothing: carried over
+    VALUE,        ///< a value, set in this step
+    CLEARED,      ///< cleared in this step
+    AS_IT_STANDS, ///< value and attribute state, taken without any rule
+    STATE_ONLY,   ///< an attribute state; its value follows from the state
+};
+
+/// What the user said of an object in one step.
+struct mdl_GivenState {
+    cow_String stepName;
+    /// A record of the object's state class; only the fields that are marked count.
+    mdl_ObjCow<cls_Record> record;
+    /// One mark per field of the state class.
+    std::vector<mdl_GivenEnm> marks;
+    bool deactivated = false;
+    /// Overrides the status that the rules give.
+    std::optional<mdl_PropagationStatusEnm> status;
+
+    bool IsGiven(const char* field) const;
+};
+
+/// A state that can't be: which step, and why.
+struct mdl_PropagationProblem {
+    cow_String stepName;
+    cow_String text;
+};
+
+/// What an object is in one step, worked out from what the user said in all steps.
+template <class S>
+struct kprC_PropagatingState {
+    cow_String stepName;
+    mdl_PropagationStatusEnm status = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
+    /// Never null; a default state where the object has none in the step.
+    mdl_ObjCow<S> state;
+    bool hasState = false;
+    /// The class number of the step's record; 0 for the initial step.
+    unsigned procedureType = 0;
+};
+
+/// Which of the status rules an object follows.
+enum class mdl_PropagationFamilyEnm { BOUNDARY_CONDITION, LOAD, FIELD, INTERACTION, OUTPUT_REQUEST };
+
+/// Base of the records that live across steps. The user's states are given step by step; Propagate() works
+/// out status and state for every step:
+///  - a state creates the object, later states change or end it, steps without one carry it on;
+///  - a linear perturbation step sees the state of the last general step and leaves nothing behind.
+class kprC_PropagatingObject : public cls_AbstractRecordOf<kprC_PropagatingObject> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_PropagatingObject", "a record that lives across steps"};
+
+    bool suppressed = false;
+
+    virtual mdl_PropagationFamilyEnm Family() const = 0;
+    /// A new state of the object's state class, with the defaults of a step of the procedure.
+    virtual cls_Record* NewState(unsigned procedureType) const = 0;
+
+    const std::vector<mdl_GivenState>& GivenStates() const { return given_; }
+    const mdl_GivenState* GivenState(const cow_String& stepName) const;
+    /// The user's state of the step, made at its first use.
+    mdl_GivenState& Give(const cow_String& stepName);
+
+    /// Works out all steps; must run again after a change of states or steps. Gives the states that can't
+    /// be, in step order; their steps are treated as if nothing had been said there.
+    virtual std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) = 0;
+
+    /// Statuses in which an object is in force: 1, 2, 3, 8, 9, 10 and 14.
+    static bool IsActive(mdl_PropagationStatusEnm status);
+    /// Status 8.
+    static bool IsBuiltIn(mdl_PropagationStatusEnm status);
+
+    static const cls_FieldTable& Fields();
+
+protected:
+    /// Lays a rule of the class's own over a state that has just been worked out. `given` is null where the
+    /// user said nothing.
+    virtual void CompleteState(cls_Record& state, mdl_PropagationStatusEnm status,
+                               const mdl_GivenState* given) const;
+
+    struct StepResult {
+        mdl_PropagationStatusEnm status = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
+        mdl_ObjCow<cls_Record> state; // null: none
+    };
+    std::vector<StepResult> WorkOut(const kprC_StepContainer& steps,
+                                    std::vector<mdl_PropagationProblem>& problems) const;
+    [[noreturn]] void RaiseNoSuchStep(const cow_String& stepName) const;
+
+private:
+    class Engine;
+    std::vector<mdl_GivenState> given_;
+};
+
+/// Sets fields of a user's state by member: Edit<S>(given).Set<&S::u1>(0.5).Clear<&S::amplitude>().
+template <class S>
+class mdl_StateEdit {
+public:
+    explicit mdl_StateEdit(mdl_GivenState& given) : given_(given) {}
+    template <auto Member, class V>
+    mdl_StateEdit& Set(const V& value) {
+        auto& member = static_cast<S&>(given_.record.Get()).*Member;
+        if constexpr (requires { member.Set(value); }) {
+            member.Set(value);
+        } else {
+            member = value;
+        }
+        return Mark(&member, mdl_GivenEnm::VALUE);
+    }
+    template <auto Member>
+    mdl_StateEdit& Clear() {
+        return Mark(&(static_cast<S&>(given_.record.Get()).*Member), mdl_GivenEnm::CLEARED);
+    }
+    mdl_StateEdit& Deactivate() {
+        given_.deactivated = true;
+        return *this;
+    }
+    mdl_StateEdit& Status(mdl_PropagationStatusEnm status) {
+        given_.status = status;
+        return *this;
+    }
+
+private:
+    mdl_StateEdit& Mark(const void* member, mdl_GivenEnm mark) {
+        const auto& fields = given_.record.ConstGet().DynFields().All();
+        for (std::size_t i = 0; i < fields.size(); ++i) {
+            if (fields[i].In(given_.record.ConstGet()) == member) given_.marks[i] = mark;
+        }
+        return *this;
+    }
+
+    mdl_GivenState& given_;
+};
+
+/// A propagating object T whose states are of class S or of classes derived from it; the base of each
+/// family's root.
+template <class T, class S>
+class kprC_PropagatingOf : public cls_AbstractRecordOf<T, kprC_PropagatingObject> {
+public:
+    using StateRecord = S;
+
+    /// The status in the step. An unknown step raises.
+    mdl_PropagationStatusEnm Status(const cow_String& stepName) const {
+        return ConstGetStateQuad(stepName).status;
+    }
+    /// Status, state and procedure in the step. An unknown step raises.
+    const kprC_PropagatingState<S>& ConstGetStateQuad(const cow_String& stepName) const {
+        const int index = steps_ == nullptr ? -1 : steps_->IndexOf(stepName);
+        if (index < 0) this->RaiseNoSuchStep(stepName);
+        return states_[static_cast<std::size_t>(index)];
+    }
+    /// Whether the user gave a state for the step, a deactivation included.
+    bool HasStep(const cow_String& stepName) const { return this->GivenState(stepName) != nullptr; }
+    /// The name of the first step of status 1; empty if there is none.
+    cow_String CreateStepName() const {
+        for (const auto& state : states_) {
+            if (state.status == mdl_PropagationStatusEnm::CREATED) return state.stepName;
+        }
+        return {};
+    }
+
+    std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) override {
+        std::vector<mdl_PropagationProblem> problems;
+        const auto results = this->WorkOut(steps, problems);
+        mdl_ObjCow<S> none;
+        std::vector<kprC_PropagatingState<S>> states(results.size());
+        for (std::size_t i = 0; i < results.size(); ++i) {
+            states[i].stepName = steps.NameAt(static_cast<int>(i));
+            states[i].status = results[i].status;
+            states[i].procedureType = steps.StepAt(static_cast<int>(i)).ProcedureType();
+            states[i].hasState = !results[i].state.IsNull();
+            if (states[i].hasState) {
+                // Steps that carry one state share it here too.
+                const bool same = i > 0 && results[i].state == results[i - 1].state;
+                states[i].state = same ? states[i - 1].state
+                                       : mdl_ObjCow<S>(static_cast<const S&>(results[i].state.ConstGet()));
+            } else {
+                if (none.IsNull()) none = mdl_ObjCow<S>(static_cast<S*>(this->NewState(0)));
+                states[i].state = none;
+            }
+        }
+        states_ = std::move(states);
+        steps_ = std::make_shared<const kprC_StepContainer>(steps);
+        return problems;
+    }
+
+private:
+    std::vector<kprC_PropagatingState<S>> states_;
+    std::shared_ptr<const kprC_StepContainer> steps_;
+};
+
+/// Objects that live across steps, by name, in ascending byte order.
+template <class T>
+class kprC_PropagatingContainer : public mdl_MapString2ObjCow<T> {
+public:
+    /// Works out all steps of all objects; raises at the first state that can't be.
+    void Propagate(const kprC_StepContainer& steps);
+    kprC_PropagatingContainer DeepCopy() const {
+        kprC_PropagatingContainer copy;
+        for (mdl_MapString2ObjCowIT<T> it(*this); !it.IsDone(); it.Next()) {
+            copy.Insert(it.CurrentKey(), it.CurrentValue());
+        }
+        return copy;
+    }
+};
+
+template <class T>
+class kprC_PropagatingContainerIT : public mdl_MapString2ObjCowIT<T> {
+public:
+    using mdl_MapString2ObjCowIT<T>::mdl_MapString2ObjCowIT;
+};
+
+[[noreturn]] void mdl_RaisePropagationProblem(const cow_String& object,
+                                              const mdl_PropagationProblem& problem);
+
+template <class T>
+void kprC_PropagatingContainer<T>::Propagate(const kprC_StepContainer& steps) {
+    const cow_List<cow_String> keys = this->Keys();
+    for (int i = 0; i < keys.Length(); ++i) {
+        const auto problems = this->Get(keys[i]).Propagate(steps);
+        if (!problems.empty()) mdl_RaisePropagationProblem(keys[i], problems.front());
+    }
+}
+
+#endif

@@ -1,0 +1,58 @@
+#ifndef QRX_STORE_KINC_INTERACTION_H
+#define QRX_STORE_KINC_INTERACTION_H
+
+#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/propagation/kprC_PropagatingObject.h"
+
+/// State of an interaction in one step; has no data of its own and serves the classes that need none.
+class kinC_InteractionState : public cls_RecordOf<kinC_InteractionState> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_InteractionState", "state of an interaction in one step",
+                                         0x2A00011};
+};
+
+/// Contact and other interactions, held by name.
+class kinC_Interaction : public kprC_PropagatingOf<kinC_Interaction, kinC_InteractionState> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_Interaction", "contact or another interaction", 0x2A00010};
+
+    mdl_PropagationFamilyEnm Family() const override { return mdl_PropagationFamilyEnm::INTERACTION; }
+    mdl_PropagationStatusEnm GetPropStatus(const cow_String& stepName) const { return Status(stepName); }
+    const kinC_InteractionState& ConstGetState(const cow_String& stepName) const {
+        return ConstGetStateQuad(stepName).state.ConstGet();
+    }
+    /// Whether it is in force in the step: status 1, 2, 3, 8, 9 or 10.
+    bool HasStep(const cow_String& stepName) const;
+    /// Status 1, 3 or 4: created, changed or ended in the step.
+    bool IsModified(const cow_String& stepName) const;
+    /// The node sets that it names as surfaces of contact; none for a suppressed one.
+    virtual cow_List<rgnC_Region> ConstGetContactNodeSets() const { return {}; }
+};
+
+/// Properties that interactions refer to by name.
+class kinC_InteractionProperty : public cls_AbstractRecordOf<kinC_InteractionProperty> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_InteractionProperty", "a property of interactions", 0x2A00040};
+};
+
+/// Numerical options of contact that interactions refer to by name.
+class kinC_ContactControls : public cls_AbstractRecordOf<kinC_ContactControls> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_ContactControls", "numerical options of contact", 0x2A00050};
+};
+
+class kinC_ContactInitialization final : public cls_RecordOf<kinC_ContactInitialization> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_ContactInitialization", "a named initialization of contact",
+                                         0x2A00058};
+};
+
+class kinC_ContactStabilization final : public cls_RecordOf<kinC_ContactStabilization> {
+public:
+    static constexpr cls_ClassInfo Class{"kinC_ContactStabilization", "a named stabilization of contact",
+                                         0x2A00059};
+};
+
+void cls_RegisterInteractionRecords(cls_ClassRegistrar& registrar);
+
+#endif

@@ -1,0 +1,45 @@
+#include "store_interface/records/steps/kprC_StepContainer.h"
+
+#include "foundation/nex_Exception.h"
+
+#include <string>
+
+const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "IMPLICIT", "IMPLICIT", "STANDARD"}, {1, "EXPLICIT", "EXPLICIT"}, {2, "OTHER", "OTHER"}};
+    static constexpr omu_EnumTable table{"kprC_AnalysisProductEnm", rows};
+    return table;
+}
+
+void kprC_StepContainer::Append(const cow_String& name, const kprC_Step& step) {
+    if (IsMember(name)) {
+        const std::string text =
+            "kprC_StepContainer: a step named '" + std::string(name.View()) + "' is there already";
+        nex_Raise(atr_String(std::string_view(text)));
+    }
+    steps_.push_back({name, mdl_ObjCow<kprC_Step>(step)});
+    index_.emplace(steps_.back().name.View(), Size() - 1);
+}
+
+cow_List<cow_String> kprC_StepContainer::Keys() const {
+    cow_List<cow_String> keys;
+    for (const Entry& entry : steps_) keys.Append(entry.name);
+    return keys;
+}
+
+int kprC_StepContainer::IndexOf(const cow_String& name) const {
+    const auto place = index_.find(name.View());
+    return place == index_.end() ? -1 : place->second;
+}
+
+const kprC_Step& kprC_StepContainer::ConstGet(const cow_String& name) const {
+    const int index = IndexOf(name);
+    if (index < 0) cow_RaiseNoSuchKey("kprC_StepContainer", name);
+    return StepAt(index);
+}
+
+kprC_Step& kprC_StepContainer::Get(const cow_String& name) {
+    const int index = IndexOf(name);
+    if (index < 0) cow_RaiseNoSuchKey("kprC_StepContainer", name);
+    return steps_[static_cast<std::size_t>(index)].record.Get();
+}

@@ -1,0 +1,57 @@
+#ifndef QRX_STORE_KPRC_STEPCONTAINER_H
+#define QRX_STORE_KPRC_STEPCONTAINER_H
+
+#include "store_interface/records/steps/kprC_Step.h"
+
+#include <unordered_map>
+#include <vector>
+
+/// Whether a job is for the implicit or the explicit solver.
+enum class kprC_AnalysisProductEnm : int { IMPLICIT = 0, EXPLICIT = 1, OTHER = 2 };
+const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm);
+
+/// The steps in the order of the analysis, the initial step first; not in name order.
+class kprC_StepContainer {
+public:
+    /// Appends a copy of the step. A name that is there already raises.
+    void Append(const cow_String& name, const kprC_Step& step);
+
+    cow_List<cow_String> Keys() const;
+    bool IsMember(const cow_String& name) const { return IndexOf(name) >= 0; }
+    /// An unknown name raises.
+    const kprC_Step& ConstGet(const cow_String& name) const;
+    kprC_Step& Get(const cow_String& name);
+    int Size() const { return static_cast<int>(steps_.size()); }
+    /// The place of the step from 0, or -1.
+    int IndexOf(const cow_String& name) const;
+    const cow_String& NameAt(int index) const { return steps_.at(static_cast<std::size_t>(index)).name; }
+    const kprC_Step& StepAt(int index) const {
+        return steps_.at(static_cast<std::size_t>(index)).record.ConstGet();
+    }
+
+private:
+    struct Entry {
+        cow_String name;
+        mdl_ObjCow<kprC_Step> record;
+    };
+
+    std::vector<Entry> steps_;
+    // The views lie in the names' shared storage, which copies of the container keep alive too.
+    std::unordered_map<std::string_view, int> index_;
+};
+
+class kprC_StepContainerIT {
+public:
+    explicit kprC_StepContainerIT(const kprC_StepContainer& steps) : steps_(steps) {}
+    void First() { index_ = 0; }
+    void Next() { ++index_; }
+    bool IsDone() const { return index_ >= steps_.Size(); }
+    const cow_String& CurrentKey() const { return steps_.NameAt(index_); }
+    const kprC_Step& CurrentValue() const { return steps_.StepAt(index_); }
+
+private:
+    const kprC_StepContainer& steps_;
+    int index_ = 0;
+};
+
+#endif
