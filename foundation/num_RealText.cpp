@@ -168,6 +168,7 @@ inline void Store(char* out, std::uint64_t bytes) {
 
 constexpr std::uint64_t kZeros = 0x3030303030303030;
 constexpr std::uint64_t kBlanks = 0x2020202020202020;
+constexpr std::uint64_t kZeroPoint = 0x3030303030302e30; // "0.000000"
 
 /// The eight digits of n < 10^8 as byte values, the first in the lowest byte.
 inline std::uint64_t EightDigits(std::uint32_t n) {
@@ -248,7 +249,7 @@ inline char* WriteShort(char* out, int negative, const Decimal& decimal, int wid
         const int length = negative + 1 - exponent + count;
         char* begin = Pad(out, width, length);
         *begin = '-';
-        Store(begin + negative, (kZeros & ~std::uint64_t{0xff00}) | std::uint64_t{'.'} << 8);
+        Store(begin + negative, kZeroPoint);
         Store(begin + negative + 1 - exponent, digits);
         return begin + length;
     }
@@ -277,13 +278,13 @@ inline char* WriteLong(char* out, bool negative, const Decimal& decimal, int wid
     text += negative;
     const int exponent = decimal.exponent;
     if (static_cast<unsigned>(exponent) < static_cast<unsigned>(precision)) {
-        const auto whole = static_cast<std::size_t>(exponent + 1);
+        const int whole = exponent + 1;
         std::memcpy(text + 1, digits, 16);
-        std::memmove(text, text + 1, whole);
+        std::memmove(text, text + 1, static_cast<std::size_t>(whole));
         text[whole] = '.';
-        text += 1 + (count > exponent + 1 ? count : exponent + 1);
+        text += 1 + (count > whole ? count : whole);
     } else if (exponent < 0 && exponent >= -4) {
-        std::memcpy(text, "0.000000", 8);
+        Store(text, kZeroPoint);
         text += 1 - exponent;
         std::memcpy(text, digits, 16);
         text += count;

@@ -5,7 +5,7 @@
 
 namespace {
 
-std::atomic<std::size_t> defaultBufferBytes{256 * 1024};
+std::atomic<std::size_t> defaultBufferBytes{std::size_t{256} * 1024};
 
 /// How far the end of [begin, end) is from the last newline, or from `begin` if there is none.
 struct Tail {

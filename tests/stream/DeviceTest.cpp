@@ -3,9 +3,11 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <filesystem>
 #include <fstream>
+#include <random>
 #include <sstream>
 #include <string>
 
@@ -56,10 +58,7 @@ int FaultyClose(std::FILE* file) {
 
 class Device : public testing::Test {
 protected:
-    Device()
-        : path_(testing::TempDir() + "qrx_device_test_" +
-                std::to_string(::testing::UnitTest::GetInstance()->random_seed()) +
-                testing::UnitTest::GetInstance()->current_test_info()->name()) {
+    Device() : path_(testing::TempDir() + "qrx_device_test_" + std::to_string(std::random_device()())) {
         standard = qio_CurrentSystem();
         faults = Faults();
     }

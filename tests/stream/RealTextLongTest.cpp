@@ -8,7 +8,7 @@
 
 namespace {
 
-// The printed text of every value in use here is shorter than its field or a real already, but for integers.
+// The normal form on the printed text itself: quicker than the one that the other tests use.
 bool AgreesInField(double value, int precision) {
     char expected[64];
     auto length =
@@ -24,7 +24,7 @@ bool AgreesInField(double value, int precision) {
     return static_cast<std::size_t>(end - text) == length && std::memcmp(text, expected, length) == 0;
 }
 
-// An odd factor visits every pattern once before it repeats.
+// An odd step visits every pattern once before it repeats.
 TEST(RealTextLong, HundredMillionFloatPatternsInTheCoordinateField_AgreeWithTheCLibrary) {
     std::uint32_t pattern = 12345;
     for (int i = 0; i < 100000000; ++i, pattern += 2654435769u) {

@@ -1,30 +1,12 @@
 #include "foundation/utl_Stream.h"
 
+#include "stream/CountedAllocations.h"
+
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <limits>
 #include <new>
 #include <string>
-#include <type_traits>
-
-namespace {
-
-long long allocations = 0;
-
-} // namespace
-
-void* operator new(std::size_t bytes) {
-    ++allocations;
-    if (void* memory = std::malloc(bytes == 0 ? 1 : bytes)) return memory;
-    throw std::bad_alloc();
-}
-void operator delete(void* memory) noexcept {
-    std::free(memory);
-}
-void operator delete(void* memory, std::size_t) noexcept {
-    std::free(memory);
-}
 
 namespace {
 
@@ -186,7 +168,7 @@ TEST(Stream, ItemsAfterTheFirst_AllocateNothing) {
     device.attach(null, true);
     utl_Stream stream(device, 131, 6, 6, 1000);
     const cow_String name("PART-1");
-    const long long before = allocations;
+    const long long before = AllocationCount();
     for (int i = 0; i < 1000; ++i) {
         stream << "*Node" << name << i << 1.0 / (i + 1) << 0.1f << endl;
         stream.Print(i, 7);
@@ -195,7 +177,7 @@ TEST(Stream, ItemsAfterTheFirst_AllocateNothing) {
         stream.Print(1e300 / (i + 1), 12, 17);
         stream.OptionalLineBreak();
     }
-    EXPECT_EQ(allocations, before);
+    EXPECT_EQ(AllocationCount(), before);
 }
 
 TEST(OptionalLineBreak, LineOf131Bytes_Stays) {
