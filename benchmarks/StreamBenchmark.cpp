@@ -1,0 +1,272 @@
+// Mesh text through the deck stream, beside fprintf, {fmt} and a raw write of the same bytes.
+#include "foundation/utl_Stream.h"
+
+#include <benchmark/benchmark.h>
+#include <fmt/compile.h>
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <cstdio>
+#include <iterator>
+#include <map>
+#include <memory>
+#include <random>
+#include <string>
+#include <vector>
+
+namespace {
+
+constexpr int kNodes = 1000000;
+constexpr int kElements = 500000;
+constexpr const char* kNull = "/dev/null";
+constexpr const char* kFile = "bench_stream.inp";
+
+struct Closer {
+    void operator()(std::FILE* file) const { std::fclose(file); }
+};
+using File = std::unique_ptr<std::FILE, Closer>;
+
+File Open(const char* path) {
+    File file(std::fopen(path, "w"));
+    if (file == nullptr) {
+        std::perror(path);
+        std::exit(1);
+    }
+    return file;
+}
+
+const std::vector<float>& Coordinates() {
+    static const std::vector<float> coordinates = [] {
+        std::mt19937 random(1);
+        std::uniform_real_distribution<float> side(-500.0f, 500.0f);
+        std::vector<float> made(3 * static_cast<std::size_t>(kNodes));
+        for (std::size_t i = 0; i < made.size(); ++i) made[i] = i % 30 == 29 ? 0.0f : side(random);
+        return made;
+    }();
+    return coordinates;
+}
+
+const std::vector<std::array<int, 8>>& Elements() {
+    static const std::vector<std::array<int, 8>> elements = [] {
+        std::mt19937 random(2);
+        std::uniform_int_distribution<int> node(1, kNodes);
+        std::vector<std::array<int, 8>> made(kElements);
+        for (auto& element : made) {
+            for (int& corner : element) corner = node(random);
+        }
+        return made;
+    }();
+    return elements;
+}
+
+void WriteNodes(utl_Stream& stream) {
+    const float* xyz = Coordinates().data();
+    for (int i = 0; i < kNodes; ++i, xyz += 3) {
+        stream.Print(i + 1, 7);
+        for (int k = 0; k < 3; ++k) {
+            stream << ", ";
+            stream.Print(xyz[k], 12, 7);
+        }
+        stream << "\n";
+    }
+    stream.Flush();
+}
+
+void WriteNodesInPlace(utl_Stream& stream) {
+    const float* xyz = Coordinates().data();
+    for (int i = 0; i < kNodes; ++i, xyz += 3) {
+        char* out = num_WriteInt(stream.Reserve(num_IntRoom(7) + 3 * num_RealRoom(12, 7)), i + 1, 7);
+        for (int k = 0; k < 3; ++k) {
+            *out++ = ',';
+            *out++ = ' ';
+            out = num_WriteReal(out, xyz[k], 12, 7);
+        }
+        *out++ = '\n';
+        stream.Commit(out);
+    }
+    stream.Flush();
+}
+
+void WriteElements(utl_Stream& stream) {
+    int label = 0;
+    for (const auto& element : Elements()) {
+        stream.Print(++label, 7);
+        for (const int corner : element) {
+            stream << ",";
+            stream.Print(corner, 7);
+        }
+        stream << "\n";
+    }
+    stream.Flush();
+}
+
+template <class Writer>
+void ThroughStream(benchmark::State& state, const char* path, int lines, Writer write) {
+    Coordinates();
+    Elements();
+    for (auto _ : state) {
+        qio_ios device;
+        device.attach(Open(path).release(), true);
+        utl_Stream stream(device, 131, 6, 6, static_cast<std::size_t>(state.range(0)));
+        write(stream);
+        stream.Flush();
+        state.counters["bytes/line"] = static_cast<double>(device.Bytes()) / lines;
+    }
+    state.SetItemsProcessed(state.iterations() * lines);
+}
+
+void NodesStream(benchmark::State& state) {
+    ThroughStream(state, kNull, kNodes, WriteNodes);
+}
+void NodesInPlace(benchmark::State& state) {
+    ThroughStream(state, kNull, kNodes, WriteNodesInPlace);
+}
+void NodesStreamToFile(benchmark::State& state) {
+    ThroughStream(state, kFile, kNodes, WriteNodes);
+    std::remove(kFile);
+}
+void ElementsStream(benchmark::State& state) {
+    ThroughStream(state, kNull, kElements, WriteElements);
+}
+
+void NodesFprintf(benchmark::State& state) {
+    const auto& coordinates = Coordinates();
+    for (auto _ : state) {
+        const File file = Open(kNull);
+        std::setvbuf(file.get(), nullptr, _IOFBF, 256 * 1024);
+        const float* xyz = coordinates.data();
+        for (int i = 0; i < kNodes; ++i, xyz += 3) {
+            std::fprintf(file.get(), "%7d, %12.7g, %12.7g, %12.7g\n", i + 1, static_cast<double>(xyz[0]),
+                         static_cast<double>(xyz[1]), static_cast<double>(xyz[2]));
+        }
+    }
+    state.SetItemsProcessed(state.iterations() * kNodes);
+}
+
+void NodesFmt(benchmark::State& state) {
+    const auto& coordinates = Coordinates();
+    std::vector<char> buffer(256 * 1024 + 256);
+    for (auto _ : state) {
+        const File file = Open(kNull);
+        std::setvbuf(file.get(), nullptr, _IONBF, 0);
+        const float* xyz = coordinates.data();
+        char* out = buffer.data();
+        for (int i = 0; i < kNodes; ++i, xyz += 3) {
+            out = fmt::format_to(out, FMT_COMPILE("{:7d}, {:12.7g}, {:12.7g}, {:12.7g}\n"), i + 1, xyz[0],
+                                 xyz[1], xyz[2]);
+            if (out - buffer.data() >= 256 * 1024) {
+                std::fwrite(buffer.data(), 1, static_cast<std::size_t>(out - buffer.data()), file.get());
+                out = buffer.data();
+            }
+        }
+        std::fwrite(buffer.data(), 1, static_cast<std::size_t>(out - buffer.data()), file.get());
+    }
+    state.SetItemsProcessed(state.iterations() * kNodes);
+}
+
+void ElementsFprintf(benchmark::State& state) {
+    const auto& elements = Elements();
+    for (auto _ : state) {
+        const File file = Open(kNull);
+        std::setvbuf(file.get(), nullptr, _IOFBF, 256 * 1024);
+        int label = 0;
+        for (const auto& e : elements) {
+            std::fprintf(file.get(), "%7d,%7d,%7d,%7d,%7d,%7d,%7d,%7d,%7d\n", ++label, e[0], e[1], e[2], e[3],
+                         e[4], e[5], e[6], e[7]);
+        }
+    }
+    state.SetItemsProcessed(state.iterations() * kElements);
+}
+
+void RawNodes(benchmark::State& state, const char* path) {
+    static const std::string bytes = [] {
+        qio_StringDevice device;
+        utl_Stream stream(device, 131, 6, 6);
+        WriteNodes(stream);
+        return device.Text();
+    }();
+    for (auto _ : state) {
+        const File file = Open(path);
+        std::setvbuf(file.get(), nullptr, _IONBF, 0);
+        for (std::size_t at = 0; at < bytes.size(); at += 256 * 1024) {
+            std::fwrite(bytes.data() + at, 1, std::min<std::size_t>(256 * 1024, bytes.size() - at),
+                        file.get());
+        }
+    }
+    state.SetItemsProcessed(state.iterations() * kNodes);
+}
+void NodesRaw(benchmark::State& state) {
+    RawNodes(state, kNull);
+}
+void NodesRawToFile(benchmark::State& state) {
+    RawNodes(state, kFile);
+    std::remove(kFile);
+}
+
+BENCHMARK(NodesStream)
+    ->Arg(4 << 10)
+    ->Arg(64 << 10)
+    ->Arg(256 << 10)
+    ->Arg(1 << 20)
+    ->Arg(4 << 20)
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesInPlace)->Arg(256 << 10)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesFprintf)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesFmt)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesRaw)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesStreamToFile)->Arg(64 << 10)->Arg(256 << 10)->Arg(1 << 20)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesRawToFile)->Unit(benchmark::kMillisecond);
+BENCHMARK(ElementsStream)->Arg(256 << 10)->Unit(benchmark::kMillisecond);
+BENCHMARK(ElementsFprintf)->Unit(benchmark::kMillisecond);
+
+/// The usual table, and behind it the ratios of the best times.
+class RatioReporter : public benchmark::ConsoleReporter {
+public:
+    void ReportRuns(const std::vector<Run>& runs) override {
+        ConsoleReporter::ReportRuns(runs);
+        for (const Run& run : runs) {
+            if (run.run_type != Run::RT_Iteration) continue;
+            const double seconds = run.real_accumulated_time / static_cast<double>(run.iterations);
+            const auto [found, isNew] = best_.emplace(run.run_name.str(), seconds);
+            if (!isNew) found->second = std::min(found->second, seconds);
+        }
+    }
+    void PrintRatios() const {
+        std::puts("\nbest times of the run, as ratios:");
+        Ratio("NodesFprintf", "NodesStream/262144");
+        Ratio("NodesFmt", "NodesStream/262144");
+        Ratio("NodesFprintf", "NodesInPlace/262144");
+        Ratio("NodesFmt", "NodesInPlace/262144");
+        Ratio("ElementsFprintf", "ElementsStream/262144");
+        Ratio("NodesStreamToFile/262144", "NodesRawToFile");
+    }
+
+private:
+    void Ratio(const char* above, const char* below) const {
+        const auto a = best_.find(above);
+        const auto b = best_.find(below);
+        if (a == best_.end() || b == best_.end()) return;
+        std::printf("  %-26s / %-24s %6.2f\n", above, below, a->second / b->second);
+    }
+
+    std::map<std::string, double> best_;
+};
+
+} // namespace
+
+int main(int argc, char** argv) {
+    std::vector<char*> arguments(argv, argv + argc);
+    std::string defaults[] = {"--benchmark_repetitions=5", "--benchmark_min_time=0.05",
+                              "--benchmark_enable_random_interleaving=true"};
+    // Those of the command line come later and win.
+    for (std::size_t i = 0; i < std::size(defaults); ++i) {
+        arguments.insert(arguments.begin() + 1 + static_cast<std::ptrdiff_t>(i), defaults[i].data());
+    }
+    int count = static_cast<int>(arguments.size());
+    benchmark::Initialize(&count, arguments.data());
+    if (benchmark::ReportUnrecognizedArguments(count, arguments.data())) return 1;
+    RatioReporter reporter;
+    benchmark::RunSpecifiedBenchmarks(&reporter);
+    reporter.PrintRatios();
+}
