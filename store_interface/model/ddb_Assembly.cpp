@@ -35,6 +35,12 @@ ddb_Mesh ddb_PartInstance::mesh() const {
     return {mesh.IsNull() ? EmptyMesh() : mesh, model_, instance_->name, instance_->meshIndex};
 }
 
+std::optional<ddb_PartInstance> ddb_InstanceContainer::FindByMeshIndex(int meshIndex) const {
+    const cow_CountedHld<odiK_Instance> instance = model_->InstanceOfMesh(meshIndex);
+    if (instance.IsNull()) return std::nullopt;
+    return ddb_PartInstance(ddb_BaseInstance(instance, model_));
+}
+
 ddb_MaterialOrientationContainer ddb_PartInstance::materialOrientations() const {
     return {instance_, instance_->attributes.materialOrientations};
 }

@@ -4,6 +4,8 @@
 #include "store_interface/model/ddb_Mesh.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
+#include <optional>
+
 /// View on a part.
 class ddb_Part {
 public:
@@ -141,6 +143,8 @@ public:
     ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> createIterator() const {
         return {model_->Instances(), model_};
     }
+    /// The part instance whose mesh has the index; none for any other index.
+    std::optional<ddb_PartInstance> FindByMeshIndex(int meshIndex) const;
 
 private:
     cow_CountedHld<odiK_Model> model_;

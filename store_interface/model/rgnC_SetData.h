@@ -61,6 +61,10 @@ public:
     int Kind() const { return static_cast<int>(set_->type); }
     int NumSubSets() const { return static_cast<int>(set_->subsets.size()); }
     rgnC_SubsetData SubSet(int index) const;
+    /// SubSet(index).MeshIndex() without making the view; unchecked.
+    int MeshIndexOfSubSet(int index) const {
+        return LiesInOneMesh() ? meshIndex_ : set_->subsets[static_cast<std::size_t>(index)].meshIndex;
+    }
     /// The store's object, whose caches the readers of large sets share.
     const odiK_Set& Object() const { return *set_; }
     /// Whether all subsets lie in one mesh, seen from one instance.

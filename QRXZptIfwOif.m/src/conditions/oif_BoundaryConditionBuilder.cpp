@@ -1,0 +1,3 @@
+#include "conditions/oif_BoundaryConditionBuilder.h"
+
+void oif_BoundaryConditionBuilder::Build() {}

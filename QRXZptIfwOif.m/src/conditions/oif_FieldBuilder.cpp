@@ -1,0 +1,3 @@
+#include "conditions/oif_FieldBuilder.h"
+
+void oif_FieldBuilder::Build() {}

@@ -1,0 +1,3 @@
+#include "conditions/oif_LoadBuilder.h"
+
+void oif_LoadBuilder::Build() {}

@@ -1,0 +1,3 @@
+#include "constraints/oif_ConstraintBuilder.h"
+
+void oif_ConstraintBuilder::Build() {}

@@ -1,0 +1,133 @@
+#include "deck/oif_Builder.h"
+
+#include "foundation/qio_Device.h"
+
+namespace {
+
+constexpr int kLineLimit = 131;
+constexpr int kPrecision = 6;
+
+} // namespace
+
+oif_Builder::oif_Builder(oif_ModelInfo& modelInfo)
+    : jobKeywords_(modelInfo), instance_(modelInfo), amplitude_(modelInfo), material_(modelInfo),
+      transform_(modelInfo), boundaryCondition_(modelInfo), step_(modelInfo), load_(modelInfo),
+      field_(modelInfo), interaction_(modelInfo), constraint_(modelInfo), outputRequest_(modelInfo),
+      part_(modelInfo), partAttributes_(modelInfo), region_(modelInfo), final_(modelInfo),
+      v6Format_(modelInfo.V6Format()), model_(&modelInfo.View()) {}
+
+bool oif_Builder::WriteInputFile(const cow_String& fileName) {
+    qio_CurrentSystem().remove(fileName.CStr());
+    std::FILE* file = qio_OpenFile(fileName.CStr(), "w");
+    if (file == nullptr) return false;
+    qio_ios device;
+    device.attach(file, true);
+    utl_Stream stream(device, kLineLimit, kPrecision, kPrecision);
+
+    BuildComponents();
+    qkw_ComponentList components = WriteList();
+    WriteInput(stream, jobKeywords_.ModelDefinition());
+    WritePartDefinitions(stream, components);
+    WritePartInstanceDefinitions(stream, components);
+    WriteAssemblyDefinitions(stream, components);
+    WriteOtherModelDefinitions(stream, components);
+    WriteStepDefinitions(stream, components);
+    stream.Flush();
+    device.close();
+    return true;
+}
+
+// Later components use what earlier ones stored in the model info: labels first, regions behind instances and
+// steps, section assignment behind regions.
+void oif_Builder::BuildComponents() {
+    jobKeywords_.Build();
+    part_.Build();
+    material_.Build();
+    instance_.Build();
+    step_.Build();
+    region_.Build();
+    partAttributes_.Build();
+    amplitude_.Build();
+    transform_.Build();
+    constraint_.Build();
+    boundaryCondition_.Build();
+    load_.Build();
+    field_.Build();
+    interaction_.Build();
+    outputRequest_.Build();
+    final_.Build();
+}
+
+// The order of the text within one section; not the order of building.
+qkw_ComponentList oif_Builder::WriteList() const {
+    qkw_ComponentList components;
+    const qkw_BuilderComponent* const order[] = {
+        &part_,      &instance_, &step_,        &region_,        &partAttributes_,
+        &amplitude_, &material_, &transform_,   &constraint_,    &boundaryCondition_,
+        &load_,      &field_,    &interaction_, &outputRequest_, &final_};
+    for (const qkw_BuilderComponent* component : order) components.Append(*component);
+    return components;
+}
+
+void oif_Builder::WriteHeading(utl_Stream& stream, const cow_String& text) const {
+    // The blank lines of this banner are "**", those of a comment are "** ".
+    stream << "**" << endl << "** " << text << endl << "**" << endl;
+}
+
+void oif_Builder::WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const {
+    for (int i = 0; i < keywords.Length(); ++i) keywords.UncheckedConstGet(i).ConstGet().Write(stream);
+}
+
+void oif_Builder::WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+    if (v6Format_) WriteHeading(stream, "PARTS");
+    for (auto it = model_->Parts().createIterator(); !it.isDone(); it.next()) {
+        for (int i = 0; i < components.Length(); ++i) {
+            WriteInput(stream, components.Get(i).Get().PartDefinition(it.currentKey()));
+        }
+    }
+}
+
+void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+    if (v6Format_) {
+        WriteHeading(stream, "ASSEMBLY");
+        // The assembly's name goes out as it stands, without quotes.
+        stream << "*Assembly, name=" << model_->Model().rootAssembly().name() << endl;
+    }
+    for (auto it = model_->Instances().createIterator(); !it.isDone(); it.next()) {
+        for (int i = 0; i < components.Length(); ++i) {
+            WriteInput(stream, components.Get(i).Get().InstanceDefinition(it.currentKey()));
+        }
+    }
+}
+
+void oif_Builder::WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+    for (int i = 0; i < components.Length(); ++i)
+        WriteInput(stream, components.Get(i).Get().AssemblyDefinition());
+}
+
+void oif_Builder::WriteOtherModelDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+    for (int i = 0; i < components.Length(); ++i)
+        WriteInput(stream, components.Get(i).Get().ModelDefinition());
+}
+
+void oif_Builder::WriteStepDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+    int count = 0;
+    for (kprC_StepContainerIT it(model_->Steps()); !it.IsDone(); it.Next(), ++count) {
+        const cow_String& stepName = it.CurrentKey();
+        const nex_Context context("step", stepName);
+        for (int i = 0; i < components.Length(); ++i) {
+            WriteInput(stream, components.Get(i).Get().StepDefinition(stepName));
+        }
+        // The initial step has no load cases.
+        if (count == 0) continue;
+        const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(it.CurrentValue(), NEX_HERE);
+        const cow_List<cow_String> loadCases = step.loadCases.Keys();
+        for (int k = 0; k < loadCases.Length(); ++k) {
+            // The list of the empty key is the body.
+            if (loadCases[k].IsEmpty()) continue;
+            for (int i = 0; i < components.Length(); ++i) {
+                WriteInput(stream, components.Get(i).Get().StepDefinition(stepName, loadCases[k]));
+            }
+        }
+    }
+}

@@ -1,0 +1,64 @@
+#ifndef QRX_OIF_BUILDER_H
+#define QRX_OIF_BUILDER_H
+
+#include "conditions/oif_BoundaryConditionBuilder.h"
+#include "conditions/oif_FieldBuilder.h"
+#include "conditions/oif_LoadBuilder.h"
+#include "constraints/oif_ConstraintBuilder.h"
+#include "deck/oif_FinalBuilder.h"
+#include "deck/oif_JobKeywordsBuilder.h"
+#include "interactions/oif_InteractionBuilder.h"
+#include "materials/oif_AmplitudeBuilder.h"
+#include "materials/oif_MaterialBuilder.h"
+#include "mesh/oif_InstanceBuilder.h"
+#include "mesh/oif_PartBuilder.h"
+#include "mesh/oif_RegionBuilder.h"
+#include "output/oif_OutputRequestBuilder.h"
+#include "sections/oif_PartAttributesBuilder.h"
+#include "sections/oif_TransformBuilder.h"
+#include "steps/oif_StepBuilder.h"
+
+/// The driver of one file: lets the sixteen components build, then writes their keywords, section by section
+/// (parts, instances, assembly, model, steps) and within a section component by component.
+class oif_Builder {
+public:
+    explicit oif_Builder(oif_ModelInfo& modelInfo);
+    oif_Builder(const oif_Builder&) = delete;
+    oif_Builder& operator=(const oif_Builder&) = delete;
+
+    /// Deletes an old file of the name and writes the deck. False when the file can't be opened; whether all
+    /// bytes arrived tells qio_LastReport(). May be called once.
+    bool WriteInputFile(const cow_String& fileName);
+
+private:
+    void BuildComponents();
+    qkw_ComponentList WriteList() const;
+    void WriteHeading(utl_Stream& stream, const cow_String& text) const;
+    void WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const;
+    void WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+    void WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+    void WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+    void WriteOtherModelDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+    void WriteStepDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+
+    oif_JobKeywordsBuilder jobKeywords_;
+    oif_InstanceBuilder instance_;
+    oif_AmplitudeBuilder amplitude_;
+    oif_MaterialBuilder material_;
+    oif_TransformBuilder transform_;
+    oif_BoundaryConditionBuilder boundaryCondition_;
+    oif_StepBuilder step_;
+    oif_LoadBuilder load_;
+    oif_FieldBuilder field_;
+    oif_InteractionBuilder interaction_;
+    oif_ConstraintBuilder constraint_;
+    oif_OutputRequestBuilder outputRequest_;
+    oif_PartBuilder part_;
+    oif_PartAttributesBuilder partAttributes_;
+    oif_RegionBuilder region_;
+    oif_FinalBuilder final_;
+    bool v6Format_;
+    const oif_Model* model_;
+};
+
+#endif

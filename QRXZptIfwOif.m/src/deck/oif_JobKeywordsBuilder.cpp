@@ -1,0 +1,8 @@
+#include "deck/oif_JobKeywordsBuilder.h"
+
+#include "deck/oif_Comment.h"
+
+void oif_JobKeywordsBuilder::Build() {
+    const cow_String text = Store().topLevelSolverInput();
+    if (!text.IsEmpty()) AddModelDefinition(oif_FileHeader(text));
+}

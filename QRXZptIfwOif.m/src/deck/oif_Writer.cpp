@@ -1,0 +1,11 @@
+#include "deck/oif_Writer.h"
+
+#include "deck/oif_Builder.h"
+#include "store_interface/model/odb_Odb.h"
+
+void oif_Writer::WriteInputFile(const char* jobName) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    const cow_String fileName = cow_String(jobName) + ".inp";
+    oif_Builder builder(modelInfo);
+    builder.WriteInputFile(fileName);
+}

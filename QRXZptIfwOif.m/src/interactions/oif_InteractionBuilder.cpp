@@ -1,0 +1,3 @@
+#include "interactions/oif_InteractionBuilder.h"
+
+void oif_InteractionBuilder::Build() {}

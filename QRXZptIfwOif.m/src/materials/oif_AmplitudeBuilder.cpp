@@ -1,0 +1,3 @@
+#include "materials/oif_AmplitudeBuilder.h"
+
+void oif_AmplitudeBuilder::Build() {}

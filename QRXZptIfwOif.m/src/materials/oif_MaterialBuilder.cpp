@@ -1,0 +1,3 @@
+#include "materials/oif_MaterialBuilder.h"
+
+void oif_MaterialBuilder::Build() {}

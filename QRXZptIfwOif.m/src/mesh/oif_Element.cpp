@@ -1,0 +1,140 @@
+#include "mesh/oif_Element.h"
+
+#include "deck/oif_ModelInfo.h"
+#include "keyword_layer/qkw_QuorixName.h"
+
+#include <algorithm>
+#include <string>
+
+namespace {
+
+constexpr int kPlacesOfLine = 16;
+constexpr int kWidestNodeField = 7;
+
+int NumDigits(int value) {
+    int digits = value < 0 ? 2 : 1;
+    while ((value /= 10) != 0) ++digits;
+    return digits;
+}
+
+} // namespace
+
+oif_Element::oif_Element(int label, int nodeLabel, const cow_String& type, const cow_String& elset)
+    : firstNumber_(label), secondNumber_(nodeLabel), elset_(elset), singleForm_(true), withHeader_(true),
+      type_(type) {}
+
+oif_Element::oif_Element(int elementOffset, int nodeOffset, const ddb_ElementClass& elements,
+                         const cow_String& elset)
+    : firstNumber_(elementOffset), secondNumber_(nodeOffset), elements_(elements), elset_(elset),
+      singleForm_(false), withHeader_(true) {}
+
+oif_Element::oif_Element(int elementOffset, int nodeOffset, const ddb_ElementClass& elements,
+                         const ddb_Mesh& mesh, bool)
+    : firstNumber_(elementOffset), secondNumber_(nodeOffset), elements_(elements), mesh_(mesh),
+      singleForm_(false), withHeader_(false) {}
+
+void oif_Element::Write(utl_Stream& stream) const {
+    if (withHeader_) {
+        stream << "*Element, type=" << (singleForm_ ? type_ : elements_->elementTypeLabel());
+        if (!elset_.IsEmpty()) stream << ", elset=" << elset_;
+        stream << endl;
+    }
+    if (singleForm_) {
+        stream << firstNumber_ << ", " << secondNumber_ << endl;
+        return;
+    }
+    WriteConnectivity(stream);
+    if (withHeader_) stream.Flush();
+}
+
+int oif_Element::NodeLabel(int index) const {
+    return mesh_ ? mesh_->mesh().Nodes().labels[index] : index;
+}
+
+void oif_Element::WriteConnectivity(utl_Stream& stream) const {
+    const std::vector<int>& connectivity = elements_->elementConnectivity();
+    const std::vector<int>& labels = elements_->userElementLabelsAsFlatArray();
+    const int numNodes = elements_->numNodesPerElement();
+
+    // The first walk finds the widths, and with them any index that has no label.
+    int largestNode = 0;
+    for (const int index : connectivity) largestNode = std::max(largestNode, NodeLabel(index));
+    const int nodeWidth = std::min(NumDigits(largestNode) + 1, kWidestNodeField);
+    int largestElement = 0;
+    for (const int label : labels) largestElement = std::max(largestElement, label);
+    const int elementWidth = NumDigits(largestElement);
+    const std::string indent(static_cast<std::size_t>(elementWidth) + 1, ' ');
+
+    const int* node = connectivity.data();
+    for (const int label : labels) {
+        stream.Print(label, elementWidth);
+        stream << ",";
+        for (int j = 0; j < numNodes; ++j, ++node) {
+            const int place = j + 2;
+            const bool last = j == numNodes - 1;
+            // The last number of an element is never indented, also where it begins a line.
+            if (!last && place % kPlacesOfLine == 1) stream << indent.c_str();
+            stream.Print(mesh_ ? mesh_->mesh().Nodes().labels.UncheckedConstGet(*node) : *node, nodeWidth);
+            if (last) {
+                stream << "\n";
+            } else if (place % kPlacesOfLine == 0) {
+                stream << ",\n";
+            } else {
+                stream << ",";
+            }
+        }
+    }
+}
+
+void oif_ElementFromMesh::AddKeyword(Types& types, const cow_String& type, const qkw_Keyword& keyword) {
+    types.GetOrInsert(type).Append(keyword);
+}
+
+void oif_ElementFromMesh::Write(utl_Stream& stream) const {
+    const ddb_Mesh mesh = instance_.mesh();
+    const ddb_ElementData elementData = mesh.elementData();
+    Types types;
+    for (int i = 0; i < elementData.numClasses(); ++i) {
+        const ddb_ElementClass elements = elementData.elementClass(i);
+        const cow_String& type = elements.elementTypeLabel();
+        // Surface elements are not written here.
+        if (type.Find("SURF") >= 0) continue;
+        AddKeyword(types, type,
+                   oif_Element(modelInfo_->AssyElementOffsets(instance_.name()),
+                               modelInfo_->AssyNodeOffsets(instance_.name()), elements, mesh, false));
+    }
+    for (cow_ConstMapIterator<cow_String, qkw_KeywordList> it(types); !it.IsDone(); it.Next()) {
+        stream << "*Element, type=" << it.CurrentKey() << endl;
+        const qkw_KeywordList& keywords = it.CurrentValue();
+        for (int i = 0; i < keywords.Length(); ++i) keywords[i].ConstGet().Write(stream);
+    }
+    stream.Flush();
+}
+
+void oif_AssemblyElement::Write(utl_Stream& stream) const {
+    stream << "*Element, type="
+           << "CONN3D2";
+    stream.LineBreak();
+    const rgnC_SetData& set = region_.ConstSet().Data();
+    for (int s = 0; s < set.NumSubSets(); ++s) {
+        const rgnC_SubsetData subset = set.SubSet(s);
+        const ddb_Mesh mesh = modelInfo_->DdbModel().mesh(subset.MeshIndex());
+        const ddb_ScopedNodeData nodes(mesh.nodeData());
+        const ddb_ElementClass elements = mesh.elementData().elementClass(subset.ClassIndex());
+        const int numNodes = elements.numNodesPerElement();
+        for (int i = 0; i < subset.Subset().Length(); ++i) {
+            const auto element = static_cast<std::size_t>(subset.Subset()[i]);
+            stream << elements.userElementLabelsAsFlatArray()[element] << ", ";
+            for (int j = 0; j < numNodes; ++j) {
+                const int node = elements.elementConnectivity()[element * static_cast<std::size_t>(numNodes) +
+                                                                static_cast<std::size_t>(j)];
+                if (j > 0) stream << ", ";
+                if (!nodes.isNativeNode(node)) {
+                    stream << qkw_QuorixName(nodes.getPartInstance(node).Shortcut().Name(), false) << ".";
+                }
+                stream << nodes.GetUserNodeLabel(static_cast<unsigned>(node));
+            }
+            stream << endl;
+        }
+    }
+}

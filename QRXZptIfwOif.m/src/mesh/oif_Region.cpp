@@ -1,0 +1,29 @@
+#include "mesh/oif_Region.h"
+
+#include "deck/oif_Model.h"
+
+oif_Region::oif_Region(const qkw_Model& model, const rgnC_Region& region) {
+    if (!region.Shortcut().HasValue()) return;
+    const auto find = [&](const ddb_SetList& sets) {
+        for (ddb_SetListIT it = sets.createIterator(); !it.isDone(); it.next()) {
+            const ddb_Set set = it.currentItem();
+            if (!(set.Shortcut() == region.Shortcut())) continue;
+            setName_ = set.setLabel();
+            return true;
+        }
+        return false;
+    };
+    const ddb_Assembly assembly = static_cast<const oif_Model&>(model).Model().rootAssembly();
+    if (find(assembly.set())) return;
+    for (ddb_InstanceContainerIT it = assembly.instance().createIterator(); !it.isDone(); it.next()) {
+        if (!it.currentValue().IsPartInstance()) continue;
+        const ddb_PartInstance instance(it.currentValue());
+        if (!find(instance.mesh().set())) continue;
+        instanceName_ = instance.name();
+        return;
+    }
+}
+
+cow_String oif_Region::FullName() const {
+    return instanceName_.IsEmpty() ? setName_ : instanceName_ + "." + setName_;
+}

@@ -1,0 +1,121 @@
+#include "mesh/oif_Surface.h"
+
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_Set.h"
+
+#include <set>
+
+oif_Surface::oif_Surface(const rgnC_SetData& setData, const ddb_PartInstance& instance,
+                         const cow_String& instanceName)
+    : name_(setData.Name()), instanceName_(instanceName), internal_(setData.Internal()) {
+    CreateLabels(setData, instance);
+}
+
+oif_Surface::oif_Surface(const rgnC_SetData& setData, const ddb_Assembly& assembly)
+    : name_(setData.Name()), internal_(setData.Internal()) {
+    std::set<int> meshesDone;
+    for (int i = 0; i < setData.NumSubSets(); ++i) {
+        const int meshIndex = setData.MeshIndexOfSubSet(i);
+        if (!meshesDone.insert(meshIndex).second) continue;
+        // Facets in the assembly's own mesh are left out.
+        const auto instance = assembly.instance().FindByMeshIndex(meshIndex);
+        if (instance) subSurfaces_.Append(oif_Surface(setData, *instance, instance->name()));
+    }
+}
+
+oif_Surface::oif_Surface(const qkw_ModelInfo&, const cow_String& name, const cow_String& nodeSet)
+    : name_(name), nodeSets_(nodeSet) {}
+
+void oif_Surface::CreateLabels(const rgnC_SetData& setData, const ddb_PartInstance& instance) {
+    const oif_Set set(setData, instance);
+    labels_ = set.Labels();
+    faces_ = set.FaceList();
+}
+
+void oif_Surface::Write(utl_Stream& stream) const {
+    if (!labels_.IsEmpty()) {
+        const LabelsOfFace faces = GroupByFace();
+        WriteSurfaceElsets(stream, faces);
+        WriteSurfaceKeyword(stream);
+        WriteSurfaceDatalines(stream, faces);
+    } else if (!nodeSets_.IsEmpty()) {
+        WriteSurfaceFromList(stream);
+    } else if (!subSurfaces_.IsEmpty()) {
+        WriteSurfaceFromKeywords(stream);
+    }
+}
+
+oif_Surface::LabelsOfFace oif_Surface::GroupByFace() const {
+    LabelsOfFace groups;
+    // Facets of one face share its text, so that most look-ups are a comparison of addresses.
+    struct Known {
+        const char* text;
+        cow_List<int>* labels;
+    };
+    std::vector<Known> known;
+    for (int i = 0; i < labels_.Length(); ++i) {
+        const cow_String& face = faces_[i];
+        cow_List<int>* labels = nullptr;
+        for (const Known& k : known) {
+            if (k.text == face.CStr()) labels = k.labels;
+        }
+        if (labels == nullptr) {
+            labels = &groups.GetOrInsert(face);
+            if (known.size() < 16) known.push_back({face.CStr(), labels});
+        }
+        labels->Append(labels_.UncheckedConstGet(i));
+    }
+    return groups;
+}
+
+cow_String oif_Surface::FaceSetName(const cow_String& face) const {
+    return cow_String("_") + name_ + "_" + face;
+}
+
+void oif_Surface::WriteSurfaceElsets(utl_Stream& stream, const LabelsOfFace& faces) const {
+    for (cow_ConstMapIterator<cow_String, cow_List<int>> it(faces); !it.IsDone(); it.Next()) {
+        stream << "*Elset, elset=" << qkw_QuorixName(FaceSetName(it.CurrentKey()), false);
+        if (!instanceName_.IsEmpty()) stream << ", instance=" << qkw_QuorixName(instanceName_, false);
+        stream << ", internal";
+        oif_Set set(it.CurrentValue());
+        if (set.CanGenerate()) stream << ", generate";
+        stream << endl;
+        set.WriteData(stream);
+    }
+}
+
+void oif_Surface::WriteSurfaceKeyword(utl_Stream& stream) const {
+    stream << "*Surface, type=ELEMENT"
+           << ", name=" << qkw_QuorixName(name_, false);
+    if (internal_) stream << ", internal";
+    stream << endl;
+}
+
+void oif_Surface::WriteSurfaceDatalines(utl_Stream& stream, const LabelsOfFace& faces) const {
+    for (cow_ConstMapIterator<cow_String, cow_List<int>> it(faces); !it.IsDone(); it.Next()) {
+        stream << qkw_QuorixName(FaceSetName(it.CurrentKey()), false) << ", " << it.CurrentKey() << endl;
+    }
+}
+
+void oif_Surface::WriteSurfaceFromList(utl_Stream& stream) const {
+    stream << "*Surface, type=NODE"
+           << ", name=" << qkw_QuorixName(name_, false);
+    if (internal_) stream << ", internal";
+    stream << endl;
+    for (int i = 0; i < nodeSets_.Length(); ++i) stream << nodeSets_[i] << ", " << 1.0 << endl;
+}
+
+void oif_Surface::WriteSurfaceFromKeywords(utl_Stream& stream) const {
+    const auto surface = [&](int i) -> const oif_Surface& {
+        return static_cast<const oif_Surface&>(subSurfaces_[i].ConstGet());
+    };
+    std::vector<LabelsOfFace> faces;
+    for (int i = 0; i < subSurfaces_.Length(); ++i) {
+        faces.push_back(surface(i).GroupByFace());
+        surface(i).WriteSurfaceElsets(stream, faces.back());
+    }
+    WriteSurfaceKeyword(stream);
+    for (int i = 0; i < subSurfaces_.Length(); ++i) {
+        surface(i).WriteSurfaceDatalines(stream, faces[static_cast<std::size_t>(i)]);
+    }
+}

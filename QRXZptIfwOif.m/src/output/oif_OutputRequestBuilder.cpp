@@ -1,0 +1,3 @@
+#include "output/oif_OutputRequestBuilder.h"
+
+void oif_OutputRequestBuilder::Build() {}

@@ -1,0 +1,3 @@
+#include "sections/oif_PartAttributesBuilder.h"
+
+void oif_PartAttributesBuilder::Build() {}

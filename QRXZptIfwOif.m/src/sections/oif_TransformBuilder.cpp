@@ -1,0 +1,3 @@
+#include "sections/oif_TransformBuilder.h"
+
+void oif_TransformBuilder::Build() {}

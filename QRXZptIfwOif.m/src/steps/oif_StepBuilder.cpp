@@ -1,0 +1,3 @@
+#include "steps/oif_StepBuilder.h"
+
+void oif_StepBuilder::Build() {}
