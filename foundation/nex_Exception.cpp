@@ -37,7 +37,7 @@ atr_String nex_Context::Text() {
 void nex_RaiseCastFailure(const char* found, const char* expected, nex_Position position) {
     std::string file(position.file);
     file.erase(0, file.find_last_of('/') + 1);
-    const std::string text = std::string("class check failed: found ") + found + ", expected " + expected + " (" +
-                             file + ":" + std::to_string(position.line) + ")";
+    const std::string text = std::string("class check failed: found ") + found + ", expected " + expected +
+                             " (" + file + ":" + std::to_string(position.line) + ")";
     nex_Raise(atr_String(std::string_view(text)));
 }

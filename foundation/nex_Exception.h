@@ -63,7 +63,9 @@ struct nex_Position {
     int line;
 };
 #define NEX_HERE                                                                                             \
-    nex_Position { __FILE__, __LINE__ }
+    nex_Position {                                                                                           \
+        __FILE__, __LINE__                                                                                   \
+    }
 
 /// Raises the failure of a class check: what was found, what was expected, and the source position.
 [[noreturn]] void nex_RaiseCastFailure(const char* found, const char* expected, nex_Position position);

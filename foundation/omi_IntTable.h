@@ -23,7 +23,8 @@ public:
 
 private:
     static std::size_t Magnitude(int key) {
-        return key < 0 ? static_cast<std::size_t>(-static_cast<long long>(key)) : static_cast<std::size_t>(key);
+        return key < 0 ? static_cast<std::size_t>(-static_cast<long long>(key))
+                       : static_cast<std::size_t>(key);
     }
     std::vector<T>& Half(int key) { return key < 0 ? negative_ : nonNegative_; }
 
