@@ -9,7 +9,8 @@ bool omu_EqualInAnyCapitals(std::string_view a, std::string_view b) {
 }
 
 const omu_EnumRow* omu_EnumTable::Row(int value) const {
-    const auto row = std::find_if(rows.begin(), rows.end(), [&](const omu_EnumRow& r) { return r.value == value; });
+    const auto row =
+        std::find_if(rows.begin(), rows.end(), [&](const omu_EnumRow& r) { return r.value == value; });
     return row == rows.end() ? nullptr : &*row;
 }
 

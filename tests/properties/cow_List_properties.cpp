@@ -92,7 +92,7 @@ void RunRandomOperations() {
             model.erase(model.begin() + index);
             break;
         case 9: {
-            if (count + models[b].size() > 3000) break;
+            if (model.size() + models[b].size() > 3000) break;
             list.Concatenate(lists[b]);
             const std::vector<Item> tail(models[b]);
             model.insert(model.end(), tail.begin(), tail.end());
