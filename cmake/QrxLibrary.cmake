@@ -1,7 +1,9 @@
-# The one installed library, made of the four layers; it needs nothing but the standard library.
-add_library(QRXZptInputFileWriter
-    $<TARGET_OBJECTS:qrx_foundation> $<TARGET_OBJECTS:qrx_store>
-    $<TARGET_OBJECTS:qrx_keyword> $<TARGET_OBJECTS:qrx_deck_writer>)
+include(CMakePackageConfigHelpers)
+
+# The one installed library, made of the layers; it needs nothing but the standard library.
+get_property(qrx_layers GLOBAL PROPERTY QRX_LAYERS)
+list(TRANSFORM qrx_layers REPLACE "(.+)" "$<TARGET_OBJECTS:\\1>" OUTPUT_VARIABLE qrx_objects)
+add_library(QRXZptInputFileWriter ${qrx_objects})
 add_library(QRX::QRXZptInputFileWriter ALIAS QRXZptInputFileWriter)
 set(QRX_INCLUDE_SUBDIR QRXZptInputFileWriter-${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
 target_include_directories(QRXZptInputFileWriter PUBLIC
@@ -11,3 +13,28 @@ target_include_directories(QRXZptInputFileWriter PUBLIC
 target_compile_features(QRXZptInputFileWriter PUBLIC cxx_std_20)
 set_target_properties(QRXZptInputFileWriter PROPERTIES
     VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR})
+
+# Installed headers keep the paths that they have in the tree, so that includes read the same there.
+set(qrx_include_dir ${CMAKE_INSTALL_INCLUDEDIR}/${QRX_INCLUDE_SUBDIR})
+foreach(layer foundation store_interface keyword_layer)
+    install(DIRECTORY ${PROJECT_SOURCE_DIR}/${layer}/ DESTINATION ${qrx_include_dir}/${layer}
+        FILES_MATCHING PATTERN "*.h")
+endforeach()
+install(DIRECTORY ${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src/ DESTINATION ${qrx_include_dir} OPTIONAL
+    FILES_MATCHING PATTERN "*.h")
+
+set(qrx_package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/QRXZptInputFileWriter)
+install(TARGETS QRXZptInputFileWriter EXPORT QRXZptInputFileWriterTargets)
+install(EXPORT QRXZptInputFileWriterTargets NAMESPACE QRX:: DESTINATION ${qrx_package_dir})
+configure_package_config_file(${CMAKE_CURRENT_LIST_DIR}/QRXZptInputFileWriterConfig.cmake.in
+    ${PROJECT_BINARY_DIR}/QRXZptInputFileWriterConfig.cmake INSTALL_DESTINATION ${qrx_package_dir})
+write_basic_package_version_file(${PROJECT_BINARY_DIR}/QRXZptInputFileWriterConfigVersion.cmake
+    COMPATIBILITY SameMajorVersion)
+install(FILES ${PROJECT_BINARY_DIR}/QRXZptInputFileWriterConfig.cmake
+    ${PROJECT_BINARY_DIR}/QRXZptInputFileWriterConfigVersion.cmake DESTINATION ${qrx_package_dir})
+
+# Found from its own place, the pkg-config file stays right when the installed tree is moved.
+file(RELATIVE_PATH QRX_PREFIX_FROM_PKGCONFIG ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig ${CMAKE_INSTALL_PREFIX})
+configure_file(${CMAKE_CURRENT_LIST_DIR}/QRXZptInputFileWriter.pc.in
+    ${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.pc @ONLY)
+install(FILES ${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)

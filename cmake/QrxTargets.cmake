@@ -6,13 +6,9 @@ target_compile_options(qrx_flags INTERFACE
     -ffp-contract=off
     $<$<BOOL:${QRX_WARNINGS_AS_ERRORS}>:-Werror>)
 
-# qrx_layer(NAME FOLDER LAYERS...): a layer of the core, which may include only the layers named.
+# qrx_layer(NAME): the sources of this folder as one layer of the core; a folder without sources adds none.
 function(qrx_layer name)
     file(GLOB_RECURSE sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
-    if(NOT sources)
-        set(sources ${CMAKE_CURRENT_BINARY_DIR}/empty.cpp)
-        file(CONFIGURE OUTPUT ${sources} CONTENT "")
-    endif()
     add_library(${name} OBJECT ${sources})
     target_include_directories(${name} PUBLIC
         $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>

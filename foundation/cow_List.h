@@ -22,8 +22,10 @@ inline int getPower(int mask) {
     return static_cast<int>(static_cast<unsigned>(mask) >> 23) - 127;
 }
 
-/// Raises the failure of an index that lies outside a list.
-[[noreturn]] void cow_RaiseOutOfRange(int index, int count);
+/// Raises the failure of an index that lies outside a container; `what` names the container and the index.
+[[noreturn]] void cow_RaiseOutOfRange(int index, int count, const char* what = "cow_List: index");
+/// Raises the failure of a number that may not be negative.
+[[noreturn]] void cow_RaiseNegative(int number, const char* what);
 
 /// How many items a new list should have room for.
 struct cow_ListConstruct {
@@ -143,7 +145,7 @@ public:
 
     /// Puts the item before the one at `index`; `index` may be the length.
     void InsertIndex(int index, T item) {
-        if (index < 0 || index > count_) RaiseOutOfRange(index);
+        if (index < 0 || index > count_) cow_RaiseOutOfRange(index, count_ + 1);
         if (index == 0) {
             Prepend(std::move(item));
             return;
@@ -155,7 +157,7 @@ public:
     void RemoveIndex(int index) {
         CheckIndex(index);
         for (int i = index; i + 1 < count_; ++i) std::swap(Writable(i), Writable(i + 1));
-        Resize(count_ - 1);
+        Shorten(count_ - 1);
     }
 
     void Concatenate(const cow_List& list) {
@@ -169,6 +171,7 @@ public:
 
     /// Makes the list `count` copies of the item.
     void Fill(int count, const T& item) {
+        if (count < 0) cow_RaiseNegative(count, "cow_List: length");
         const T value(item);
         *this = cow_List(cow_ListConstruct(count));
         for (int i = 0; i < count; ++i) Append(value);
@@ -176,13 +179,9 @@ public:
 
     /// Cuts the list off behind `count` items, or fills it up with default items.
     void Resize(int count) {
-        if (count < 0) RaiseOutOfRange(count);
-        if (count == 0) {
-            *this = cow_List();
-            return;
-        }
+        if (count < 0) cow_RaiseNegative(count, "cow_List: length");
         while (count_ < count) Append(T());
-        if (count < count_) CutOff(count);
+        if (count < count_) Shorten(count);
     }
 
     /// The longest run of items from `index` on that lies in one piece; `length` gets its length.
@@ -325,27 +324,30 @@ private:
         if (first_ > 0) return;
         const int used = EndBlock();
         if (used == tableLength_) GrowTable(2 * tableLength_);
-        // A block that a failed Append left behind would be overwritten below.
-        delete std::exchange(table_[used], nullptr);
+        // Blocks that a failed Append left behind would be overwritten below.
+        for (int b = used; b < tableLength_; ++b) delete std::exchange(table_[b], nullptr);
         std::move_backward(table_, table_ + used, table_ + tableLength_);
         std::fill(table_, table_ + (tableLength_ - used), nullptr);
         first_ = (tableLength_ - used) << shift_;
     }
 
-    void CutOff(int count) {
+    void Shorten(int count) {
+        if (count == 0) {
+            *this = cow_List();
+            return;
+        }
         CopyArray();
         const int last = (first_ + count - 1) >> shift_;
-        for (int b = EndBlock() - 1; b > last; --b) {
-            const auto [from, to] = LiveRange(b);
-            ReleaseBlock(b, from, to);
-        }
         const auto [from, to] = LiveRange(last);
         const int end = first_ + count - (last << shift_);
-        if (table_[last]->IsShared()) {
-            CloneRange(last, from, end);
-        } else {
-            for (int i = to; i > end; --i) table_[last]->Items()[i - 1].~T();
+        const bool cloned = table_[last]->IsShared();
+        // Before anything is destroyed, since the copies may fail.
+        if (cloned) CloneRange(last, from, end);
+        for (int b = EndBlock() - 1; b > last; --b) {
+            const auto [start, stop] = LiveRange(b);
+            ReleaseBlock(b, start, stop);
         }
+        for (int i = to; i > end && !cloned; --i) table_[last]->Items()[i - 1].~T();
         count_ = count;
     }
 

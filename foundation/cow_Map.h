@@ -23,11 +23,35 @@ template <class K, class V>
 class cow_MapNode : public mem_AllocationOperators {
 public:
     cow_MapNode(const K& nodeKey, const V& nodeValue) : key(nodeKey), value(nodeValue) {}
+    cow_MapNode(const cow_MapNode&) = default;
+    cow_MapNode& operator=(const cow_MapNode&) = delete;
+    ~cow_MapNode() {
+        Drop(left);
+        Drop(right);
+    }
 
     K key;
     V value;
     cow_MapNodeHandle<K, V> left;
     cow_MapNodeHandle<K, V> right;
+
+private:
+    // Drops a subtree without recursion, since equal bits make long chains: turns left children up to the
+    // top until the top has none of its own, then lets the top go.
+    static void Drop(cow_MapNodeHandle<K, V>& subtree) noexcept {
+        cow_MapNodeHandle<K, V> top(std::move(subtree));
+        while (top.HolderCount() == 1) {
+            if (top->left.HolderCount() == 1) {
+                cow_MapNodeHandle<K, V> child(std::move(top->left));
+                top->left = std::move(child->right);
+                child->right = std::move(top);
+                top = std::move(child);
+            } else {
+                cow_MapNodeHandle<K, V> rest(std::move(top->right));
+                top = std::move(rest);
+            }
+        }
+    }
 };
 
 /// The path of a text key: at even depth the lowest bit of a byte counted from the key's head (the
@@ -50,6 +74,12 @@ inline bool cow_MapGoesRight(int key, int depth) {
 template <class K, class V>
 class cow_Map {
 public:
+    cow_Map() = default;
+    // Moving would leave the count behind without nodes; a copy costs no more.
+    cow_Map(const cow_Map&) = default;
+    cow_Map& operator=(const cow_Map&) = default;
+    ~cow_Map() = default;
+
     /// Adds the pair, or overwrites the value of an existing key, which keeps its place. Always true.
     bool Insert(const K& key, const V& value) {
         Handle* place = PrivatePlace(key);

@@ -3,10 +3,9 @@
 #include "foundation/cow_List.h"
 
 #include <bit>
-#include <limits>
 
 void omi_BlkBitVect::SetBit(int bit) {
-    if (bit < 0) cow_RaiseOutOfRange(bit, std::numeric_limits<int>::max());
+    if (bit < 0) cow_RaiseNegative(bit, "omi_BlkBitVect: bit");
     const auto page = static_cast<std::size_t>(bit >> 18);
     const auto block = static_cast<std::size_t>((bit >> 9) & 511);
     if (page >= pages_.size()) pages_.resize(page + 1);

@@ -1,0 +1,98 @@
+#!/usr/bin/env python3
+"""Fails on an include that breaks the order of the layers.
+
+usage: check_layers.py REPOSITORY
+"""
+
+import pathlib
+import re
+import sys
+
+DECK_WRITER = "QRXZptIfwOif.m/src"
+CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER]
+
+# What a layer may include besides its own headers.
+ALLOWED = {
+    "foundation": [],
+    "store_interface": ["foundation"],
+    "keyword_layer": ["foundation", "store_interface"],
+    DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
+    "model_file": ["foundation", "store_interface"],
+    "tools": CORE + ["model_file"],
+}
+LIBRARIES = {
+    "model_file": ["nlohmann/"],
+    "tools": ["nlohmann/", "CLI/"],
+}
+
+STANDARD = set("""
+    algorithm any array atomic barrier bit bitset charconv chrono codecvt compare complex concepts
+    condition_variable coroutine deque exception execution filesystem format forward_list fstream functional
+    future initializer_list iomanip ios iosfwd iostream istream iterator latch limits list locale map memory
+    memory_resource mutex new numbers numeric optional ostream queue random ranges ratio regex
+    scoped_allocator semaphore set shared_mutex source_location span sstream stack stdexcept stop_token
+    streambuf string string_view syncstream system_error thread tuple type_traits typeindex typeinfo
+    unordered_map unordered_set utility valarray variant vector version
+    cassert cctype cerrno cfenv cfloat cinttypes climits clocale cmath csetjmp csignal cstdarg cstddef
+    cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
+    """.split())
+# The operating system's own headers, for the output device and the programs.
+SYSTEM = {"fcntl.h", "unistd.h", "sys/stat.h", "sys/types.h"}
+SYSTEM_LAYERS = {"foundation", "tools"}
+
+INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')
+
+
+def layer_of_header(root, path):
+    """The layer whose header a quoted include names, or None."""
+    for layer in ALLOWED:
+        if layer != DECK_WRITER and path.startswith(layer + "/"):
+            return layer if (root / path).is_file() else None
+    return DECK_WRITER if "/" in path and (root / DECK_WRITER / path).is_file() else None
+
+
+def finding(root, layer, quoted, angled):
+    """What is wrong with an include of a file of the layer, or None."""
+    if quoted is not None:
+        target = layer_of_header(root, quoted)
+        if target is None:
+            return f'"{quoted}" names no header by its path'
+        if target != layer and target not in ALLOWED[layer]:
+            return f'{layer} may not include {target} ("{quoted}")'
+        return None
+    if angled is None:
+        return "the name of an included file must be written out"
+    if angled in STANDARD or angled in SYSTEM and layer in SYSTEM_LAYERS:
+        return None
+    if any(angled.startswith(library) for library in LIBRARIES.get(layer, [])):
+        return None
+    return f"{layer} may not include <{angled}>"
+
+
+def findings(root):
+    """All findings of a tree, as "file:line: text", and the number of files read."""
+    found = []
+    count = 0
+    for layer in ALLOWED:
+        for file in sorted((root / layer).rglob("*")):
+            if file.suffix not in (".h", ".cpp", ".inl", ".inc"):
+                continue
+            count += 1
+            for number, line in enumerate(file.read_text(encoding="utf-8").splitlines(), 1):
+                match = INCLUDE.match(line)
+                text = finding(root, layer, match[1], match[2]) if match else None
+                if text:
+                    found.append(f"{file.relative_to(root)}:{number}: {text}")
+    return found, count
+
+
+def main():
+    if len(sys.argv) != 2:
+        sys.exit(__doc__.strip())
+    found, count = findings(pathlib.Path(sys.argv[1]))
+    print("\n".join(found + [f"{count} files, {len(found)} findings"]))
+    sys.exit(1 if found or count == 0 else 0)
+
+
+if __name__ == "__main__":
+    main()
