@@ -15,7 +15,7 @@ odiK_Model& odb_Odb::AddModel(const cow_String& name) {
         nex_Raise(atr_String(std::string_view(text)));
     }
     cow_CountedHld<odiK_Model> model(new odiK_Model(name));
-    return *models_.emplace(name, model).first->second;
+    return *models_.emplace(name, std::move(model)).first->second;
 }
 
 odiK_Model* odb_Odb::FindModel(const cow_String& name) const {

@@ -17,6 +17,10 @@ std::string Number(long long value) {
     return std::to_string(value);
 }
 
+std::string Quoted(std::string_view text) {
+    return std::string("'").append(text).append("'");
+}
+
 std::string Place(const char* array, std::size_t index) {
     return std::string("/") + array + "/" + std::to_string(index);
 }
@@ -159,8 +163,8 @@ int odiK_Mesh::FindSet(const cow_String& name) const {
 
 void odiK_Mesh::AddSet(const odiK_SetInput& input, odiK_Problems& problems) {
     if (FindSet(input.name) >= 0) {
-        problems.Error("/name", "found a second set named '" + std::string(input.name.View()) +
-                                    "', expected names that are unique in the mesh");
+        problems.Error("/name", "found a second set named " + Quoted(input.name.View()) +
+                                    ", expected names that are unique in the mesh");
         return;
     }
     auto set = cow_CountedHld<odiK_Set>(new odiK_Set());
@@ -218,7 +222,7 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
             if (member.facet < 0 || !odiK_FacetFits(elements.shape, member.facet)) {
                 problems.Error(
                     place + Place("facets", i) + "/1",
-                    "found " + (facet.face.empty() ? Number(facet.id) : "'" + std::string(facet.face) + "'") +
+                    "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)) +
                         ", expected a face of an element of type " + std::string(elements.type.View()));
                 continue;
             }

@@ -11,7 +11,7 @@ namespace {
 }
 
 std::string Quoted(const cow_String& name) {
-    return "'" + std::string(name.View()) + "'";
+    return std::string("'").append(name.View()).append("'");
 }
 
 void NormalizeAxis(gsl_Vector& axis, const cow_String& datum, const char* member) {
@@ -71,13 +71,15 @@ odiK_Part& odiK_Model::AddPart(const cow_String& name) {
     CheckNewName(parts_, name, "a part");
     cow_CountedHld<odiK_Part> part(new odiK_Part());
     part->name = name;
-    return *parts_.emplace(name, part).first->second;
+    return *parts_.emplace(name, std::move(part)).first->second;
 }
 
 odiK_Instance& odiK_Model::AddInstance(const cow_String& name, const cow_String& partName) {
     if (parts_.count(partName) == 0)
         Raise("instance " + Quoted(name) + ": there is no part named " + Quoted(partName));
-    return AddOtherEntry(name, partName).isPartInstance = true, *FindInstance(name);
+    odiK_Instance& instance = AddOtherEntry(name, partName);
+    instance.isPartInstance = true;
+    return instance;
 }
 
 odiK_Instance& odiK_Model::AddOtherEntry(const cow_String& name, const cow_String& partName) {
@@ -90,7 +92,7 @@ odiK_Instance& odiK_Model::AddOtherEntry(const cow_String& name, const cow_Strin
     instance->isPartInstance = false;
     const auto part = parts_.find(partName);
     if (part != parts_.end()) instance->part = part->second;
-    return *instances_.emplace(name, instance).first->second;
+    return *instances_.emplace(name, std::move(instance)).first->second;
 }
 
 odiK_Instance* odiK_Model::FindInstance(const cow_String& name) const {
