@@ -3,12 +3,16 @@
 
 #include "model_file/mdf_Value.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <ostream>
 #include <span>
 #include <string>
 #include <string_view>
 #include <vector>
+
+/// Bytes of the UTF-8 character that the text begins with; 0 when it begins with none.
+std::size_t mdf_Utf8Length(std::string_view text);
 
 /// How the items of an array or object stand. Inside OneLine and Wrapped everything stays on the line.
 enum class mdf_Layout : std::uint8_t {
@@ -60,7 +64,7 @@ private:
     void Begin(char bracket, mdf_Layout layout);
     void End(char bracket);
     void Scalar(std::string_view text);
-    void Separate(std::size_t length);
+    void Separate(std::size_t length, bool isKey = false);
     void NewLine(std::size_t depth);
     void Quote(std::string_view text);
     void Flush();
