@@ -66,9 +66,10 @@ std::string Hex(unsigned char byte) {
 
 /// The text in single quotes, with bytes that can't be shown as \xNN.
 std::string Quoted(std::string_view text) {
+    const std::size_t whole = text.size();
     std::string quoted = "'";
     while (!text.empty()) {
-        if (quoted.size() > longestQuote) return quoted + "...'";
+        if (whole - text.size() >= longestQuote) return quoted + "...'";
         const std::size_t length = mdf_Utf8Length(text);
         const auto byte = static_cast<unsigned char>(text.front());
         if (length == 0 || byte < 0x20 || byte == 0x7F)
