@@ -297,6 +297,11 @@ const mdf_Rows& mdf_Value::Rows() const {
     return *rows_;
 }
 
+const mdf_Rows& mdf_Value::Rows(std::size_t row) const {
+    if (row >= Rows().count) throw std::logic_error("a row beyond the end was asked for");
+    return *rows_;
+}
+
 const mdf_Facets& mdf_Value::FacetRow(std::size_t row) const {
     Expect(mdf_Kind::FacetArray);
     if (row >= facets_->Count()) throw std::logic_error("a facet beyond the end was asked for");
@@ -428,11 +433,11 @@ int mdf_Value::UniformRowLength() const {
 }
 
 std::size_t mdf_Value::RowLength(std::size_t row) const {
-    return Rows().End(row) - Rows().Begin(row);
+    return Rows(row).End(row) - Rows(row).Begin(row);
 }
 
 std::size_t mdf_Value::RowBegin(std::size_t row) const {
-    return Rows().Begin(row);
+    return Rows(row).Begin(row);
 }
 
 std::vector<int> mdf_Value::TakeInts() {

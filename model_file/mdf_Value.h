@@ -141,6 +141,7 @@ private:
     void Expect(mdf_Kind kind) const;
     const mdf_Numbers& Numbers() const;
     const mdf_Rows& Rows() const;
+    const mdf_Rows& Rows(std::size_t row) const;
     const mdf_Facets& FacetRow(std::size_t row) const;
 
     mdf_Kind kind_ = mdf_Kind::Null;

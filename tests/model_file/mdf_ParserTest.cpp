@@ -53,6 +53,8 @@ TEST(ModelFileValue, Accessors_OfAnotherKind_Raise) {
     EXPECT_THROW(Parsed("[1]").Items(), std::logic_error);
     EXPECT_THROW(Parsed("[1]").Reals(), std::logic_error);
     EXPECT_THROW(Parsed("[1.5]").Ints(), std::logic_error);
+    EXPECT_THROW(Parsed("[[1], [2, 3]]").RowLength(2), std::logic_error);
+    EXPECT_THROW(Parsed("[[1], [2]]").RowBegin(2), std::logic_error);
     EXPECT_THROW(Parsed("[[1, \"A\"], [2, 5]]").FacetName(1), std::logic_error);
     EXPECT_THROW(Parsed("[[1, \"A\"], [2, 5]]").FacetId(0), std::logic_error);
     EXPECT_THROW(Parsed("[[1, \"A\"], [2, 5]]").FacetLabel(2), std::logic_error);
