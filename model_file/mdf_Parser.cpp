@@ -239,14 +239,10 @@ void mdf_Builder::MakeRoom(mdf_Numbers& numbers) const {
     int depth = rowOpen_ ? 1 : 0;
     const char* at = cursor_.at - 1;
     for (; at != cursor_.end; ++at) {
-        if (*at == ',')
-            ++ahead;
-        else if (*at == '[')
-            ++depth;
-        else if (*at == ']' && --depth < 0)
-            break;
-        else if (*at == '"' || *at == '/' || *at == '{')
-            break;
+        if (*at == '"' || *at == '/' || *at == '{') break;
+        if (*at == ',') ++ahead;
+        if (*at == '[') ++depth;
+        if (*at == ']' && --depth < 0) break;
     }
     const bool counted = depth < 0;
     numbers.Reserve(size + (counted ? ahead : std::max(ahead, size)));
