@@ -1,0 +1,191 @@
+#include "tools/Commands.h"
+
+#include "deck/oif_Writer.h"
+#include "foundation/nex_Exception.h"
+#include "model_file/mdf_ModelFile.h"
+#include "tools/DeckFile.h"
+#include "tools/ModelSummary.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <chrono>
+#include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <iostream>
+#include <system_error>
+
+using nlohmann::ordered_json;
+
+namespace {
+
+std::string ReasonText(int error) {
+    return std::generic_category().message(error == 0 ? EIO : error);
+}
+
+/// The store of a model file that is right; else null, with the code.
+std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code) {
+    mdf_Report found;
+    found.fileName = path;
+    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
+    report.AddAll(found);
+    code = ExitCode::DONE;
+    if (found.unreadable) {
+        code = ExitCode::FILE_SYSTEM_REFUSED;
+    } else if (found.HasErrors() || odb == nullptr) {
+        code = ExitCode::MODEL_IS_WRONG;
+    }
+    if (code != ExitCode::DONE) odb.reset();
+    return odb;
+}
+
+/// The path of the deck; empty for a job name that names no file.
+std::string TargetOf(const WriteRequest& request) {
+    const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
+                                                          : std::filesystem::path(request.job);
+    if (!job.has_filename()) return {};
+    std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
+    target += ".inp";
+    return target.lexically_normal().string();
+}
+
+std::string Grouped(long long count) {
+    std::string text = std::to_string(count);
+    for (auto place = static_cast<int>(text.size()) - 3; place > 0; place -= 3) {
+        text.insert(static_cast<std::size_t>(place), 1, ' ');
+    }
+    return text;
+}
+
+std::string CountLine(const std::string& count, const std::string& text, std::size_t width) {
+    std::string line(width + 2 - std::min(width, count.size()), ' ');
+    line.append(count).append("  ").append(text).append("\n");
+    return line;
+}
+
+std::string NameList(const std::vector<std::string>& names) {
+    constexpr std::size_t kShown = 5;
+    std::string text;
+    for (std::size_t i = 0; i < names.size() && i < kShown; ++i) {
+        if (i > 0) text.append(", ");
+        text.append(names[i]);
+    }
+    if (names.size() > kShown) text.append(", ...");
+    return text;
+}
+
+void Summarise(const std::string& target, const DeckFile::Result& result, double seconds,
+               const std::vector<KindCount>& counts, const std::vector<LeftOut>& leftOut, RunReport& report) {
+    if (report.AsJson()) {
+        ordered_json& written = report.Member("written");
+        written = {{"target", target}, {"bytes", result.bytes}, {"seconds", seconds}};
+        ordered_json& byKind = written["counts"] = ordered_json::object();
+        for (const KindCount& kind : counts) byKind[kind.key] = kind.count;
+        ordered_json& missing = written["leftOut"] = ordered_json::array();
+        for (const LeftOut& entry : leftOut) {
+            missing.push_back(
+                {{"what", entry.what}, {"why", entry.why}, {"count", entry.count}, {"names", entry.names}});
+        }
+        return;
+    }
+    std::size_t width = 0;
+    for (const KindCount& kind : counts) width = std::max(width, Grouped(kind.count).size());
+    for (const LeftOut& entry : leftOut) width = std::max(width, Grouped(entry.count).size());
+    char time[32];
+    std::snprintf(time, sizeof time, "%.2f s", seconds);
+    report.Print(target + ": " + Grouped(result.bytes) + " bytes in " + time + "\n");
+    if (!counts.empty()) report.Print("written:\n");
+    for (const KindCount& kind : counts) report.Print(CountLine(Grouped(kind.count), kind.name, width));
+    if (!leftOut.empty()) report.Print("left out, since a deck can't carry it:\n");
+    for (const LeftOut& entry : leftOut) {
+        std::string text = std::string(entry.what) + " (" + entry.why + ")";
+        if (!entry.names.empty()) text += ": " + NameList(entry.names);
+        report.Print(CountLine(Grouped(entry.count), text, width));
+    }
+}
+
+double SecondsSince(std::chrono::steady_clock::time_point start) {
+    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+}
+
+} // namespace
+
+ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
+    const std::string target = TargetOf(request);
+    if (target.empty()) {
+        report.Error("qrxdeck", "the job '" + request.job + "' names no file");
+        return ExitCode::WRONG_USAGE;
+    }
+    ExitCode code;
+    const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code);
+    return odb == nullptr ? code : WriteDeck(*odb, request.model, target, report);
+}
+
+ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
+                   RunReport& report) {
+    const auto start = std::chrono::steady_clock::now();
+    const odiK_Model* model = odb.FindModel(odb_Odb::DefaultModelName());
+    if (model == nullptr) {
+        report.Error(modelFile, std::string("there is no model named \"") + odb_Odb::DefaultModelName() +
+                                    "\" to write a deck from");
+        return ExitCode::MODEL_IS_WRONG;
+    }
+    // Before the deck, so that nothing can fail once it stands.
+    const std::vector<KindCount> counts = CountsOfDeck(*model);
+    const std::vector<LeftOut> leftOut = LeftOutOf(odb, *model);
+
+    DeckFile deck(target);
+    DeckFile::Result result;
+    try {
+        result = deck.Replace([&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); });
+    } catch (const QRXBasException& failure) {
+        report.WriterError(failure.what(), failure.Context());
+        return ExitCode::CANNOT_BE_EXPRESSED;
+    } catch (const DeckFileError& failure) {
+        report.Error(target, failure.what());
+        return ExitCode::FILE_SYSTEM_REFUSED;
+    }
+    if (result.removeError != 0) {
+        report.Warning(target, "the temporary folder '" + deck.TemporaryFolder() +
+                                   "' can't be removed: " + ReasonText(result.removeError));
+    }
+    if (result.folderSyncError != 0) {
+        report.Warning(target, "the deck stands, but its folder can't be brought to the disk: " +
+                                   ReasonText(result.folderSyncError));
+    }
+    Summarise(target, result, SecondsSince(start), counts, leftOut, report);
+    return ExitCode::DONE;
+}
+
+ExitCode RunCheck(const std::string& model, RunReport& report) {
+    ExitCode code;
+    if (ReadModel(model, report, code) != nullptr) report.Print(model + ": no errors\n");
+    return code;
+}
+
+ExitCode RunInfo(const std::string& model, RunReport& report) {
+    ExitCode code;
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    if (odb == nullptr) return code;
+    ordered_json& models = report.Member("models") = ordered_json::object();
+    for (const auto& [name, entry] : odb->Models()) {
+        const std::string key(name.View());
+        models[key] = DescribeModel(*entry);
+        report.Print(TextOfDescription(key, models[key]));
+    }
+    return code;
+}
+
+ExitCode RunSchema(const std::string& output, RunReport& report) {
+    if (output.empty()) {
+        if (mdf_WriteSchema(std::cout) && std::cout.flush()) return ExitCode::DONE;
+        report.Error("standard output", "cannot write the schema");
+        return ExitCode::FILE_SYSTEM_REFUSED;
+    }
+    errno = 0;
+    std::ofstream file(output, std::ios::binary);
+    if (file && mdf_WriteSchema(file)) file.close();
+    if (file) return ExitCode::DONE;
+    report.Error(output, "cannot write the schema: " + ReasonText(errno));
+    return ExitCode::FILE_SYSTEM_REFUSED;
+}

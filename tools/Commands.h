@@ -1,0 +1,25 @@
+#ifndef QRX_TOOLS_COMMANDS_H
+#define QRX_TOOLS_COMMANDS_H
+
+#include "tools/RunReport.h"
+
+#include <string>
+
+/// What the user asked for on the command line.
+struct WriteRequest {
+    std::string model;
+    /// Empty: the model file's name without extension. May hold a folder, relative to the output folder.
+    std::string job;
+    std::string outputDir = ".";
+};
+
+ExitCode RunWrite(const WriteRequest& request, RunReport& report);
+/// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
+ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
+                   RunReport& report);
+ExitCode RunCheck(const std::string& model, RunReport& report);
+ExitCode RunInfo(const std::string& model, RunReport& report);
+/// Writes the schema to the file, or to the standard output when the name is empty.
+ExitCode RunSchema(const std::string& output, RunReport& report);
+
+#endif

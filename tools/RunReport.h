@@ -1,0 +1,47 @@
+#ifndef QRX_TOOLS_RUNREPORT_H
+#define QRX_TOOLS_RUNREPORT_H
+
+#include "model_file/mdf_ModelFile.h"
+
+#include <nlohmann/json.hpp>
+
+#include <string>
+
+/// What a run of the program came to.
+enum class ExitCode : int {
+    DONE = 0,
+    MODEL_IS_WRONG = 1,
+    WRONG_USAGE = 2,
+    FILE_SYSTEM_REFUSED = 3, ///< or there is not enough memory
+    CANNOT_BE_EXPRESSED = 4,
+    INTERNAL_FAILURE = 5,
+};
+
+/// What a run has to say: as text, messages at once on the standard error; or all of it as one JSON object on
+/// the standard output when the run ends, and nothing on the standard error.
+class RunReport {
+public:
+    explicit RunReport(bool asJson);
+
+    bool AsJson() const { return asJson_; }
+    void AddAll(const mdf_Report& report);
+    void Error(const std::string& file, const std::string& text);
+    void Warning(const std::string& file, const std::string& text);
+    /// A text exactly as the deck writer raised it, and what was being written.
+    void WriterError(const std::string& text, const std::string& context);
+    /// A member of the JSON object.
+    nlohmann::ordered_json& Member(const char* name) { return root_[name]; }
+    /// Text for the standard output; left out of JSON.
+    void Print(const std::string& text);
+    /// Ends the report. An output that can't be written turns success into a refusal of the file system.
+    ExitCode Finish(ExitCode code);
+
+private:
+    void Add(const mdf_Report& report, const mdf_Message& message);
+    static void PutError(const std::string& line);
+
+    bool asJson_;
+    nlohmann::ordered_json root_;
+};
+
+#endif

@@ -1,0 +1,124 @@
+#include "foundation/nex_Exception.h"
+#include "tools/Commands.h"
+#include "tools/SignalCleanUp.h"
+
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <cstdio>
+#include <iostream>
+#include <new>
+#include <string_view>
+
+namespace {
+
+constexpr char kAbout[] = "Writes finite-element models, held in JSON model files, as keyword decks.";
+constexpr char kExitCodes[] =
+    "Exit codes:\n"
+    "  0  done (there may be warnings)\n"
+    "  1  the model is wrong\n"
+    "  2  wrong usage\n"
+    "  3  a file can't be read or written, or there is not enough memory\n"
+    "  4  a deck can't express the model: the reason on a line, object and step on the next\n"
+    "  5  an internal failure\n"
+    "\n"
+    "A run that fails leaves an older deck as it was.\n";
+
+struct CommandLine {
+    CLI::App app{kAbout, "qrxdeck"};
+    WriteRequest write;
+    std::string model;
+    std::string schemaOutput;
+    bool json = false;
+    CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
+    CLI::App* checkCommand = app.add_subcommand("check", "Look for errors in a model, write nothing");
+    CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
+    CLI::App* schemaCommand =
+        app.add_subcommand("schema", "Print the JSON Schema of model files, for editors and generators");
+
+    CommandLine() {
+        app.set_version_flag("--version", "qrxdeck " QRX_VERSION);
+        app.require_subcommand(1);
+        app.footer(kExitCodes);
+        app.get_formatter()->column_width(30);
+
+        AddModel(writeCommand, write.model);
+        writeCommand
+            ->add_option(
+                "--job", write.job,
+                "Name of the deck without \".inp\"; may hold a folder, relative to the output folder "
+                "(default: the model file's name without extension)")
+            ->type_name("NAME");
+        writeCommand
+            ->add_option("--output-dir", write.outputDir, "Folder of the deck (default: the current one)")
+            ->type_name("DIR");
+        AddModel(checkCommand, model);
+        AddModel(infoCommand, model);
+        schemaCommand->add_option("--output", schemaOutput, "File to write (default: the standard output)")
+            ->type_name("FILE");
+    }
+
+    ExitCode Run(RunReport& report) const {
+        if (*writeCommand) return RunWrite(write, report);
+        if (*checkCommand) return RunCheck(model, report);
+        if (*infoCommand) return RunInfo(model, report);
+        return RunSchema(schemaOutput, report);
+    }
+
+private:
+    void AddModel(CLI::App* command, std::string& file) {
+        command->add_option("MODEL", file, "Model file, JSON")->required()->type_name("");
+        command->add_flag(
+            "--json", json,
+            "Everything as one JSON object on the standard output: exitCode, messages, results");
+    }
+};
+
+ExitCode RunGuarded(const CommandLine& commandLine, RunReport& report) {
+    try {
+        return commandLine.Run(report);
+    } catch (const std::bad_alloc&) {
+        report.Error("qrxdeck", "not enough memory");
+        return ExitCode::FILE_SYSTEM_REFUSED;
+    } catch (const std::exception& failure) {
+        report.Error("qrxdeck", std::string("internal failure: ") + failure.what());
+        return ExitCode::INTERNAL_FAILURE;
+    }
+}
+
+ExitCode Main(int argc, char** argv) {
+    CommandLine commandLine;
+    try {
+        commandLine.app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        const bool wrong = error.get_exit_code() != static_cast<int>(CLI::ExitCodes::Success);
+        const bool json = std::any_of(argv, argv + argc,
+                                      [](const char* word) { return std::string_view(word) == "--json"; });
+        RunReport report(wrong && json);
+        if (!wrong) {
+            commandLine.app.exit(error, std::cout, std::cerr);
+            std::cout.flush();
+            return report.Finish(ExitCode::DONE);
+        }
+        report.Error("qrxdeck", error.what());
+        if (!json) std::fputs("Run with --help for more information.\n", stderr);
+        return report.Finish(ExitCode::WRONG_USAGE);
+    }
+    RunReport report(commandLine.json);
+    return report.Finish(RunGuarded(commandLine, report));
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    SignalCleanUp::Install();
+    try {
+        return static_cast<int>(Main(argc, argv));
+    } catch (const std::bad_alloc&) {
+        std::fputs("qrxdeck: error: not enough memory\n", stderr);
+        return static_cast<int>(ExitCode::FILE_SYSTEM_REFUSED);
+    } catch (const std::exception& failure) {
+        std::fprintf(stderr, "qrxdeck: error: internal failure: %s\n", failure.what());
+        return static_cast<int>(ExitCode::INTERNAL_FAILURE);
+    }
+}
