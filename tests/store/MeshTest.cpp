@@ -188,6 +188,15 @@ TEST(Mesh, BadElements_AreNamedAndNotAdded) {
     EXPECT_EQ(mesh.NumElements(), 0);
 }
 
+TEST(Mesh, NodesForElementsWithoutAny_AreAnErrorOfTheirCount) {
+    odiK_Mesh mesh = MeshWithNodes();
+    EXPECT_EQ(Raised([&] {
+                  mesh.AddElements("T3D2", {1}, 0, {99, 98});
+              }),
+              "/connectivity: found 2 nodes, expected 0 for each of 1 labels");
+    EXPECT_TRUE(mesh.Classes().empty());
+}
+
 TEST(Mesh, ElementLabelThatStandsTwice_IsNamedWithItsClass) {
     odiK_Mesh mesh = MeshWithNodes();
     mesh.AddElements("T3D2", {1, 2}, 2, {1, 2, 2, 3});
