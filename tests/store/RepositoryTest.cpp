@@ -174,6 +174,12 @@ TEST(StepContainer, NameThatIsTakenOrUnknown_Raises) {
     EXPECT_EQ(Raised([&] { steps.Get("B"); }), "kprC_StepContainer: no entry named 'B'");
 }
 
+TEST(StepContainer, PlaceOutsideTheSteps_Raises) {
+    const kprC_StepContainer steps = StepsOf("IG");
+    EXPECT_EQ(Raised([&] { steps.NameAt(2); }), "cow_List: index 2 is out of range, expected 0 to 1");
+    EXPECT_EQ(Raised([&] { steps.StepAt(-1); }), "cow_List: index -1 is out of range, expected 0 to 1");
+}
+
 TEST(StepContainer, Copy_OutlivesTheOriginalAndIsApartFromIt) {
     kprC_StepContainer copy;
     {

@@ -217,6 +217,18 @@ TEST_F(StoreViews, Elements_GiveTheirClasses) {
               "cow_List: index -1 is out of range, expected 0 to 1");
 }
 
+TEST_F(StoreViews, ElementClassesOfTheSectionCode_GiveTheirControls) {
+    const bme_ElementData elements(View().mesh(1).mesh());
+    EXPECT_EQ(elements.NumClasses(), 2U);
+    EXPECT_EQ(elements.GetClass(0).GetElemControlParams().hourglass,
+              bme_ElemCtrlParams::HourglassEnm::ENHANCED);
+    EXPECT_EQ(elements.GetClass(1).GetElemControlParams().hourglass,
+              bme_ElemCtrlParams::HourglassEnm::DEFAULT);
+    EXPECT_EQ(elements.GetClass(1).FirstElementIndex(), 2);
+    EXPECT_EQ(elements.GetClass(1).NumElements(), 1);
+    EXPECT_EQ(Raised([&] { elements.GetClass(2); }), "cow_List: index 2 is out of range, expected 0 to 1");
+}
+
 TEST_F(StoreViews, Sets_AreWalkedInTheOrderOfTheModel) {
     const ddb_SetList sets = Instance("I-2").mesh().set();
     EXPECT_EQ(sets.size(), 3);
