@@ -28,6 +28,18 @@ const cow_String& SectionOf(const ptoC_PartAttributeList& list, int index) {
     return static_cast<const ptoC_SectionAssignment&>(list.ConstGet(index)).sectionName;
 }
 
+TEST(Model, NamesThatAreTaken_Raise) {
+    odiK_Model model("M");
+    model.AddPart("P");
+    model.AddInstance("I", "P");
+    EXPECT_EQ(Raised([&] { model.AddPart("P"); }), "a part named 'P' is there already");
+    EXPECT_EQ(Raised([&] { model.AddInstance("I", "P"); }), "an instance named 'I' is there already");
+    EXPECT_EQ(Raised([&] { model.AddOtherEntry("I", ""); }), "an instance named 'I' is there already");
+    EXPECT_EQ(Raised([&] { model.AddInstance("J", "Q"); }), "instance 'J': there is no part named 'Q'");
+    EXPECT_EQ(Raised([&] { model.AddOtherEntry("J", "Q"); }), "instance 'J': there is no part named 'Q'");
+    EXPECT_EQ(model.FindInstance("J"), nullptr);
+}
+
 TEST(Model, PartsAndInstances_StandInByteOrder) {
     odiK_Model model("M");
     for (const char* name : {"b", "B", "a"}) model.AddPart(name);
