@@ -337,6 +337,12 @@ TEST_F(StoreViews, OrientationsOfAnInstance_GiveTheirSets) {
     EXPECT_EQ(Instance("I-3").materialOrientations().size(), 0);
 }
 
+TEST_F(StoreViews, OrientationView_StaysGoodWhenTheModelIsAskedForAgain) {
+    const ddb_MaterialOrientation orientation = Instance("I-2").materialOrientations().get(0);
+    View();
+    EXPECT_EQ(orientation.region().setLabel(), "All");
+}
+
 TEST_F(StoreViews, Shortcuts_LeadToTheirObjects) {
     const ddb_PartInstance instance = Instance("I-2");
     EXPECT_EQ(instance.Shortcut().Name(), "I-2");
