@@ -250,7 +250,7 @@ private:
             type.SetState(attribute, static_cast<int>(AttributeState::CARRIED));
             return;
         }
-        type.SetState(attribute, static_cast<int>(AttributeState::NEVER_SET));
+        type.Reset(attribute);
         if (defaultValue != nullptr) type.ValueType().Assign(type.WritableValue(attribute), defaultValue);
     }
 

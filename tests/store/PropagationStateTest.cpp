@@ -327,6 +327,18 @@ TEST(PropagationState, ListOfAttributes_IsReplacedAsAWhole) {
     EXPECT_EQ(StateIn<S>(temperature, "S2").values.Length(), 0);
 }
 
+TEST(PropagationState, ClearedItemOfAList_HasItsDefaultInTheNextStep) {
+    Temperature temperature;
+    using S = TemperatureState;
+    auto values = Values({1.0});
+    values.Append(mdl_PropAttr<double>(5.0, State::CLEARED));
+    Give<S>(temperature, "S0").Set<&S::values>(values);
+    temperature.Propagate(StepsOf("IG"));
+    ExpectAttribute(StateIn<S>(temperature, "S0").values[1], State::CLEARED, 5.0);
+    ExpectAttribute(StateIn<S>(temperature, "S1").values[0], State::CARRIED, 1.0);
+    ExpectAttribute(StateIn<S>(temperature, "S1").values[1], State::NEVER_SET, 0.0);
+}
+
 TEST(PropagationState, CompletedField_FollowsTheStatusUnlessItIsGiven) {
     Contact contact;
     using S = ContactState;
