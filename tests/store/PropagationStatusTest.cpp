@@ -171,6 +171,17 @@ TEST(PropagationStatus, StateThatCannotBe_IsNotedAndTreatedAsNotGiven) {
     }
 }
 
+TEST(PropagationStatus, StateForAnUnknownStep_IsAProblem) {
+    Force force;
+    force.Give("S1");
+    force.Give("Nowhere");
+    const auto problems = force.Propagate(StepsOf("IG"));
+    ASSERT_EQ(problems.size(), 1U);
+    EXPECT_EQ(problems[0].stepName, "Nowhere");
+    EXPECT_EQ(problems[0].text, "a state, but there is no step of that name");
+    EXPECT_EQ(force.Status("S1"), Status::CREATED);
+}
+
 TEST(PropagationStatus, ExplicitStatusInAGeneralStep_LeavesTheMemoryOfItsRule) {
     const int nextWhenAlive[16] = {5, 2, 2, 2, 5, 5, 2, 2, 2, 2, 2, 2, 2, 2, 2, 5};
     const int nextWhenNeverBegun[16] = {0, 2, 2, 2, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 2, 0};
