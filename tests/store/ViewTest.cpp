@@ -468,6 +468,28 @@ TEST_F(StoreViews, CyclicSector_GivesItsDefinition) {
     EXPECT_EQ(found.GetEndPoint(), (g3d_Vector{4, 5, 6}));
 }
 
+TEST_F(StoreViews, ModelWithoutACyclicSector_HasOneWithoutSymmetry) {
+    EXPECT_EQ(View().modelSectorForCyclicSymmetry().GetSymmetryType(), calC_SymmetryTypeEnm::NONE);
+}
+
+class PlainTie : public cls_RecordOf<PlainTie, kcoC_Constraint> {
+public:
+    static constexpr cls_ClassInfo Class{"sample_PlainTie", "a tie"};
+};
+class CyclicTie final : public PlainTie {
+public:
+    cls_Record* Copy() const override { return new CyclicTie(*this); }
+    bool IsCyclic() const override { return true; }
+};
+
+TEST_F(StoreViews, CyclicSymmetry_IsAskedOfAConstraintByName) {
+    model->constraints.Insert("Plain", PlainTie());
+    model->constraints.Insert("Cyclic", CyclicTie());
+    EXPECT_TRUE(View().hasCyclicSymmetry("Cyclic"));
+    EXPECT_FALSE(View().hasCyclicSymmetry("Plain"));
+    EXPECT_FALSE(View().hasCyclicSymmetry("Default Model"));
+}
+
 TEST(ElementControls, Library_DecidesWhatDefaultMeans) {
     using L = bme_ElemLibrary;
     bme_ElemCtrlParams params;
