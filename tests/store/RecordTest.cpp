@@ -432,6 +432,7 @@ TEST(FieldType, Holders_TakeCopiesAndGiveThemBack) {
 
     const auto& variant = TypeOf<cls_HolderType>("figure");
     EXPECT_EQ(variant.ClassId(), Figure::TypeId());
+    EXPECT_NE(Base::TypeId(), Every::TypeId());
     const Box box;
     variant.Set(&record.figure, &box);
     EXPECT_EQ(variant.Get(&record.figure)->DynTypeId(), Box::TypeId());
