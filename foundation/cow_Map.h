@@ -5,6 +5,7 @@
 #include "foundation/cow_String.h"
 
 #include <memory>
+#include <unordered_map>
 #include <vector>
 
 /// Raises the failure of a key that a container doesn't hold.
@@ -69,25 +70,42 @@ inline bool cow_MapGoesRight(int key, int depth) {
     return depth < 32 && ((static_cast<unsigned>(key) >> depth) & 1U) != 0;
 }
 
+/// What a map's index of its keys is made of; the view lives as long as the key's storage.
+inline std::string_view cow_MapIndexKey(const cow_String& key) {
+    return key.View();
+}
+inline int cow_MapIndexKey(int key) {
+    return key;
+}
+
 /// A digital search tree, NOT a sorted map: it is walked in pre-order (node, left, right), which depends on
 /// the order of insertion and on single bits of the keys. Copies share all subtrees until one is written.
+/// Keys that agree in the bits that count make long chains, so a large map also keeps an index of its nodes.
 template <class K, class V>
 class cow_Map {
 public:
     cow_Map() = default;
     // Moving would leave the count behind without nodes; a copy costs no more.
-    cow_Map(const cow_Map&) = default;
-    cow_Map& operator=(const cow_Map&) = default;
+    cow_Map(const cow_Map& other) : root_(other.root_), count_(other.count_), shared_(true) {
+        other.shared_ = true;
+    }
+    cow_Map& operator=(const cow_Map& other) {
+        if (this == &other) return *this;
+        DropIndex();
+        root_ = other.root_;
+        count_ = other.count_;
+        shared_ = true;
+        other.shared_ = true;
+        return *this;
+    }
     ~cow_Map() = default;
 
     /// Adds the pair, or overwrites the value of an existing key, which keeps its place. Always true.
     bool Insert(const K& key, const V& value) {
-        Handle* place = PrivatePlace(key);
-        if (place->IsNull()) {
-            place->Reset(new Node(key, value));
-            ++count_;
+        if (Node* node = PrivateNode(key)) {
+            node->value = value;
         } else {
-            place->Referent()->value = value;
+            Hang(key, value);
         }
         return true;
     }
@@ -100,17 +118,14 @@ public:
     }
     /// The value for writing; an absent key raises as in ConstGet.
     V& Get(const K& key) {
-        if (!IsMember(key)) cow_RaiseNoSuchKey("cow_Map", key);
-        return PrivatePlace(key)->Referent()->value;
+        Node* node = PrivateNode(key);
+        if (node == nullptr) cow_RaiseNoSuchKey("cow_Map", key);
+        return node->value;
     }
     /// The value for writing, a default one at the key's first use.
     V& GetOrInsert(const K& key) {
-        Handle* place = PrivatePlace(key);
-        if (place->IsNull()) {
-            place->Reset(new Node(key, V()));
-            ++count_;
-        }
-        return place->Referent()->value;
+        if (Node* node = PrivateNode(key)) return node->value;
+        return Hang(key, V())->value;
     }
     /// The value, or null for an absent key.
     const V* Find(const K& key) const {
@@ -121,6 +136,7 @@ public:
     /// node may change.
     bool Remove(const K& key) {
         if (!IsMember(key)) return false;
+        DropIndex();
         Handle* place = PrivatePlace(key);
         // Any leaf below may stand in the removed node's place: its path leads through it.
         Handle* leaf = place;
@@ -151,10 +167,62 @@ private:
     using Node = cow_MapNode<K, V>;
     using Handle = cow_MapNodeHandle<K, V>;
 
+    using IndexKey = decltype(cow_MapIndexKey(std::declval<const K&>()));
+    using Index = std::unordered_map<IndexKey, Node*>;
+    static constexpr int kSmallestIndexed = 64;
+    // An index pays when it saves about this many walks a key.
+    static constexpr int kWalksPerIndex = 8;
+
     const Node* FindNode(const K& key) const {
+        if (count_ >= kSmallestIndexed && HasIndex()) {
+            const auto place = index_->find(cow_MapIndexKey(key));
+            return place == index_->end() ? nullptr : place->second;
+        }
         const Node* node = root_.Referent();
         for (int depth = 0; node != nullptr && !(node->key == key); ++depth) {
             node = (cow_MapGoesRight(key, depth) ? node->right : node->left).Referent();
+        }
+        return node;
+    }
+
+    bool HasIndex() const {
+        if (index_ != nullptr) return true;
+        if (++walks_ < count_ / kWalksPerIndex) return false;
+        index_ = std::make_unique<Index>();
+        std::vector<Node*> open{root_.Referent()};
+        while (!open.empty()) {
+            Node* node = open.back();
+            open.pop_back();
+            index_->emplace(cow_MapIndexKey(node->key), node);
+            if (!node->right.IsNull()) open.push_back(node->right.Referent());
+            if (!node->left.IsNull()) open.push_back(node->left.Referent());
+        }
+        return true;
+    }
+
+    void DropIndex() const {
+        index_.reset();
+        walks_ = 0;
+    }
+
+    // The key's node as this map's own, or null for an absent key. Its path is made private only where
+    // another map may share it.
+    Node* PrivateNode(const K& key) {
+        const Node* node = FindNode(key);
+        if (node == nullptr) return nullptr;
+        return shared_ ? PrivatePlace(key)->Referent() : const_cast<Node*>(node);
+    }
+
+    Node* Hang(const K& key, const V& value) {
+        Handle* place = PrivatePlace(key);
+        place->Reset(new Node(key, value));
+        ++count_;
+        Node* node = place->Referent();
+        try {
+            if (index_ != nullptr) index_->emplace(cow_MapIndexKey(node->key), node);
+        } catch (...) {
+            // The tree is whole; an index that misses a key is worse than none.
+            DropIndex();
         }
         return node;
     }
@@ -163,6 +231,8 @@ private:
     Handle* PrivatePlace(const K& key) {
         Handle* place = &root_;
         for (int depth = 0; !place->IsNull(); ++depth) {
+            // The index knows the node that a copy takes the place of.
+            if (place->HolderCount() > 1) DropIndex();
             Node& node = place->Get();
             if (node.key == key) break;
             place = cow_MapGoesRight(key, depth) ? &node.right : &node.left;
@@ -172,6 +242,10 @@ private:
 
     Handle root_;
     int count_ = 0;
+    // Whether another map may share nodes. Never becomes false again.
+    mutable bool shared_ = false;
+    mutable int walks_ = 0;
+    mutable std::unique_ptr<Index> index_;
 };
 
 /// A snapshot of a map's walk in pre-order. The map must not be changed while it is in use.

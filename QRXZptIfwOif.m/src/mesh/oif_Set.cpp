@@ -165,12 +165,6 @@ void oif_Set::WriteData(utl_Stream& stream) const {
     }
 }
 
-void oif_SetKeyword::CreateLabels() {
-    setName_ = setData_->Name();
-    const oif_Set set = instance_ ? oif_Set(*setData_, *instance_) : oif_Set(*setData_, *assembly_);
-    labels_ = set.Labels();
-}
-
 void oif_SetKeyword::WriteMembers(utl_Stream& stream) const {
     for (int i = 0; i < members_.Length(); ++i) stream << qkw_QuorixName(members_[i], false) << ", " << endl;
 }
@@ -186,17 +180,17 @@ void oif_Nset::Write(utl_Stream& stream) const {
     }
     oif_Set set(labels_);
     if (!instanceName_.IsEmpty()) stream << ", instance=" << qkw_QuorixName(instanceName_, false);
-    if (setData_ && setData_->Internal()) stream << ", internal";
+    if (internal_) stream << ", internal";
     if (set.CanGenerate()) stream << ", generate";
     stream << endl;
     set.WriteData(stream);
 }
 
-oif_Elset::oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal)
-    : internal_(internal) {
+oif_Elset::oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal) {
     labels_ = labels;
     setName_ = name;
     instanceName_ = instanceName;
+    internal_ = internal;
 }
 
 void oif_Elset::Write(utl_Stream& stream) const {

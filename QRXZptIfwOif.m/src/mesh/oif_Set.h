@@ -4,8 +4,6 @@
 #include "keyword_layer/qkw_Keyword.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 
-#include <optional>
-
 /// The labels of a set in one mesh, and for facets the face names, as data lines:
 ///     1,3,17          16 labels a line, no blanks, no comma at the end
 ///     2, 20, 2        start, end and increment, with generate
@@ -37,34 +35,23 @@ private:
     int increment_ = 0;
 };
 
-/// What node and element sets have in common: the set data and where it is seen from.
+/// What node and element sets have in common.
 class oif_SetKeyword {
 protected:
     oif_SetKeyword() = default;
     oif_SetKeyword(const cow_String& name, const cow_List<cow_String>& members)
         : setName_(name), members_(members) {}
-    oif_SetKeyword(const rgnC_SetData& setData, const ddb_Assembly& assembly)
-        : setData_(setData), assembly_(assembly) {
-        CreateLabels();
-    }
-    oif_SetKeyword(const rgnC_SetData& setData, const ddb_PartInstance& instance,
-                   const cow_String& instanceName)
-        : setData_(setData), instance_(instance), instanceName_(instanceName) {
-        CreateLabels();
-    }
+    oif_SetKeyword(const rgnC_SetData& setData, const oif_Set& set, const cow_String& instanceName)
+        : setName_(setData.Name()), instanceName_(instanceName), labels_(set.Labels()),
+          internal_(setData.Internal()) {}
 
     void WriteMembers(utl_Stream& stream) const;
 
-    std::optional<rgnC_SetData> setData_;
-    std::optional<ddb_PartInstance> instance_;
-    std::optional<ddb_Assembly> assembly_;
     cow_String setName_;
     cow_String instanceName_;
     cow_List<int> labels_;
     cow_List<cow_String> members_;
-
-private:
-    void CreateLabels();
+    bool internal_ = false;
 };
 
 /// A node set:
@@ -73,11 +60,12 @@ private:
 class oif_Nset final : public qkw_KeywordOf<oif_Nset>, private oif_SetKeyword {
 public:
     oif_Nset(const cow_String& name, const cow_List<cow_String>& members) : oif_SetKeyword(name, members) {}
-    oif_Nset(const rgnC_SetData& setData, const ddb_Assembly& assembly) : oif_SetKeyword(setData, assembly) {}
+    oif_Nset(const rgnC_SetData& setData, const ddb_Assembly& assembly)
+        : oif_SetKeyword(setData, oif_Set(setData, assembly), cow_String()) {}
     oif_Nset(const rgnC_SetData& setData, const ddb_PartInstance& instance)
-        : oif_SetKeyword(setData, instance, cow_String()) {}
+        : oif_Nset(setData, instance, cow_String()) {}
     oif_Nset(const rgnC_SetData& setData, const ddb_PartInstance& instance, const cow_String& instanceName)
-        : oif_SetKeyword(setData, instance, instanceName) {}
+        : oif_SetKeyword(setData, oif_Set(setData, instance), instanceName) {}
     void Write(utl_Stream& stream) const override;
 };
 
@@ -85,18 +73,16 @@ public:
 class oif_Elset final : public qkw_KeywordOf<oif_Elset>, private oif_SetKeyword {
 public:
     oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal);
-    oif_Elset(const cow_String& name, const cow_List<cow_String>& members)
-        : oif_SetKeyword(name, members), internal_(true) {}
+    oif_Elset(const cow_String& name, const cow_List<cow_String>& members) : oif_SetKeyword(name, members) {
+        internal_ = true;
+    }
     oif_Elset(const rgnC_SetData& setData, const ddb_Assembly& assembly)
-        : oif_SetKeyword(setData, assembly), internal_(setData.Internal()) {}
+        : oif_SetKeyword(setData, oif_Set(setData, assembly), cow_String()) {}
     oif_Elset(const rgnC_SetData& setData, const ddb_PartInstance& instance)
-        : oif_SetKeyword(setData, instance, cow_String()), internal_(setData.Internal()) {}
+        : oif_Elset(setData, instance, cow_String()) {}
     oif_Elset(const rgnC_SetData& setData, const ddb_PartInstance& instance, const cow_String& instanceName)
-        : oif_SetKeyword(setData, instance, instanceName), internal_(setData.Internal()) {}
+        : oif_SetKeyword(setData, oif_Set(setData, instance), instanceName) {}
     void Write(utl_Stream& stream) const override;
-
-private:
-    bool internal_;
 };
 
 #endif

@@ -1,0 +1,197 @@
+// Times and peak memory of whole tasks, each in a process of its own:
+//     bench_model [TASK ...]
+// Tasks: load, rss, instances, surface; all of them without an argument.
+#include "deck/oif_Writer.h"
+#include "model_file/mdf_ModelFile.h"
+
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <cstdio>
+#include <fstream>
+#include <functional>
+#include <numeric>
+#include <random>
+
+namespace {
+
+struct Measure {
+    double seconds = 0.0;
+    double peakMiB = 0.0;
+};
+
+/// Runs the task in a child; `prepare` there first, untimed.
+Measure InChild(const std::function<std::function<void()>()>& prepare) {
+    int pipe_[2];
+    if (pipe(pipe_) != 0) std::exit(1);
+    if (fork() == 0) {
+        const std::function<void()> task = prepare();
+        const auto start = std::chrono::steady_clock::now();
+        task();
+        Measure measure;
+        measure.seconds = std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+        rusage usage{};
+        getrusage(RUSAGE_SELF, &usage);
+        measure.peakMiB = static_cast<double>(usage.ru_maxrss) / 1024.0;
+        if (write(pipe_[1], &measure, sizeof measure) != sizeof measure) _exit(1);
+        _exit(0);
+    }
+    Measure measure;
+    const auto got = read(pipe_[0], &measure, sizeof measure);
+    wait(nullptr);
+    close(pipe_[0]);
+    close(pipe_[1]);
+    if (got != sizeof measure) std::exit(1);
+    return measure;
+}
+
+std::vector<float> Coordinates(int nodes) {
+    std::mt19937 random(1);
+    std::uniform_real_distribution<float> side(-500.0F, 500.0F);
+    std::vector<float> xyz(3 * static_cast<std::size_t>(nodes));
+    for (std::size_t i = 0; i < xyz.size(); ++i) xyz[i] = i % 30 == 29 ? 0.0F : side(random);
+    return xyz;
+}
+
+std::vector<int> Labels(int count) {
+    std::vector<int> labels(static_cast<std::size_t>(count));
+    std::iota(labels.begin(), labels.end(), 1);
+    return labels;
+}
+
+/// A part with nodes, and hexahedra on runs of eight of them.
+void FillPart(odiK_Part& part, int nodes, int elements) {
+    part.mesh.Reset(new odiK_Mesh());
+    part.mesh->SetNodes(Labels(nodes), Coordinates(nodes));
+    std::vector<int> corners;
+    corners.reserve(8 * static_cast<std::size_t>(elements));
+    for (int e = 0; e < elements; ++e) {
+        for (int k = 0; k < 8; ++k) corners.push_back((e * 7 + k * 13) % nodes + 1);
+    }
+    part.mesh->AddElements("C3D8", Labels(elements), 8, std::move(corners));
+}
+
+std::shared_ptr<odb_Odb> MeshStore(int count) {
+    auto odb = std::make_shared<odb_Odb>();
+    odiK_Model& model = odb->AddModel(odb_Odb::DefaultModelName());
+    FillPart(model.AddPart("P"), count, count);
+    model.AddInstance("I", "P");
+    model.Complete();
+    return odb;
+}
+
+std::function<void()> WriteTask(const std::shared_ptr<odb_Odb>& odb) {
+    return [odb] { oif_Writer(*odb).WriteInputFile("bench_model"); };
+}
+
+void MeasureLoad() {
+    const char* const path = "bench_model.json";
+    {
+        std::ofstream out(path);
+        mdf_WriteModelFile(*MeshStore(1000000), out);
+    }
+    std::ifstream in(path, std::ios::ate | std::ios::binary);
+    const double megabytes = static_cast<double>(in.tellg()) / 1e6;
+    const Measure load = InChild([&] {
+        return [&] {
+            mdf_Report report;
+            if (mdf_ReadModelFile(path, report) == nullptr) std::exit(1);
+        };
+    });
+    std::printf(
+        "load: %.0f MB in %.2f s, %.0f MB/s (at least 40); peak %.0f MiB, %.2f times the file (at most 4)\n",
+        megabytes, load.seconds, megabytes / load.seconds, load.peakMiB, load.peakMiB * 1.048576 / megabytes);
+    std::remove(path);
+}
+
+void MeasureRss() {
+    for (const int count : {1000000, 4000000}) {
+        const Measure store = InChild([&] {
+            const auto odb = MeshStore(count);
+            return [odb] {};
+        });
+        // The store is copied into the child untouched, so its own peak is in both.
+        const Measure write = InChild([&] { return WriteTask(MeshStore(count)); });
+        std::printf("mesh of %d nodes and elements: store %.0f MiB, with writing %.0f MiB, more by %.1f MiB "
+                    "(at most 16); %.2f s\n",
+                    count, store.peakMiB, write.peakMiB, write.peakMiB - store.peakMiB, write.seconds);
+    }
+}
+
+Measure WriteInstances(int instances) {
+    return InChild([&] {
+        auto odb = std::make_shared<odb_Odb>();
+        odiK_Model& model = odb->AddModel(odb_Odb::DefaultModelName());
+        odiK_Part& part = model.AddPart("P");
+        FillPart(part, 100, 50);
+        for (int s = 0; s < 200; ++s) {
+            part.mesh->AddNodeSet(cow_String("SET-") + cow_String(s),
+                                  {s % 100 + 1, (s * 7) % 100 + 1, (s * 3) % 100 + 1});
+        }
+        for (int i = 0; i < instances; ++i) model.AddInstance(cow_String("I-") + cow_String(i), "P");
+        model.Complete();
+        return WriteTask(odb);
+    });
+}
+
+void MeasureInstances() {
+    const Measure hundred = WriteInstances(100);
+    const Measure thousand = WriteInstances(1000);
+    const Measure many = WriteInstances(10000);
+    std::printf(
+        "instances with 200 sets each: 100 in %.3f s, 1,000 in %.3f s, 10,000 in %.3f s; ratios %.1f and "
+        "%.1f (at most 12)\n",
+        hundred.seconds, thousand.seconds, many.seconds, thousand.seconds / hundred.seconds,
+        many.seconds / thousand.seconds);
+}
+
+void MeasureSurface() {
+    constexpr int facets = 1000000;
+    const auto withSet = [&](const std::function<void(odiK_Mesh&)>& add) {
+        return InChild([&] {
+            auto odb = std::make_shared<odb_Odb>();
+            odiK_Model& model = odb->AddModel(odb_Odb::DefaultModelName());
+            odiK_Part& part = model.AddPart("P");
+            part.mesh.Reset(new odiK_Mesh());
+            part.mesh->SetNodes({1, 2, 3, 4, 5, 6, 7, 8}, std::vector<float>(24));
+            std::vector<int> corners;
+            for (int e = 0; e < 2 * facets; ++e) corners.insert(corners.end(), {1, 2, 3, 4, 5, 6, 7, 8});
+            // SURF keeps the elements themselves out of the deck.
+            part.mesh->AddElements("C3D8SURF", Labels(2 * facets), 8, std::move(corners));
+            add(*part.mesh);
+            model.AddInstance("I", "P");
+            model.Complete();
+            return WriteTask(odb);
+        });
+    };
+    std::mt19937 random(3);
+    std::vector<int> labels;
+    std::vector<odiK_FacetInput> faces;
+    for (int i = 0; i < facets; ++i) {
+        labels.push_back(2 * i + 1 + static_cast<int>(random() % 2));
+        faces.push_back({labels.back(), static_cast<int>(random() % 6), {}});
+    }
+    const Measure set = withSet([&](odiK_Mesh& mesh) { mesh.AddElementSet("S", labels); });
+    const Measure surface = withSet([&](odiK_Mesh& mesh) { mesh.AddSurface("S", faces); });
+    std::printf("surface of 1,000,000 facets on six faces: %.3f s; irregular set of as many labels: %.3f s; "
+                "ratio %.2f "
+                "(at most 4)\n",
+                surface.seconds, set.seconds, surface.seconds / set.seconds);
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    const std::pair<const char*, void (*)()> tasks[] = {{"load", MeasureLoad},
+                                                        {"rss", MeasureRss},
+                                                        {"instances", MeasureInstances},
+                                                        {"surface", MeasureSurface}};
+    for (const auto& [name, task] : tasks) {
+        bool wanted = argc == 1;
+        for (int i = 1; i < argc; ++i) wanted = wanted || std::string(argv[i]) == name;
+        if (wanted) task();
+    }
+    std::remove("bench_model.inp");
+}
