@@ -1,0 +1,219 @@
+#include "deck/QRXZptInputFileWriter.h"
+#include "deck/oif_Builder.h"
+#include "deck/oif_Comment.h"
+#include "deck/oif_Writer.h"
+#include "support/DeckTest.h"
+
+#include <cstdio>
+
+namespace {
+
+/// Files keywords in all sections.
+class Filer final : public oif_ComponentOf<Filer> {
+public:
+    using oif_ComponentOf::oif_ComponentOf;
+    void Build() override {
+        AddModelDefinition(oif_RawKeyword("model"));
+        AddAssemblyDefinition(oif_RawKeyword("assembly"));
+        AddPartDefinition("P", oif_RawKeyword("part"));
+        AddInstanceDefinition("I", oif_RawKeyword("instance"));
+        AddStepDefinition("S", oif_RawKeyword("body"));
+        AddStepDefinition("S", oif_RawKeyword("case"), "A");
+        AddAtomOptionDefinition(oif_RawKeyword("atom"));
+        AddSingleTermDefinition(oif_RawKeyword("single"));
+        AddCombinedTermDefinition(oif_RawKeyword("combined"));
+        AddDesignAreaDefinition(oif_RawKeyword("area"));
+    }
+};
+
+std::string TextOf(const qkw_KeywordList& keywords) {
+    std::string text;
+    for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
+    return text;
+}
+
+std::string WrittenDeck(TestStore& store) {
+    const std::string job = ::testing::TempDir() + "builder_test";
+    oif_Writer(store.odb).WriteInputFile(job.c_str());
+    EXPECT_TRUE(qio_LastReport().opened);
+    EXPECT_EQ(qio_LastReport().error, 0);
+    std::string text = FileText(job + ".inp");
+    EXPECT_EQ(qio_LastReport().bytes, static_cast<long long>(text.size()));
+    std::remove((job + ".inp").c_str());
+    return text;
+}
+
+} // namespace
+
+TEST(BuilderComponent, Keywords_AreFiledBySection) {
+    TestStore store;
+    Filer filer(store.Info());
+    filer.Build();
+    EXPECT_EQ(TextOf(filer.ModelDefinition()), "model\n");
+    EXPECT_EQ(TextOf(filer.AssemblyDefinition()), "assembly\n");
+    EXPECT_EQ(TextOf(filer.PartDefinition("P")), "part\n");
+    EXPECT_EQ(TextOf(filer.InstanceDefinition("I")), "instance\n");
+    EXPECT_EQ(TextOf(filer.StepDefinition("S")), "body\n");
+    EXPECT_EQ(TextOf(filer.StepDefinition("S", "")), "body\n");
+    EXPECT_EQ(TextOf(filer.StepDefinition("S", "A")), "case\n");
+    EXPECT_EQ(TextOf(filer.AtomOptionDefinition()), "atom\n");
+    EXPECT_EQ(TextOf(filer.SingleTermDefinition()), "single\n");
+    EXPECT_EQ(TextOf(filer.CombinedTermDefinition()), "combined\n");
+    EXPECT_EQ(TextOf(filer.DesignAreaDefinition()), "area\n");
+}
+
+TEST(BuilderComponent, UnknownKeys_GiveEmptyListsAndMakeNoEntry) {
+    TestStore store;
+    Filer filer(store.Info());
+    filer.Build();
+    EXPECT_TRUE(filer.PartDefinition("Q").IsEmpty());
+    EXPECT_TRUE(filer.PartDefinition("Q").IsEmpty());
+    EXPECT_TRUE(filer.InstanceDefinition("Q").IsEmpty());
+    EXPECT_TRUE(filer.StepDefinition("Q").IsEmpty());
+    EXPECT_TRUE(filer.StepDefinition("S", "Q").IsEmpty());
+}
+
+TEST(BuilderComponent, Copy_SharesListsUntilOneIsWritten) {
+    TestStore store;
+    Filer filer(store.Info());
+    filer.Build();
+    const std::unique_ptr<qkw_BuilderComponent> copy(filer.Copy());
+    filer.Build();
+    EXPECT_EQ(TextOf(copy->ModelDefinition()), "model\n");
+    EXPECT_EQ(TextOf(filer.ModelDefinition()), "model\nmodel\n");
+    EXPECT_EQ(TextOf(copy->StepDefinition("S", "A")), "case\n");
+}
+
+TEST(Builder, ModelWithoutParts_HasBothBanners) {
+    TestStore store;
+    EXPECT_EQ(WrittenDeck(store), "**\n** PARTS\n**\n"
+                                  "**\n** ASSEMBLY\n**\n"
+                                  "*Assembly, name=Assembly\n"
+                                  "*End Assembly\n");
+}
+
+TEST(Builder, OpeningTextWithoutLineEnd_RunsIntoTheBannerOnPurpose) {
+    TestStore store;
+    store.model.topLevelSolverInput = "*Heading";
+    EXPECT_EQ(WrittenDeck(store).substr(0, 20), "*Heading**\n** PARTS\n");
+}
+
+TEST(Builder, StepsWithAndWithoutLoadCases_CloseInTheRightPlace) {
+    KnowTestSteps();
+    TestStore store;
+    kprC_InitialStep initial;
+    initial.solverInput = "initial text";
+    // Load cases of the initial step can't be; it has none.
+    store.model.steps.Append("Initial", initial);
+    TestGeneralStep plain;
+    plain.solverInput = "plain text\n";
+    store.model.steps.Append("Plain", plain);
+    TestPerturbationStep cases;
+    cases.solverInput = "body text";
+    cases.loadCases.Insert("B", klcC_LoadCase());
+    cases.loadCases.Insert("A", klcC_LoadCase());
+    store.model.steps.Append("Cases", cases);
+    EXPECT_EQ(WrittenDeck(store), "**\n** PARTS\n**\n"
+                                  "**\n** ASSEMBLY\n**\n"
+                                  "*Assembly, name=Assembly\n"
+                                  "*End Assembly\n"
+                                  "initial text\n"
+                                  "plain text\n"
+                                  "*End Step\n"
+                                  "body text\n"
+                                  "*End Load Case\n"
+                                  "*End Load Case\n"
+                                  "*End Step\n");
+}
+
+TEST(Builder, TwoInstancesOfOnePart_CloseThePartOnce) {
+    TestStore store;
+    store.AddPart("P", {}).solverInput = "part text";
+    store.model.AddInstance("I2", "P").solverInput = "two";
+    store.model.AddInstance("I1", "P").solverInput = "one\n";
+    store.model.assemblyName = "the assembly";
+    store.model.assemblySolverInput = "assembly text";
+    store.model.solverInput = "model text";
+    EXPECT_EQ(WrittenDeck(store), "**\n** PARTS\n**\n"
+                                  "*Part, name=P\n"
+                                  "part text\n"
+                                  "*End Part\n"
+                                  "**\n** ASSEMBLY\n**\n"
+                                  "*Assembly, name=the assembly\n"
+                                  "*Instance, name=I1, part=P\n"
+                                  "one\n"
+                                  "*End Instance\n"
+                                  "*Instance, name=I2, part=P\n"
+                                  "two\n"
+                                  "*End Instance\n"
+                                  "assembly text\n"
+                                  "*End Assembly\n"
+                                  "model text\n");
+}
+
+TEST(Builder, PathThatCannotBeOpened_GivesFalseAndNoException) {
+    TestStore store;
+    oif_Builder builder(store.Info());
+    EXPECT_FALSE(builder.WriteInputFile(::testing::TempDir() + "no/such/folder/deck.inp"));
+    EXPECT_FALSE(qio_LastReport().opened);
+    EXPECT_NE(qio_LastReport().error, 0);
+}
+
+TEST(Writer, JobNameWithExtension_KeepsItAndGetsAnother) {
+    TestStore store;
+    const std::string job = ::testing::TempDir() + "job.v2.inp";
+    oif_Writer(store.odb).WriteInputFile(job.c_str());
+    EXPECT_FALSE(FileText(job + ".inp").empty());
+    std::remove((job + ".inp").c_str());
+}
+
+TEST(Writer, OldDeck_IsReplacedWhole) {
+    TestStore store;
+    const std::string job = ::testing::TempDir() + "old";
+    std::ofstream(job + ".inp") << std::string(100000, 'x');
+    oif_Writer(store.odb).WriteInputFile(job.c_str());
+    EXPECT_EQ(FileText(job + ".inp").find('x'), std::string::npos);
+    std::remove((job + ".inp").c_str());
+}
+
+TEST(Writer, StoreWithoutDefaultModel_Raises) {
+    odb_Odb odb;
+    odb.AddModel("Other");
+    EXPECT_EQ(Raised([&] { oif_Writer(odb).WriteInputFile("unused"); }),
+              "ddb_Ddb: no entry named 'Default Model'");
+}
+
+TEST(Writer, Twice_WritesTheSame) {
+    TestStore store;
+    store.AddPart("P", {1, 2});
+    store.model.AddInstance("I", "P");
+    EXPECT_EQ(WrittenDeck(store), WrittenDeck(store));
+}
+
+TEST(Module, StartAndStop_CountEachModuleOnce) {
+    int count = 0;
+    QRXZptInputFileWriter_initialize(count);
+    // Twelve libraries, two layers and the writer itself.
+    EXPECT_EQ(count, 15);
+    QRXZptInputFileWriter_initialize(count);
+    EXPECT_EQ(count, 15);
+    QRXZptInputFileWriter_finalize(count);
+    EXPECT_EQ(count, 15);
+    QRXZptInputFileWriter_finalize(count);
+    EXPECT_EQ(count, 0);
+    QRXZptInputFileWriter_finalize(count);
+    EXPECT_EQ(count, 0);
+}
+
+TEST(Module, LayerInUseByAnother_StaysUp) {
+    int layer = 0;
+    QRXZptIfwOif_initialize(layer);
+    EXPECT_EQ(layer, 1);
+    int count = 0;
+    QRXZptInputFileWriter_initialize(count);
+    EXPECT_EQ(count, 14);
+    QRXZptInputFileWriter_finalize(count);
+    EXPECT_EQ(count, 0);
+    QRXZptIfwOif_finalize(layer);
+    EXPECT_EQ(layer, 0);
+}
