@@ -34,7 +34,8 @@ struct mdf_Report {
 /// Reads a model file, or its text, into a store. Null when there are errors; warnings alone don't hinder.
 /// The store's models are complete: every name is resolved and every status is known.
 std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report);
-std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName, mdf_Report& report);
+std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
+                                           mdf_Report& report);
 
 /// Writes all models of a store as a model file; fields that have their default are left out. False when the
 /// stream failed.

@@ -220,10 +220,10 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
             const odiK_ElementClass& elements = classes_[static_cast<std::size_t>(member.classIndex)];
             member.facet = facet.face.empty() ? facet.id : odiK_FacetOfFace(elements.shape, facet.face);
             if (member.facet < 0 || !odiK_FacetFits(elements.shape, member.facet)) {
-                problems.Error(
-                    place + Place("facets", i) + "/1",
-                    "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)) +
-                        ", expected a face of an element of type " + std::string(elements.type.View()));
+                problems.Error(place + Place("facets", i) + "/1",
+                               "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)) +
+                                   ", expected a face of an element of type " +
+                                   std::string(elements.type.View()));
                 continue;
             }
         }

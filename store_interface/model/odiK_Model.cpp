@@ -241,4 +241,5 @@ void odiK_Model::Complete() {
     fieldOutputRequests.Propagate(steps);
     historyOutputRequests.Propagate(steps);
     adaptiveMeshConstraints.Propagate(steps);
+    SetComplete();
 }

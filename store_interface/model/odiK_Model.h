@@ -110,8 +110,8 @@ struct odiK_MemberInput {
 
 /// A model in memory: the object behind all views, and the interface through which a program fills a store.
 /// Parts first, then instances, then sets, regions and records; the first region or set of the assembly
-/// seals the instances. Complete() works out what follows from all that; odb_Odb calls it before the model is
-/// read. A model must not change while it is being written.
+/// seals the instances. Complete() works out what follows from all that; the store calls it when the model is
+/// first read. A model must not change while it is being written.
 class odiK_Model {
 public:
     explicit odiK_Model(const cow_String& name) : name_(name) {}
@@ -202,10 +202,14 @@ public:
     rgnC_Region Region(const cow_String& instanceName, const cow_String& setName);
 
     /// Works out what follows: attributes of the instances on their own sets, statuses and states in all
-    /// steps. Raises when something can't be.
+    /// steps. Raises when something can't be. Must be called again after a change of a model that has been
+    /// read.
     void Complete();
     /// The same but for what lives across steps.
     void CompleteTree(odiK_Problems& problems);
+    /// Tells that all of it has been worked out.
+    void SetComplete() { complete_ = true; }
+    bool IsComplete() const { return complete_; }
 
 private:
     template <class Entry>
@@ -218,6 +222,7 @@ private:
     std::map<cow_String, cow_CountedHld<odiK_Instance>> instances_;
     std::vector<cow_CountedHld<odiK_Instance>> instanceOfMesh_;
     bool sealed_ = false;
+    bool complete_ = false;
     cow_CountedHld<odiK_Mesh> assemblyMesh_;
     odiK_Assembly assembly_;
     std::vector<cow_CountedHld<odiK_Set>> assemblySets_;

@@ -38,6 +38,8 @@ public:
     /// Whether the first class is the second or derives from it. Unknown numbers derive from nothing.
     bool InheritanceCheck(const unsigned& derived, const unsigned& base) const;
 
+    /// All classes, in the order in which they were entered.
+    const std::vector<cls_ClassEntry>& All() const { return entries_; }
     const cls_ClassEntry* Find(unsigned id) const;
     const cls_ClassEntry* FindByName(std::string_view name) const;
     /// The classes that records of class `base` can be made of, in the order in which they were entered.

@@ -163,6 +163,8 @@ struct cls_Field {
     std::span<const cls_IntMeaning> meanings;
     /// For a list: its only permitted length, or 0.
     int length = 0;
+    /// For a text that the deck takes as it stands: a model file may give it line by line.
+    bool verbatim = false;
     /// Absent or empty is an error of a model file.
     bool required = false;
     /// Filled by the store or a program, never by a model file.
@@ -213,6 +215,10 @@ public:
     }
     cls_Describe& Length(int length) {
         fields_.back().length = length;
+        return *this;
+    }
+    cls_Describe& Verbatim() {
+        fields_.back().verbatim = true;
         return *this;
     }
     cls_Describe& Required() {

@@ -46,6 +46,7 @@ const cls_FieldTable& kprC_Step::Fields() {
             .Field<&kprC_Step::suppressed>("suppressed", "a suppressed step is written like any other")
             .Field<&kprC_Step::solverInput>("solverInput",
                                             "deck text that closes the step's body, as it stands")
+            .Verbatim()
             .Field<&kprC_Step::matrixStorage>("matrixStorage",
                                               "how the solver stores the matrix of the equation system");
     return fields;

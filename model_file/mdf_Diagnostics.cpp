@@ -1,0 +1,148 @@
+#include "model_file/mdf_Diagnostics.h"
+
+#include "model_file/mdf_Parser.h"
+
+#include <algorithm>
+#include <charconv>
+
+namespace {
+
+constexpr int kMaxMessages = 50;
+constexpr std::size_t kLongestName = 80;
+
+char Lower(char c) {
+    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
+
+std::string LowerCase(std::string_view text) {
+    std::string lower(text);
+    std::transform(lower.begin(), lower.end(), lower.begin(), Lower);
+    return lower;
+}
+
+// Number of single-character changes between the texts, capitals not counted.
+std::size_t Distance(std::string_view a, std::string_view b) {
+    std::vector<std::size_t> row(b.size() + 1);
+    for (std::size_t j = 0; j <= b.size(); ++j) row[j] = j;
+    for (std::size_t i = 0; i < a.size(); ++i) {
+        std::size_t diagonal = row[0];
+        row[0] = i + 1;
+        for (std::size_t j = 0; j < b.size(); ++j) {
+            const std::size_t change = diagonal + (Lower(a[i]) == Lower(b[j]) ? 0 : 1);
+            diagonal = row[j + 1];
+            row[j + 1] = std::min({row[j] + 1, row[j + 1] + 1, change});
+        }
+    }
+    return row[b.size()];
+}
+
+} // namespace
+
+std::string mdf_Path::Text() const {
+    if (parent_ == nullptr) return {};
+    std::string text = parent_->Text();
+    if (isIndex_) {
+        mdf_AppendPointer(text, index_);
+    } else {
+        mdf_AppendPointer(text, token_);
+    }
+    return text;
+}
+
+void mdf_Diagnostics::Add(bool isError, const std::string& pointer, const std::string& text) {
+    int& count = isError ? numErrors_ : numWarnings_;
+    if (count++ >= kMaxMessages) return;
+    report_->messages.push_back({isError, pointer, 0, 0, text});
+}
+
+void mdf_Diagnostics::Expected(const mdf_Path& path, const mdf_Value& found, const std::string& expected) {
+    Error(path, "found " + mdf_Shown(found) + ", expected " + expected);
+}
+
+std::string mdf_Quoted(std::string_view text) {
+    std::string quoted("'");
+    return quoted.append(text).append("'");
+}
+
+std::string mdf_Shown(const mdf_Value& value) {
+    constexpr std::size_t longest = 60;
+    if (value.IsNull()) return "null";
+    if (value.IsBool()) return value.Bool() ? "true" : "false";
+    if (value.IsInt()) return std::to_string(value.Int());
+    if (value.IsNumber()) {
+        char text[400];
+        const auto end =
+            value.IsLargeInteger()
+                ? std::to_chars(text, text + sizeof text, value.Real(), std::chars_format::fixed, 0).ptr
+                : std::to_chars(text, text + sizeof text, value.Real()).ptr;
+        std::string shown(text, end);
+        if (!value.IsLargeInteger() && shown.find_first_of(".e") == std::string::npos) shown += ".0";
+        return shown;
+    }
+    if (value.IsString()) {
+        const std::string& text = value.String();
+        return text.size() <= longest ? mdf_Quoted(text) : mdf_Quoted(text.substr(0, longest)) + "...";
+    }
+    if (value.IsObject()) return "an object";
+    return "an array of " + std::to_string(value.Size()) + (value.Size() == 1 ? " item" : " items");
+}
+
+std::string mdf_DidYouMean(std::string_view name, const std::vector<std::string>& known) {
+    constexpr std::size_t longest = 80;
+    if (name.size() > longest) return {};
+    const std::string* nearest = nullptr;
+    std::size_t least = std::max<std::size_t>(1, name.size() / 3) + 1;
+    for (const std::string& candidate : known) {
+        if (candidate.size() > longest) continue;
+        const std::size_t distance = Distance(name, candidate);
+        if (distance < least) {
+            least = distance;
+            nearest = &candidate;
+        }
+    }
+    return nearest == nullptr ? std::string() : "; did you mean " + mdf_Quoted(*nearest) + "?";
+}
+
+std::string mdf_OneOf(const std::vector<std::string>& words) {
+    if (words.size() == 1) return words.front();
+    std::string text("one of ");
+    for (std::size_t i = 0; i < words.size(); ++i) text.append(i == 0 ? "" : ", ").append(words[i]);
+    return text;
+}
+
+std::string mdf_NameProblem(std::string_view name) {
+    if (name.empty()) return "an empty name, expected a name that can stand in a deck";
+    if (name.size() > kLongestName) {
+        return "a name of " + std::to_string(name.size()) + " bytes, expected at most " +
+               std::to_string(kLongestName);
+    }
+    for (const char c : name) {
+        if (c == '"') return "a name with a double quote, expected a name that can stand in a deck";
+        const auto byte = static_cast<unsigned char>(c);
+        if (byte < 0x20 || byte == 0x7f) {
+            return "a name with a control character, expected a name that can stand in a deck";
+        }
+    }
+    return {};
+}
+
+void mdf_CapitalsCheck::Enter(const std::string& name, const mdf_Path& path, const char* kind,
+                              mdf_Diagnostics& diagnostics) {
+    const auto [place, isNew] = byLowerCase_.emplace(LowerCase(name), name);
+    if (isNew || place->second == name) return;
+    diagnostics.Warning(path, std::string("this ") + kind + " and " + mdf_Quoted(place->second) +
+                                  " differ only in capitals, which solvers take for one name");
+}
+
+bool mdf_Report::HasErrors() const {
+    return std::any_of(messages.begin(), messages.end(),
+                       [](const mdf_Message& message) { return message.isError; });
+}
+
+std::string mdf_Report::Line(const mdf_Message& message) const {
+    std::string line = fileName + ":";
+    if (message.line > 0) line += std::to_string(message.line) + ":" + std::to_string(message.column) + ":";
+    line += message.isError ? " error: " : " warning: ";
+    if (!message.pointer.empty()) line += message.pointer + ": ";
+    return line + message.text;
+}

@@ -1,0 +1,529 @@
+#include "model_file/mdf_MeshReader.h"
+
+#include <cmath>
+#include <limits>
+
+namespace {
+
+constexpr std::size_t kNoLimit = std::numeric_limits<int>::max();
+
+std::size_t NumNodes(const cow_CountedHld<odiK_Mesh>& mesh) {
+    return mesh.IsNull() ? 0 : static_cast<std::size_t>(mesh->Nodes().NumNodes());
+}
+
+std::size_t NumElements(const cow_CountedHld<odiK_Mesh>& mesh) {
+    return mesh.IsNull() ? 0 : static_cast<std::size_t>(mesh->NumElements());
+}
+
+} // namespace
+
+/// Hands what the store finds on to the diagnostics, below a path.
+class mdf_MeshReader::Problems : public odiK_Problems {
+public:
+    Problems(mdf_Diagnostics& diagnostics, const mdf_Path& path) : diagnostics_(diagnostics), path_(path) {}
+    void Error(const std::string& place, const std::string& text) override {
+        diagnostics_.Error(path_.Text() + place, text);
+    }
+    void Warning(const std::string& place, const std::string& text) override {
+        diagnostics_.Warning(path_.Text() + place, text);
+    }
+
+private:
+    mdf_Diagnostics& diagnostics_;
+    const mdf_Path& path_;
+};
+
+cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Path& path) {
+    cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an object");
+        return mesh;
+    }
+    records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
+    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(*mesh, *nodes, mdf_Path(path, "nodes"));
+    if (mdf_Value* elements = json.Find("elements"))
+        ReadElements(*mesh, *elements, mdf_Path(path, "elements"), false);
+    Problems problems(diagnostics_, path);
+    mesh->FinishElements(problems);
+    if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, mdf_Path(path, "sets"));
+    return mesh;
+}
+
+void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path) {
+    odiK_Mesh& mesh = model_.AssemblyMesh();
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an object");
+        return;
+    }
+    if (json.Find("sets") != nullptr) {
+        diagnostics_.Error(mdf_Path(path, "sets"),
+                           "found sets, expected them in the member \"sets\" of the assembly");
+    }
+    records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
+    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(mesh, *nodes, mdf_Path(path, "nodes"));
+    if (mdf_Value* elements = json.Find("elements"))
+        ReadElements(mesh, *elements, mdf_Path(path, "elements"), true);
+    Problems problems(diagnostics_, path);
+    mesh.FinishElements(problems);
+    if (mesh.Nodes().NumNodes() > 0) {
+        diagnostics_.Warning(mdf_Path(path, "nodes"), "the assembly's own " +
+                                                          std::to_string(mesh.Nodes().NumNodes()) +
+                                                          " nodes reach no deck");
+    }
+}
+
+void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an object");
+        return;
+    }
+    records_.CheckMembers(json, {"labels", "coordinates"}, path);
+    mdf_Value* coordinates = json.Find("coordinates");
+    mdf_Value* labelsJson = json.Find("labels");
+    if (labelsJson == nullptr || coordinates == nullptr) {
+        diagnostics_.Error(path, "found no labels or no coordinates, expected both");
+        return;
+    }
+    const mdf_Path coordinatesPath(path, "coordinates");
+    if (!coordinates->IsArray()) {
+        diagnostics_.Expected(coordinatesPath, *coordinates, "an array of points [x, y, z]");
+        return;
+    }
+    const std::size_t count = coordinates->Size();
+    std::vector<int> labels;
+    if (!ReadLabels(labels, *labelsJson, mdf_Path(path, "labels"), count)) return;
+
+    std::vector<float> xyz(3 * count);
+    bool good = true;
+    const auto put = [&](std::size_t place, double value) {
+        xyz[place] = static_cast<float>(value);
+        if (!std::isinf(xyz[place])) return;
+        good = false;
+        const mdf_Path row(coordinatesPath, place / 3);
+        diagnostics_.Expected(mdf_Path(row, place % 3), mdf_Value(value), "a coordinate of single precision");
+    };
+    if (coordinates->Kind() == mdf_Kind::Matrix && coordinates->UniformRowLength() == 3) {
+        const mdf_MatrixData rows = coordinates->TakeMatrix();
+        for (std::size_t i = 0; i < 3 * count; ++i) put(i, rows.ints.empty() ? rows.reals[i] : rows.ints[i]);
+    } else {
+        for (std::size_t i = 0; i < count; ++i) {
+            const mdf_Path row(coordinatesPath, i);
+            const mdf_Value point = coordinates->Item(i);
+            if (!point.IsArray() || point.Size() != 3) {
+                diagnostics_.Expected(row, point, "three coordinates");
+                good = false;
+                continue;
+            }
+            for (std::size_t j = 0; j < 3; ++j) {
+                if (point.Item(j).IsNumber()) {
+                    put(3 * i + j, point.Item(j).Real());
+                } else {
+                    diagnostics_.Expected(mdf_Path(row, j), point.Item(j), "a number");
+                    good = false;
+                }
+            }
+        }
+    }
+    if (!good) return;
+    Problems problems(diagnostics_, path);
+    mesh.SetNodes(std::move(labels), std::move(xyz), problems);
+}
+
+bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path,
+                                std::size_t most) {
+    if (json.Kind() == mdf_Kind::IntArray) {
+        labels = json.TakeInts();
+        return true;
+    }
+    if (json.IsArray()) {
+        for (std::size_t i = 0; i < json.Size(); ++i) {
+            const mdf_Value label = json.Item(i);
+            if (!label.IsInt()) diagnostics_.Expected(mdf_Path(path, i), label, "a label");
+        }
+        return false;
+    }
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an array of labels, or {\"from\": ..., \"to\": ..., \"by\": ...}");
+        return false;
+    }
+    records_.CheckMembers(json, {"from", "to", "by"}, path);
+    int range[3] = {0, 0, 1};
+    const char* const names[3] = {"from", "to", "by"};
+    for (int i = 0; i < 3; ++i) {
+        const mdf_Path place(path, std::string_view(names[i]));
+        const mdf_Value* number = json.Find(names[i]);
+        if (number == nullptr && i < 2) {
+            diagnostics_.Error(place, "found nothing, expected a label");
+            return false;
+        }
+        if (number == nullptr) continue;
+        if (!number->IsInt() || number->Int() <= 0) {
+            diagnostics_.Expected(place, *number, "a positive integer");
+            return false;
+        }
+        range[i] = number->Int();
+    }
+    if (range[0] > range[1]) {
+        diagnostics_.Error(path, "found a range from " + std::to_string(range[0]) + " to " +
+                                     std::to_string(range[1]) + ", expected from not above to");
+        return false;
+    }
+    const std::size_t count = static_cast<std::size_t>((range[1] - range[0]) / range[2]) + 1;
+    if (count > most) {
+        diagnostics_.Error(path, "found a range of " + std::to_string(count) + " labels, expected at most " +
+                                     std::to_string(most));
+        return false;
+    }
+    labels.reserve(count);
+    for (long long label = range[0]; label <= range[1]; label += range[2])
+        labels.push_back(static_cast<int>(label));
+    return true;
+}
+
+void mdf_MeshReader::ReadElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly) {
+    if (!json.IsArray()) {
+        diagnostics_.Expected(path, json, "an array of element classes");
+        return;
+    }
+    if (json.Kind() != mdf_Kind::Array) {
+        if (!json.Empty()) diagnostics_.Expected(mdf_Path(path, std::size_t{0}), json.Item(0), "an object");
+        return;
+    }
+    for (std::size_t i = 0; i < json.Size(); ++i) {
+        ReadElementClass(mesh, json.Items()[i], mdf_Path(path, i), inAssembly);
+    }
+}
+
+void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path,
+                                      bool inAssembly) {
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an object");
+        return;
+    }
+    records_.CheckMembers(json, {"type", "labels", "connectivity", "controls"}, path);
+    const mdf_Value* type = json.Find("type");
+    mdf_Value* labelsJson = json.Find("labels");
+    mdf_Value* connectivity = json.Find("connectivity");
+    if (type == nullptr || labelsJson == nullptr || connectivity == nullptr) {
+        diagnostics_.Error(path,
+                           "found an element class without type, labels or connectivity, expected all three");
+        return;
+    }
+    if (!type->IsString()) {
+        diagnostics_.Expected(mdf_Path(path, "type"), *type, "the label of an element type");
+        return;
+    }
+    const std::string problem = mdf_NameProblem(type->String());
+    if (!problem.empty()) {
+        diagnostics_.Error(mdf_Path(path, "type"), "found " + problem);
+        return;
+    }
+    if (ddb_ShapeOfLabel(type->String()).unknown) {
+        diagnostics_.Warning(mdf_Path(path, "type"), mdf_Quoted(type->String()) +
+                                                         " is no known element type; it is "
+                                                         "taken for a point element");
+    }
+    bme_ElemCtrlParams controls;
+    if (const mdf_Value* given = json.Find("controls")) {
+        records_.ReadRecord(controls, *given, mdf_Path(path, "controls"));
+    }
+    const mdf_Path connectivityPath(path, "connectivity");
+    if (!connectivity->IsArray()) {
+        diagnostics_.Expected(connectivityPath, *connectivity, "an array of rows of node labels");
+        return;
+    }
+    const std::size_t count = connectivity->Size();
+    std::vector<int> labels;
+    if (!ReadLabels(labels, *labelsJson, mdf_Path(path, "labels"), count)) return;
+    int width = 0;
+    std::vector<int> nodes;
+    Problems problems(diagnostics_, path);
+    if (inAssembly) {
+        if (!ReadScopedConnectivity(mesh, *connectivity, connectivityPath, count, width, nodes)) return;
+        mesh.AddElementsByIndex(cow_String(type->String()), std::move(labels), width, std::move(nodes),
+                                controls, problems);
+    } else {
+        if (!ReadConnectivity(*connectivity, connectivityPath, count, width, nodes)) return;
+        mesh.AddElements(cow_String(type->String()), std::move(labels), width, std::move(nodes), controls,
+                         problems);
+    }
+}
+
+bool mdf_MeshReader::ReadConnectivity(mdf_Value& json, const mdf_Path& path, std::size_t numElements,
+                                      int& width, std::vector<int>& nodes) {
+    if (json.Kind() == mdf_Kind::Matrix && json.UniformRowLength() > 0 && json.AllInts()) {
+        mdf_MatrixData rows = json.TakeMatrix();
+        width = rows.rowLength;
+        nodes = std::move(rows.ints);
+        return true;
+    }
+    bool good = true;
+    for (std::size_t i = 0; i < numElements; ++i) {
+        const mdf_Path rowPath(path, i);
+        const mdf_Value row = json.Item(i);
+        if (i == 0 && row.IsArray()) width = static_cast<int>(row.Size());
+        if (!row.IsArray() || row.Empty() || row.Size() != static_cast<std::size_t>(width)) {
+            diagnostics_.Expected(rowPath, row,
+                                  width > 0
+                                      ? "a row of " + std::to_string(width) + " node labels, as the first one"
+                                      : "a row of node labels");
+            good = false;
+            continue;
+        }
+        for (std::size_t j = 0; j < row.Size(); ++j) {
+            if (row.Item(j).IsInt()) continue;
+            diagnostics_.Expected(mdf_Path(rowPath, j), row.Item(j), "a node label");
+            good = false;
+        }
+    }
+    return good && numElements == 0;
+}
+
+bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path,
+                                            std::size_t numElements, int& width, std::vector<int>& nodes) {
+    bool good = true;
+    for (std::size_t i = 0; i < numElements; ++i) {
+        const mdf_Path rowPath(path, i);
+        const mdf_Value row = json.Item(i);
+        if (i == 0 && row.IsArray()) width = static_cast<int>(row.Size());
+        if (!row.IsArray() || row.Empty() || row.Size() != static_cast<std::size_t>(width)) {
+            diagnostics_.Expected(rowPath, row,
+                                  width > 0 ? "a row of " + std::to_string(width) + " nodes, as the first one"
+                                            : "a row of nodes");
+            good = false;
+            continue;
+        }
+        for (std::size_t j = 0; j < row.Size(); ++j) {
+            const int node = ReadScopedNode(mesh, row.Item(j), mdf_Path(rowPath, j));
+            good = good && node >= 0;
+            nodes.push_back(node);
+        }
+    }
+    return good;
+}
+
+int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path) {
+    if (json.IsInt()) {
+        const int node = mesh.FindNode(json.Int());
+        if (node < 0) diagnostics_.Expected(path, json, "the label of a node of the assembly's own mesh");
+        return node;
+    }
+    // The instance's name runs to the last dot.
+    const std::size_t dot = json.IsString() ? json.String().rfind('.') : std::string::npos;
+    if (dot == std::string::npos) {
+        diagnostics_.Expected(path, json, "a node label, or \"INSTANCE.LABEL\"");
+        return -1;
+    }
+    const std::string name = json.String().substr(0, dot);
+    const std::string digits = json.String().substr(dot + 1);
+    const odiK_Instance* instance = model_.FindInstance(cow_String(name));
+    if (instance == nullptr || !instance->isPartInstance) {
+        std::vector<std::string> names;
+        for (const auto& [known, entry] : model_.Instances()) names.emplace_back(known.View());
+        diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
+                                     mdf_DidYouMean(name, names));
+        return -1;
+    }
+    const bool isNumber =
+        !digits.empty() && digits.size() <= 10 && digits.find_first_not_of("0123456789") == std::string::npos;
+    const long long label = isNumber ? std::stoll(digits) : 0;
+    const auto nodes = instance->Mesh();
+    if (label < 1 || label > std::numeric_limits<int>::max() || nodes.IsNull() ||
+        nodes->FindNode(static_cast<int>(label)) < 0) {
+        diagnostics_.Error(path, "found node " + mdf_Quoted(digits) +
+                                     ", expected the label of a node of instance " + mdf_Quoted(name));
+        return -1;
+    }
+    return mesh.AddForeignNode(instance->name, static_cast<int>(label));
+}
+
+bool mdf_MeshReader::ReadSetHead(SetHead& head, const mdf_Value& json, const mdf_Path& path,
+                                 mdf_CapitalsCheck& capitals) {
+    const mdf_Value* name = json.Find("name");
+    const mdf_Value* kind = json.Find("kind");
+    const mdf_Value* internal = json.Find("internal");
+    const mdf_Path namePath(path, "name");
+    if (name == nullptr || !name->IsString()) {
+        diagnostics_.Error(namePath, "found " +
+                                         (name == nullptr ? std::string("nothing") : mdf_Shown(*name)) +
+                                         ", expected the name of the set");
+        return false;
+    }
+    const std::string problem = mdf_NameProblem(name->String());
+    if (!problem.empty()) {
+        diagnostics_.Error(namePath, "found " + problem);
+        return false;
+    }
+    head.name = cow_String(name->String());
+    capitals.Enter(name->String(), namePath, "set", diagnostics_);
+    const char* const kinds[] = {"node", "element", "surface"};
+    int type = -1;
+    for (int i = 0; i < 3; ++i) {
+        if (kind != nullptr && kind->IsString() && kind->String() == kinds[i]) type = i;
+    }
+    if (type < 0) {
+        diagnostics_.Error(mdf_Path(path, "kind"),
+                           "found " + (kind == nullptr ? std::string("nothing") : mdf_Shown(*kind)) +
+                               ", expected one of node, element, surface");
+        return false;
+    }
+    head.type = static_cast<res_SetTypeEnm>(type);
+    if (internal != nullptr && !internal->IsBool()) {
+        diagnostics_.Expected(mdf_Path(path, "internal"), *internal, "true or false");
+        return false;
+    }
+    head.internal = internal != nullptr && internal->Bool();
+    return true;
+}
+
+bool mdf_MeshReader::ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
+                                 std::size_t mostLabels) {
+    const bool facets = type == res_SetTypeEnm::FACETS;
+    const char* const member = facets ? "facets" : "labels";
+    mdf_Value* given = json.Find(member);
+    const mdf_Path place(path, std::string_view(member));
+    if (given == nullptr) {
+        diagnostics_.Error(place, std::string("found nothing, expected the ") + member + " of the set");
+        return false;
+    }
+    if (!facets) {
+        if (!ReadLabels(members.labels, *given, place, mostLabels)) return false;
+        members.empty = members.labels.empty();
+        return true;
+    }
+    members.facetText = std::move(*given);
+    if (!ReadFacets(members.facets, members.facetText, place)) return false;
+    members.empty = members.facets.empty();
+    return true;
+}
+
+bool mdf_MeshReader::ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json,
+                                const mdf_Path& path) {
+    if (!json.IsArray()) {
+        diagnostics_.Expected(path, json, "an array of facets [label, face]");
+        return false;
+    }
+    facets.reserve(json.Size());
+    if (json.Kind() == mdf_Kind::FacetArray) {
+        for (std::size_t i = 0; i < json.Size(); ++i) {
+            if (json.FacetHasName(i)) {
+                facets.push_back({json.FacetLabel(i), -1, json.FacetName(i)});
+            } else {
+                facets.push_back({json.FacetLabel(i), json.FacetId(i), {}});
+            }
+        }
+    } else if (json.Kind() == mdf_Kind::Matrix && json.UniformRowLength() == 2 && json.AllInts()) {
+        const std::span<const int> numbers = json.Ints();
+        for (std::size_t i = 0; i < json.Size(); ++i)
+            facets.push_back({numbers[2 * i], numbers[2 * i + 1], {}});
+    } else {
+        for (std::size_t i = 0; i < json.Size(); ++i) {
+            const mdf_Value facet = json.Item(i);
+            const bool good = facet.IsArray() && facet.Size() == 2 && facet.Item(0).IsInt() &&
+                              (facet.Item(1).IsInt() || facet.Item(1).IsString());
+            if (!good) diagnostics_.Expected(mdf_Path(path, i), facet, "a facet [label, face]");
+        }
+        return json.Empty();
+    }
+    for (std::size_t i = 0; i < facets.size(); ++i) {
+        // An empty name would read as a number.
+        if (facets[i].face.data() == nullptr || !facets[i].face.empty()) continue;
+        diagnostics_.Error(mdf_Path(path, i), "found an empty face, expected a face name or a number");
+        return false;
+    }
+    return true;
+}
+
+void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
+    if (!json.IsArray() || (json.Kind() != mdf_Kind::Array && !json.Empty())) {
+        diagnostics_.Expected(path, json, "an array of sets");
+        return;
+    }
+    mdf_CapitalsCheck capitals;
+    for (std::size_t i = 0; i < json.Size(); ++i) {
+        mdf_Value& set = json.Items()[i];
+        const mdf_Path place(path, i);
+        if (!set.IsObject()) {
+            diagnostics_.Expected(place, set, "an object");
+            continue;
+        }
+        SetHead head;
+        if (!ReadSetHead(head, set, place, capitals)) continue;
+        const bool facets = head.type == res_SetTypeEnm::FACETS;
+        records_.CheckMembers(set, {"name", "kind", "internal", facets ? "facets" : "labels"}, place);
+        const int most = head.type == res_SetTypeEnm::NODES ? mesh.Nodes().NumNodes() : mesh.NumElements();
+        Members members;
+        if (!ReadMembers(members, head.type, set, place, static_cast<std::size_t>(most))) continue;
+        if (members.empty) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
+        Problems problems(diagnostics_, place);
+        mesh.AddSet({head.name, head.type, head.internal, members.labels, members.facets}, problems);
+    }
+}
+
+void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
+    if (!json.IsArray() || (json.Kind() != mdf_Kind::Array && !json.Empty())) {
+        diagnostics_.Expected(path, json, "an array of sets");
+        return;
+    }
+    mdf_CapitalsCheck capitals;
+    for (std::size_t i = 0; i < json.Size(); ++i) {
+        mdf_Value& set = json.Items()[i];
+        const mdf_Path place(path, i);
+        if (!set.IsObject()) {
+            diagnostics_.Expected(place, set, "an object");
+            continue;
+        }
+        SetHead head;
+        if (!ReadSetHead(head, set, place, capitals)) continue;
+        records_.CheckMembers(set, {"name", "kind", "internal", "members"}, place);
+        mdf_Value* entries = set.Find("members");
+        const mdf_Path entriesPath(place, "members");
+        if (entries == nullptr || !entries->IsArray() ||
+            (entries->Kind() != mdf_Kind::Array && !entries->Empty())) {
+            diagnostics_.Error(
+                entriesPath, "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)) +
+                                 ", expected an array of members");
+            continue;
+        }
+        if (entries->Empty()) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
+        std::vector<Members> members(entries->Size());
+        std::vector<odiK_MemberInput> inputs;
+        bool good = true;
+        for (std::size_t m = 0; m < entries->Size(); ++m) {
+            mdf_Value& entry = entries->Items()[m];
+            const mdf_Path entryPath(entriesPath, m);
+            if (!entry.IsObject()) {
+                diagnostics_.Expected(entryPath, entry, "an object");
+                good = false;
+                continue;
+            }
+            const bool facets = head.type == res_SetTypeEnm::FACETS;
+            records_.CheckMembers(entry, {"instance", facets ? "facets" : "labels"}, entryPath);
+            const mdf_Value* instance = entry.Find("instance");
+            if (instance != nullptr && (!instance->IsString() || instance->String().empty())) {
+                diagnostics_.Expected(mdf_Path(entryPath, "instance"), *instance, "the name of an instance");
+                good = false;
+                continue;
+            }
+            const cow_String instanceName =
+                instance == nullptr ? cow_String() : cow_String(instance->String());
+            const odiK_Instance* owner = model_.FindInstance(instanceName);
+            const auto mesh = owner == nullptr ? model_.ConstAssemblyMesh() : owner->Mesh();
+            const std::size_t most = instance != nullptr && owner == nullptr ? kNoLimit
+                                     : head.type == res_SetTypeEnm::NODES    ? NumNodes(mesh)
+                                                                             : NumElements(mesh);
+            if (!ReadMembers(members[m], head.type, entry, entryPath, most)) {
+                good = false;
+                continue;
+            }
+            if (members[m].empty) {
+                diagnostics_.Error(entryPath, "found an entry without members, expected at least one");
+                good = false;
+            }
+            inputs.push_back({instanceName, members[m].labels, members[m].facets});
+        }
+        if (!good) continue;
+        Problems problems(diagnostics_, place);
+        model_.AddAssemblySet(head.name, head.type, head.internal, inputs, problems);
+    }
+}

@@ -1,0 +1,55 @@
+#ifndef QRX_MODEL_FILE_MDF_MESHREADER_H
+#define QRX_MODEL_FILE_MDF_MESHREADER_H
+
+#include "model_file/mdf_RecordReader.h"
+
+/// Reads meshes and sets. Bulk arrays are moved out of the document, so that they never stand twice in
+/// memory.
+class mdf_MeshReader {
+public:
+    mdf_MeshReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics)
+        : model_(model), records_(records), diagnostics_(diagnostics) {}
+
+    /// The mesh of a part or an instance.
+    cow_CountedHld<odiK_Mesh> ReadMesh(mdf_Value& json, const mdf_Path& path);
+    /// The assembly's own mesh: no sets, and ends of elements may lie in instances, which must be there.
+    void ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path);
+    /// The sets of the assembly.
+    void ReadAssemblySets(mdf_Value& json, const mdf_Path& path);
+
+private:
+    class Problems;
+    struct SetHead {
+        cow_String name;
+        res_SetTypeEnm type = res_SetTypeEnm::NODES;
+        bool internal = false;
+    };
+    struct Members {
+        std::vector<int> labels;
+        std::vector<odiK_FacetInput> facets;
+        mdf_Value facetText; // keeps the face names alive
+        bool empty = true;
+    };
+
+    void ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
+    void ReadElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
+    void ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
+    bool ReadConnectivity(mdf_Value& json, const mdf_Path& path, std::size_t numElements, int& width,
+                          std::vector<int>& nodes);
+    bool ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path,
+                                std::size_t numElements, int& width, std::vector<int>& nodes);
+    int ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path);
+    void ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
+    bool ReadSetHead(SetHead& head, const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals);
+    bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
+                     std::size_t mostLabels);
+    bool ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json, const mdf_Path& path);
+    /// `most` is the largest number of labels that can be right, so that a wild range costs nothing.
+    bool ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path, std::size_t most);
+
+    odiK_Model& model_;
+    mdf_RecordReader& records_;
+    mdf_Diagnostics& diagnostics_;
+};
+
+#endif
