@@ -326,7 +326,7 @@ class Refusals(ProgramTest):
 
     def test_MemoryThatRunsOut_IsCodeThreeAndLeavesTheOldDeck(self):
         def limit():
-            resource.setrlimit(resource.RLIMIT_AS, (64 << 20, resource.RLIM_INFINITY))
+            resource.setrlimit(resource.RLIMIT_AS, (32 << 20, resource.RLIM_INFINITY))
         if self.run_program("--version", preexec_fn=limit).returncode != 0:
             self.skipTest("a program with sanitizers does not start in so little memory")
         self.put("model.json", large_model(1000000))
