@@ -481,6 +481,7 @@ void mdf_ModelReader::ReadInstance(const cow_String& name, mdf_Value& json, cons
             for (const auto& [known, entry] : model_.Parts()) names.emplace_back(known.View());
             diagnostics_.Error(partPath, "found " + mdf_Shown(*part) + ", expected the name of a part" +
                                              mdf_DidYouMean(part->String(), names));
+            partName = cow_String();
         }
     }
     odiK_Instance& instance = model_.AddOtherEntry(name, partName);

@@ -95,12 +95,12 @@ private:
 /// View on one orientation assignment.
 class ddb_OrientationView {
 public:
-    explicit ddb_OrientationView(const ptoC_PartAttribute& record) : record_(&record) {}
+    explicit ddb_OrientationView(const ptoC_PartAttribute& record) : region_(record.region) {}
     /// The set that it is assigned to.
-    ddb_Set region() const { return {record_->region.ConstSet().Id(), record_->region}; }
+    ddb_Set region() const { return {region_.ConstSet().Id(), region_}; }
 
 private:
-    const ptoC_PartAttribute* record_;
+    rgnC_Region region_;
 };
 class ddb_MaterialOrientation : public ddb_OrientationView {
 public:

@@ -180,7 +180,12 @@ class bme_ElementData {
 public:
     explicit bme_ElementData(const odiK_Mesh& mesh) : mesh_(&mesh) {}
     unsigned NumClasses() const { return static_cast<unsigned>(mesh_->Classes().size()); }
-    bme_ElementClass GetClass(unsigned index) const { return bme_ElementClass(mesh_->Classes().at(index)); }
+    /// An index outside the classes raises.
+    bme_ElementClass GetClass(unsigned index) const {
+        if (index >= NumClasses())
+            cow_RaiseOutOfRange(static_cast<int>(index), static_cast<int>(NumClasses()));
+        return bme_ElementClass(mesh_->Classes()[index]);
+    }
 
 private:
     const odiK_Mesh* mesh_;

@@ -26,11 +26,12 @@ const odiK_Assembly& ddb_Model::Object(const cow_String& key) const {
     return model_->AssemblyObject();
 }
 
-bool ddb_Model::hasCyclicSymmetry(const cow_String& modelName) const {
-    return modelName == model_->Name() && !model_->cyclicSymmetry.IsNull();
+bool ddb_Model::hasCyclicSymmetry(const cow_String& constraintName) const {
+    const auto& constraints = model_->constraints;
+    return constraints.IsMember(constraintName) && constraints.ConstGet(constraintName).IsCyclic();
 }
 
 const ddb_ModelSectorDefinition& ddb_Model::modelSectorForCyclicSymmetry() const {
-    if (model_->cyclicSymmetry.IsNull()) cow_RaiseNoSuchKey("ddb_Model", "cyclicSymmetry");
-    return model_->cyclicSymmetry.ConstGet();
+    static const ddb_ModelSectorDefinition none;
+    return model_->cyclicSymmetry.IsNull() ? none : model_->cyclicSymmetry.ConstGet();
 }

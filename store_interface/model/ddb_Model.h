@@ -94,9 +94,10 @@ public:
     bool endRestartStep() const { return model_->endRestartStep; }
     const cow_String& globalJob() const { return model_->globalJob; }
     bool shellToSolid() const { return model_->shellToSolid; }
-    /// Whether the model, called by its name, has a cyclic sector definition.
-    bool hasCyclicSymmetry(const cow_String& modelName) const;
-    /// The sector definition; raises when there is none.
+    /// Whether the constraint of the name joins the two sides of the cyclic sector; false for an unknown
+    /// name.
+    bool hasCyclicSymmetry(const cow_String& constraintName) const;
+    /// The sector definition; one without symmetry when the model has none.
     const ddb_ModelSectorDefinition& modelSectorForCyclicSymmetry() const;
 
     ddr_ShortcutTo<mdl_MapString2ObjCow<kmaC_Material>> material() const {

@@ -35,6 +35,17 @@ bool CheckLabels(const std::vector<int>& labels, odiK_Problems& problems) {
     return good;
 }
 
+bool CheckConnectivity(const std::vector<int>& nodes, const std::vector<int>& labels, int nodesPerElement,
+                       odiK_Problems& problems) {
+    if (nodesPerElement >= 0 && nodes.size() == labels.size() * static_cast<std::size_t>(nodesPerElement)) {
+        return true;
+    }
+    problems.Error("/connectivity", "found " + Number(static_cast<long long>(nodes.size())) +
+                                        " nodes, expected " + Number(nodesPerElement) + " for each of " +
+                                        Number(static_cast<long long>(labels.size())) + " labels");
+    return false;
+}
+
 } // namespace
 
 int odiK_NodeData::Label(int nodeIndex) const {
@@ -76,6 +87,7 @@ int odiK_Mesh::AddForeignNode(const cow_String& instanceName, int label) {
 void odiK_Mesh::AddElements(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                             std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls,
                             odiK_Problems& problems) {
+    if (!CheckConnectivity(nodeLabels, labels, nodesPerElement, problems)) return;
     bool good = true;
     const auto width = static_cast<std::size_t>(nodesPerElement);
     for (std::size_t i = 0; i < nodeLabels.size(); ++i) {
@@ -102,12 +114,7 @@ void odiK_Mesh::AddElements(const cow_String& type, std::vector<int> labels, int
 void odiK_Mesh::AddElementsByIndex(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                                    std::vector<int> nodeIndices, const bme_ElemCtrlParams& controls,
                                    odiK_Problems& problems) {
-    if (nodeIndices.size() != labels.size() * static_cast<std::size_t>(nodesPerElement)) {
-        problems.Error("/connectivity", "found " + Number(static_cast<long long>(nodeIndices.size())) +
-                                            " nodes, expected " + Number(nodesPerElement) + " for each of " +
-                                            Number(static_cast<long long>(labels.size())) + " labels");
-        return;
-    }
+    if (!CheckConnectivity(nodeIndices, labels, nodesPerElement, problems)) return;
     if (!CheckLabels(labels, problems)) return;
     odiK_ElementClass added;
     added.type = type;

@@ -14,6 +14,10 @@ std::string Quoted(const cow_String& name) {
     return std::string("'").append(name.View()).append("'");
 }
 
+[[noreturn]] void RaiseNoSuchPart(const cow_String& instance, const cow_String& part) {
+    Raise("instance " + Quoted(instance) + ": there is no part named " + Quoted(part));
+}
+
 void NormalizeAxis(gsl_Vector& axis, const cow_String& datum, const char* member) {
     const double length = axis.ComputeMagnitude();
     if (!(length > 0.0)) Raise("datum " + Quoted(datum) + ": " + member + " has no length");
@@ -75,8 +79,7 @@ odiK_Part& odiK_Model::AddPart(const cow_String& name) {
 }
 
 odiK_Instance& odiK_Model::AddInstance(const cow_String& name, const cow_String& partName) {
-    if (parts_.count(partName) == 0)
-        Raise("instance " + Quoted(name) + ": there is no part named " + Quoted(partName));
+    if (parts_.count(partName) == 0) RaiseNoSuchPart(name, partName);
     odiK_Instance& instance = AddOtherEntry(name, partName);
     instance.isPartInstance = true;
     return instance;
@@ -90,8 +93,11 @@ odiK_Instance& odiK_Model::AddOtherEntry(const cow_String& name, const cow_Strin
     instance->name = name;
     instance->partName = partName;
     instance->isPartInstance = false;
-    const auto part = parts_.find(partName);
-    if (part != parts_.end()) instance->part = part->second;
+    if (!partName.IsEmpty()) {
+        const auto part = parts_.find(partName);
+        if (part == parts_.end()) RaiseNoSuchPart(name, partName);
+        instance->part = part->second;
+    }
     return *instances_.emplace(name, std::move(instance)).first->second;
 }
 

@@ -250,7 +250,7 @@ private:
             type.SetState(attribute, static_cast<int>(AttributeState::CARRIED));
             return;
         }
-        type.SetState(attribute, static_cast<int>(AttributeState::NEVER_SET));
+        type.Reset(attribute);
         if (defaultValue != nullptr) type.ValueType().Assign(type.WritableValue(attribute), defaultValue);
     }
 
@@ -335,6 +335,11 @@ kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps,
     std::vector<StepResult> results;
     results.reserve(static_cast<std::size_t>(steps.Size()));
     for (int i = 0; i < steps.Size(); ++i) results.push_back(engine.Step(steps.NameAt(i), steps.StepAt(i)));
+    for (const mdl_GivenState& given : given_) {
+        if (!steps.IsMember(given.stepName)) {
+            problems.push_back({given.stepName, "a state, but there is no step of that name"});
+        }
+    }
     return results;
 }
 

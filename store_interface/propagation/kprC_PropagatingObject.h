@@ -72,7 +72,7 @@ public:
     mdl_GivenState& Give(const cow_String& stepName);
 
     /// Works out all steps; must run again after a change of states or steps. Gives the states that can't
-    /// be, in step order; their steps are treated as if nothing had been said there.
+    /// be, in step order, then those of unknown steps; they are treated as if nothing had been said.
     virtual std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) = 0;
 
     /// Statuses in which an object is in force: 1, 2, 3, 8, 9, 10 and 14.

@@ -80,6 +80,7 @@ struct cls_TypeOf<mdl_PropAttr<T>> {
         }
         const void* Value(const void* attribute) const override { return &At(attribute).ConstGet(); }
         void* WritableValue(void* attribute) const override { return &At(attribute).WritableValue(); }
+        void Reset(void* attribute) const override { At(attribute) = mdl_PropAttr<T>(); }
 
     private:
         static mdl_PropAttr<T>& At(void* value) { return *static_cast<mdl_PropAttr<T>*>(value); }

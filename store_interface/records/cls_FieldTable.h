@@ -131,6 +131,8 @@ public:
     virtual void SetState(void* attribute, int state) const = 0;
     virtual const void* Value(const void* attribute) const = 0;
     virtual void* WritableValue(void* attribute) const = 0;
+    /// Makes it a default one, never set.
+    virtual void Reset(void* attribute) const = 0;
 
 private:
     const cls_FieldType* valueType_;

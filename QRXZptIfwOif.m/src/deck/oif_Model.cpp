@@ -25,6 +25,14 @@ oif_Model::oif_Model(const ddb_Model& model, const cow_String& name) : qkw_Model
     }
 }
 
+ddb_PartContainer oif_Model::Parts() const {
+    return ddbModel_.part();
+}
+
+ddb_InstanceContainer oif_Model::Instances() const {
+    return ddbModel_.rootAssembly().instance();
+}
+
 const mdl_MapString2ObjCow<kadC_AdptMeshCtrl>& oif_Model::AdaptiveMeshControls() const {
     return ddbModel_.adaptiveMeshControls().container();
 }

@@ -11,8 +11,8 @@ public:
     oif_Model(const ddb_Model& model, const cow_String& name);
 
     const ddb_Model& Model() const { return ddbModel_; }
-    ddb_PartContainer Parts() const { return ddbModel_.part(); }
-    ddb_InstanceContainer Instances() const { return ddbModel_.rootAssembly().instance(); }
+    ddb_PartContainer Parts() const;
+    ddb_InstanceContainer Instances() const;
     /// The assembly-level object with the assembly's attribute lists.
     const odiK_Assembly& Assembly() const { return ddbModel_.Object("rootAssembly"); }
 

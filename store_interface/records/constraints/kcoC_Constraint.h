@@ -12,6 +12,8 @@ public:
 
     /// The node sets that the constraint names as surfaces; each gets a node-based surface. Empty for most.
     virtual cow_List<rgnC_Region> ConstGetContactNodeSets() const { return {}; }
+    /// Whether it joins the two sides of the model's cyclic sector; a tie can.
+    virtual bool IsCyclic() const { return false; }
 };
 
 enum class calC_SymmetryTypeEnm : int { NONE = 0, CYCLIC = 1 };

@@ -7,47 +7,49 @@ const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::AssembledTypeEnm) {
     static constexpr omu_EnumRow rows[] = {{0, "NONE", ""},
                                            {1, "BEAM", "Beam"},
                                            {2, "BUSHING", "Bushing"},
-                                           {3, "CVJOINT", "CVJ Joint"},
+                                           {3, "CVJOINT", "CVJ Joint", "CVJoint"},
                                            {4, "CYLINDRICAL", "Cylindrical"},
                                            {5, "HINGE", "Hinge"},
                                            {6, "PLANAR", "Planar"},
                                            {7, "RETRACTOR", "Retractor"},
-                                           {8, "SLIPRING", "SlipR Ring"},
+                                           {8, "SLIPRING", "SlipR Ring", "SlipRing"},
                                            {9, "TRANSLATOR", "Translator"},
-                                           {10, "UJOINT", "UJ Joint"},
+                                           {10, "UJOINT", "UJ Joint", "UJoint"},
                                            {11, "WELD", "Weld"}};
     static constexpr omu_EnumTable table{"kseC_ConnectorSection::AssembledTypeEnm", rows};
     return table;
 }
 
 const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::TranslationalTypeEnm) {
-    static constexpr omu_EnumRow rows[] = {{0, "NONE", ""},
-                                           {1, "ACCELEROMETER", "Accelerometer"},
-                                           {2, "AXIAL", "Axial"},
-                                           {3, "CARTESIAN", "Cartesian"},
-                                           {4, "JOIN", "Join"},
-                                           {5, "LINK", "Link"},
-                                           {6, "PROJECTION_CARTESIAN", "Proj Cartesian"},
-                                           {7, "RADIAL_THRUST", "Radial-Thrust"},
-                                           {8, "SLIDE_PLANE", "Slide-Plane"},
-                                           {9, "SLOT", "Slot"}};
+    static constexpr omu_EnumRow rows[] = {
+        {0, "NONE", ""},
+        {1, "ACCELEROMETER", "Accelerometer"},
+        {2, "AXIAL", "Axial"},
+        {3, "CARTESIAN", "Cartesian"},
+        {4, "JOIN", "Join"},
+        {5, "LINK", "Link"},
+        {6, "PROJECTION_CARTESIAN", "Proj Cartesian", "Projection Cartesian"},
+        {7, "RADIAL_THRUST", "Radial-Thrust"},
+        {8, "SLIDE_PLANE", "Slide-Plane"},
+        {9, "SLOT", "Slot"}};
     static constexpr omu_EnumTable table{"kseC_ConnectorSection::TranslationalTypeEnm", rows};
     return table;
 }
 
 const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::RotationalTypeEnm) {
-    static constexpr omu_EnumRow rows[] = {{0, "NONE", ""},
-                                           {1, "ALIGN", "Align"},
-                                           {2, "CARDAN", "Cardan"},
-                                           {3, "CONSTANT_VELOCITY", "Constant Velocity"},
-                                           {4, "EULER", "Euler"},
-                                           {5, "FLEXION_TORSION", "Flexion-Torsion"},
-                                           {6, "FLOW_CONVERTER", "Flow-Converter"},
-                                           {7, "PROJECTION_FLEXION_TORSION", "Proj Flex-Tors"},
-                                           {8, "REVOLUTE", "Revolute"},
-                                           {9, "ROTATION", "Rotation"},
-                                           {10, "ROTATION_ACCELEROMETER", "Rotation-Accelerometer"},
-                                           {11, "UNIVERSAL", "Universal"}};
+    static constexpr omu_EnumRow rows[] = {
+        {0, "NONE", ""},
+        {1, "ALIGN", "Align"},
+        {2, "CARDAN", "Cardan"},
+        {3, "CONSTANT_VELOCITY", "Constant Velocity"},
+        {4, "EULER", "Euler"},
+        {5, "FLEXION_TORSION", "Flexion-Torsion"},
+        {6, "FLOW_CONVERTER", "Flow-Converter"},
+        {7, "PROJECTION_FLEXION_TORSION", "Proj Flex-Tors", "Projection Flexion-Torsion"},
+        {8, "REVOLUTE", "Revolute"},
+        {9, "ROTATION", "Rotation"},
+        {10, "ROTATION_ACCELEROMETER", "Rotation-Accelerometer"},
+        {11, "UNIVERSAL", "Universal"}};
     static constexpr omu_EnumTable table{"kseC_ConnectorSection::RotationalTypeEnm", rows};
     return table;
 }

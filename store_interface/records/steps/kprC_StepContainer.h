@@ -24,16 +24,20 @@ public:
     int Size() const { return static_cast<int>(steps_.size()); }
     /// The place of the step from 0, or -1.
     int IndexOf(const cow_String& name) const;
-    const cow_String& NameAt(int index) const { return steps_.at(static_cast<std::size_t>(index)).name; }
-    const kprC_Step& StepAt(int index) const {
-        return steps_.at(static_cast<std::size_t>(index)).record.ConstGet();
-    }
+    /// A place outside the steps raises.
+    const cow_String& NameAt(int index) const { return EntryAt(index).name; }
+    const kprC_Step& StepAt(int index) const { return EntryAt(index).record.ConstGet(); }
 
 private:
     struct Entry {
         cow_String name;
         mdl_ObjCow<kprC_Step> record;
     };
+
+    const Entry& EntryAt(int index) const {
+        if (index < 0 || index >= Size()) cow_RaiseOutOfRange(index, Size());
+        return steps_[static_cast<std::size_t>(index)];
+    }
 
     std::vector<Entry> steps_;
     // The views lie in the names' shared storage, which copies of the container keep alive too.
