@@ -43,10 +43,10 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
 std::string TargetOf(const WriteRequest& request) {
     const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
                                                           : std::filesystem::path(request.job);
-    if (!job.has_filename()) return {};
+    if (!job.has_filename() || job.filename() == "." || job.filename() == "..") return {};
     std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
     target += ".inp";
-    return target.lexically_normal().string();
+    return target.string();
 }
 
 std::string Grouped(long long count) {

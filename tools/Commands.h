@@ -10,7 +10,8 @@ struct WriteRequest {
     std::string model;
     /// Empty: the model file's name without extension. May hold a folder, relative to the output folder.
     std::string job;
-    std::string outputDir = ".";
+    /// Empty: the current one.
+    std::string outputDir;
 };
 
 ExitCode RunWrite(const WriteRequest& request, RunReport& report);

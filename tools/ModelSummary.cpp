@@ -284,7 +284,9 @@ std::string NumberText(double value) {
 }
 
 std::string TripleText(const ordered_json& triple) {
-    return "(" + NumberText(triple[0]) + ", " + NumberText(triple[1]) + ", " + NumberText(triple[2]) + ")";
+    std::string text = "(";
+    text.append(NumberText(triple[0])).append(", ").append(NumberText(triple[1])).append(", ");
+    return text.append(NumberText(triple[2])).append(")");
 }
 
 bool IsZero(const ordered_json& triple) {

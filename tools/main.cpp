@@ -58,6 +58,14 @@ struct CommandLine {
             ->type_name("FILE");
     }
 
+    /// What is wrong, in the words of the command line's reader but for a command that isn't known.
+    std::string Complaint(const CLI::ParseError& error, int argc, char** argv) const {
+        const bool named = argc > 1 && argv[1][0] != '-';
+        if (!named || !app.get_subcommands().empty()) return error.what();
+        return std::string("there is no command '") + argv[1] +
+               "'; the commands are write, check, info and schema";
+    }
+
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return RunCheck(model, report);
@@ -100,7 +108,7 @@ ExitCode Main(int argc, char** argv) {
             std::cout.flush();
             return report.Finish(ExitCode::DONE);
         }
-        report.Error("qrxdeck", error.what());
+        report.Error("qrxdeck", commandLine.Complaint(error, argc, argv));
         if (!json) std::fputs("Run with --help for more information.\n", stderr);
         return report.Finish(ExitCode::WRONG_USAGE);
     }

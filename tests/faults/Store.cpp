@@ -1,0 +1,64 @@
+#include "faults/Store.h"
+
+#include <algorithm>
+#include <fstream>
+#include <numeric>
+#include <random>
+#include <sstream>
+
+void FillStore(odb_Odb& odb, int nodes) {
+    odiK_Model& model = odb.AddModel(odb_Odb::DefaultModelName());
+    model.topLevelSolverInput = "*Heading\n";
+    odiK_Part& part = model.AddPart("P");
+    part.solverInput = "** part\n";
+    part.mesh = cow_CountedHld<odiK_Mesh>(new odiK_Mesh());
+
+    std::vector<int> labels(static_cast<std::size_t>(nodes));
+    std::iota(labels.begin(), labels.end(), 1);
+    std::vector<float> coordinates(3 * labels.size(), 0.25F);
+    std::vector<int> elementLabels(labels.begin(), labels.end() - 1);
+    std::vector<int> ends;
+    for (const int label : elementLabels) ends.insert(ends.end(), {label, label + 1});
+    part.mesh->SetNodes(labels, coordinates);
+    part.mesh->AddElements("T3D2", elementLabels, 2, ends);
+    part.mesh->AddNodeSet("ODD", {1, 3, 4});
+    part.mesh->AddElementSet("ALL", elementLabels);
+    part.mesh->AddSurface("ENDS", {{1, -1, "END1"}, {2, -1, "END2"}});
+
+    model.AddInstance("A", "P");
+    model.AddInstance("B", "P").translation[0] = 2.0F;
+    const std::vector<int> tip = {2};
+    const std::vector<odiK_MemberInput> members = {{"A", tip, {}}, {"B", tip, {}}};
+    model.AddAssemblySet("TIPS", res_SetTypeEnm::NODES, members);
+    model.steps.Append("Initial", kprC_InitialStep());
+}
+
+TestFolder::TestFolder()
+    : path_(std::filesystem::temp_directory_path() /
+            ("qrx_faults_" + std::to_string(std::random_device()()))) {
+    std::filesystem::create_directory(path_);
+}
+
+TestFolder::~TestFolder() {
+    std::error_code ignored;
+    std::filesystem::remove_all(path_, ignored);
+}
+
+std::vector<std::string> TestFolder::Entries() const {
+    std::vector<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(path_)) {
+        names.push_back(entry.path().filename().string());
+    }
+    std::sort(names.begin(), names.end());
+    return names;
+}
+
+void TestFolder::Put(const std::string& name, const std::string& text) const {
+    std::ofstream(Path(name), std::ios::binary) << text;
+}
+
+std::string TestFolder::Text(const std::string& name) const {
+    std::ostringstream text;
+    text << std::ifstream(Path(name), std::ios::binary).rdbuf();
+    return text.str();
+}

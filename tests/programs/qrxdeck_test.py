@@ -1,0 +1,443 @@
+#!/usr/bin/env python3
+"""Calls qrxdeck as a user does.
+
+usage: qrxdeck_test.py PROGRAM [unittest options]
+"""
+
+import json
+import os
+import pathlib
+import resource
+import shutil
+import signal
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+
+OLD_DECK = b"** the old deck\n"
+
+MODEL = {
+    "format": "qrx-model/1",
+    "models": {
+        "Default Model": {
+            "topLevelSolverInput": ["*Heading", "One truss"],
+            "parts": {
+                "ROD": {
+                    "mesh": {
+                        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [2.5, 0, 0]]},
+                        "elements": [{"type": "T3D2", "labels": [1], "connectivity": [[1, 2]]}],
+                        "sets": [{"name": "TIP", "kind": "node", "labels": [2]}],
+                    }
+                }
+            },
+            "assembly": {"instances": {"ROD-1": {"part": "ROD", "translation": [0, 1, 0]}}},
+            "steps": [{"name": "Initial", "class": "kprC_InitialStep"}],
+        }
+    },
+}
+
+DECK = b"""\
+*Heading
+One truss
+**
+** PARTS
+**
+*Part, name=ROD
+*End Part
+**
+** ASSEMBLY
+**
+*Assembly, name=Assembly
+*Instance, name=ROD-1, part=ROD
+          0.,           1.,           0.
+*Node
+      1,           0.,           0.,           0.
+      2,          2.5,           0.,           0.
+*Element, type=T3D2
+1, 1, 2
+*Nset, nset=TIP
+2,\x20
+*End Instance
+*End Assembly
+"""
+
+
+def changed(change):
+    """The model with a change made to its default model."""
+    model = json.loads(json.dumps(MODEL))
+    change(model["models"]["Default Model"])
+    return model
+
+
+def large_model(nodes):
+    def enlarge(model):
+        mesh = model["parts"]["ROD"]["mesh"]
+        mesh["nodes"] = {"labels": {"from": 1, "to": nodes}, "coordinates": [[0.5, 0, 0]] * nodes}
+
+    return changed(enlarge)
+
+
+class ProgramTest(unittest.TestCase):
+    maxDiff = None
+
+    def setUp(self):
+        self.folder = pathlib.Path(tempfile.mkdtemp(prefix="qrxdeck_test_"))
+        self.addCleanup(shutil.rmtree, self.folder)
+        self.put("model.json", MODEL)
+
+    def put(self, name, model):
+        path = self.folder / name
+        path.write_text(model if isinstance(model, str) else json.dumps(model), encoding="utf-8")
+        return path
+
+    def run_program(self, *arguments, **options):
+        options = {"cwd": self.folder, "capture_output": True, **options}
+        run = subprocess.run([PROGRAM, *arguments], **options)
+        run.output = (run.stdout or b"").decode(errors="replace")
+        run.errors = (run.stderr or b"").decode(errors="replace")
+        return run
+
+    def entries(self, folder="."):
+        return sorted(os.listdir(os.fsencode(self.folder / folder)))
+
+    def assert_refused(self, run, code, errors=None):
+        self.assertEqual(run.returncode, code, run.errors)
+        self.assertEqual(run.output, "")
+        if errors is None:
+            self.assertNotEqual(run.errors, "")
+        else:
+            self.assertEqual(run.errors, errors)
+
+
+class Write(ProgramTest):
+    def test_ModelAlone_WritesUnderItsNameIntoTheCurrentFolder(self):
+        run = self.run_program("write", "model.json")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
+        self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+        self.assertRegex(run.output, r"^model\.inp: %d bytes in \d+\.\d\d s\nwritten:\n" % len(DECK))
+        self.assertIn("\n  2  nodes\n", run.output)
+        self.assertNotIn("left out", run.output)
+
+    def test_ModelElsewhere_WritesIntoTheCurrentFolderAllTheSame(self):
+        (self.folder / "in").mkdir()
+        (self.folder / "model.json").rename(self.folder / "in" / "rod.v2.json")
+        run = self.run_program("write", "in/rod.v2.json")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertEqual((self.folder / "rod.v2.inp").read_bytes(), DECK)
+        self.assertEqual(self.entries("in"), [b"rod.v2.json"])
+
+    def test_JobNamesOfEveryKind_NameTheDeck(self):
+        for job in ["a.b", "with blank", " ", "ä€漢", "job.inp", ".hidden", "-", "100% %s", "it's \"quoted\"",
+                    "line\nend", "XXXXXX", "~", "x" * 250]:
+            with self.subTest(job=job):
+                run = self.run_program("write", "model.json", "--job=" + job)
+                self.assertEqual((run.returncode, run.errors), (0, ""))
+                self.assertEqual((self.folder / (job + ".inp")).read_bytes(), DECK)
+                (self.folder / (job + ".inp")).unlink()
+        self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_JobThatIsNoUtf8_NamesTheDeck(self):
+        run = self.run_program("write", "model.json", "--job", b"\xff\xfe")
+        self.assertEqual((run.returncode, run.stderr), (0, b""))
+        self.assertIn(b"\xff\xfe.inp", self.entries())
+        run = self.run_program("write", "model.json", "--job", b"\xff\xfe", "--json")
+        self.assertEqual(json.loads(run.output)["written"]["target"], "\ufffd\ufffd.inp")
+
+    def test_JobWithAFolder_IsRelativeToTheOutputFolder(self):
+        (self.folder / "out" / "sub").mkdir(parents=True)
+        run = self.run_program("write", "model.json", "--output-dir", "out", "--job", "sub/job")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertEqual((self.folder / "out" / "sub" / "job.inp").read_bytes(), DECK)
+        self.assertTrue(run.output.startswith("out/sub/job.inp: "))
+        self.assertEqual(self.entries("out"), [b"sub"])
+        self.assertEqual(self.entries("out/sub"), [b"job.inp"])
+
+    def test_OldDeck_IsReplaced(self):
+        (self.folder / "model.inp").write_bytes(OLD_DECK)
+        self.assertEqual(self.run_program("write", "model.json").returncode, 0)
+        self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
+
+    def test_TwoRuns_GiveTheSameBytes(self):
+        self.run_program("write", "model.json", "--job", "a")
+        self.run_program("write", "model.json", "--job", "b")
+        self.assertEqual((self.folder / "a.inp").read_bytes(), (self.folder / "b.inp").read_bytes())
+
+    def test_Locales_DoNotShowInTheDeck(self):
+        known = subprocess.run(["locale", "-a"], capture_output=True, text=True).stdout.split()
+        for name in ["C", "POSIX"] + [name for name in known if name.startswith(("C.", "de_DE", "tr_TR"))]:
+            with self.subTest(locale=name):
+                run = self.run_program("write", "model.json", env={**os.environ, "LC_ALL": name, "LANG": name})
+                self.assertEqual((run.returncode, run.errors), (0, ""))
+                self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
+
+    def test_Deck_HasTheRightsOfAnyNewFile(self):
+        previous = os.umask(0o027)
+        try:
+            self.run_program("write", "model.json")
+        finally:
+            os.umask(previous)
+        self.assertEqual((self.folder / "model.inp").stat().st_mode & 0o777, 0o640)
+
+    def test_SeveralModels_AreLeftOutByName(self):
+        model = json.loads(json.dumps(MODEL))
+        model["models"]["Study"] = {"steps": MODEL["models"]["Default Model"]["steps"]}
+        self.put("model.json", model)
+        run = self.run_program("write", "model.json")
+        self.assertEqual(run.returncode, 0, run.errors)
+        self.assertRegex(run.output, r"left out, since a deck can't carry it:\n +1  other models .*: Study\n$")
+
+    def test_Json_TellsAllOnStandardOutput(self):
+        run = self.run_program("write", "model.json", "--json")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        result = json.loads(run.output)
+        seconds = result["written"].pop("seconds")
+        self.assertGreater(seconds, 0)
+        self.assertLess(seconds, 60)
+        self.assertEqual(result, {
+            "exitCode": 0,
+            "messages": [],
+            "written": {
+                "target": "model.inp",
+                "bytes": len(DECK),
+                "counts": {"parts": 1, "instances": 1, "nodes": 2, "elements": 1, "nodeSets": 1, "steps": 1},
+                "leftOut": [],
+            },
+        })
+
+
+class Refusals(ProgramTest):
+    def setUp(self):
+        super().setUp()
+        (self.folder / "model.inp").write_bytes(OLD_DECK)
+
+    def tearDown(self):
+        deck = self.folder / "model.inp"
+        if deck.is_file():
+            self.assertEqual(deck.read_bytes(), OLD_DECK)
+        self.assertEqual([name for name in self.entries() if name.startswith(b".")], [])
+
+    def test_WrongModel_IsCodeOneWithPointer(self):
+        def spoil(model):
+            model["assembly"]["instances"]["ROD-1"]["part"] = "RUD"
+        self.put("model.json", changed(spoil))
+        for command in ["write", "check", "info"]:
+            with self.subTest(command=command):
+                run = self.run_program(command, "model.json")
+                self.assert_refused(run, 1)
+                self.assertRegex(run.errors, r"^model\.json: error: "
+                                 r"/models/Default Model/assembly/instances/ROD-1/part: .*RUD")
+
+    def test_WrongModel_HasPointerInJson(self):
+        self.put("model.json", changed(lambda model: model.update(parts=3)))
+        run = self.run_program("write", "model.json", "--json")
+        self.assertEqual((run.returncode, run.errors), (1, ""))
+        result = json.loads(run.output)
+        self.assertEqual(result["exitCode"], 1)
+        self.assertNotIn("written", result)
+        message = result["messages"][0]
+        self.assertEqual((message["severity"], message["file"], message["pointer"]),
+                         ("error", "model.json", "/models/Default Model/parts"))
+        self.assertTrue(message["text"])
+
+    def test_SyntaxError_IsCodeOneWithLineAndColumn(self):
+        self.put("model.json", '{\n  "format": oops\n}\n')
+        run = self.run_program("write", "model.json")
+        self.assert_refused(run, 1)
+        self.assertRegex(run.errors, r"^model\.json:2:\d+: error: ")
+        message = json.loads(self.run_program("check", "model.json", "--json").output)["messages"][0]
+        self.assertEqual(message["line"], 2)
+        self.assertGreater(message["column"], 0)
+
+    def test_NoDefaultModel_IsCodeOne(self):
+        model = json.loads(json.dumps(MODEL))
+        model["models"]["Study"] = model["models"].pop("Default Model")
+        self.put("model.json", model)
+        run = self.run_program("write", "model.json")
+        self.assert_refused(run, 1)
+        self.assertIn("'Default Model'", run.errors)
+
+    def test_WrongUsage_IsCodeTwo(self):
+        for arguments in [[], ["write"], ["frobnicate"], ["write", "model.json", "--frob"],
+                          ["write", "model.json", "other.json"], ["write", "model.json", "--job"],
+                          ["check"], ["write", "model.json", "check"], ["schema", "--output"],
+                          ["write", "model.json", "--job", "folder/"], ["write", "model.json", "--job", "."],
+                          ["write", "model.json", "--job", "a/.."]]:
+            with self.subTest(arguments=arguments):
+                run = self.run_program(*arguments)
+                self.assert_refused(run, 2)
+                self.assertRegex(run.errors, r"^qrxdeck: error: ")
+
+    def test_UnknownCommand_IsNamed(self):
+        self.assert_refused(self.run_program("wirte", "model.json"), 2,
+                            "qrxdeck: error: there is no command 'wirte'; "
+                            "the commands are write, check, info and schema\n"
+                            "Run with --help for more information.\n")
+
+    def test_WrongUsage_IsToldInJson(self):
+        run = self.run_program("write", "--json")
+        self.assertEqual((run.returncode, run.errors), (2, ""))
+        result = json.loads(run.output)
+        self.assertEqual(result["exitCode"], 2)
+        self.assertEqual([message["severity"] for message in result["messages"]], ["error"])
+
+    def test_ModelThatCannotBeRead_IsCodeThree(self):
+        (self.folder / "folder.json").mkdir()
+        for name in ["none.json", "folder.json", "model.json/x", ""]:
+            for command in ["write", "check", "info"]:
+                with self.subTest(name=name, command=command):
+                    arguments = ["--job", "model"] if command == "write" else []
+                    self.assert_refused(self.run_program(command, name, *arguments), 3)
+
+    def test_OutputFolderThatIsNotThere_IsCodeThreeAndNotMade(self):
+        run = self.run_program("write", "model.json", "--output-dir", "none")
+        self.assert_refused(run, 3, "none/model.inp: error: cannot make a temporary folder in 'none': "
+                            "No such file or directory\n")
+        self.assertFalse((self.folder / "none").exists())
+
+    def test_OutputFolderThatIsAFile_IsCodeThree(self):
+        self.assert_refused(self.run_program("write", "model.json", "--output-dir", "model.json"), 3)
+
+    def test_TargetThatIsAFolder_IsCodeThreeAndStays(self):
+        (self.folder / "job.inp").mkdir()
+        run = self.run_program("write", "model.json", "--job", "job")
+        self.assert_refused(run, 3, "job.inp: error: a folder is in its place: Is a directory\n")
+        self.assertEqual(self.entries("job.inp"), [])
+
+    def test_NameThatIsTooLong_IsCodeThree(self):
+        self.assert_refused(self.run_program("write", "model.json", "--job", "x" * 300), 3)
+
+    @unittest.skipIf(os.geteuid() == 0, "rights do not hold for root")
+    def test_ReadOnlyFolder_IsCodeThree(self):
+        (self.folder / "out").mkdir(mode=0o555)
+        run = self.run_program("write", "model.json", "--output-dir", "out")
+        self.assert_refused(run, 3)
+        self.assertIn("Permission denied", run.errors)
+
+    def test_FileThatOutgrowsItsLimit_IsCodeThreeAndLeavesTheOldDeck(self):
+        self.put("model.json", large_model(20000))
+        run = self.run_program(
+            "write", "model.json",
+            preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_FSIZE, (4096, resource.RLIM_INFINITY)))
+        self.assert_refused(run, 3, "model.inp: error: cannot write the deck: File too large\n")
+        self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+    def test_MemoryThatRunsOut_IsCodeThreeAndLeavesTheOldDeck(self):
+        def limit():
+            resource.setrlimit(resource.RLIMIT_AS, (32 << 20, resource.RLIM_INFINITY))
+        if self.run_program("--version", preexec_fn=limit).returncode != 0:
+            self.skipTest("a program with sanitizers does not start in so little memory")
+        self.put("model.json", large_model(1000000))
+        self.assert_refused(self.run_program("write", "model.json", preexec_fn=limit), 3,
+                            "qrxdeck: error: not enough memory\n")
+
+    def test_OutputThatIsFull_IsCodeThree(self):
+        for arguments in [["info", "model.json"], ["schema"], ["check", "model.json", "--json"], ["--version"]]:
+            with self.subTest(arguments=arguments), open("/dev/full", "wb") as full:
+                run = self.run_program(*arguments, stdout=full, stderr=subprocess.PIPE, capture_output=False)
+                self.assertEqual(run.returncode, 3)
+                self.assertRegex(run.errors, r"^standard output: error: ")
+
+    def test_RefusalByTheFileSystem_IsToldInJson(self):
+        (self.folder / "job.inp").mkdir()
+        run = self.run_program("write", "model.json", "--job", "job", "--json")
+        self.assertEqual((run.returncode, run.errors), (3, ""))
+        self.assertEqual(json.loads(run.output), {
+            "exitCode": 3,
+            "messages": [{"severity": "error", "file": "job.inp", "pointer": "",
+                          "text": "a folder is in its place: Is a directory"}],
+        })
+
+
+class Signals(ProgramTest):
+    def test_RunThatIsEnded_LeavesTheOldDeckAndNoDebris(self):
+        self.put("model.json", large_model(300000))
+        (self.folder / "model.inp").write_bytes(OLD_DECK)
+        for number in [signal.SIGINT, signal.SIGTERM, signal.SIGHUP]:
+            with self.subTest(signal=number):
+                run = subprocess.Popen([PROGRAM, "write", "model.json"], cwd=self.folder,
+                                       stdout=subprocess.DEVNULL)
+                while run.poll() is None and not any(n.startswith(b".qrxdeck") for n in self.entries()):
+                    time.sleep(0.001)
+                run.send_signal(number)
+                run.wait()
+                self.assertEqual(run.returncode, -number)
+                self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
+                self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+
+class OtherCommands(ProgramTest):
+    def test_Check_OfARightModel_SaysSoAndWritesNothing(self):
+        run = self.run_program("check", "model.json")
+        self.assertEqual((run.returncode, run.output, run.errors), (0, "model.json: no errors\n", ""))
+        self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_Check_WithWarningsAlone_IsCodeZero(self):
+        def empty_set(model):
+            model["parts"]["ROD"]["mesh"]["sets"].append({"name": "NONE", "kind": "node", "labels": []})
+        self.put("model.json", changed(empty_set))
+        run = self.run_program("check", "model.json")
+        self.assertEqual(run.returncode, 0)
+        self.assertRegex(run.errors, r"^model\.json: warning: /models/Default Model/parts/ROD/mesh/sets/1")
+        result = json.loads(self.run_program("check", "model.json", "--json").output)
+        self.assertEqual((result["exitCode"], [m["severity"] for m in result["messages"]]), (0, ["warning"]))
+
+    def test_Check_OfAModelNamedLikeACommand_Works(self):
+        self.put("info", MODEL)
+        run = self.run_program("check", "info")
+        self.assertEqual((run.returncode, run.output), (0, "info: no errors\n"))
+
+    def test_Info_TellsWhatIsInTheModel(self):
+        run = self.run_program("info", "model.json")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertEqual(run.output, 'model "Default Model"\n'
+                         "  parts (1)\n"
+                         "    ROD  2 nodes, 1 elements: 1 T3D2\n"
+                         "  instances (1)\n"
+                         "    ROD-1  of ROD  moved by (0, 1, 0)\n"
+                         "  sets\n"
+                         "    part ROD  1 node sets  0 element sets  0 surfaces\n"
+                         "  steps (1)\n"
+                         "    0  Initial  kprC_InitialStep\n")
+
+    def test_InfoInJson_HasTheSame(self):
+        model = json.loads(self.run_program("info", "model.json", "--json").output)["models"]["Default Model"]
+        self.assertEqual(model["parts"]["ROD"]["mesh"], {"nodes": 2, "elements": 1, "elementTypes": {"T3D2": 1}})
+        self.assertEqual(model["parts"]["ROD"]["sets"], {"node": {"TIP": 1}, "element": {}, "surface": {}})
+        self.assertEqual(model["instances"]["ROD-1"]["translation"], [0, 1, 0])
+        self.assertEqual([step["class"] for step in model["steps"]], ["kprC_InitialStep"])
+
+    def test_Schema_IsJsonAndTheSameInAFile(self):
+        run = self.run_program("schema")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertIsInstance(json.loads(run.output), dict)
+        self.assertEqual(self.run_program("schema", "--output", "schema.json").returncode, 0)
+        self.assertEqual((self.folder / "schema.json").read_text(), run.output)
+
+    def test_SchemaInAFolderThatIsNotThere_IsCodeThree(self):
+        run = self.run_program("schema", "--output", "none/schema.json")
+        self.assert_refused(run, 3, "none/schema.json: error: cannot write the schema: "
+                            "No such file or directory\n")
+
+    def test_SchemaOnAFullDisk_IsCodeThree(self):
+        run = self.run_program("schema", "--output", "/dev/full")
+        self.assert_refused(run, 3, "/dev/full: error: cannot write the schema: No space left on device\n")
+
+    def test_Version_IsOnALineOfItsOwn(self):
+        run = self.run_program("--version")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertRegex(run.output, r"^qrxdeck \d+\.\d+\.\d+\n$")
+
+    def test_Help_NamesCommandsAndExitCodes(self):
+        run = self.run_program("--help")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        for word in ["write", "check", "info", "schema", "--version", "Exit codes:"]:
+            self.assertIn(word, run.output)
+        self.assertIn("--output-dir DIR", self.run_program("write", "--help").output)
+
+
+if __name__ == "__main__":
+    PROGRAM = os.path.abspath(sys.argv.pop(1))
+    unittest.main()
