@@ -506,7 +506,7 @@ bool mdf_Builder::parse_error(std::size_t, const std::string&, const nlohmann::d
 
 std::string mdf_Error::Message(std::string_view fileName) const {
     std::string message(fileName);
-    if (line > 0) message += ":" + std::to_string(line) + ":" + std::to_string(column);
+    if (line > 0) message.append(":").append(std::to_string(line)).append(":").append(std::to_string(column));
     message += ": ";
     if (!pointer.empty()) message += pointer + ": ";
     return message + text;

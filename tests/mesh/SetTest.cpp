@@ -40,6 +40,14 @@ public:
     TestStore store;
 };
 
+/// A constraint that names node sets as surfaces.
+class Users final : public cls_RecordOf<Users, kcoC_Constraint> {
+public:
+    static constexpr cls_ClassInfo Class{"TestUsersOfNodeSets", "a constraint on node sets"};
+    cow_List<rgnC_Region> regions;
+    cow_List<rgnC_Region> ConstGetContactNodeSets() const override { return regions; }
+};
+
 } // namespace
 
 TEST(Set, RegularLabels_Generate) {
@@ -334,12 +342,6 @@ TEST(RegionBuilder, Surfaces_StandBehindAllSetsOfTheAssembly) {
 }
 
 TEST(RegionBuilder, NodeSetsThatConstraintsUseAsSurfaces_GetOneSurfaceEach) {
-    class Users final : public cls_RecordOf<Users, kcoC_Constraint> {
-    public:
-        static constexpr cls_ClassInfo Class{"TestUsersOfNodeSets", "a constraint on node sets"};
-        cow_List<rgnC_Region> regions;
-        cow_List<rgnC_Region> ConstGetContactNodeSets() const override { return regions; }
-    };
     TestStore store;
     store.AddPart("P", {1, 2}).mesh->AddNodeSet("S", {1});
     store.model.AddInstance("I", "P");
