@@ -3,6 +3,7 @@
 #include "foundation/nex_Exception.h"
 
 #include <cmath>
+#include <limits>
 
 namespace {
 
@@ -21,7 +22,10 @@ std::string Quoted(const cow_String& name) {
 void NormalizeAxis(gsl_Vector& axis, const cow_String& datum, const char* member) {
     const double length = axis.ComputeMagnitude();
     if (!(length > 0.0)) Raise("datum " + Quoted(datum) + ": " + member + " has no length");
-    axis.Normalize();
+    if (!std::isfinite(length)) Raise("datum " + Quoted(datum) + ": " + member + " is too long");
+    // What was normalised stays to the bit, so that a written model reads back the same.
+    constexpr double rounding = 4.0 * std::numeric_limits<double>::epsilon();
+    if (std::fabs(length - 1.0) > rounding) axis.Normalize();
 }
 
 void Place(odiK_Datum& datum) {
