@@ -205,7 +205,9 @@ rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String&
 
 void odiK_Model::CompleteTree(odiK_Problems& problems) {
     SealInstances();
-    for (const auto& [name, instance] : instances_) {
+    for (const auto& entry : instances_) {
+        const cow_String& name = entry.first;
+        const cow_CountedHld<odiK_Instance>& instance = entry.second;
         const odiK_AttributeInputs none;
         const odiK_AttributeInputs& part = instance->part.IsNull() ? none : instance->part->attributes;
         const auto fill =
