@@ -34,7 +34,8 @@ const odiK_Mesh& MeshOfP(const std::unique_ptr<odb_Odb>& odb) {
 }
 
 int AssembledType(const std::string& value) {
-    const auto odb = Store(Model(R"("sections": {"S": {"assembledType": )" + value + "}}"));
+    const auto odb = Store(
+        Model(R"("sections": {"S": {"class": "kseC_ConnectorSection", "assembledType": )" + value + "}}"));
     const auto& section = static_cast<const kseC_ConnectorSection&>(TheModel(odb).sections.ConstGet("S"));
     return static_cast<int>(section.assembledType);
 }
