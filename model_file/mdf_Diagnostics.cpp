@@ -1,6 +1,7 @@
 #include "model_file/mdf_Diagnostics.h"
 
 #include "model_file/mdf_Parser.h"
+#include "model_file/mdf_Writer.h"
 
 #include <algorithm>
 #include <charconv>
@@ -20,17 +21,52 @@ std::string LowerCase(std::string_view text) {
     return lower;
 }
 
-// Number of single-character changes between the texts, capitals not counted.
+bool IsControl(char c) {
+    const auto byte = static_cast<unsigned char>(c);
+    return byte < 0x20 || byte == 0x7f;
+}
+
+// Control characters as \xNN, so that no text of a file acts on the terminal that shows it.
+std::string Visible(std::string_view text) {
+    constexpr const char* digits = "0123456789ABCDEF";
+    std::string visible;
+    for (const char c : text) {
+        if (!IsControl(c)) {
+            visible += c;
+            continue;
+        }
+        const auto byte = static_cast<unsigned char>(c);
+        visible.append("\\x").append({digits[byte >> 4], digits[byte & 15]});
+    }
+    return visible;
+}
+
+// The beginning of the text, cut between characters.
+std::string_view Beginning(std::string_view text, std::size_t longest) {
+    std::size_t end = 0;
+    while (end < text.size()) {
+        const std::size_t length = std::max<std::size_t>(1, mdf_Utf8Length(text.substr(end)));
+        if (end + length > longest) break;
+        end += length;
+    }
+    return text.substr(0, end);
+}
+
+// Number of characters put in, left out, changed or swapped with the next, capitals not counted.
 std::size_t Distance(std::string_view a, std::string_view b) {
     std::vector<std::size_t> row(b.size() + 1);
+    std::vector<std::size_t> above(b.size() + 1);
+    std::vector<std::size_t> twoAbove(b.size() + 1);
     for (std::size_t j = 0; j <= b.size(); ++j) row[j] = j;
+    const auto same = [&](std::size_t i, std::size_t j) { return Lower(a[i]) == Lower(b[j]); };
     for (std::size_t i = 0; i < a.size(); ++i) {
-        std::size_t diagonal = row[0];
+        twoAbove.swap(above);
+        above.swap(row);
         row[0] = i + 1;
         for (std::size_t j = 0; j < b.size(); ++j) {
-            const std::size_t change = diagonal + (Lower(a[i]) == Lower(b[j]) ? 0 : 1);
-            diagonal = row[j + 1];
-            row[j + 1] = std::min({row[j] + 1, row[j + 1] + 1, change});
+            row[j + 1] = std::min({row[j] + 1, above[j + 1] + 1, above[j] + (same(i, j) ? 0 : 1)});
+            if (i > 0 && j > 0 && same(i, j - 1) && same(i - 1, j))
+                row[j + 1] = std::min(row[j + 1], twoAbove[j - 1] + 1);
         }
     }
     return row[b.size()];
@@ -61,7 +97,7 @@ void mdf_Diagnostics::Expected(const mdf_Path& path, const mdf_Value& found, con
 
 std::string mdf_Quoted(std::string_view text) {
     std::string quoted("'");
-    return quoted.append(text).append("'");
+    return quoted.append(Visible(text)).append("'");
 }
 
 std::string mdf_Shown(const mdf_Value& value) {
@@ -81,7 +117,7 @@ std::string mdf_Shown(const mdf_Value& value) {
     }
     if (value.IsString()) {
         const std::string& text = value.String();
-        return text.size() <= longest ? mdf_Quoted(text) : mdf_Quoted(text.substr(0, longest)) + "...";
+        return text.size() <= longest ? mdf_Quoted(text) : mdf_Quoted(Beginning(text, longest)) + "...";
     }
     if (value.IsObject()) return "an object";
     return "an array of " + std::to_string(value.Size()) + (value.Size() == 1 ? " item" : " items");
@@ -91,9 +127,12 @@ std::string mdf_DidYouMean(std::string_view name, const std::vector<std::string>
     constexpr std::size_t longest = 80;
     if (name.size() > longest) return {};
     const std::string* nearest = nullptr;
-    std::size_t least = std::max<std::size_t>(1, name.size() / 3) + 1;
+    // Something of the name must be left.
+    std::size_t least = std::min(std::max<std::size_t>(1, name.size() / 3) + 1, name.size());
     for (const std::string& candidate : known) {
-        if (candidate.size() > longest) continue;
+        const std::size_t gap =
+            std::max(candidate.size(), name.size()) - std::min(candidate.size(), name.size());
+        if (candidate.size() > longest || gap >= least) continue;
         const std::size_t distance = Distance(name, candidate);
         if (distance < least) {
             least = distance;
@@ -118,8 +157,7 @@ std::string mdf_NameProblem(std::string_view name) {
     }
     for (const char c : name) {
         if (c == '"') return "a name with a double quote, expected a name that can stand in a deck";
-        const auto byte = static_cast<unsigned char>(c);
-        if (byte < 0x20 || byte == 0x7f) {
+        if (IsControl(c)) {
             return "a name with a control character, expected a name that can stand in a deck";
         }
     }
@@ -143,6 +181,6 @@ std::string mdf_Report::Line(const mdf_Message& message) const {
     std::string line = fileName + ":";
     if (message.line > 0) line += std::to_string(message.line) + ":" + std::to_string(message.column) + ":";
     line += message.isError ? " error: " : " warning: ";
-    if (!message.pointer.empty()) line += message.pointer + ": ";
+    if (!message.pointer.empty()) line += Visible(message.pointer) + ": ";
     return line + message.text;
 }

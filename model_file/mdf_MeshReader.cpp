@@ -5,8 +5,6 @@
 
 namespace {
 
-constexpr std::size_t kNoLimit = std::numeric_limits<int>::max();
-
 std::size_t NumNodes(const cow_CountedHld<odiK_Mesh>& mesh) {
     return mesh.IsNull() ? 0 : static_cast<std::size_t>(mesh->Nodes().NumNodes());
 }
@@ -40,13 +38,23 @@ cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Pa
         return mesh;
     }
     records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
-    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(*mesh, *nodes, mdf_Path(path, "nodes"));
-    if (mdf_Value* elements = json.Find("elements"))
-        ReadElements(*mesh, *elements, mdf_Path(path, "elements"), false);
-    Problems problems(diagnostics_, path);
-    mesh->FinishElements(problems);
+    ReadNodesAndElements(*mesh, json, path, false);
     if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, mdf_Path(path, "sets"));
     return mesh;
+}
+
+void mdf_MeshReader::ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path,
+                                          bool inAssembly) {
+    const int before = diagnostics_.NumErrors();
+    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(mesh, *nodes, mdf_Path(path, "nodes"));
+    if (diagnostics_.NumErrors() != before && mesh.Nodes().NumNodes() == 0) incomplete_.insert(&mesh);
+    if (mdf_Value* elements = json.Find("elements")) {
+        const std::size_t classes = elements->Size();
+        ReadElements(mesh, *elements, mdf_Path(path, "elements"), inAssembly);
+        if (mesh.Classes().size() != classes) incomplete_.insert(&mesh);
+    }
+    Problems problems(diagnostics_, path);
+    mesh.FinishElements(problems);
 }
 
 void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path) {
@@ -60,11 +68,7 @@ void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path) {
                            "found sets, expected them in the member \"sets\" of the assembly");
     }
     records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
-    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(mesh, *nodes, mdf_Path(path, "nodes"));
-    if (mdf_Value* elements = json.Find("elements"))
-        ReadElements(mesh, *elements, mdf_Path(path, "elements"), true);
-    Problems problems(diagnostics_, path);
-    mesh.FinishElements(problems);
+    ReadNodesAndElements(mesh, json, path, true);
     if (mesh.Nodes().NumNodes() > 0) {
         diagnostics_.Warning(mdf_Path(path, "nodes"), "the assembly's own " +
                                                           std::to_string(mesh.Nodes().NumNodes()) +
@@ -235,15 +239,25 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const md
     const std::size_t count = connectivity->Size();
     std::vector<int> labels;
     if (!ReadLabels(labels, *labelsJson, mdf_Path(path, "labels"), count)) return;
+    if (labels.size() != count) {
+        const auto counted = [](std::size_t number, const char* thing) {
+            return std::to_string(number) + " " + thing + (number == 1 ? "" : "s");
+        };
+        diagnostics_.Error(connectivityPath, "found " + counted(count, "row") + " for " +
+                                                 counted(labels.size(), "label") + ", expected one for each");
+        return;
+    }
     int width = 0;
     std::vector<int> nodes;
     Problems problems(diagnostics_, path);
     if (inAssembly) {
         if (!ReadScopedConnectivity(mesh, *connectivity, connectivityPath, count, width, nodes)) return;
+        if (IsIncomplete(&mesh)) return;
         mesh.AddElementsByIndex(cow_String(type->String()), std::move(labels), width, std::move(nodes),
                                 controls, problems);
     } else {
         if (!ReadConnectivity(*connectivity, connectivityPath, count, width, nodes)) return;
+        if (IsIncomplete(&mesh)) return;
         mesh.AddElements(cow_String(type->String()), std::move(labels), width, std::move(nodes), controls,
                          problems);
     }
@@ -305,7 +319,8 @@ bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& js
 int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path) {
     if (json.IsInt()) {
         const int node = mesh.FindNode(json.Int());
-        if (node < 0) diagnostics_.Expected(path, json, "the label of a node of the assembly's own mesh");
+        if (node < 0 && !IsIncomplete(&mesh))
+            diagnostics_.Expected(path, json, "the label of a node of the assembly's own mesh");
         return node;
     }
     // The instance's name runs to the last dot.
@@ -317,17 +332,19 @@ int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const
     const std::string name = json.String().substr(0, dot);
     const std::string digits = json.String().substr(dot + 1);
     const odiK_Instance* instance = model_.FindInstance(cow_String(name));
-    if (instance == nullptr || !instance->isPartInstance) {
-        std::vector<std::string> names;
-        for (const auto& [known, entry] : model_.Instances()) names.emplace_back(known.View());
-        diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
-                                     mdf_DidYouMean(name, names));
+    if (instance == nullptr) {
+        records_.ReportNoInstance(name, path);
+        return -1;
+    }
+    if (!instance->isPartInstance) {
+        diagnostics_.Error(path, "found " + mdf_Quoted(name) + ", which is no part instance, expected one");
         return -1;
     }
     const bool isNumber =
         !digits.empty() && digits.size() <= 10 && digits.find_first_not_of("0123456789") == std::string::npos;
     const long long label = isNumber ? std::stoll(digits) : 0;
     const auto nodes = instance->Mesh();
+    if (IsIncomplete(nodes.Referent())) return -1;
     if (label < 1 || label > std::numeric_limits<int>::max() || nodes.IsNull() ||
         nodes->FindNode(static_cast<int>(label)) < 0) {
         diagnostics_.Error(path, "found node " + mdf_Quoted(digits) +
@@ -365,11 +382,13 @@ bool mdf_MeshReader::ReadSetHead(SetHead& head, const mdf_Value& json, const mdf
         diagnostics_.Error(mdf_Path(path, "kind"),
                            "found " + (kind == nullptr ? std::string("nothing") : mdf_Shown(*kind)) +
                                ", expected one of node, element, surface");
+        records_.NoteWrong(name->String());
         return false;
     }
     head.type = static_cast<res_SetTypeEnm>(type);
     if (internal != nullptr && !internal->IsBool()) {
         diagnostics_.Expected(mdf_Path(path, "internal"), *internal, "true or false");
+        records_.NoteWrong(name->String());
         return false;
     }
     head.internal = internal != nullptr && internal->Bool();
@@ -451,11 +470,18 @@ void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& 
         if (!ReadSetHead(head, set, place, capitals)) continue;
         const bool facets = head.type == res_SetTypeEnm::FACETS;
         records_.CheckMembers(set, {"name", "kind", "internal", facets ? "facets" : "labels"}, place);
+        Problems problems(diagnostics_, place);
+        if (IsIncomplete(&mesh)) {
+            mesh.AddSet({head.name, head.type, head.internal, {}, {}}, problems);
+            continue;
+        }
         const int most = head.type == res_SetTypeEnm::NODES ? mesh.Nodes().NumNodes() : mesh.NumElements();
         Members members;
-        if (!ReadMembers(members, head.type, set, place, static_cast<std::size_t>(most))) continue;
+        if (!ReadMembers(members, head.type, set, place, static_cast<std::size_t>(most))) {
+            records_.NoteWrong(head.name.View());
+            continue;
+        }
         if (members.empty) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
-        Problems problems(diagnostics_, place);
         mesh.AddSet({head.name, head.type, head.internal, members.labels, members.facets}, problems);
     }
 }
@@ -483,6 +509,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
             diagnostics_.Error(
                 entriesPath, "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)) +
                                  ", expected an array of members");
+            records_.NoteWrong(head.name.View());
             continue;
         }
         if (entries->Empty()) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
@@ -508,10 +535,17 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
             const cow_String instanceName =
                 instance == nullptr ? cow_String() : cow_String(instance->String());
             const odiK_Instance* owner = model_.FindInstance(instanceName);
+            if (instance != nullptr && owner == nullptr) {
+                records_.ReportNoInstance(instance->String(), mdf_Path(entryPath, "instance"));
+                good = false;
+                continue;
+            }
             const auto mesh = owner == nullptr ? model_.ConstAssemblyMesh() : owner->Mesh();
-            const std::size_t most = instance != nullptr && owner == nullptr ? kNoLimit
-                                     : head.type == res_SetTypeEnm::NODES    ? NumNodes(mesh)
-                                                                             : NumElements(mesh);
+            if (IsIncomplete(mesh.Referent())) {
+                good = false;
+                continue;
+            }
+            const std::size_t most = head.type == res_SetTypeEnm::NODES ? NumNodes(mesh) : NumElements(mesh);
             if (!ReadMembers(members[m], head.type, entry, entryPath, most)) {
                 good = false;
                 continue;
@@ -522,7 +556,10 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
             }
             inputs.push_back({instanceName, members[m].labels, members[m].facets});
         }
-        if (!good) continue;
+        if (!good) {
+            records_.NoteWrong(head.name.View());
+            continue;
+        }
         Problems problems(diagnostics_, place);
         model_.AddAssemblySet(head.name, head.type, head.internal, inputs, problems);
     }

@@ -31,6 +31,7 @@ private:
         bool empty = true;
     };
 
+    void ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
     void ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
     void ReadElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
     void ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
@@ -47,9 +48,13 @@ private:
     /// `most` is the largest number of labels that can be right, so that a wild range costs nothing.
     bool ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path, std::size_t most);
 
+    bool IsIncomplete(const odiK_Mesh* mesh) const { return incomplete_.count(mesh) != 0; }
+
     odiK_Model& model_;
     mdf_RecordReader& records_;
     mdf_Diagnostics& diagnostics_;
+    // Meshes that lack nodes or elements because of errors: what refers to these is not reported too.
+    std::set<const odiK_Mesh*> incomplete_;
 };
 
 #endif

@@ -85,7 +85,18 @@ void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
         if (v.IsNull()) return;
         ddb_ModelSectorDefinition sector;
         records_.ReadRecord(sector, v, p);
+        if (!v.IsObject()) return;
         model_.cyclicSymmetry = mdl_ObjCow<ddb_ModelSectorDefinition>(sector);
+        const std::pair<const char*, g3d_Vector> points[] = {{"startPoint", sector.startPoint},
+                                                             {"endPoint", sector.endPoint}};
+        for (const auto& [member, point] : points) {
+            const double xyz[3] = {point.x, point.y, point.z};
+            const mdf_Path place(p, std::string_view(member));
+            for (std::size_t i = 0; i < 3; ++i) {
+                if (!std::isinf(static_cast<float>(xyz[i]))) continue;
+                diagnostics_.Expected(mdf_Path(place, i), mdf_Value(xyz[i]), "a number of single precision");
+            }
+        }
         if (sector.symmetryType == calC_SymmetryTypeEnm::NONE) {
             diagnostics_.Warning(p, "the sector definition is idle, since symmetryType is NONE");
         }
@@ -192,10 +203,11 @@ void mdf_ModelReader::ReadDatums(const mdf_Value& json, const mdf_Path& path) {
         diagnostics_.Expected(path, json, "an array of datums");
         return;
     }
-    for (std::size_t i = 0; i < json.Size(); ++i) ReadDatum(json.Item(i), mdf_Path(path, i));
+    mdf_CapitalsCheck capitals;
+    for (std::size_t i = 0; i < json.Size(); ++i) ReadDatum(json.Item(i), mdf_Path(path, i), capitals);
 }
 
-void mdf_ModelReader::ReadDatum(const mdf_Value& json, const mdf_Path& path) {
+void mdf_ModelReader::ReadDatum(const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
@@ -212,7 +224,14 @@ void mdf_ModelReader::ReadDatum(const mdf_Value& json, const mdf_Path& path) {
     }
     if (!CheckName(name->String(), mdf_Path(path, "name"))) return;
     datum.name = cow_String(name->String());
+    capitals.Enter(name->String(), mdf_Path(path, "name"), "datum", diagnostics_);
     bool good = true;
+    if (!model_.FindDatum(datum.name).IsNullRef()) {
+        diagnostics_.Error(mdf_Path(path, "name"), "found a second datum named " +
+                                                       mdf_Quoted(name->String()) +
+                                                       ", expected names that are unique");
+        good = false;
+    }
     const auto word = [&](const char* member, std::initializer_list<const char*> words, int& index) {
         const mdf_Value* value = json.Find(member);
         if (value == nullptr) return;
@@ -242,20 +261,47 @@ void mdf_ModelReader::ReadDatum(const mdf_Value& json, const mdf_Path& path) {
     direction("xAxis", datum.xAxis);
     direction("yAxis", datum.yAxis);
     direction("zAxis", datum.zAxis);
-    if (!good) return;
-    const bool zGiven = json.Find("zAxis") != nullptr;
-    if (zGiven && datum.zAxis == gsl_Vector()) {
-        diagnostics_.Error(mdf_Path(path, "zAxis"),
-                           "found a direction of no length, expected one with a length");
+    if (!good) {
+        records_.NoteWrong(name->String());
         return;
     }
+    const bool zGiven = json.Find("zAxis") != nullptr;
     if (!zGiven && datum.type == dtu_DatumType::PLANE) datum.zAxis = gsl_Vector(0.0, 0.0, 1.0);
     datum.origin = gsl_Point(origin.X(), origin.Y(), origin.Z());
-    try {
+    if (CheckAxes(datum, zGiven, path)) {
         model_.AddDatum(datum);
-    } catch (const QRXBasException& failure) {
-        diagnostics_.Error(path, failure.what());
+    } else {
+        records_.NoteWrong(name->String());
     }
+}
+
+bool mdf_ModelReader::CheckAxes(const odiK_Datum& datum, bool zGiven, const mdf_Path& path) {
+    const bool csys = datum.type == dtu_DatumType::CSYS;
+    const auto check = [&](bool used, const char* member, gsl_Vector& axis) {
+        const double length = axis.ComputeMagnitude();
+        const bool good = length > 0.0 && std::isfinite(length);
+        if (used && !good) {
+            diagnostics_.Error(
+                mdf_Path(path, std::string_view(member)),
+                std::string("found a direction ") +
+                    (length > 0.0 ? "whose length is beyond double precision" : "of no length") +
+                    ", expected one with a length");
+        }
+        axis.Normalize();
+        return good || !used;
+    };
+    gsl_Vector x = datum.xAxis;
+    gsl_Vector y = datum.yAxis;
+    gsl_Vector z = datum.zAxis;
+    bool good = check(csys || datum.type == dtu_DatumType::AXIS, "xAxis", x);
+    good = check(csys, "yAxis", y) && good;
+    good = check(zGiven && (csys || datum.type == dtu_DatumType::PLANE), "zAxis", z) && good;
+    if (good && csys && !(gsl_Cross(x, y).ComputeMagnitude() > gsl_Util::Instance().AngleTolerance())) {
+        diagnostics_.Error(mdf_Path(path, "yAxis"),
+                           "found a direction parallel to xAxis, expected one that is not");
+        good = false;
+    }
+    return good;
 }
 
 bool mdf_ModelReader::ReadDirection(gsl_Vector& vector, const mdf_Value& json, const mdf_Path& path) {
@@ -353,12 +399,13 @@ void mdf_ModelReader::ReadAttributeInputs(std::vector<odiK_AttributeInput>& inpu
 }
 
 void mdf_ModelReader::CheckAttributeInputs(const std::vector<odiK_AttributeInput>& inputs,
-                                           const odiK_Mesh* mesh, const std::string& pointer, bool) {
+                                           const odiK_Mesh* mesh, const std::string& pointer) {
     for (std::size_t i = 0; i < inputs.size(); ++i) {
         if (inputs[i].record.IsNull()) continue;
         const std::string place = pointer + "/" + std::to_string(i) + "/region";
         const std::string name(inputs[i].setName.View());
         const int id = mesh == nullptr ? -1 : mesh->FindSet(inputs[i].setName);
+        if (id < 0 && records_.IsWrong(name)) continue;
         if (id < 0) {
             std::vector<std::string> names;
             if (mesh != nullptr) {
@@ -380,9 +427,9 @@ void mdf_ModelReader::CheckPartAttributes() {
     mdf_AppendPointer(models, model_.Name().View());
     const auto check = [&](const odiK_AttributeInputs& inputs, const odiK_Mesh* mesh,
                            const std::string& pointer) {
-        CheckAttributeInputs(inputs.sectionAssignments, mesh, pointer + "/sectionAssignments", true);
-        CheckAttributeInputs(inputs.materialOrientations, mesh, pointer + "/materialOrientations", true);
-        CheckAttributeInputs(inputs.beamOrientations, mesh, pointer + "/beamOrientations", true);
+        CheckAttributeInputs(inputs.sectionAssignments, mesh, pointer + "/sectionAssignments");
+        CheckAttributeInputs(inputs.materialOrientations, mesh, pointer + "/materialOrientations");
+        CheckAttributeInputs(inputs.beamOrientations, mesh, pointer + "/beamOrientations");
     };
     for (const auto& [name, part] : model_.Parts()) {
         std::string pointer = models + "/parts";
@@ -398,7 +445,7 @@ void mdf_ModelReader::CheckPartAttributes() {
         const auto own = [&](const std::unique_ptr<std::vector<odiK_AttributeInput>>& inputs,
                              const std::vector<odiK_AttributeInput>* inherited, const char* member) {
             const auto* list = inputs != nullptr ? inputs.get() : inherited;
-            if (list != nullptr) CheckAttributeInputs(*list, mesh.Referent(), pointer + "/" + member, true);
+            if (list != nullptr) CheckAttributeInputs(*list, mesh.Referent(), pointer + "/" + member);
         };
         own(instance->ownSectionAssignments, other ? &instance->part->attributes.sectionAssignments : nullptr,
             "sectionAssignments");
@@ -445,6 +492,7 @@ void mdf_ModelReader::ReadInstances(mdf_Value& json, const mdf_Path& path) {
         if (!CheckName(member.name, place)) continue;
         capitals.Enter(member.name, place, "instance", diagnostics_);
         if (!member.value.IsObject()) {
+            records_.NoteWrong(member.name);
             diagnostics_.Expected(place, member.value, "an object");
             continue;
         }
@@ -553,7 +601,10 @@ void mdf_ModelReader::ReadRepository(mdl_Repository& repository, const char* kin
             propagating ? std::vector<std::string>{"states"} : std::vector<std::string>{};
         const std::unique_ptr<cls_Record> record =
             records_.ReadVariant(repository.ItemTypeId(), member.value, place, others);
-        if (record == nullptr) continue;
+        if (record == nullptr) {
+            records_.NoteWrong(member.name);
+            continue;
+        }
         if (propagating) {
             if (const mdf_Value* states = member.value.Find("states")) {
                 records_.ReadStates(static_cast<kprC_PropagatingObject&>(*record), *states,
@@ -600,7 +651,12 @@ void mdf_ModelReader::ReadSteps(const mdf_Value& json, const mdf_Path& path) {
     for (std::size_t i = 0; i < json.Size(); ++i) {
         const mdf_Value item = json.Item(i);
         const mdf_Path place(path, i);
-        const std::unique_ptr<cls_Record> record = records_.NewVariant(kprC_Step::TypeId(), item, place);
+        std::unique_ptr<cls_Record> record;
+        if (item.IsObject() && item.Find("class") == nullptr) {
+            diagnostics_.Error(mdf_Path(place, "class"), "found nothing, expected the class of the step");
+        } else {
+            record = records_.NewVariant(kprC_Step::TypeId(), item, place);
+        }
         const mdf_Value* nameJson = item.IsObject() ? item.Find("name") : nullptr;
         const mdf_Path namePath(place, "name");
         if (item.IsObject() && (nameJson == nullptr || !nameJson->IsString())) {
@@ -608,7 +664,11 @@ void mdf_ModelReader::ReadSteps(const mdf_Value& json, const mdf_Path& path) {
                 namePath, "found " + (nameJson == nullptr ? std::string("nothing") : mdf_Shown(*nameJson)) +
                               ", expected the name of the step");
         }
-        if (record == nullptr || nameJson == nullptr || !nameJson->IsString()) continue;
+        if (nameJson == nullptr || !nameJson->IsString()) continue;
+        if (record == nullptr) {
+            records_.NoteWrong(nameJson->String());
+            continue;
+        }
         records_.ReadRecord(*record, item, place, {"name", "class"});
         const std::string& name = nameJson->String();
         if (!CheckName(name, namePath)) continue;
@@ -698,6 +758,11 @@ std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, const std::vector<mdf_Err
     std::vector<std::string> names;
     for (mdf_Member& member : models->Members()) {
         const mdf_Path place(modelsPath, member.name);
+        const std::string problem = mdf_NameProblem(member.name);
+        if (!problem.empty()) {
+            diagnostics.Error(place, "found " + problem);
+            continue;
+        }
         names.push_back(member.name);
         odiK_Model& model = odb->AddModel(cow_String(member.name));
         mdf_ModelReader(model, diagnostics).Read(member.value, place);

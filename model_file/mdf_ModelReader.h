@@ -15,7 +15,8 @@ public:
 private:
     void ReadScalars(const mdf_Value& json, const mdf_Path& path);
     void ReadDatums(const mdf_Value& json, const mdf_Path& path);
-    void ReadDatum(const mdf_Value& json, const mdf_Path& path);
+    void ReadDatum(const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals);
+    bool CheckAxes(const odiK_Datum& datum, bool zGiven, const mdf_Path& path);
     void ReadParts(mdf_Value& json, const mdf_Path& path);
     void ReadAssembly(mdf_Value& json, const mdf_Path& path);
     void ReadInstances(mdf_Value& json, const mdf_Path& path);
@@ -23,7 +24,7 @@ private:
     void ReadAttributeInputs(std::vector<odiK_AttributeInput>& inputs, unsigned type, const mdf_Value& json,
                              const mdf_Path& path);
     void CheckAttributeInputs(const std::vector<odiK_AttributeInput>& inputs, const odiK_Mesh* mesh,
-                              const std::string& pointer, bool elementsOnly);
+                              const std::string& pointer);
     void CheckPartAttributes();
     void ReadAssemblyAttributes(mdf_Value& json, const mdf_Path& path);
     void ReadRepository(mdl_Repository& repository, const char* kind, const mdf_Value& json,

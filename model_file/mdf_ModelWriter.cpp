@@ -111,9 +111,11 @@ private:
             Text("type", types[static_cast<int>(datum.type)], "csys");
             Text("system", systems[static_cast<int>(datum.csysType)], "rectangular");
             Triple("origin", datum.origin.X(), datum.origin.Y(), datum.origin.Z());
-            if (csys || datum.type == dtu_DatumType::AXIS) Vector("xAxis", datum.xAxis);
-            if (csys) Vector("yAxis", datum.yAxis);
-            if (csys || datum.type == dtu_DatumType::PLANE) Vector("zAxis", datum.zAxis);
+            if (csys || datum.type == dtu_DatumType::AXIS) Vector("xAxis", datum.givenAxes[0]);
+            if (csys) Vector("yAxis", datum.givenAxes[1]);
+            // A z axis that was left out follows from the others again.
+            const bool zGiven = !(datum.givenAxes[2] == gsl_Vector());
+            if (zGiven && (csys || datum.type == dtu_DatumType::PLANE)) Vector("zAxis", datum.givenAxes[2]);
             out_.EndObject();
         }
         out_.EndArray();

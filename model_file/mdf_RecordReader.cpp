@@ -52,7 +52,9 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
     }
     const cls_FieldTable& table = record.DynFields();
     std::vector<std::string> known = FieldNames(table);
-    known.insert(known.end(), others.begin(), others.end());
+    for (const std::string& other : others) {
+        if (std::find(known.begin(), known.end(), other) == known.end()) known.push_back(other);
+    }
     CheckMembers(object, known, path);
     for (const cls_Field& field : table.All()) {
         if (field.notModelData || std::find(others.begin(), others.end(), field.name) != others.end())
@@ -64,8 +66,9 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
             if (!ReadValue(*field.type, field.In(record), *json, place, field, mayBeUnset)) continue;
         }
         if (!field.required) continue;
+        const bool isText = field.type->Kind() == cls_FieldKind::String;
         const bool missing =
-            json == nullptr || json->IsNull() || (json->IsString() && json->String().empty());
+            json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
         if (missing) diagnostics_.Error(place, std::string("found nothing, expected ") + field.doc);
     }
 }
@@ -83,7 +86,8 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     const mdf_Path place(path, "class");
     if (name == nullptr) {
         if (classes.size() == 1) return std::unique_ptr<cls_Record>(classes.front()->create());
-        diagnostics_.Error(place, "found nothing, expected " + mdf_OneOf(names));
+        diagnostics_.Error(place, "found nothing, expected " +
+                                      (names.empty() ? std::string("no object here") : mdf_OneOf(names)));
         return nullptr;
     }
     if (!name->IsString()) {
@@ -291,15 +295,19 @@ bool mdf_RecordReader::ReadTable(const cls_TableType& type, void* value, const m
         return true;
     }
     const std::size_t columns = json.Item(0).IsArray() ? json.Item(0).Size() : 0;
+    // All rows before any memory: a long first row with many others would ask for the product.
+    for (std::size_t i = 0; i < json.Size(); ++i) {
+        const mdf_Value row = json.Item(i);
+        if (row.IsArray() && row.Size() == columns) continue;
+        diagnostics_.Expected(mdf_Path(path, i), row,
+                              i == 0 ? "a row of numbers"
+                                     : "a row of " + std::to_string(columns) + " numbers, as the first one");
+        return false;
+    }
     cow_2DArray<double> cells(static_cast<int>(json.Size()), static_cast<int>(columns));
     for (std::size_t i = 0; i < json.Size(); ++i) {
         const mdf_Path rowPath(path, i);
         const mdf_Value row = json.Item(i);
-        if (!row.IsArray() || row.Size() != columns) {
-            diagnostics_.Expected(rowPath, row,
-                                  "a row of " + std::to_string(columns) + " numbers, as the first one");
-            return false;
-        }
         for (std::size_t j = 0; j < columns; ++j) {
             const mdf_Value cell = row.Item(j);
             if (!cell.IsNumber()) {
@@ -381,11 +389,19 @@ bool mdf_RecordReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, co
     std::vector<std::string> names;
     for (const odiK_Datum& known : model_.Datums()) names.push_back(Text(known.name));
     if (json.IsString()) datum = model_.FindDatum(cow_String(json.String()));
-    if (json.IsString() && !datum.IsNullRef()) return true;
+    if (json.IsString() && (!datum.IsNullRef() || IsWrong(json.String()))) return true;
     diagnostics_.Expected(path, json,
                           "the name of a datum, or null" +
                               (json.IsString() ? mdf_DidYouMean(json.String(), names) : std::string()));
     return false;
+}
+
+void mdf_RecordReader::ReportNoInstance(const std::string& name, const mdf_Path& path) {
+    if (IsWrong(name)) return;
+    std::vector<std::string> names;
+    for (const auto& [known, entry] : model_.Instances()) names.push_back(Text(known));
+    diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
+                                 mdf_DidYouMean(name, names));
 }
 
 rgnC_Region mdf_RecordReader::ReadRegion(const mdf_Value& value, const mdf_Path& path) {
@@ -430,11 +446,10 @@ rgnC_Region mdf_RecordReader::ReadRegion(const mdf_Value& value, const mdf_Path&
     const odiK_Instance* owner = model_.FindInstance(cow_String(instance));
     std::vector<std::string> names;
     if (!instance.empty() && owner == nullptr) {
-        for (const auto& [name, entry] : model_.Instances()) names.push_back(Text(name));
-        diagnostics_.Error(path, "found instance " + mdf_Quoted(instance) +
-                                     ", expected the name of an instance" + mdf_DidYouMean(instance, names));
+        ReportNoInstance(instance, path);
         return {};
     }
+    if (IsWrong(set)) return {};
     static const std::vector<cow_CountedHld<odiK_Set>> none;
     const auto mesh = owner == nullptr ? cow_CountedHld<odiK_Mesh>() : owner->Mesh();
     for (const auto& known : owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets()) {
@@ -484,6 +499,7 @@ void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Valu
     const std::vector<std::string> steps = mdf_Names(model_.steps.Keys());
     for (const mdf_Member& member : states.Members()) {
         const mdf_Path place(path, member.name);
+        if (IsWrong(member.name)) continue;
         if (!model_.steps.IsMember(cow_String(member.name))) {
             diagnostics_.Error(place, "found " + mdf_Quoted(member.name) + ", expected the name of a step" +
                                           mdf_DidYouMean(member.name, steps));
@@ -582,7 +598,7 @@ void mdf_RecordReader::CheckReferences() {
             names = NamesOfKind(reference.kind);
             lookup.insert(names.begin(), names.end());
         }
-        if (lookup.count(reference.name) != 0) continue;
+        if (lookup.count(reference.name) != 0 || IsWrong(reference.name)) continue;
         // Orientations and filters may be defined elsewhere in the deck.
         if (reference.kind == "orientation" || reference.kind == "filter") {
             diagnostics_.Warning(reference.pointer, "found " + mdf_Quoted(reference.name) +

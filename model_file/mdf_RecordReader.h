@@ -30,6 +30,11 @@ public:
 
     /// Reports members that are none of the known ones.
     void CheckMembers(const mdf_Value& object, const std::vector<std::string>& known, const mdf_Path& path);
+    /// Tells that an object of the name is given but wrong: what refers to it is not reported too.
+    void NoteWrong(std::string_view name) { wrong_.emplace(name); }
+    bool IsWrong(std::string_view name) const { return wrong_.count(name) != 0; }
+    /// Reports that there is no instance of the name.
+    void ReportNoInstance(const std::string& name, const mdf_Path& path);
     /// Looks up all names that records refer to.
     void CheckReferences();
 
@@ -63,6 +68,7 @@ private:
     odiK_Model& model_;
     mdf_Diagnostics& diagnostics_;
     std::vector<Reference> references_;
+    std::set<std::string, std::less<>> wrong_;
 };
 
 /// Copies of cow_String as std::string and of lists of names, for messages.

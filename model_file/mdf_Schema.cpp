@@ -281,6 +281,7 @@ private:
             choices.push_back(Reference(entry->info.name));
         }
         if (choices.size() == 1) return choices.front();
+        for (Json& choice : choices) choice["required"] = {"class"};
         return choices.empty() ? Json(false) : Json{{"oneOf", choices}};
     }
 
@@ -294,8 +295,6 @@ private:
         if (cls_Classes().InheritanceCheck(entry.info.Id(), kprC_Step::TypeId())) {
             properties["name"] = Reference("NAME");
             required = {"name", "class"};
-        } else if (cls_Classes().ConcreteClasses(RootOf(entry)).size() > 1) {
-            required = {"class"};
         }
         for (const cls_Field& field : entry.fields().All()) {
             if (field.notModelData) continue;
@@ -310,17 +309,6 @@ private:
         if (!required.empty()) record["required"] = required;
         record["properties"] = properties;
         return record;
-    }
-
-    // The outermost class of the family.
-    static unsigned RootOf(const cls_ClassEntry& entry) {
-        const cls_ClassEntry* root = &entry;
-        while (root->baseId != cls_Record::TypeId() && root->baseId != kprC_PropagatingObject::TypeId()) {
-            const cls_ClassEntry* base = cls_Classes().Find(root->baseId);
-            if (base == nullptr) break;
-            root = base;
-        }
-        return root->info.Id();
     }
 
     static Json StateOf(const kprC_PropagatingObject& object) {

@@ -17,6 +17,10 @@ std::string Number(long long value) {
     return std::to_string(value);
 }
 
+std::string Count(std::size_t number, const char* thing) {
+    return std::to_string(number) + " " + thing + (number == 1 ? "" : "s");
+}
+
 std::string Quoted(std::string_view text) {
     return std::string("'").append(text).append("'");
 }
@@ -40,9 +44,9 @@ bool CheckConnectivity(const std::vector<int>& nodes, const std::vector<int>& la
     if (nodesPerElement >= 0 && nodes.size() == labels.size() * static_cast<std::size_t>(nodesPerElement)) {
         return true;
     }
-    problems.Error("/connectivity", "found " + Number(static_cast<long long>(nodes.size())) +
-                                        " nodes, expected " + Number(nodesPerElement) + " for each of " +
-                                        Number(static_cast<long long>(labels.size())) + " labels");
+    problems.Error("/connectivity", "found " + Count(nodes.size(), "node") + ", expected " +
+                                        Number(nodesPerElement) + " for each of " +
+                                        Count(labels.size(), "label"));
     return false;
 }
 
@@ -58,9 +62,8 @@ int odiK_NodeData::Label(int nodeIndex) const {
 
 void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates, odiK_Problems& problems) {
     if (coordinates.size() != 3 * labels.size()) {
-        problems.Error("/coordinates", "found " + Number(static_cast<long long>(coordinates.size() / 3)) +
-                                           " points for " + Number(static_cast<long long>(labels.size())) +
-                                           " labels, expected one for each");
+        problems.Error("/coordinates", "found " + Count(coordinates.size() / 3, "point") + " for " +
+                                           Count(labels.size(), "label") + ", expected one for each");
         return;
     }
     if (!CheckLabels(labels, problems)) return;

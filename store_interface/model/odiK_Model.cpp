@@ -21,6 +21,7 @@ std::string Quoted(const cow_String& name) {
 void NormalizeAxis(gsl_Vector& axis, const cow_String& datum, const char* member) {
     const double length = axis.ComputeMagnitude();
     if (!(length > 0.0)) Raise("datum " + Quoted(datum) + ": " + member + " has no length");
+    if (!std::isfinite(length)) Raise("datum " + Quoted(datum) + ": " + member + " is too long");
     axis.Normalize();
 }
 
@@ -53,6 +54,9 @@ void odiK_Assembly::AppendConnectorOrientation(const ptoC_ConnectorOrientation& 
 dtmC_DatumRef odiK_Model::AddDatum(odiK_Datum datum) {
     if (!FindDatum(datum.name).IsNullRef())
         Raise("a datum named " + Quoted(datum.name) + " is there already");
+    datum.givenAxes[0] = datum.xAxis;
+    datum.givenAxes[1] = datum.yAxis;
+    datum.givenAxes[2] = datum.zAxis;
     Place(datum);
     datums_.push_back(datum);
     return dtmC_DatumRef(static_cast<int>(datums_.size()));
@@ -201,7 +205,9 @@ rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String&
 
 void odiK_Model::CompleteTree(odiK_Problems& problems) {
     SealInstances();
-    for (const auto& [name, instance] : instances_) {
+    for (const auto& entry : instances_) {
+        const cow_String& name = entry.first;
+        const cow_CountedHld<odiK_Instance>& instance = entry.second;
         const odiK_AttributeInputs none;
         const odiK_AttributeInputs& part = instance->part.IsNull() ? none : instance->part->attributes;
         const auto fill =

@@ -98,6 +98,8 @@ struct odiK_Datum {
     gsl_Vector xAxis{1.0, 0.0, 0.0};
     gsl_Vector yAxis{0.0, 1.0, 0.0};
     gsl_Vector zAxis{0.0, 0.0, 1.0};
+    /// The axes as they were given, kept by AddDatum: normalising twice may change the last bit.
+    gsl_Vector givenAxes[3];
 };
 
 /// One entry of a set of the assembly: members in the mesh of an instance, or in the assembly's own mesh when

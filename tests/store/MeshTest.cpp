@@ -130,7 +130,7 @@ TEST(Mesh, BadNodesOfAProgram_RaiseAtTheFirst) {
               }),
               "/labels/0: found 0, expected a positive label");
     EXPECT_EQ(Raised([&] { mesh.SetNodes({1}, {}); }),
-              "/coordinates: found 0 points for 1 labels, expected one for each");
+              "/coordinates: found 0 points for 1 label, expected one for each");
 }
 
 TEST(Mesh, Elements_HoldNodeIndicesByClass) {
@@ -193,7 +193,7 @@ TEST(Mesh, NodesForElementsWithoutAny_AreAnErrorOfTheirCount) {
     EXPECT_EQ(Raised([&] {
                   mesh.AddElements("T3D2", {1}, 0, {99, 98});
               }),
-              "/connectivity: found 2 nodes, expected 0 for each of 1 labels");
+              "/connectivity: found 2 nodes, expected 0 for each of 1 label");
     EXPECT_TRUE(mesh.Classes().empty());
 }
 

@@ -1,0 +1,54 @@
+#include "hostile/Findings.h"
+
+#include "model_file/mdf_ModelFile.h"
+
+std::vector<std::string> Findings(std::string_view text) {
+    mdf_Report report;
+    const auto odb = mdf_ReadModelText(text, "m.json", report);
+    EXPECT_EQ(odb == nullptr, report.HasErrors());
+    std::vector<std::string> findings;
+    for (const mdf_Message& message : report.messages) {
+        const std::string line = report.Line(message);
+        // What the program prints begins with the file, the place in it and the kind.
+        const std::string place =
+            message.line > 0 ? std::to_string(message.line) + ":" + std::to_string(message.column) + ":" : "";
+        const std::string head = "m.json:" + place + (message.isError ? " error: " : " warning: ");
+        EXPECT_EQ(line.substr(0, head.size()), head);
+        std::string finding = line.substr(head.size());
+        constexpr std::string_view prefix = "/models/Default Model";
+        if (finding.starts_with(prefix)) finding.replace(0, prefix.size(), "@");
+        if (!place.empty()) finding.insert(0, place + " ");
+        if (message.pointer.empty() && place.empty()) finding.insert(0, ": ");
+        findings.push_back((message.isError ? "" : "warning ") + finding);
+    }
+    return findings;
+}
+
+std::string Model(std::string_view members) {
+    return R"({"format": "qrx-model/1", "models": {"Default Model": {)" + std::string(members) + "}}}";
+}
+
+std::string Mesh(std::string_view members) {
+    return Model(R"("parts": {"P": {"mesh": {)" + std::string(members) + "}}}");
+}
+
+std::string Whole(std::string_view assemblyMembers, std::string_view modelMembers) {
+    std::string members = R"("parts": {"Q": {}, "P": {"mesh": {
+        "nodes": {"labels": {"from": 1, "to": 8}, "coordinates": [[0, 0, 0], [1, 0, 0], [1, 1, 0], [0, 1, 0],
+                                                                  [0, 0, 1], [1, 0, 1], [1, 1, 1], [0, 1, 1]]},
+        "elements": [
+            {"type": "C3D8", "labels": [1, 2], "connectivity": [[1, 2, 3, 4, 5, 6, 7, 8], [1, 2, 3, 4, 5, 6, 7, 8]]},
+            {"type": "S4", "labels": [3], "connectivity": [[1, 2, 3, 4]]},
+            {"type": "B31", "labels": [4], "connectivity": [[1, 2]]},
+            {"type": "MASS", "labels": [5], "connectivity": [[1]]}],
+        "sets": [{"name": "ALL", "kind": "element", "labels": {"from": 1, "to": 5}},
+                 {"name": "NODES", "kind": "node", "labels": [1, 2]},
+                 {"name": "TOP", "kind": "surface", "facets": [[1, "S2"]]},
+                 {"name": "A.B", "kind": "node", "labels": [3]}]}}},
+        "assembly": {"instances": {"I": {"part": "P"}, "J": {"part": "P", "translation": [2, 0, 0]},
+                                   "E": {"part": "P", "partInstance": false}})";
+    if (!assemblyMembers.empty()) members.append(", ").append(assemblyMembers);
+    members += "}";
+    if (!modelMembers.empty()) members.append(", ").append(modelMembers);
+    return Model(members);
+}

@@ -1,0 +1,77 @@
+#include "model_file/mdf_ModelFile.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+#include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
+
+#include <sstream>
+
+namespace {
+
+using Json = nlohmann::json;
+
+const Json& Schema() {
+    static const Json schema = [] {
+        std::ostringstream out;
+        EXPECT_TRUE(mdf_WriteSchema(out));
+        return Json::parse(out.str());
+    }();
+    return schema;
+}
+
+/// The targets of all references below a place.
+void CollectReferences(const Json& place, std::vector<std::string>& references) {
+    if (place.is_object()) {
+        for (const auto& [name, member] : place.items()) {
+            if (name == "$ref" && member.is_string()) references.push_back(member.get<std::string>());
+            CollectReferences(member, references);
+        }
+    } else if (place.is_array()) {
+        for (const Json& item : place) CollectReferences(item, references);
+    }
+}
+
+} // namespace
+
+TEST(ModelFileSchema, Text_IsJsonOfTheNewestDraft) {
+    EXPECT_EQ(Schema().at("$schema"), "https://json-schema.org/draft/2020-12/schema");
+    EXPECT_EQ(Schema().at("type"), "object");
+}
+
+TEST(ModelFileSchema, EveryConcreteClass_HasADocumentedDefinition) {
+    for (const cls_ClassEntry& entry : cls_Classes().All()) {
+        if (entry.create == nullptr) continue;
+        ASSERT_TRUE(Schema().at("$defs").contains(entry.info.name)) << entry.info.name;
+        const Json& definition = Schema().at("$defs").at(entry.info.name);
+        EXPECT_EQ(definition.at("description"), entry.info.doc);
+        EXPECT_EQ(definition.at("additionalProperties"), false);
+    }
+}
+
+TEST(ModelFileSchema, EveryField_IsThereWithItsDocumentation) {
+    int fields = 0;
+    for (const cls_ClassEntry& entry : cls_Classes().All()) {
+        if (entry.create == nullptr) continue;
+        const Json& properties = Schema().at("$defs").at(entry.info.name).at("properties");
+        for (const cls_Field& field : entry.fields().All()) {
+            SCOPED_TRACE(std::string(entry.info.name) + "::" + field.name);
+            EXPECT_EQ(properties.contains(field.name), !field.notModelData);
+            if (field.notModelData) continue;
+            ++fields;
+            const std::string description = properties.at(field.name).value("description", "");
+            EXPECT_FALSE(description.empty());
+            EXPECT_TRUE(description.starts_with(field.doc)) << description;
+        }
+    }
+    EXPECT_GT(fields, 40);
+}
+
+TEST(ModelFileSchema, EveryReference_HasItsDefinition) {
+    std::vector<std::string> references;
+    CollectReferences(Schema(), references);
+    ASSERT_FALSE(references.empty());
+    for (const std::string& reference : references) {
+        ASSERT_TRUE(reference.starts_with("#/$defs/")) << reference;
+        EXPECT_TRUE(Schema().at("$defs").contains(reference.substr(8))) << reference;
+    }
+}
