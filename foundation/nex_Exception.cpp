@@ -28,8 +28,8 @@ atr_String nex_Context::Text() {
     std::string text;
     for (const nex_Context* frame = innermost; frame != nullptr; frame = frame->outer_) {
         std::string piece(frame->kind_);
-        piece.append(" '").append(frame->name_->View()).append("'");
-        text = text.empty() ? piece : piece + ", " + text;
+        piece.append(" '").append(frame->name_->View()).append(text.empty() ? "'" : "', ");
+        text.insert(0, piece);
     }
     return atr_String(std::string_view(text));
 }

@@ -40,6 +40,23 @@ private:
     int numWarnings_ = 0;
 };
 
+/// Hands on what the store finds, below a path.
+class mdf_StoreProblems : public odiK_Problems {
+public:
+    mdf_StoreProblems(mdf_Diagnostics& diagnostics, const mdf_Path& path)
+        : diagnostics_(diagnostics), path_(path) {}
+    void Error(const std::string& place, const std::string& text) override {
+        diagnostics_.Error(path_.Text() + place, text);
+    }
+    void Warning(const std::string& place, const std::string& text) override {
+        diagnostics_.Warning(path_.Text() + place, text);
+    }
+
+private:
+    mdf_Diagnostics& diagnostics_;
+    const mdf_Path& path_;
+};
+
 /// A value as messages show it: short texts and numbers as they stand, else what kind of thing it is.
 std::string mdf_Shown(const mdf_Value& value);
 std::string mdf_Quoted(std::string_view text);

@@ -15,22 +15,6 @@ std::size_t NumElements(const cow_CountedHld<odiK_Mesh>& mesh) {
 
 } // namespace
 
-/// Hands what the store finds on to the diagnostics, below a path.
-class mdf_MeshReader::Problems : public odiK_Problems {
-public:
-    Problems(mdf_Diagnostics& diagnostics, const mdf_Path& path) : diagnostics_(diagnostics), path_(path) {}
-    void Error(const std::string& place, const std::string& text) override {
-        diagnostics_.Error(path_.Text() + place, text);
-    }
-    void Warning(const std::string& place, const std::string& text) override {
-        diagnostics_.Warning(path_.Text() + place, text);
-    }
-
-private:
-    mdf_Diagnostics& diagnostics_;
-    const mdf_Path& path_;
-};
-
 cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Path& path) {
     cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
     if (!json.IsObject()) {
@@ -53,7 +37,7 @@ void mdf_MeshReader::ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, cons
         ReadElements(mesh, *elements, mdf_Path(path, "elements"), inAssembly);
         if (mesh.Classes().size() != classes) incomplete_.insert(&mesh);
     }
-    Problems problems(diagnostics_, path);
+    mdf_StoreProblems problems(diagnostics_, path);
     mesh.FinishElements(problems);
 }
 
@@ -129,7 +113,7 @@ void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path&
         }
     }
     if (!good) return;
-    Problems problems(diagnostics_, path);
+    mdf_StoreProblems problems(diagnostics_, path);
     mesh.SetNodes(std::move(labels), std::move(xyz), problems);
 }
 
@@ -249,7 +233,7 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const md
     }
     int width = 0;
     std::vector<int> nodes;
-    Problems problems(diagnostics_, path);
+    mdf_StoreProblems problems(diagnostics_, path);
     if (inAssembly) {
         if (!ReadScopedConnectivity(mesh, *connectivity, connectivityPath, count, width, nodes)) return;
         if (IsIncomplete(&mesh)) return;
@@ -453,7 +437,8 @@ bool mdf_MeshReader::ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_
     return true;
 }
 
-void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
+template <class Reader>
+void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Reader& read) {
     if (!json.IsArray() || (json.Kind() != mdf_Kind::Array && !json.Empty())) {
         diagnostics_.Expected(path, json, "an array of sets");
         return;
@@ -462,45 +447,37 @@ void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& 
     for (std::size_t i = 0; i < json.Size(); ++i) {
         mdf_Value& set = json.Items()[i];
         const mdf_Path place(path, i);
+        SetHead head;
         if (!set.IsObject()) {
             diagnostics_.Expected(place, set, "an object");
-            continue;
+        } else if (ReadSetHead(head, set, place, capitals)) {
+            read(set, place, head);
         }
-        SetHead head;
-        if (!ReadSetHead(head, set, place, capitals)) continue;
+    }
+}
+
+void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
+    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const SetHead& head) {
         const bool facets = head.type == res_SetTypeEnm::FACETS;
         records_.CheckMembers(set, {"name", "kind", "internal", facets ? "facets" : "labels"}, place);
-        Problems problems(diagnostics_, place);
+        mdf_StoreProblems problems(diagnostics_, place);
         if (IsIncomplete(&mesh)) {
             mesh.AddSet({head.name, head.type, head.internal, {}, {}}, problems);
-            continue;
+            return;
         }
         const int most = head.type == res_SetTypeEnm::NODES ? mesh.Nodes().NumNodes() : mesh.NumElements();
         Members members;
         if (!ReadMembers(members, head.type, set, place, static_cast<std::size_t>(most))) {
             records_.NoteWrong(head.name.View());
-            continue;
+            return;
         }
         if (members.empty) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
         mesh.AddSet({head.name, head.type, head.internal, members.labels, members.facets}, problems);
-    }
+    });
 }
 
 void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
-    if (!json.IsArray() || (json.Kind() != mdf_Kind::Array && !json.Empty())) {
-        diagnostics_.Expected(path, json, "an array of sets");
-        return;
-    }
-    mdf_CapitalsCheck capitals;
-    for (std::size_t i = 0; i < json.Size(); ++i) {
-        mdf_Value& set = json.Items()[i];
-        const mdf_Path place(path, i);
-        if (!set.IsObject()) {
-            diagnostics_.Expected(place, set, "an object");
-            continue;
-        }
-        SetHead head;
-        if (!ReadSetHead(head, set, place, capitals)) continue;
+    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const SetHead& head) {
         records_.CheckMembers(set, {"name", "kind", "internal", "members"}, place);
         mdf_Value* entries = set.Find("members");
         const mdf_Path entriesPath(place, "members");
@@ -510,7 +487,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
                 entriesPath, "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)) +
                                  ", expected an array of members");
             records_.NoteWrong(head.name.View());
-            continue;
+            return;
         }
         if (entries->Empty()) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
         std::vector<Members> members(entries->Size());
@@ -558,9 +535,9 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
         }
         if (!good) {
             records_.NoteWrong(head.name.View());
-            continue;
+            return;
         }
-        Problems problems(diagnostics_, place);
+        mdf_StoreProblems problems(diagnostics_, place);
         model_.AddAssemblySet(head.name, head.type, head.internal, inputs, problems);
-    }
+    });
 }

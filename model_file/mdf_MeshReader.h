@@ -18,7 +18,6 @@ public:
     void ReadAssemblySets(mdf_Value& json, const mdf_Path& path);
 
 private:
-    class Problems;
     struct SetHead {
         cow_String name;
         res_SetTypeEnm type = res_SetTypeEnm::NODES;
@@ -40,6 +39,9 @@ private:
     bool ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path,
                                 std::size_t numElements, int& width, std::vector<int>& nodes);
     int ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path);
+    /// Calls `read(set, path, head)` for each set whose head is good.
+    template <class Reader>
+    void ForEachSet(mdf_Value& json, const mdf_Path& path, const Reader& read);
     void ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
     bool ReadSetHead(SetHead& head, const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals);
     bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,

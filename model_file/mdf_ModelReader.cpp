@@ -106,22 +106,7 @@ void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
     Propagate(path);
     if (diagnostics_.NumErrors() > 0) return;
 
-    class Problems : public odiK_Problems {
-    public:
-        Problems(mdf_Diagnostics& diagnostics, const mdf_Path& path)
-            : diagnostics_(diagnostics), path_(path) {}
-        void Error(const std::string& place, const std::string& text) override {
-            diagnostics_.Error(path_.Text() + place, text);
-        }
-        void Warning(const std::string& place, const std::string& text) override {
-            diagnostics_.Warning(path_.Text() + place, text);
-        }
-
-    private:
-        mdf_Diagnostics& diagnostics_;
-        const mdf_Path& path_;
-    };
-    Problems problems(diagnostics_, path);
+    mdf_StoreProblems problems(diagnostics_, path);
     model_.CompleteTree(problems);
     model_.SetComplete();
 }

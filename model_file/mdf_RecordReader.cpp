@@ -29,6 +29,7 @@ std::string MeaningWord(const cls_IntMeaning& meaning) {
 
 std::vector<std::string> mdf_Names(const cow_List<cow_String>& names) {
     std::vector<std::string> copies;
+    copies.reserve(static_cast<std::size_t>(names.Length()));
     for (int i = 0; i < names.Length(); ++i) copies.push_back(Text(names[i]));
     return copies;
 }
@@ -81,6 +82,7 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     }
     const auto classes = cls_Classes().ConcreteClasses(base);
     std::vector<std::string> names;
+    names.reserve(classes.size());
     for (const cls_ClassEntry* entry : classes) names.emplace_back(entry->info.name);
     const mdf_Value* name = object.Find("class");
     const mdf_Path place(path, "class");
@@ -440,7 +442,7 @@ rgnC_Region mdf_RecordReader::ReadRegion(const mdf_Value& value, const mdf_Path&
         diagnostics_.Expected(path, value, "\"SET\", \"INSTANCE.SET\", an object of both names, or null");
         return {};
     }
-    const rgnC_Region region = model_.FindRegion(cow_String(instance), cow_String(set));
+    rgnC_Region region = model_.FindRegion(cow_String(instance), cow_String(set));
     if (region.HasValue()) return region;
 
     const odiK_Instance* owner = model_.FindInstance(cow_String(instance));

@@ -14,7 +14,7 @@ END
 }
 
 build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev)
-test=(libgtest-dev librapidcheck-dev pkg-config python3 python3-jsonschema)
+test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
 bench=(libbenchmark-dev libfmt-dev)
 dev=(clang clang-tidy clang-format)
 

@@ -181,7 +181,7 @@ Found Suppressed(const odb_Odb&, const odiK_Model& model) {
     return Named(std::move(names));
 }
 
-const LeftOutRule kLeftOutRules[] = {
+constexpr LeftOutRule kLeftOutRules[] = {
     {"other models", "a deck is always written from \"Default Model\"", OtherModels},
     {"parts without an instance", "only instances show a mesh", IdleParts},
     {"entries of the assembly", "they are no part instances", OtherEntries},
