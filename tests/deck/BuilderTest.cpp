@@ -26,6 +26,11 @@ public:
     }
 };
 
+class OtherFormatInfo : public oif_ModelInfo {
+public:
+    explicit OtherFormatInfo(const ddb_Model& model) : oif_ModelInfo(model) { SetV6Format(false); }
+};
+
 std::string TextOf(const qkw_KeywordList& keywords) {
     std::string text;
     for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
@@ -149,6 +154,19 @@ TEST(Builder, TwoInstancesOfOnePart_CloseThePartOnce) {
                                   "assembly text\n"
                                   "*End Assembly\n"
                                   "model text\n");
+}
+
+TEST(Builder, OtherFormat_HasNoBannersAndNoOpeningOrClosingLinesOfInstances) {
+    TestStore store;
+    store.AddPart("P", {}).solverInput = "part text";
+    store.model.AddInstance("I", "P").solverInput = "instance text";
+    store.model.assemblySolverInput = "assembly text";
+    OtherFormatInfo info(store.View());
+    oif_Builder builder(info);
+    const std::string path = ::testing::TempDir() + "other_format.inp";
+    EXPECT_TRUE(builder.WriteInputFile(path));
+    EXPECT_EQ(FileText(path), "part text\n*End Part\ninstance text\nassembly text\n");
+    std::remove(path.c_str());
 }
 
 TEST(Builder, PathThatCannotBeOpened_GivesFalseAndNoException) {

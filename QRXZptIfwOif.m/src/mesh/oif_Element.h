@@ -68,7 +68,7 @@ public:
 
 private:
     rgnC_Region region_;
-    cow_String setName_;
+    [[maybe_unused]] cow_String setName_;
     const oif_ModelInfo* modelInfo_;
 };
 

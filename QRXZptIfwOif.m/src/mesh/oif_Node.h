@@ -25,7 +25,7 @@ public:
 private:
     void WriteDataLine(utl_Stream& stream, int label, float x, float y, float z) const;
 
-    int sourceKind_ = 0; // 1: a part instance
+    [[maybe_unused]] int sourceKind_ = 0; // 1: a part instance; nothing reads it
     bool threeDimensional_ = true;
     double smallReal_ = 0.0;
     std::optional<ddb_NodeData> nodeData_;

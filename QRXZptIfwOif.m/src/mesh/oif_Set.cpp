@@ -95,7 +95,9 @@ void oif_Set::AppendFacets(const rgnC_SubsetData& subset, const odiK_ElementClas
     const ddb_FaceRule rule = ddb_FaceRuleOf(elements.shape);
     // One text a face, shared by all facets that have it.
     std::vector<cow_String> names;
-    const auto numbered = [&](int id) -> const cow_String& {
+    const auto numbered = [&](int id) {
+        constexpr int most = 64;
+        if (id < 0 || id >= most) return cow_String(rule.prefix) + cow_String(id + 1);
         while (static_cast<int>(names.size()) <= id) {
             names.push_back(cow_String(rule.prefix) + cow_String(static_cast<int>(names.size()) + 1));
         }
