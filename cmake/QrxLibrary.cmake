@@ -18,7 +18,7 @@ set_target_properties(QRXZptInputFileWriter PROPERTIES
 set(qrx_include_dir ${CMAKE_INSTALL_INCLUDEDIR}/${QRX_INCLUDE_SUBDIR})
 foreach(layer foundation store_interface keyword_layer)
     install(DIRECTORY ${PROJECT_SOURCE_DIR}/${layer}/ DESTINATION ${qrx_include_dir}/${layer}
-        FILES_MATCHING PATTERN "*.h")
+        FILES_MATCHING PATTERN "*.h" PATTERN "*.inl")
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src/ DESTINATION ${qrx_include_dir} OPTIONAL
     FILES_MATCHING PATTERN "*.h")

@@ -1,12 +1,19 @@
-#include "foundation/cow_List.h"
-#include "foundation/cow_String.h"
+#include "deck/oif_Writer.h"
+#include "foundation/qio_Device.h"
+#include "store_interface/model/odb_Odb.h"
 
 #include <cstdio>
 
 int main() {
-    const cow_String instance("Part-1-1.");
-    cow_List<cow_String> names;
-    for (int i = 1; i <= 2; ++i) names.Append(instance + cow_String("Set-") + cow_String(i));
-    std::printf("%s %s\n", names[0].CStr(), names[1].CStr());
-    return names.Length() == 2 ? 0 : 1;
+    odb_Odb odb;
+    odiK_Model& model = odb.AddModel(odb_Odb::DefaultModelName());
+    odiK_Part& part = model.AddPart("ROD");
+    part.mesh.Reset(new odiK_Mesh());
+    part.mesh->SetNodes({1, 2}, {0.0F, 0.0F, 0.0F, 100.0F, 0.0F, 0.0F});
+    part.mesh->AddElements("T3D2", {1}, 2, {1, 2});
+    model.AddInstance("ROD-1", "ROD");
+    oif_Writer(odb).WriteInputFile("consumer");
+    // The deck's length by hand: banners, part, assembly, instance, two nodes and one element.
+    std::printf("consumer.inp: %lld bytes\n", qio_LastReport().bytes);
+    return qio_LastReport().opened && qio_LastReport().error == 0 ? 0 : 1;
 }
