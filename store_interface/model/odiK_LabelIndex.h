@@ -21,6 +21,12 @@ public:
         return FindSorted(label);
     }
 
+    /// Whether the labels run without a gap, the one at place i being `first` + i.
+    bool IsRun(int& first) const {
+        first = static_cast<int>(first_);
+        return form_ == Form::RUN;
+    }
+
 private:
     enum class Form { RUN, TABLE, SORTED };
 

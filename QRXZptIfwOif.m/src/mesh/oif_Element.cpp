@@ -4,7 +4,8 @@
 #include "keyword_layer/qkw_QuorixName.h"
 
 #include <algorithm>
-#include <string>
+#include <cstring>
+#include <vector>
 
 namespace {
 
@@ -47,42 +48,92 @@ void oif_Element::Write(utl_Stream& stream) const {
     if (withHeader_) stream.Flush();
 }
 
-int oif_Element::NodeLabel(int index) const {
-    return mesh_ ? mesh_->mesh().Nodes().labels[index] : index;
-}
-
 void oif_Element::WriteConnectivity(utl_Stream& stream) const {
     const std::vector<int>& connectivity = elements_->elementConnectivity();
+    // The first walk finds the widest label, and with it any index that has no label.
+    if (!mesh_) {
+        const auto largest = std::max_element(connectivity.begin(), connectivity.end());
+        WriteRows(
+            stream, [](int index) { return index; }, largest == connectivity.end() ? 0 : *largest);
+        return;
+    }
+    const odiK_NodeData& nodes = mesh_->mesh().Nodes();
+    int largestIndex = 0;
+    unsigned outside = 0;
+    const auto count = static_cast<unsigned>(nodes.NumNodes());
+    for (const int index : connectivity) {
+        largestIndex = std::max(largestIndex, index);
+        outside |= static_cast<unsigned>(static_cast<unsigned>(index) >= count);
+    }
+    if (outside != 0) {
+        for (const int index : connectivity) nodes.labels.CheckIndex(index);
+    }
+    int first = 0;
+    if (nodes.index.IsRun(first)) {
+        WriteRows(
+            stream, [first](int index) { return first + index; },
+            connectivity.empty() ? 0 : first + largestIndex);
+        return;
+    }
+    // The blocks of the label list, so that a look-up reads two addresses and no counts.
+    const cow_List<int>& labels = nodes.labels;
+    const int shift = labels.Shift();
+    const int mask = (1 << shift) - 1;
+    const int begin = labels.First();
+    std::vector<const int*> blocks(static_cast<std::size_t>(begin >> shift), nullptr);
+    for (int i = 0; i < labels.Length();) {
+        int length = 0;
+        const int* run = labels.ConstRun(i, length);
+        blocks.push_back(run - ((begin + i) & mask));
+        i += length;
+    }
+    const auto labelOf = [table = blocks.data(), shift, mask, begin](int index) {
+        return table[(begin + index) >> shift][(begin + index) & mask];
+    };
+    int largest = 0;
+    for (const int index : connectivity) largest = std::max(largest, labelOf(index));
+    WriteRows(stream, labelOf, largest);
+}
+
+template <class LabelOf>
+void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode) const {
+    // Sixteen numbers of eleven characters, their commas and the indent.
+    constexpr std::size_t lineRoom = 256;
+    static_assert(lineRoom + num_IntRoom(kWidestNodeField) <= utl_Stream::kSlack);
+
     const std::vector<int>& labels = elements_->userElementLabelsAsFlatArray();
     const int numNodes = elements_->numNodesPerElement();
-
-    // The first walk finds the widths, and with them any index that has no label.
-    int largestNode = 0;
-    for (const int index : connectivity) largestNode = std::max(largestNode, NodeLabel(index));
     const int nodeWidth = std::min(NumDigits(largestNode) + 1, kWidestNodeField);
     int largestElement = 0;
     for (const int label : labels) largestElement = std::max(largestElement, label);
     const int elementWidth = NumDigits(largestElement);
-    const std::string indent(static_cast<std::size_t>(elementWidth) + 1, ' ');
+    const auto indent = static_cast<std::size_t>(elementWidth) + 1;
 
-    const int* node = connectivity.data();
+    const int* node = elements_->elementConnectivity().data();
     for (const int label : labels) {
-        stream.Print(label, elementWidth);
-        stream << ",";
+        char* out = num_WriteInt(stream.Reserve(utl_Stream::kSlack), label, elementWidth);
+        *out++ = ',';
         for (int j = 0; j < numNodes; ++j, ++node) {
             const int place = j + 2;
             const bool last = j == numNodes - 1;
             // The last number of an element is never indented, also where it begins a line.
-            if (!last && place % kPlacesOfLine == 1) stream << indent.c_str();
-            stream.Print(mesh_ ? mesh_->mesh().Nodes().labels.UncheckedConstGet(*node) : *node, nodeWidth);
+            if (!last && place % kPlacesOfLine == 1) {
+                std::memset(out, ' ', indent);
+                out += indent;
+            }
+            out = num_WriteInt(out, labelOf(*node), nodeWidth);
             if (last) {
-                stream << "\n";
+                *out++ = '\n';
             } else if (place % kPlacesOfLine == 0) {
-                stream << ",\n";
+                *out++ = ',';
+                *out++ = '\n';
+                stream.Commit(out);
+                out = stream.Reserve(utl_Stream::kSlack);
             } else {
-                stream << ",";
+                *out++ = ',';
             }
         }
+        stream.Commit(out);
     }
 }
 

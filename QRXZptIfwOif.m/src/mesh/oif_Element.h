@@ -26,7 +26,8 @@ public:
 
 private:
     void WriteConnectivity(utl_Stream& stream) const;
-    int NodeLabel(int index) const;
+    template <class LabelOf>
+    void WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode) const;
 
     int firstNumber_;
     int secondNumber_;
