@@ -3,8 +3,7 @@
 #include "deck/oif_Comment.h"
 #include "deck/oif_Writer.h"
 #include "support/DeckTest.h"
-
-#include <cstdio>
+#include "support/TestFolder.h"
 
 namespace {
 
@@ -38,13 +37,12 @@ std::string TextOf(const qkw_KeywordList& keywords) {
 }
 
 std::string WrittenDeck(TestStore& store) {
-    const std::string job = ::testing::TempDir() + "builder_test";
-    oif_Writer(store.odb).WriteInputFile(job.c_str());
+    const TestFolder folder;
+    oif_Writer(store.odb).WriteInputFile(folder.Path("job").c_str());
     EXPECT_TRUE(qio_LastReport().opened);
     EXPECT_EQ(qio_LastReport().error, 0);
-    std::string text = FileText(job + ".inp");
+    std::string text = folder.Text("job.inp");
     EXPECT_EQ(qio_LastReport().bytes, static_cast<long long>(text.size()));
-    std::remove((job + ".inp").c_str());
     return text;
 }
 
@@ -163,35 +161,35 @@ TEST(Builder, OtherFormat_HasNoBannersAndNoOpeningOrClosingLinesOfInstances) {
     store.model.assemblySolverInput = "assembly text";
     OtherFormatInfo info(store.View());
     oif_Builder builder(info);
-    const std::string path = ::testing::TempDir() + "other_format.inp";
-    EXPECT_TRUE(builder.WriteInputFile(path));
-    EXPECT_EQ(FileText(path), "part text\n*End Part\ninstance text\nassembly text\n");
-    std::remove(path.c_str());
+    const TestFolder folder;
+    EXPECT_TRUE(builder.WriteInputFile(folder.Path("other.inp")));
+    EXPECT_EQ(folder.Text("other.inp"), "part text\n*End Part\ninstance text\nassembly text\n");
 }
 
 TEST(Builder, PathThatCannotBeOpened_GivesFalseAndNoException) {
     TestStore store;
     oif_Builder builder(store.Info());
-    EXPECT_FALSE(builder.WriteInputFile(::testing::TempDir() + "no/such/folder/deck.inp"));
+    const TestFolder folder;
+    EXPECT_FALSE(builder.WriteInputFile(folder.Path("no/such/folder/deck.inp")));
     EXPECT_FALSE(qio_LastReport().opened);
     EXPECT_NE(qio_LastReport().error, 0);
 }
 
 TEST(Writer, JobNameWithExtension_KeepsItAndGetsAnother) {
     TestStore store;
-    const std::string job = ::testing::TempDir() + "job.v2.inp";
-    oif_Writer(store.odb).WriteInputFile(job.c_str());
-    EXPECT_FALSE(FileText(job + ".inp").empty());
-    std::remove((job + ".inp").c_str());
+    const TestFolder folder;
+    oif_Writer(store.odb).WriteInputFile(folder.Path("job.v2.inp").c_str());
+    EXPECT_EQ(folder.Entries(), std::vector<std::string>{"job.v2.inp.inp"});
+    EXPECT_FALSE(folder.Text("job.v2.inp.inp").empty());
 }
 
 TEST(Writer, OldDeck_IsReplacedWhole) {
     TestStore store;
-    const std::string job = ::testing::TempDir() + "old";
-    std::ofstream(job + ".inp") << std::string(100000, 'x');
-    oif_Writer(store.odb).WriteInputFile(job.c_str());
-    EXPECT_EQ(FileText(job + ".inp").find('x'), std::string::npos);
-    std::remove((job + ".inp").c_str());
+    const TestFolder folder;
+    folder.Put("old.inp", std::string(100000, 'x'));
+    oif_Writer(store.odb).WriteInputFile(folder.Path("old").c_str());
+    EXPECT_FALSE(folder.Text("old.inp").empty());
+    EXPECT_EQ(folder.Text("old.inp").find('x'), std::string::npos);
 }
 
 TEST(Writer, StoreWithoutDefaultModel_Raises) {

@@ -1,6 +1,7 @@
 #include "deck/oif_Writer.h"
 #include "faults/FailingAllocations.h"
 #include "faults/Store.h"
+#include "support/TestFolder.h"
 #include "tools/DeckFile.h"
 
 #include <gtest/gtest.h>

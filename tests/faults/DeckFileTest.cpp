@@ -4,6 +4,7 @@
 #include "faults/Store.h"
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
+#include "support/TestFolder.h"
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,8 @@
 #include "faults/Store.h"
 
-#include <algorithm>
-#include <fstream>
 #include <numeric>
-#include <random>
-#include <sstream>
+#include <string>
+#include <vector>
 
 void FillStore(odb_Odb& odb, int nodes) {
     odiK_Model& model = odb.AddModel(odb_Odb::DefaultModelName());
@@ -31,34 +29,4 @@ void FillStore(odb_Odb& odb, int nodes) {
     const std::vector<odiK_MemberInput> members = {{"A", tip, {}}, {"B", tip, {}}};
     model.AddAssemblySet("TIPS", res_SetTypeEnm::NODES, members);
     model.steps.Append("Initial", kprC_InitialStep());
-}
-
-TestFolder::TestFolder()
-    : path_(std::filesystem::temp_directory_path() /
-            ("qrx_faults_" + std::to_string(std::random_device()()))) {
-    std::filesystem::create_directory(path_);
-}
-
-TestFolder::~TestFolder() {
-    std::error_code ignored;
-    std::filesystem::remove_all(path_, ignored);
-}
-
-std::vector<std::string> TestFolder::Entries() const {
-    std::vector<std::string> names;
-    for (const auto& entry : std::filesystem::directory_iterator(path_)) {
-        names.push_back(entry.path().filename().string());
-    }
-    std::sort(names.begin(), names.end());
-    return names;
-}
-
-void TestFolder::Put(const std::string& name, const std::string& text) const {
-    std::ofstream(Path(name), std::ios::binary) << text;
-}
-
-std::string TestFolder::Text(const std::string& name) const {
-    std::ostringstream text;
-    text << std::ifstream(Path(name), std::ios::binary).rdbuf();
-    return text.str();
 }

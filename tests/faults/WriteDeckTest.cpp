@@ -1,5 +1,6 @@
 #include "faults/Store.h"
 #include "foundation/qio_Device.h"
+#include "support/TestFolder.h"
 #include "tools/Commands.h"
 
 #include <gtest/gtest.h>

@@ -1,9 +1,8 @@
 #include "model_file/mdf_Parser.h"
+#include "support/TestFolder.h"
 
 #include <gtest/gtest.h>
 
-#include <cstdio>
-#include <filesystem>
 #include <fstream>
 #include <ostream>
 #include <string>
@@ -165,7 +164,8 @@ TEST(ModelFileErrors, AppendPointer_WithTildeAndSlash_Escapes) {
 }
 
 TEST(ModelFileReadFile, Text_WithAnyBytes_ComesUnchanged) {
-    const std::string path = testing::TempDir() + "mdf_ReadFile.json";
+    const TestFolder folder;
+    const std::string path = folder.Path("model.json");
     const std::string written("a\r\n\0\xFF\x1A z", 9);
     std::ofstream(path, std::ios::binary) << written;
     std::string text = "old";
@@ -175,20 +175,19 @@ TEST(ModelFileReadFile, Text_WithAnyBytes_ComesUnchanged) {
     std::ofstream(path, std::ios::binary | std::ios::trunc).flush();
     EXPECT_TRUE(mdf_ReadFile(path, text, error));
     EXPECT_EQ(text, "");
-    std::filesystem::remove(path);
 }
 
 TEST(ModelFileReadFile, Path_OfNoFile_IsAnErrorInTheSystemsWords) {
     std::string text;
     mdf_Error error;
-    EXPECT_FALSE(mdf_ReadFile(testing::TempDir() + "no such file.json", text, error));
+    EXPECT_FALSE(mdf_ReadFile(TestFolder().Path("no such file.json"), text, error));
     EXPECT_EQ(error.text, "the file can't be read: No such file or directory");
 }
 
 TEST(ModelFileReadFile, Path_OfAFolder_IsAnErrorInTheSystemsWords) {
     std::string text;
     mdf_Error error;
-    EXPECT_FALSE(mdf_ReadFile(testing::TempDir(), text, error));
+    EXPECT_FALSE(mdf_ReadFile(TestFolder().Path(), text, error));
     EXPECT_EQ(error.text, "the file can't be read: Is a directory");
     EXPECT_EQ(error.Message("x"), "x: the file can't be read: Is a directory");
 }

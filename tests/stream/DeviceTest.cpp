@@ -1,13 +1,12 @@
 #include "foundation/qio_Device.h"
 #include "foundation/utl_Stream.h"
+#include "support/TestFolder.h"
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cerrno>
-#include <filesystem>
 #include <fstream>
-#include <random>
 #include <sstream>
 #include <string>
 
@@ -58,13 +57,12 @@ int FaultyClose(std::FILE* file) {
 
 class Device : public testing::Test {
 protected:
-    Device() : path_(testing::TempDir() + "qrx_device_test_" + std::to_string(std::random_device()())) {
+    Device() : path_(folder_.Path("device")) {
         standard = qio_CurrentSystem();
         faults = Faults();
     }
     ~Device() override {
         qio_CurrentSystem() = standard;
-        std::filesystem::remove(path_);
     }
 
     static qio_System FaultySystem() {
@@ -96,6 +94,7 @@ protected:
         return text.str();
     }
 
+    TestFolder folder_;
     std::string path_;
 };
 

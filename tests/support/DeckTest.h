@@ -95,12 +95,6 @@ inline void KnowTestSteps() {
     if (cls_Classes().Find(TestExplicitStep::TypeId()) == nullptr) cls_Classes().Add<TestExplicitStep>();
 }
 
-inline std::string FileText(const std::string& path) {
-    std::ifstream in(path, std::ios::binary);
-    std::ostringstream text;
-    text << in.rdbuf();
-    return text.str();
-}
 
 /// The text that the action raises as an exception of the system; "nothing raised" when it raises none.
 template <class Action>
