@@ -100,21 +100,23 @@ std::string mdf_Quoted(std::string_view text) {
     return quoted.append(Visible(text)).append("'");
 }
 
+std::string mdf_Shown(double value) {
+    char text[40];
+    std::string shown(text, std::to_chars(text, text + sizeof text, value).ptr);
+    if (shown.find_first_of(".e") == std::string::npos) shown += ".0";
+    return shown;
+}
+
 std::string mdf_Shown(const mdf_Value& value) {
     constexpr std::size_t longest = 60;
     if (value.IsNull()) return "null";
     if (value.IsBool()) return value.Bool() ? "true" : "false";
     if (value.IsInt()) return std::to_string(value.Int());
-    if (value.IsNumber()) {
+    if (value.IsLargeInteger()) {
         char text[400];
-        const auto end =
-            value.IsLargeInteger()
-                ? std::to_chars(text, text + sizeof text, value.Real(), std::chars_format::fixed, 0).ptr
-                : std::to_chars(text, text + sizeof text, value.Real()).ptr;
-        std::string shown(text, end);
-        if (!value.IsLargeInteger() && shown.find_first_of(".e") == std::string::npos) shown += ".0";
-        return shown;
+        return {text, std::to_chars(text, text + sizeof text, value.Real(), std::chars_format::fixed, 0).ptr};
     }
+    if (value.IsNumber()) return mdf_Shown(value.Real());
     if (value.IsString()) {
         const std::string& text = value.String();
         return text.size() <= longest ? mdf_Quoted(text) : mdf_Quoted(Beginning(text, longest)) + "...";

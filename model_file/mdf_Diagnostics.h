@@ -59,6 +59,7 @@ private:
 
 /// A value as messages show it: short texts and numbers as they stand, else what kind of thing it is.
 std::string mdf_Shown(const mdf_Value& value);
+std::string mdf_Shown(double value);
 std::string mdf_Quoted(std::string_view text);
 
 /// The known name that is nearest to `name`, as "; did you mean 'x'?", or nothing when none is near.

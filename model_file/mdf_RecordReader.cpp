@@ -1,9 +1,15 @@
 #include "model_file/mdf_RecordReader.h"
 
+#include "model_file/checks/mdf_RecordChecks.h"
+
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace {
+
+// Stands for a null in a list until all fields are read; no number of a model file is one.
+constexpr double kNullItem = std::numeric_limits<double>::quiet_NaN();
 
 std::string Text(const cow_String& text) {
     return std::string(text.View());
@@ -51,6 +57,7 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
         diagnostics_.Expected(path, object, "an object");
         return;
     }
+    const int errorsBefore = diagnostics_.NumErrors();
     const cls_FieldTable& table = record.DynFields();
     std::vector<std::string> known = FieldNames(table);
     for (const std::string& other : others) {
@@ -72,6 +79,10 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
             json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
         if (missing) diagnostics_.Error(place, std::string("found nothing, expected ") + field.doc);
     }
+    for (const cls_Field& field : table.All()) CompleteList(field, record, path);
+    if (diagnostics_.NumErrors() != errorsBefore) return;
+    mdf_RecordCheck check(diagnostics_, path);
+    mdf_RecordChecks::All().Run(record, check);
 }
 
 std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const mdf_Value& object,
@@ -336,9 +347,34 @@ bool mdf_RecordReader::ReadList(const cls_ListType& type, void* value, const mdf
     type.Clear(value);
     for (std::size_t i = 0; i < json.Size(); ++i) {
         void* item = type.Append(value);
+        if (field.defaultItems != nullptr && json.Item(i).IsNull()) {
+            *static_cast<double*>(item) = kNullItem;
+            continue;
+        }
         ReadValue(type.ItemType(), item, json.Item(i), mdf_Path(path, i), field, false);
     }
     return true;
+}
+
+// Runs when all fields are read, since the default items may depend on some of them.
+void mdf_RecordReader::CompleteList(const cls_Field& field, cls_Record& record, const mdf_Path& path) {
+    if (field.defaultItems == nullptr) return;
+    const cow_List<double> defaults = field.defaultItems(record);
+    auto& items = *static_cast<cow_List<double>*>(field.In(record));
+    for (int i = 0; i < defaults.Length(); ++i) {
+        if (i >= items.Length()) {
+            items.Append(defaults[i]);
+        } else if (std::isnan(items.ConstGet(i))) {
+            items.Get(i) = defaults[i];
+        }
+    }
+    for (int i = defaults.Length(); i < items.Length(); ++i) {
+        if (!std::isnan(items.ConstGet(i))) continue;
+        const mdf_Path listPath(path, std::string_view(field.name));
+        diagnostics_.Error(mdf_Path(listPath, static_cast<std::size_t>(i)),
+                           "found null, expected a number: the list has defaults for the first " +
+                               std::to_string(defaults.Length()) + " items only");
+    }
 }
 
 bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_Value& json,

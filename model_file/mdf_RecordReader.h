@@ -54,6 +54,7 @@ private:
     bool ReadTriple(double (&xyz)[3], const mdf_Value& json, const mdf_Path& path);
     bool ReadList(const cls_ListType& type, void* value, const mdf_Value& json, const mdf_Path& path,
                   const cls_Field& field);
+    void CompleteList(const cls_Field& field, cls_Record& record, const mdf_Path& path);
     bool ReadMap(const cls_MapType& type, void* value, const mdf_Value& json, const mdf_Path& path,
                  const cls_Field& field);
     bool ReadHolder(const cls_HolderType& type, void* value, const mdf_Value& json, const mdf_Path& path);

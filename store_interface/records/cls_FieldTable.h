@@ -165,6 +165,9 @@ struct cls_Field {
     std::span<const cls_IntMeaning> meanings;
     /// For a list: its only permitted length, or 0.
     int length = 0;
+    /// For a list of reals that counts by position: the list that holds where a model file says nothing. An
+    /// item given as null is the item of the same place; a list too short goes on with its tail.
+    cow_List<double> (*defaultItems)(const cls_Record& record) = nullptr;
     /// For a text that the deck takes as it stands: a model file may give it line by line.
     bool verbatim = false;
     /// Absent or empty is an error of a model file.
@@ -221,6 +224,14 @@ public:
     }
     cls_Describe& Verbatim() {
         fields_.back().verbatim = true;
+        return *this;
+    }
+    /// `Items` takes the record as a const C&.
+    template <auto Items>
+    cls_Describe& DefaultItems() {
+        fields_.back().defaultItems = [](const cls_Record& record) {
+            return Items(static_cast<const C&>(record));
+        };
         return *this;
     }
     cls_Describe& Required() {

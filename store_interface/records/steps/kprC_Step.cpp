@@ -1,35 +1,65 @@
 #include "store_interface/records/steps/kprC_Step.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
-
-#include <algorithm>
-#include <iterator>
-
-bool kprC_IsExplicit(unsigned stepType) {
-    return stepType == 0x23C0065 || stepType == 0x23C0069 || stepType == 0x23C007B;
-}
-
-bool kprC_IsPerturbation(unsigned stepType) {
-    static constexpr unsigned procedures[] = {
-        0x23C0066, // buckling
-        0x23C006A, // frequency
-        0x23C006F, // modal dynamics
-        0x23C0070, // random response
-        0x23C0071, // response spectrum
-        0x23C0075, // static linear perturbation
-        0x23C0076, // steady state, direct
-        0x23C0077, // steady state, modal
-        0x23C007D, // complex frequency
-        0x23C007E, // steady state, subspace
-    };
-    return std::find(std::begin(procedures), std::end(procedures), stepType) != std::end(procedures);
-}
+#include "store_interface/records/steps/kprC_DynamicSteps.h"
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
+#include "store_interface/records/steps/kprC_ThermalSteps.h"
 
 const omu_EnumTable& omu_EnumTableOf(kprC_Step::MatrixStorageEnm) {
     static constexpr omu_EnumRow rows[] = {{0, "SOLVER_DEFAULT", "SOLVER_DEFAULT"},
                                            {1, "SYMMETRIC", "SYMMETRIC"},
                                            {2, "UNSYMMETRIC", "UNSYMMETRIC"}};
     static constexpr omu_EnumTable table{"kprC_Step::MatrixStorageEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::NlgeomEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "OFF", "OFF"}, {1, "ON", "ON"}};
+    static constexpr omu_EnumTable table{"kprC_Step::NlgeomEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::ResponseEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "STEADY_STATE", "STEADY_STATE"},
+                                           {1, "TRANSIENT", "TRANSIENT"}};
+    static constexpr omu_EnumTable table{"kprC_Step::ResponseEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::SolutionTechniqueEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "FULL_NEWTON", "FULL_NEWTON"},
+                                           {1, "SEPARATED", "SEPARATED"},
+                                           {2, "QUASI_NEWTON", "QUASI_NEWTON"}};
+    static constexpr omu_EnumTable table{"kprC_Step::SolutionTechniqueEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::AmplitudeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "STEP", "STEP"}, {1, "RAMP", "RAMP"}};
+    static constexpr omu_EnumTable table{"kprC_Step::AmplitudeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::ExtrapolationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "LINEAR", "LINEAR"},
+                                           {1, "PARABOLIC", "PARABOLIC"},
+                                           {2, "NONE", "NONE"},
+                                           {3, "RESERVED_3", "RESERVED_3"},
+                                           {4, "PROCEDURE_DEFAULT", "PROCEDURE_DEFAULT"}};
+    static constexpr omu_EnumTable table{"kprC_Step::ExtrapolationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::TimeIncrementationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "AUTOMATIC", "AUTOMATIC"}, {1, "DIRECT", "DIRECT"}};
+    static constexpr omu_EnumTable table{"kprC_Step::TimeIncrementationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_Step::FrequencyScaleEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "LOGARITHMIC", "LOGARITHMIC"}, {1, "LINEAR", "LINEAR"}};
+    static constexpr omu_EnumTable table{"kprC_Step::FrequencyScaleEnm", rows};
     return table;
 }
 
@@ -55,7 +85,14 @@ const cls_FieldTable& kprC_Step::Fields() {
 const cls_FieldTable& kprC_AnalysisStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kprC_AnalysisStep>(kprC_Step::Fields())
-            .Field<&kprC_AnalysisStep::loadCases>("loadCases", "load cases by name");
+            .Field<&kprC_AnalysisStep::loadCases>("loadCases", "load cases by name")
+            .Field<&kprC_AnalysisStep::controls>("controls", "solution controls of the step")
+            .Field<&kprC_AnalysisStep::solverControls>("solverControls",
+                                                       "controls of the iterative linear solver")
+            .Field<&kprC_AnalysisStep::restart>("restart", "what is kept for a restart")
+            .Field<&kprC_AnalysisStep::diagnosticPrint>("diagnosticPrint",
+                                                        "what the solver prints to watch the run")
+            .Field<&kprC_AnalysisStep::monitor>("monitor", "degree of freedom to watch during the run");
     return fields;
 }
 
@@ -64,4 +101,11 @@ void cls_RegisterStepRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kprC_Step>();
     registrar.Add<kprC_InitialStep>();
     registrar.Add<kprC_AnalysisStep>();
+    cls_RegisterStepControlRecords(registrar);
+    cls_RegisterStepRequestRecords(registrar);
+    cls_RegisterModalDampingRecords(registrar);
+    cls_RegisterStaticStepRecords(registrar);
+    cls_RegisterThermalStepRecords(registrar);
+    cls_RegisterDynamicStepRecords(registrar);
+    cls_RegisterModalStepRecords(registrar);
 }

@@ -1,0 +1,54 @@
+#ifndef QRX_MODEL_FILE_MDF_RECORDCHECKS_H
+#define QRX_MODEL_FILE_MDF_RECORDCHECKS_H
+
+#include "model_file/mdf_Diagnostics.h"
+#include "store_interface/records/cls_Record.h"
+
+#include <functional>
+#include <unordered_map>
+#include <vector>
+
+/// The record that is checked: where it stands in the file, and what is to be said of it.
+class mdf_RecordCheck {
+public:
+    mdf_RecordCheck(mdf_Diagnostics& diagnostics, const mdf_Path& path)
+        : diagnostics_(diagnostics), path_(path) {}
+    void Error(const char* field, const std::string& text) {
+        diagnostics_.Error(mdf_Path(path_, std::string_view(field)), text);
+    }
+    void Warning(const char* field, const std::string& text) {
+        diagnostics_.Warning(mdf_Path(path_, std::string_view(field)), text);
+    }
+    /// An error unless the number is 0 or more.
+    void NotNegative(const char* field, int value);
+    void NotNegative(const char* field, double value);
+
+private:
+    mdf_Diagnostics& diagnostics_;
+    const mdf_Path& path_;
+};
+
+/// What records of a model file must satisfy beyond the types of their fields. A record that has an error in
+/// a field already isn't checked.
+class mdf_RecordChecks {
+public:
+    /// The checks of all families.
+    static const mdf_RecordChecks& All();
+
+    /// Adds a check of all records of class T and of the classes derived from it.
+    template <class T>
+    void Add(void (*check)(const T&, mdf_RecordCheck&)) {
+        checks_[T::TypeId()].push_back([check](const cls_Record& record, mdf_RecordCheck& report) {
+            check(static_cast<const T&>(record), report);
+        });
+    }
+    void Run(const cls_Record& record, mdf_RecordCheck& report) const;
+
+private:
+    std::unordered_map<unsigned, std::vector<std::function<void(const cls_Record&, mdf_RecordCheck&)>>>
+        checks_;
+};
+
+void mdf_AddStepChecks(mdf_RecordChecks& checks);
+
+#endif

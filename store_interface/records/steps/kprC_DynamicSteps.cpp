@@ -1,0 +1,182 @@
+#include "store_interface/records/steps/kprC_DynamicSteps.h"
+
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::MassScalingTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "SEMI_AUTOMATIC", "SEMI_AUTOMATIC"},
+                                           {1, "AUTOMATIC", "AUTOMATIC"},
+                                           {2, "REINITIALIZE", "REINITIALIZE"},
+                                           {3, "DISABLE_THROUGHOUT_STEP", "DISABLE_THROUGHOUT_STEP"}};
+    static constexpr omu_EnumTable table{"kprC_MassScaling::MassScalingTypeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::DtTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "UNIFORM", "UNIFORM"},
+                                           {1, "BELOW_MIN", "BELOW_MIN"},
+                                           {2, "SET_EQUAL_DT", "SET_EQUAL_DT"},
+                                           {3, "NONUNIFORM", "NONUNIFORM"}};
+    static constexpr omu_EnumTable table{"kprC_MassScaling::DtTypeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::RollingDirectionEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "X", "X"}, {1, "Y", "Y"}, {2, "Z", "Z"}, {3, "NONE", "NONE"}};
+    static constexpr omu_EnumTable table{"kprC_MassScaling::RollingDirectionEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::FrequencyKindEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"}, {1, "NUMBER_INTERVAL", "NUMBER_INTERVAL"}};
+    static constexpr omu_EnumTable table{"kprC_MassScaling::FrequencyKindEnm", rows};
+    return table;
+}
+
+bool kprC_MassScaling::IsVariable() const {
+    switch (type) {
+    case MassScalingTypeEnm::AUTOMATIC:
+    case MassScalingTypeEnm::DISABLE_THROUGHOUT_STEP: return true;
+    case MassScalingTypeEnm::SEMI_AUTOMATIC: return throughoutStep;
+    default: return false;
+    }
+}
+
+const cls_FieldTable& kprC_MassScaling::Fields() {
+    using R = kprC_MassScaling;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::type>(
+                "type",
+                "0 semi-automatic, 1 automatic (rolling), 2 reinitialise mass, 3 disable throughout the step")
+            .Field<&R::region>("region", "element set that is scaled")
+            .Field<&R::frequency>("frequency", "increments between two scalings; 0 = by numberInterval")
+            .Field<&R::dt>("dt", "wanted stable time increment (time); 0 is not written")
+            .Field<&R::factor>("factor", "mass factor (no unit), fixed form only; 0 is not written")
+            .Field<&R::numberInterval>("numberInterval", "number of scalings, evenly spread over the step")
+            .Field<&R::frequencyKind>("frequencyKind", "1: the recurrence of type 0 is written (a user gives "
+                                                       "it with throughoutStep); type 1 does not look at it")
+            .Field<&R::feedRate>("feedRate", "rolling: velocity of the rolled piece (length/time)")
+            .Field<&R::extrudedLength>("extrudedLength",
+                                       "rolling: element length along the rolling direction (length)")
+            .Field<&R::crossSection>(
+                "crossSection",
+                "rolling: number of nodes in the cross-section, written truncated to an integer")
+            .Field<&R::direction>("direction", "rolling direction: 0, 1, 2 = X, Y, Z, 3 none")
+            .Field<&R::wholeModel>("wholeModel", "true: the whole model, region is not looked at")
+            .Field<&R::dtType>("dtType", "the dt rule: 0 uniform, 1 below min, 2 set equal dt, 3 nonuniform")
+            .Field<&R::throughoutStep>("throughoutStep", "type 0: false = once at the beginning of the step "
+                                                         "(fixed), true = throughout the step (variable)");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_ImplicitDynamicsStep::InitialConditionsEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "DEFAULT", "DEFAULT"}, {1, "COMPUTE", "COMPUTE"}, {2, "NONE", "NONE"}};
+    static constexpr omu_EnumTable table{"kprC_ImplicitDynamicsStep::InitialConditionsEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kprC_ImplicitDynamicsStep::Fields() {
+    using R = kprC_ImplicitDynamicsStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
+            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
+            .Field<&R::timePeriod>("timePeriod",
+                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
+                                                 "0 automatic, 1 direct (fixed increments)")
+            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
+            .Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)")
+            .Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only")
+            .Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only")
+            .Field<&R::haftol>(
+                "haftol",
+                "half-increment residual tolerance (force); always written by any method but the direct one")
+            .Field<&R::nohaf>("nohaf", "direct method only: no half-increment residual")
+            .Field<&R::amplitude>("amplitude",
+                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
+            .Field<&R::extrapolation>("extrapolation",
+                                      "4 is not written; else 1 prints PARABOLIC, any other value NO")
+            .Field<&R::alpha>("alpha", "numerical damping of the integration operator (no unit)")
+            .Field<&R::noStop>("noStop",
+                               "direct method only: accept the increment after the last allowed iteration")
+            .Field<&R::initialConditions>("initialConditions",
+                                          "2 none: the computation of initial accelerations is bypassed");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_ExplicitDynamicsStep::TimeIncrementationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "AUTOMATIC", "AUTOMATIC"},
+                                           {1, "DIRECT_USER_CONTROL", "DIRECT_USER_CONTROL"},
+                                           {2, "ELEMENT_BY_ELEMENT", "ELEMENT_BY_ELEMENT"},
+                                           {3, "FIXED", "FIXED"}};
+    static constexpr omu_EnumTable table{"kprC_ExplicitDynamicsStep::TimeIncrementationEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kprC_ExplicitDynamicsStep::Fields() {
+    using R = kprC_ExplicitDynamicsStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::timeIncrementationMethod>(
+                "timeIncrementationMethod",
+                "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
+            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
+            .Field<&R::timePeriod>("timePeriod",
+                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
+            .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
+            .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
+            .Field<&R::linearBulkViscosity>("linearBulkViscosity",
+                                            "linear bulk viscosity coefficient (no unit)")
+            .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
+                                               "quadratic bulk viscosity coefficient (no unit)")
+            .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
+            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+    return fields;
+}
+
+const cls_FieldTable& kprC_TempDisplacementDynamicsStep::Fields() {
+    using R = kprC_TempDisplacementDynamicsStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::timeIncrementationMethod>(
+                "timeIncrementationMethod",
+                "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
+            .Field<&R::timePeriod>("timePeriod",
+                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
+            .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
+            .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
+            .Field<&R::linearBulkViscosity>("linearBulkViscosity",
+                                            "linear bulk viscosity coefficient (no unit)")
+            .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
+                                               "quadratic bulk viscosity coefficient (no unit)")
+            .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
+            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SubspaceDynamicsStep::Fields() {
+    using R = kprC_SubspaceDynamicsStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
+            .Field<&R::vectors>("vectors", "number of modes used; 0 = all, then no *Select Eigenmodes")
+            .Field<&R::timePeriod>("timePeriod",
+                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::initialInc>("initialInc", "fixed time increment (time)")
+            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
+            .Field<&R::amplitude>("amplitude",
+                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written");
+    return fields;
+}
+
+void cls_RegisterDynamicStepRecords(cls_ClassRegistrar& registrar) {
+    registrar.Add<kprC_MassScaling>();
+    registrar.Add<kprC_ImplicitDynamicsStep>();
+    registrar.Add<kprC_ExplicitDynamicsStep>();
+    registrar.Add<kprC_TempDisplacementDynamicsStep>();
+    registrar.Add<kprC_SubspaceDynamicsStep>();
+}

@@ -1,0 +1,323 @@
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+const cls_FieldTable& kprC_RandomResponseFrequency::Fields() {
+    using R = kprC_RandomResponseFrequency;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
+            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
+            .Field<&R::points>("points", "number of points in the range, ends included")
+            .Field<&R::bias>("bias",
+                             "bias of the points towards the ends (no unit); written from 4 points on");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SteadyStateDirectFrequency::Fields() {
+    using R = kprC_SteadyStateDirectFrequency;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
+            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
+            .Field<&R::points>("points", "number of points in the range, ends included")
+            .Field<&R::bias>("bias",
+                             "bias of the points towards the ends (no unit); written from 4 points on");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SteadyStateModalFrequency::Fields() {
+    using R = kprC_SteadyStateModalFrequency;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
+            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
+            .Field<&R::points>("points", "number of points in the range, ends included")
+            .Field<&R::bias>("bias",
+                             "bias of the points towards the ends (no unit); written from 4 points on");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SteadyStateSubspaceFrequency::Fields() {
+    using R = kprC_SteadyStateSubspaceFrequency;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
+            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
+            .Field<&R::points>("points", "number of points in the range, ends included")
+            .Field<&R::bias>("bias",
+                             "bias of the points towards the ends (no unit); written from 4 points on");
+    return fields;
+}
+
+const cls_FieldTable& kprC_ResponseSpectrumComponent::Fields() {
+    using R = kprC_ResponseSpectrumComponent;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::spectrumName>("spectrumName", "spectrum, written as it stands")
+            .RefersTo("amplitude")
+            .Field<&R::x>("x", "direction cosine, global X")
+            .Field<&R::y>("y", "direction cosine, global Y")
+            .Field<&R::z>("z", "direction cosine, global Z")
+            .Field<&R::scale>("scale", "factor on the spectrum");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::EigensolverEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "SUBSPACE", "SUBSPACE"}, {1, "LANCZOS", "LANCZOS"}, {2, "AMS", "AMS"}};
+    static constexpr omu_EnumTable table{"kprC_FrequencyStep::EigensolverEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::NormalizationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "DISPLACEMENT", "DISPLACEMENT"}, {1, "MASS", "MASS"}};
+    static constexpr omu_EnumTable table{"kprC_FrequencyStep::NormalizationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::AcousticCouplingEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "OFF", "OFF"}, {1, "ON", "ON"}, {2, "PROJECTION", "PROJECTION"}};
+    static constexpr omu_EnumTable table{"kprC_FrequencyStep::AcousticCouplingEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kprC_FrequencyStep::Fields() {
+    using R = kprC_FrequencyStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::numEigen>("numEigen", "number of modes; unset = all in the range")
+            .Field<&R::maxEigen>("maxEigen", "upper frequency bound (cycles per time)")
+            .Field<&R::shift>("shift", "shift point (squared cycles per time)")
+            .Field<&R::vectors>("vectors", "subspace: number of iteration vectors, always written")
+            .Field<&R::maxIterations>("maxIterations",
+                                      "subspace: largest number of iterations, always written")
+            .Field<&R::eigensolver>("eigensolver", "0 subspace, 1 Lanczos, 2 AMS")
+            .Field<&R::dampingProjection>("dampingProjection", "false (0) writes damping projection=off")
+            .Field<&R::minEigen>("minEigen", "lower frequency bound (cycles per time)")
+            .Field<&R::blockSize>("blockSize", "Lanczos: block size")
+            .Field<&R::maxBlocks>("maxBlocks", "Lanczos: largest number of blocks")
+            .Field<&R::normalization>("normalization", "0 displacement, non-zero mass")
+            .Field<&R::propertyEvaluationFrequency>(
+                "propertyEvaluationFrequency",
+                "frequency at which frequency-dependent properties are taken (cycles per time)")
+            .Field<&R::acousticCoupling>("acousticCoupling",
+                                         "0 off, 1 on, 2 projection; not written with the subspace solver")
+            .Field<&R::residualModes>("residualModes", "compute residual modes (Lanczos, AMS)")
+            .Field<&R::sim>("sim", "Lanczos: modes kept in the linear dynamics data base")
+            .Field<&R::substructureCutoffMultiplier>("substructureCutoffMultiplier",
+                                                     "AMS: first cutoff factor; 5.0 is not written")
+            .Field<&R::firstCutoffMultiplier>("firstCutoffMultiplier",
+                                              "AMS: second cutoff factor; 1.7 is not written")
+            .Field<&R::secondCutoffMultiplier>("secondCutoffMultiplier",
+                                               "AMS: third cutoff factor; 1.1 is not written")
+            .Field<&R::acousticRangeFactor>("acousticRangeFactor",
+                                            "AMS: factor on the acoustic frequency range; 1.0 is not written")
+            .Field<&R::residualModeSets>("residualModeSets",
+                                         "AMS residual modes: node set names as [instance.]set, one per line")
+            .RefersTo("set")
+            .Field<&R::residualModeValues>("residualModeValues",
+                                           "AMS residual modes: degree of freedom, parallel to "
+                                           "residualModeSets; its length counts the lines")
+            .Field<&R::nsetRegion>(
+                "nsetRegion",
+                "AMS: node set to which mode shapes are restricted; null or empty name = all nodes");
+    return fields;
+}
+
+const cls_FieldTable& kprC_ComplexFrequencyStep::Fields() {
+    using R = kprC_ComplexFrequencyStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::numEigen>("numEigen", "number of complex modes; unset = all")
+            .Field<&R::shift>("shift", "shift point (cycles per time); 0 is not written")
+            .Field<&R::frictionDamping>("frictionDamping", "add friction-induced damping")
+            .Field<&R::minEigen>("minEigen", "lower frequency bound (cycles per time)")
+            .Field<&R::maxEigen>(
+                "maxEigen",
+                "upper frequency bound (cycles per time); written when below 1e18 or when minEigen is set");
+    return fields;
+}
+
+const cls_FieldTable& kprC_ModalDynamicsStep::Fields() {
+    using R = kprC_ModalDynamicsStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::continueAnalysis>("continueAnalysis",
+                                         "go on from the state of the step before, if that is a linear "
+                                         "perturbation static or a modal dynamics step")
+            .Field<&R::timePeriod>("timePeriod",
+                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timeIncrement>("timeIncrement", "fixed time increment (time)")
+            .Field<&R::amplitude>("amplitude",
+                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
+            .Field<&R::compositeDamping>("compositeDamping",
+                                         "modal damping definition, or absent; the fields stand in the order "
+                                         "in which they are written")
+            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
+                                                       "stand in the order in which they are written")
+            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
+                                                           "stand in the order in which they are written")
+            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
+                                                 "modal damping definition, or absent; the fields stand in "
+                                                 "the order in which they are written")
+            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
+                                                   "modal damping definition, or absent; the fields stand in "
+                                                   "the order in which they are written");
+    return fields;
+}
+
+const cls_FieldTable& kprC_RandomResponseStep::Fields() {
+    using R = kprC_RandomResponseStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
+            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
+            .Field<&R::compositeDamping>("compositeDamping",
+                                         "modal damping definition, or absent; the fields stand in the order "
+                                         "in which they are written")
+            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
+                                                       "stand in the order in which they are written")
+            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
+                                                           "stand in the order in which they are written")
+            .Field<&R::structuralDamping>("structuralDamping",
+                                          "modal damping definition, or absent; the fields stand in the "
+                                          "order in which they are written")
+            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
+                                                 "modal damping definition, or absent; the fields stand in "
+                                                 "the order in which they are written")
+            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
+                                                   "modal damping definition, or absent; the fields stand in "
+                                                   "the order in which they are written")
+            .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
+                                                     "modal damping definition, or absent; the fields stand "
+                                                     "in the order in which they are written");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_ResponseSpectrumStep::CompEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "SINGLE_DIRECTION", "SINGLE_DIRECTION"}, {1, "ALGEBRAIC", "ALGEBRAIC"}, {2, "SRSS", "SRSS"}};
+    static constexpr omu_EnumTable table{"kprC_ResponseSpectrumStep::CompEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_ResponseSpectrumStep::SumEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "ABS", "ABS"}, {1, "CQC", "CQC"}, {2, "NRL", "NRL"}, {3, "SRSS", "SRSS"}, {4, "TENP", "TENP"}};
+    static constexpr omu_EnumTable table{"kprC_ResponseSpectrumStep::SumEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kprC_ResponseSpectrumStep::Fields() {
+    using R = kprC_ResponseSpectrumStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::comp>("comp", "1 algebraic, 2 SRSS, other values write nothing")
+            .Field<&R::sum>("sum", "0 ABS, 1 CQC, 2 NRL, 3 SRSS, 4 TENP")
+            .Field<&R::components>("components", "directions of excitation, one data line each")
+            .Field<&R::compositeDamping>("compositeDamping",
+                                         "modal damping definition, or absent; the fields stand in the order "
+                                         "in which they are written")
+            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
+                                                       "stand in the order in which they are written")
+            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
+                                                           "stand in the order in which they are written")
+            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
+                                                 "modal damping definition, or absent; the fields stand in "
+                                                 "the order in which they are written")
+            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
+                                                   "modal damping definition, or absent; the fields stand in "
+                                                   "the order in which they are written");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SteadyStateDirectStep::Fields() {
+    using R = kprC_SteadyStateDirectStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::complex>("complex", "true: complex (damped) response; false: real only")
+            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
+            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
+            .Field<&R::subdivideUsingEigenfrequencies>(
+                "subdivideUsingEigenfrequencies",
+                "whether the ranges are divided at the natural frequencies");
+    return fields;
+}
+
+const cls_FieldTable& kprC_SteadyStateModalStep::Fields() {
+    using R = kprC_SteadyStateModalStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
+            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
+            .Field<&R::subdivideUsingEigenfrequencies>(
+                "subdivideUsingEigenfrequencies", "whether the ranges are divided at the natural frequencies")
+            .Field<&R::compositeDamping>("compositeDamping",
+                                         "modal damping definition, or absent; the fields stand in the order "
+                                         "in which they are written")
+            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
+                                                       "stand in the order in which they are written")
+            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
+                                                           "stand in the order in which they are written")
+            .Field<&R::structuralDamping>("structuralDamping",
+                                          "modal damping definition, or absent; the fields stand in the "
+                                          "order in which they are written")
+            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
+                                                 "modal damping definition, or absent; the fields stand in "
+                                                 "the order in which they are written")
+            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
+                                                   "modal damping definition, or absent; the fields stand in "
+                                                   "the order in which they are written")
+            .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
+                                                     "modal damping definition, or absent; the fields stand "
+                                                     "in the order in which they are written");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kprC_SteadyStateSubspaceStep::ProjectionEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"},
+                                           {1, "CONSTANT", "CONSTANT"},
+                                           {2, "EIGENFREQUENCY", "EIGENFREQUENCY"},
+                                           {3, "PROPERTY_CHANGE", "PROPERTY_CHANGE"},
+                                           {4, "RANGE", "RANGE"}};
+    static constexpr omu_EnumTable table{"kprC_SteadyStateSubspaceStep::ProjectionEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kprC_SteadyStateSubspaceStep::Fields() {
+    using R = kprC_SteadyStateSubspaceStep;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kprC_AnalysisStep::Fields())
+            .Field<&R::complex>("complex", "true: complex (damped) response; false: real only")
+            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
+            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
+            .Field<&R::frictionDamping>("frictionDamping", "add friction-induced damping")
+            .Field<&R::subdivideUsingEigenfrequencies>(
+                "subdivideUsingEigenfrequencies", "whether the ranges are divided at the natural frequencies")
+            .Field<&R::projection>("projection",
+                                   "0 none, 1 constant, 2 eigenfrequency, 3 property change, 4 range")
+            .Field<&R::dampingChange>(
+                "dampingChange", "projection 3: relative change of damping that asks for a new projection")
+            .Field<&R::stiffnessChange>(
+                "stiffnessChange",
+                "projection 3: relative change of stiffness that asks for a new projection");
+    return fields;
+}
+
+void cls_RegisterModalStepRecords(cls_ClassRegistrar& registrar) {
+    registrar.Add<kprC_RandomResponseFrequency>();
+    registrar.Add<kprC_SteadyStateDirectFrequency>();
+    registrar.Add<kprC_SteadyStateModalFrequency>();
+    registrar.Add<kprC_SteadyStateSubspaceFrequency>();
+    registrar.Add<kprC_ResponseSpectrumComponent>();
+    registrar.Add<kprC_FrequencyStep>();
+    registrar.Add<kprC_ComplexFrequencyStep>();
+    registrar.Add<kprC_ModalDynamicsStep>();
+    registrar.Add<kprC_RandomResponseStep>();
+    registrar.Add<kprC_ResponseSpectrumStep>();
+    registrar.Add<kprC_SteadyStateDirectStep>();
+    registrar.Add<kprC_SteadyStateModalStep>();
+    registrar.Add<kprC_SteadyStateSubspaceStep>();
+}

@@ -1,0 +1,250 @@
+#ifndef QRX_STORE_KPRC_MODALSTEPS_H
+#define QRX_STORE_KPRC_MODALSTEPS_H
+
+#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/records/steps/kprC_ModalDamping.h"
+#include "store_interface/records/steps/kprC_Step.h"
+
+class cls_ClassRegistrar;
+
+class kprC_RandomResponseFrequency final : public cls_RecordOf<kprC_RandomResponseFrequency> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_RandomResponseFrequency",
+                                         "One frequency range of a random response step."};
+
+    double upper = 0.0;
+    double lower = 0.0;
+    int points = 20;
+    double bias = 1.0;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SteadyStateDirectFrequency final : public cls_RecordOf<kprC_SteadyStateDirectFrequency> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateDirectFrequency",
+                                         "One frequency range of a direct steady-state dynamics step."};
+
+    double upper = 0.0;
+    double lower = 0.0;
+    int points = 20;
+    double bias = 1.0;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SteadyStateModalFrequency final : public cls_RecordOf<kprC_SteadyStateModalFrequency> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateModalFrequency",
+                                         "One frequency range of a modal steady-state dynamics step."};
+
+    double upper = 0.0;
+    double lower = 0.0;
+    int points = 20;
+    double bias = 3.0;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SteadyStateSubspaceFrequency final : public cls_RecordOf<kprC_SteadyStateSubspaceFrequency> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateSubspaceFrequency",
+                                         "One frequency range of a subspace steady-state dynamics step."};
+
+    double upper = 0.0;
+    double lower = 0.0;
+    int points = 20;
+    double bias = 3.0;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_ResponseSpectrumComponent final : public cls_RecordOf<kprC_ResponseSpectrumComponent> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_ResponseSpectrumComponent",
+                                         "One direction of excitation of a response spectrum step."};
+
+    cow_String spectrumName;
+    double x = 0.0;
+    double y = 0.0;
+    double z = 0.0;
+    double scale = 1.0;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_FrequencyStep final : public kprC_ProcedureOf<kprC_FrequencyStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_FrequencyStep", "Extraction of natural frequencies and modes.",
+                                         0x23C006A};
+
+    enum class EigensolverEnm : int { SUBSPACE = 0, LANCZOS = 1, AMS = 2 };
+    enum class NormalizationEnm : int { DISPLACEMENT = 0, MASS = 1 };
+    enum class AcousticCouplingEnm : int { OFF = 0, ON = 1, PROJECTION = 2 };
+
+    int numEigen = cls_UnsetInt;
+    double maxEigen = cls_UnsetDouble;
+    double shift = cls_UnsetDouble;
+    int vectors = 18;
+    int maxIterations = 30;
+    EigensolverEnm eigensolver = EigensolverEnm::LANCZOS;
+    bool dampingProjection = true;
+    double minEigen = cls_UnsetDouble;
+    int blockSize = cls_UnsetInt;
+    int maxBlocks = cls_UnsetInt;
+    NormalizationEnm normalization = NormalizationEnm::DISPLACEMENT;
+    double propertyEvaluationFrequency = cls_UnsetDouble;
+    AcousticCouplingEnm acousticCoupling = AcousticCouplingEnm::ON;
+    bool residualModes = false;
+    bool sim = false;
+    double substructureCutoffMultiplier = 5.0;
+    double firstCutoffMultiplier = 1.7;
+    double secondCutoffMultiplier = 1.1;
+    double acousticRangeFactor = 1.0;
+    cow_List<cow_String> residualModeSets;
+    cow_List<int> residualModeValues;
+    rgnC_Region nsetRegion;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::EigensolverEnm);
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::NormalizationEnm);
+const omu_EnumTable& omu_EnumTableOf(kprC_FrequencyStep::AcousticCouplingEnm);
+
+class kprC_ComplexFrequencyStep final : public kprC_ProcedureOf<kprC_ComplexFrequencyStep> {
+public:
+    static constexpr cls_ClassInfo Class{
+        "kprC_ComplexFrequencyStep",
+        "Complex eigenvalue extraction. The writer refuses it in oif_Step::Write.", 0x23C007D};
+
+    int numEigen = cls_UnsetInt;
+    double shift = 0.0;
+    bool frictionDamping = false;
+    double minEigen = cls_UnsetDouble;
+    double maxEigen = 1e+18;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_ModalDynamicsStep final : public kprC_ProcedureOf<kprC_ModalDynamicsStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_ModalDynamicsStep",
+                                         "Transient dynamics by modal superposition.", 0x23C006F};
+
+    bool continueAnalysis = false;
+    double timePeriod = 1.0;
+    double timeIncrement = 1.0;
+    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
+    mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
+    mdl_ObjCow<kprC_DirectDamping> directDamping;
+    mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
+    mdl_ObjCow<kprC_DirectDampingByFrequency> directDampingByFrequency;
+    mdl_ObjCow<kprC_RayleighDampingByFrequency> rayleighDampingByFrequency;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_RandomResponseStep final : public kprC_ProcedureOf<kprC_RandomResponseStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_RandomResponseStep",
+                                         "Response to random excitation on the modes of an earlier step.",
+                                         0x23C0070};
+
+    cow_List<kprC_RandomResponseFrequency> frequencies;
+    FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
+    mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
+    mdl_ObjCow<kprC_DirectDamping> directDamping;
+    mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
+    mdl_ObjCow<kprC_StructuralDamping> structuralDamping;
+    mdl_ObjCow<kprC_DirectDampingByFrequency> directDampingByFrequency;
+    mdl_ObjCow<kprC_RayleighDampingByFrequency> rayleighDampingByFrequency;
+    mdl_ObjCow<kprC_StructuralDampingByFrequency> structuralDampingByFrequency;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_ResponseSpectrumStep final : public kprC_ProcedureOf<kprC_ResponseSpectrumStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_ResponseSpectrumStep",
+                                         "Peak response to a spectrum on the modes of an earlier step.",
+                                         0x23C0071};
+
+    enum class CompEnm : int { SINGLE_DIRECTION = 0, ALGEBRAIC = 1, SRSS = 2 };
+    enum class SumEnm : int { ABS = 0, CQC = 1, NRL = 2, SRSS = 3, TENP = 4 };
+
+    CompEnm comp = CompEnm::SINGLE_DIRECTION;
+    SumEnm sum = SumEnm::ABS;
+    cow_List<kprC_ResponseSpectrumComponent> components;
+    mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
+    mdl_ObjCow<kprC_DirectDamping> directDamping;
+    mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
+    mdl_ObjCow<kprC_DirectDampingByFrequency> directDampingByFrequency;
+    mdl_ObjCow<kprC_RayleighDampingByFrequency> rayleighDampingByFrequency;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_ResponseSpectrumStep::CompEnm);
+const omu_EnumTable& omu_EnumTableOf(kprC_ResponseSpectrumStep::SumEnm);
+
+class kprC_SteadyStateDirectStep final : public kprC_ProcedureOf<kprC_SteadyStateDirectStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateDirectStep",
+                                         "Harmonic response by direct solution.", 0x23C0076};
+
+    bool complex = true;
+    cow_List<kprC_SteadyStateDirectFrequency> frequencies;
+    FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
+    bool subdivideUsingEigenfrequencies = false;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SteadyStateModalStep final : public kprC_ProcedureOf<kprC_SteadyStateModalStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateModalStep",
+                                         "Harmonic response on the modes of an earlier step.", 0x23C0077};
+
+    cow_List<kprC_SteadyStateModalFrequency> frequencies;
+    FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
+    bool subdivideUsingEigenfrequencies = true;
+    mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
+    mdl_ObjCow<kprC_DirectDamping> directDamping;
+    mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
+    mdl_ObjCow<kprC_StructuralDamping> structuralDamping;
+    mdl_ObjCow<kprC_DirectDampingByFrequency> directDampingByFrequency;
+    mdl_ObjCow<kprC_RayleighDampingByFrequency> rayleighDampingByFrequency;
+    mdl_ObjCow<kprC_StructuralDampingByFrequency> structuralDampingByFrequency;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SteadyStateSubspaceStep final : public kprC_ProcedureOf<kprC_SteadyStateSubspaceStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SteadyStateSubspaceStep",
+                                         "Harmonic response in the subspace of the modes of an earlier step.",
+                                         0x23C007E};
+
+    enum class ProjectionEnm : int {
+        NONE = 0,
+        CONSTANT = 1,
+        EIGENFREQUENCY = 2,
+        PROPERTY_CHANGE = 3,
+        RANGE = 4
+    };
+
+    bool complex = true;
+    cow_List<kprC_SteadyStateSubspaceFrequency> frequencies;
+    FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
+    bool frictionDamping = false;
+    bool subdivideUsingEigenfrequencies = true;
+    ProjectionEnm projection = ProjectionEnm::NONE;
+    double dampingChange = 0.1;
+    double stiffnessChange = 0.1;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_SteadyStateSubspaceStep::ProjectionEnm);
+
+void cls_RegisterModalStepRecords(cls_ClassRegistrar& registrar);
+
+#endif

@@ -1,0 +1,171 @@
+#ifndef QRX_STORE_KPRC_STATICSTEPS_H
+#define QRX_STORE_KPRC_STATICSTEPS_H
+
+#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/records/steps/kprC_Step.h"
+
+class cls_ClassRegistrar;
+
+class kprC_StaticStep final : public kprC_ProcedureOf<kprC_StaticStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_StaticStep", "General static analysis.", 0x23C0073};
+
+    enum class StabilizationEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
+
+    NlgeomEnm nlgeom = NlgeomEnm::OFF;
+    bool adiabatic = false;
+    double timePeriod = 1.0;
+    StabilizationEnm stabilizationMethod = StabilizationEnm::NONE;
+    double stabilizationMagnitude = 0.0002;
+    TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
+    int maxNumInc = 100;
+    double initialInc = 1.0;
+    double minInc = 1e-05;
+    double maxInc = 1.0;
+    AmplitudeEnm amplitude = AmplitudeEnm::RAMP;
+    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    bool noStop = false;
+    cow_String fullyPlastic;
+    SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_StaticStep::StabilizationEnm);
+
+class kprC_StaticRiksStep final : public kprC_ProcedureOf<kprC_StaticRiksStep> {
+public:
+    static constexpr cls_ClassInfo Class{
+        "kprC_StaticRiksStep", "Static analysis with arc length control, for unstable collapse.", 0x23C0074};
+
+    NlgeomEnm nlgeom = NlgeomEnm::OFF;
+    bool adiabatic = false;
+    TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
+    int maxNumInc = 100;
+    double initialArcInc = 1.0;
+    double totalArc = 1.0;
+    double minArcInc = 1e-05;
+    double maxArcInc = 1e+36;
+    double maxLPF = cls_UnsetDouble;
+    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    bool noStop = false;
+    cow_String fullyPlastic;
+    bool nodeMonitored = false;
+    rgnC_Region region;
+    int dof = 1;
+    double dofValue = 0.0;
+    bool longTerm = false;
+    SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_StaticLinearPerturbationStep final : public kprC_ProcedureOf<kprC_StaticLinearPerturbationStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_StaticLinearPerturbationStep",
+                                         "Linear static perturbation about the base state.", 0x23C0075};
+};
+
+class kprC_GeostaticStep final : public kprC_ProcedureOf<kprC_GeostaticStep> {
+public:
+    static constexpr cls_ClassInfo Class{
+        "kprC_GeostaticStep", "Geostatic equilibrium under initial stress and self weight.", 0x23C006B};
+
+    NlgeomEnm nlgeom = NlgeomEnm::OFF;
+    SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_SoilsStep final : public kprC_ProcedureOf<kprC_SoilsStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_SoilsStep", "Coupled pore fluid flow and stress.", 0x23C0072};
+
+    enum class ResponseEnm : int { TRANSIENT = 0, STEADY_STATE = 1 };
+    enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
+
+    NlgeomEnm nlgeom = NlgeomEnm::OFF;
+    ResponseEnm response = ResponseEnm::TRANSIENT;
+    double end = cls_UnsetDouble;
+    double timePeriod = 1.0;
+    StabilizationMethodEnm stabilizationMethod = StabilizationMethodEnm::NONE;
+    double stabilizationMagnitude = 0.0002;
+    TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
+    int maxNumInc = 100;
+    double initialInc = 1.0;
+    double minInc = 1e-05;
+    double maxInc = 1.0;
+    bool creep = true;
+    double cetol = 0.0;
+    double utol = 0.0;
+    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
+    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_SoilsStep::ResponseEnm);
+const omu_EnumTable& omu_EnumTableOf(kprC_SoilsStep::StabilizationMethodEnm);
+
+class kprC_ViscoStep final : public kprC_ProcedureOf<kprC_ViscoStep> {
+public:
+    static constexpr cls_ClassInfo Class{
+        "kprC_ViscoStep", "Quasi-static response with creep, swelling or viscoelasticity.", 0x23C007A};
+
+    enum class CreepIntegrationEnm : int { AUTOMATIC = 0, EXPLICIT = 1 };
+    enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
+
+    NlgeomEnm nlgeom = NlgeomEnm::OFF;
+    CreepIntegrationEnm creepIntegration = CreepIntegrationEnm::AUTOMATIC;
+    double cetol = 0.0;
+    double timePeriod = 1.0;
+    StabilizationMethodEnm stabilizationMethod = StabilizationMethodEnm::NONE;
+    double stabilizationMagnitude = 0.0002;
+    TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
+    int maxNumInc = 100;
+    double initialInc = 1.0;
+    double minInc = 1e-05;
+    double maxInc = 1.0;
+    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
+    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_ViscoStep::CreepIntegrationEnm);
+const omu_EnumTable& omu_EnumTableOf(kprC_ViscoStep::StabilizationMethodEnm);
+
+class kprC_AnnealStep final : public kprC_ProcedureOf<kprC_AnnealStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_AnnealStep",
+                                         "Annealing between explicit steps: all stresses and plastic strains "
+                                         "are reset, at a given temperature.",
+                                         0x23C0065};
+
+    double refTemp = cls_UnsetDouble;
+    NlgeomEnm nlgeom = NlgeomEnm::ON;
+
+    static const cls_FieldTable& Fields();
+};
+
+class kprC_BuckleStep final : public kprC_ProcedureOf<kprC_BuckleStep> {
+public:
+    static constexpr cls_ClassInfo Class{"kprC_BuckleStep", "Eigenvalue buckling prediction.", 0x23C0066};
+
+    enum class EigensolverEnm : int { SUBSPACE = 0, LANCZOS = 1 };
+
+    int numEigen = 10;
+    double maxEigen = cls_UnsetDouble;
+    int vectors = 18;
+    int maxIterations = 30;
+    EigensolverEnm eigensolver = EigensolverEnm::SUBSPACE;
+    double minEigen = cls_UnsetDouble;
+    int blockSize = cls_UnsetInt;
+    int maxBlocks = cls_UnsetInt;
+
+    static const cls_FieldTable& Fields();
+};
+const omu_EnumTable& omu_EnumTableOf(kprC_BuckleStep::EigensolverEnm);
+
+void cls_RegisterStaticStepRecords(cls_ClassRegistrar& registrar);
+
+#endif
