@@ -103,10 +103,10 @@ public:
     Engine(const kprC_PropagatingObject& object, std::vector<mdl_PropagationProblem>& problems)
         : object_(object), family_(object.Family()), problems_(problems) {}
 
-    StepResult Step(const cow_String& name, const kprC_Step& step) {
+    /// `given` is null where the user said nothing.
+    StepResult Step(const cow_String& name, const kprC_Step& step, const mdl_GivenState* given) {
         const bool perturbation = step.Perturbation();
         if (!perturbation) run_ = Chain();
-        const mdl_GivenState* given = object_.GivenState(name);
         const bool ownRun = perturbation && family_ == mdl_PropagationFamilyEnm::OUTPUT_REQUEST;
         Chain& chain = ownRun ? run_ : general_;
 
@@ -334,11 +334,22 @@ kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps,
     Engine engine(*this, problems);
     std::vector<StepResult> results;
     results.reserve(static_cast<std::size_t>(steps.Size()));
-    for (int i = 0; i < steps.Size(); ++i) results.push_back(engine.Step(steps.NameAt(i), steps.StepAt(i)));
+    std::vector<const mdl_GivenState*> givenAt(static_cast<std::size_t>(steps.Size()));
+    std::vector<cow_String> unknown;
     for (const mdl_GivenState& given : given_) {
-        if (!steps.IsMember(given.stepName)) {
-            problems.push_back({given.stepName, "a state, but there is no step of that name"});
+        const int index = steps.IndexOf(given.stepName);
+        if (index < 0) {
+            unknown.push_back(given.stepName);
+        } else {
+            givenAt[static_cast<std::size_t>(index)] = &given;
         }
+    }
+    for (int i = 0; i < steps.Size(); ++i) {
+        results.push_back(
+            engine.Step(steps.NameAt(i), steps.StepAt(i), givenAt[static_cast<std::size_t>(i)]));
+    }
+    for (const cow_String& name : unknown) {
+        problems.push_back({name, "a state, but there is no step of that name"});
     }
     return results;
 }

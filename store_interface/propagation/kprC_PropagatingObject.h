@@ -4,7 +4,6 @@
 #include "store_interface/propagation/mdl_PropAttr.h"
 #include "store_interface/records/steps/kprC_StepContainer.h"
 
-#include <memory>
 #include <optional>
 #include <vector>
 
@@ -154,7 +153,7 @@ public:
     }
     /// Status, state and procedure in the step. An unknown step raises.
     const kprC_PropagatingState<S>& ConstGetStateQuad(const cow_String& stepName) const {
-        const int index = steps_ == nullptr ? -1 : steps_->IndexOf(stepName);
+        const int index = steps_.IndexOf(stepName);
         if (index < 0) this->RaiseNoSuchStep(stepName);
         return states_[static_cast<std::size_t>(index)];
     }
@@ -189,13 +188,13 @@ public:
             }
         }
         states_ = std::move(states);
-        steps_ = std::make_shared<const kprC_StepContainer>(steps);
+        steps_ = steps;
         return problems;
     }
 
 private:
     std::vector<kprC_PropagatingState<S>> states_;
-    std::shared_ptr<const kprC_StepContainer> steps_;
+    kprC_StepContainer steps_; // as they were when the states were worked out
 };
 
 /// Objects that live across steps, by name, in ascending byte order.

@@ -164,6 +164,19 @@ TEST(StepContainer, Steps_RunInTheOrderOfTheAnalysis) {
     EXPECT_EQ(&it.CurrentValue(), &steps.ConstGet("M"));
 }
 
+TEST(StepContainer, Copies_ShareTheStepsUntilOneIsWrittenTo) {
+    kprC_StepContainer steps;
+    steps.Append("A", kprC_InitialStep());
+    const kprC_StepContainer copy = steps;
+    EXPECT_EQ(&copy.StepAt(0), &steps.StepAt(0));
+    steps.Get("A").description = "changed";
+    steps.Append("B", kprC_InitialStep());
+    EXPECT_EQ(copy.ConstGet("A").description, "");
+    EXPECT_EQ(copy.Size(), 1);
+    EXPECT_EQ(copy.IndexOf("B"), -1);
+    EXPECT_EQ(steps.IndexOf("B"), 1);
+}
+
 TEST(StepContainer, NameThatIsTakenOrUnknown_Raises) {
     kprC_StepContainer steps;
     steps.Append("A", kprC_InitialStep());

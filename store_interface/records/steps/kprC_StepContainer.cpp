@@ -17,19 +17,25 @@ void kprC_StepContainer::Append(const cow_String& name, const kprC_Step& step) {
             "kprC_StepContainer: a step named '" + std::string(name.View()) + "' is there already";
         nex_Raise(atr_String(std::string_view(text)));
     }
-    steps_.push_back({name, mdl_ObjCow<kprC_Step>(step)});
-    index_.emplace(steps_.back().name.View(), Size() - 1);
+    Data& data = Writable();
+    data.steps.push_back({name, mdl_ObjCow<kprC_Step>(step)});
+    data.index.emplace(data.steps.back().name.View(), Size() - 1);
+}
+
+kprC_StepContainer::Data& kprC_StepContainer::Writable() {
+    if (data_.use_count() > 1) data_ = std::make_shared<Data>(*data_);
+    return *data_;
 }
 
 cow_List<cow_String> kprC_StepContainer::Keys() const {
     cow_List<cow_String> keys;
-    for (const Entry& entry : steps_) keys.Append(entry.name);
+    for (const Entry& entry : data_->steps) keys.Append(entry.name);
     return keys;
 }
 
 int kprC_StepContainer::IndexOf(const cow_String& name) const {
-    const auto place = index_.find(name.View());
-    return place == index_.end() ? -1 : place->second;
+    const auto place = data_->index.find(name.View());
+    return place == data_->index.end() ? -1 : place->second;
 }
 
 const kprC_Step& kprC_StepContainer::ConstGet(const cow_String& name) const {
@@ -41,5 +47,5 @@ const kprC_Step& kprC_StepContainer::ConstGet(const cow_String& name) const {
 kprC_Step& kprC_StepContainer::Get(const cow_String& name) {
     const int index = IndexOf(name);
     if (index < 0) cow_RaiseNoSuchKey("kprC_StepContainer", name);
-    return steps_[static_cast<std::size_t>(index)].record.Get();
+    return Writable().steps[static_cast<std::size_t>(index)].record.Get();
 }

@@ -3,6 +3,7 @@
 
 #include "store_interface/records/steps/kprC_Step.h"
 
+#include <memory>
 #include <unordered_map>
 #include <vector>
 
@@ -10,7 +11,8 @@
 enum class kprC_AnalysisProductEnm : int { IMPLICIT = 0, EXPLICIT = 1, OTHER = 2 };
 const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm);
 
-/// The steps in the order of the analysis, the initial step first; not in name order.
+/// The steps in the order of the analysis, the initial step first; not in name order. Copies share the steps
+/// until one of them is written to.
 class kprC_StepContainer {
 public:
     /// Appends a copy of the step. A name that is there already raises.
@@ -21,7 +23,7 @@ public:
     /// An unknown name raises.
     const kprC_Step& ConstGet(const cow_String& name) const;
     kprC_Step& Get(const cow_String& name);
-    int Size() const { return static_cast<int>(steps_.size()); }
+    int Size() const { return static_cast<int>(data_->steps.size()); }
     /// The place of the step from 0, or -1.
     int IndexOf(const cow_String& name) const;
     /// A place outside the steps raises.
@@ -36,12 +38,17 @@ private:
 
     const Entry& EntryAt(int index) const {
         if (index < 0 || index >= Size()) cow_RaiseOutOfRange(index, Size());
-        return steps_[static_cast<std::size_t>(index)];
+        return data_->steps[static_cast<std::size_t>(index)];
     }
 
-    std::vector<Entry> steps_;
-    // The views lie in the names' shared storage, which copies of the container keep alive too.
-    std::unordered_map<std::string_view, int> index_;
+    struct Data {
+        std::vector<Entry> steps;
+        // The views lie in the names' shared storage, which copies of the container keep alive too.
+        std::unordered_map<std::string_view, int> index;
+    };
+    Data& Writable();
+
+    std::shared_ptr<Data> data_ = std::make_shared<Data>();
 };
 
 class kprC_StepContainerIT {
