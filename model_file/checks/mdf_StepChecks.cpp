@@ -111,9 +111,12 @@ void CheckControls(const kprC_PrimaryControls& controls, mdf_RecordCheck& report
     const int integers = std::min(kIntegerEntries, controls.timeIncrementation.Length());
     for (int i = 0; i < integers; ++i) {
         const double entry = controls.timeIncrementation[i];
-        if (entry == std::trunc(entry) && std::fabs(entry) <= std::numeric_limits<int>::max()) continue;
-        report.Error("timeIncrementation", "found " + mdf_Shown(entry) + " as entry " + std::to_string(i) +
-                                               ", expected a whole number of 32 bits");
+        const std::string found = "found " + mdf_Shown(entry) + " as entry " + std::to_string(i);
+        if (std::fabs(entry) > std::numeric_limits<int>::max()) {
+            report.Error("timeIncrementation", found + ", expected a whole number of 32 bits");
+        } else if (entry != std::trunc(entry)) {
+            report.Warning("timeIncrementation", found + ", which is cut to a whole number");
+        }
     }
 }
 
