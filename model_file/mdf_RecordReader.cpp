@@ -622,6 +622,11 @@ std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) 
     if (kind == "set") {
         std::vector<std::string> names;
         for (const auto& set : model_.AssemblySets()) names.push_back(Text(set->name));
+        for (const auto& [instanceName, instance] : model_.Instances()) {
+            const auto mesh = instance->Mesh();
+            if (mesh.IsNull()) continue;
+            for (const auto& set : mesh->Sets()) names.push_back(Text(instanceName) + "." + Text(set->name));
+        }
         return names;
     }
     return {};

@@ -38,7 +38,6 @@ const cls_FieldTable& kprC_StaticStep::Fields() {
                                "direct method only: accept the increment after the last allowed iteration")
             .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
                                                      "own spelling (written as it stands); empty = none")
-            .RefersTo("set")
             .Field<&R::solutionTechnique>("solutionTechnique",
                                           "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
                                           "SolutionTechnique(), writes nothing");
@@ -66,7 +65,6 @@ const cls_FieldTable& kprC_StaticRiksStep::Fields() {
                                "direct method only: accept the increment after the last allowed iteration")
             .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
                                                      "own spelling (written as it stands); empty = none")
-            .RefersTo("set")
             .Field<&R::nodeMonitored>("nodeMonitored", "whether a displacement of region ends the step")
             .Field<&R::region>("region", "node set that is monitored")
             .Field<&R::dof>("dof", "degree of freedom monitored, 1 to 6")
