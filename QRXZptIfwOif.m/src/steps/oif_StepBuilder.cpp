@@ -117,7 +117,7 @@ void oif_StepBuilder::AddMassScaling(const cow_String& stepName, const Step& ste
 template <class Step>
 void oif_StepBuilder::AddModalDamping(const cow_String& stepName, const Step& step) {
     const auto add = [&](const auto& damping) {
-        if (!damping.IsNull()) AddStepDefinition(stepName, oif_ModalDamping(damping.ConstGet()));
+        if (!damping.IsNull()) AddStepDefinition(stepName, oif_ModalDamping(damping));
     };
     // Transient and spectrum steps have no structural damping.
     constexpr bool hasStructural = requires {
