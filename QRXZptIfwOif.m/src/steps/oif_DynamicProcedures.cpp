@@ -44,6 +44,7 @@ bool WriteBulkViscosity(utl_Stream& stream, const kprC_AnalysisStep& step) {
 } // namespace
 
 void oif_ImplicitDynamics::Write(utl_Stream& stream) const {
+    // No blank behind any comma here.
     stream << "*Dynamic";
     if (step_.alpha != cls_UnsetDouble) stream << ",alpha=" << step_.alpha;
     if (step_.adiabatic) stream << ",adiabatic";
@@ -83,6 +84,6 @@ void oif_SubspaceDynamics::Write(utl_Stream& stream) const {
     stream << "*Dynamic, subspace";
     if (step_.vectors > 0) stream << ", vectors=" << step_.vectors;
     stream << endl;
-    // The line ends in a separator: the bounds of increments have no meaning here.
+    // The line ends in a separator, behind which nothing ever stands.
     stream << step_.initialInc << ", " << step_.timePeriod << ", " << endl;
 }

@@ -57,6 +57,7 @@ bool oif_IsAutomatic(const Step& step) {
 /// "initial, period, ", then "min, max" when the increments are automatic.
 template <class Step>
 void oif_WriteIncrements(utl_Stream& stream, const Step& step) {
+    // The separator stays at the end when the increments are fixed.
     stream << step.initialInc << ", " << step.timePeriod << ", ";
     if (oif_IsAutomatic(step)) stream << step.minInc << ", " << step.maxInc;
 }

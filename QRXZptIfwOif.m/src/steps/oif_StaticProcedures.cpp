@@ -43,6 +43,7 @@ void oif_StaticRiks::Write(utl_Stream& stream) const {
     } else {
         stream << ", ";
     }
+    // Both separators stand whether or not anything follows.
     stream << ", ";
     oif_WriteWhenSet(stream, step_.maxLPF);
     stream << ", ";
