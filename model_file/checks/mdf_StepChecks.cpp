@@ -27,7 +27,9 @@ void CheckTimes(const kprC_AnalysisStep& step, mdf_RecordCheck& report) {
         if (increment.IsSet() && increment.value < 0.0) expect(increment, "0 or more");
     }
     if (!initial.IsSet()) return;
-    if (period.IsSet() && initial.value > period.value) expect(initial, orLess(period));
+    if (period.IsSet() && period.value > 0.0 && initial.value > period.value) {
+        expect(initial, orLess(period));
+    }
     if (!automatic) return;
     if (least.IsSet() && least.value > initial.value) expect(least, orLess(initial));
     if (most.IsSet() && most.value < initial.value) expect(initial, orLess(most));
