@@ -27,10 +27,11 @@ protected:
     qkw_Keyword& operator=(qkw_Keyword&&) = default;
 };
 
-/// Base of the keyword class T: gives Copy().
-template <class T>
-class qkw_KeywordOf : public qkw_Keyword {
+/// Base of the keyword class T, itself derived from Base: gives Copy().
+template <class T, class Base = qkw_Keyword>
+class qkw_KeywordOf : public Base {
 public:
+    using Base::Base;
     qkw_Keyword* Copy() const override { return new T(static_cast<const T&>(*this)); }
 };
 

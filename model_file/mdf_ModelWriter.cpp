@@ -441,14 +441,20 @@ private:
         out_.EndObject();
     }
 
-    // Fields that have the value of a default record are left out.
+    /// What a file gets that says nothing of the field.
+    static bool IsDefault(const cls_Field& field, const cls_Record& record, const cls_Record& byDefault) {
+        if (field.defaultItems == nullptr) return field.type->Equal(field.In(record), field.In(byDefault));
+        return *static_cast<const cow_List<double>*>(field.In(record)) == field.defaultItems(record);
+    }
+
+    // Fields that have their defaults are left out.
     void WriteFields(const cls_Record& record, const odiK_Model& model, const char* passedOver) {
         const std::unique_ptr<cls_Record> byDefault(cls_Classes().Find(record.DynTypeId())->create());
         for (const cls_Field& field : record.DynFields().All()) {
             if (field.notModelData || (passedOver != nullptr && std::string_view(passedOver) == field.name))
                 continue;
             const void* value = field.In(record);
-            if (!field.required && field.type->Equal(value, field.In(*byDefault))) continue;
+            if (!field.required && IsDefault(field, record, *byDefault)) continue;
             out_.Key(field.name);
             WriteValue(*field.type, value, model);
         }

@@ -72,6 +72,9 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
         if (json != nullptr) {
             const bool mayBeUnset = cls_IsUnset(*field.type, field.In(record));
             if (!ReadValue(*field.type, field.In(record), *json, place, field, mayBeUnset)) continue;
+        } else if (field.defaultItems != nullptr) {
+            // The defaults may be others than those of a new record.
+            static_cast<const cls_ListType&>(*field.type).Clear(field.In(record));
         }
         if (!field.required) continue;
         const bool isText = field.type->Kind() == cls_FieldKind::String;
@@ -622,6 +625,11 @@ std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) 
     if (kind == "set") {
         std::vector<std::string> names;
         for (const auto& set : model_.AssemblySets()) names.push_back(Text(set->name));
+        for (const auto& [instanceName, instance] : model_.Instances()) {
+            const auto mesh = instance->Mesh();
+            if (mesh.IsNull()) continue;
+            for (const auto& set : mesh->Sets()) names.push_back(Text(instanceName) + "." + Text(set->name));
+        }
         return names;
     }
     return {};
@@ -644,8 +652,11 @@ void mdf_RecordReader::CheckReferences() {
                                                         "define");
             continue;
         }
+        const bool startsWithVowel =
+            std::string_view("aeiou").find(reference.kind.front()) != std::string_view::npos;
         diagnostics_.Error(reference.pointer, "found " + mdf_Quoted(reference.name) +
-                                                  ", expected the name of a " + reference.kind +
+                                                  ", expected the name of " +
+                                                  (startsWithVowel ? "an " : "a ") + reference.kind +
                                                   mdf_DidYouMean(reference.name, names));
     }
 }

@@ -382,8 +382,10 @@ private:
             return {{"type", "array"}, {"items", Reference("TRIPLE")}, {"minItems", 2}, {"maxItems", 2}};
         case cls_FieldKind::Table: return Reference("TABLE");
         case cls_FieldKind::List: {
-            Json list = {{"type", "array"},
-                         {"items", TypeOf(static_cast<const cls_ListType&>(type).ItemType(), nullptr)}};
+            Json item = TypeOf(static_cast<const cls_ListType&>(type).ItemType(), nullptr);
+            // A null item is the default of its place.
+            if (field != nullptr && field->defaultItems != nullptr) item = Nullable(item);
+            Json list = {{"type", "array"}, {"items", item}};
             if (field != nullptr && field->length > 0) list["minItems"] = list["maxItems"] = field->length;
             return list;
         }

@@ -1,6 +1,7 @@
 #include "tools/ModelSummary.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/steps/kprC_StepTimes.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -234,14 +235,42 @@ ordered_json DescribeInstance(const odiK_Instance& instance) {
     return entry;
 }
 
+/// "kprC_StaticLinearPerturbationStep" as "static linear perturbation".
+std::string ProcedureOf(const kprC_Step& step) {
+    std::string name = Text(cls_Classes().NameOf(step.DynTypeId()));
+    if (name.starts_with("kprC_")) name.erase(0, 5);
+    if (name.ends_with("Step")) name.erase(name.size() - 4);
+    std::string words;
+    for (const char c : name) {
+        const bool isCapital = c >= 'A' && c <= 'Z';
+        if (isCapital && !words.empty()) words += ' ';
+        words += isCapital ? static_cast<char>(c - 'A' + 'a') : c;
+    }
+    return words;
+}
+
 ordered_json DescribeSteps(const kprC_StepContainer& steps) {
     ordered_json list = ordered_json::array();
     for (int i = 0; i < steps.Size(); ++i) {
         const kprC_Step& step = steps.StepAt(i);
-        list.push_back({{"name", Text(steps.NameAt(i))},
-                        {"class", Text(cls_Classes().NameOf(step.DynTypeId()))},
-                        {"perturbation", step.Perturbation()},
-                        {"explicit", step.Explicit()}});
+        const auto* analysis = dynamic_cast<const kprC_AnalysisStep*>(&step);
+        ordered_json entry = {
+            {"name", Text(steps.NameAt(i))},  {"class", Text(cls_Classes().NameOf(step.DynTypeId()))},
+            {"procedure", ProcedureOf(step)}, {"perturbation", step.Perturbation()},
+            {"explicit", step.Explicit()},    {"suppressed", step.suppressed}};
+        if (analysis != nullptr) {
+            const kprC_StepTimes times(step);
+            entry["nlgeom"] = step.Nlgeom() == kprC_Step::NlgeomEnm::ON;
+            if (times.period.IsSet()) entry["period"] = times.period.value;
+            ordered_json& increments = entry["increments"] = ordered_json::object();
+            const std::pair<const char*, kprC_TimeField> fields[] = {
+                {"initial", times.initial}, {"min", times.least}, {"max", times.most}};
+            for (const auto& [key, field] : fields) {
+                if (field.IsSet()) increments[key] = field.value;
+            }
+            entry["loadCases"] = NamesIn(analysis->loadCases);
+        }
+        list.push_back(std::move(entry));
     }
     return list;
 }
@@ -339,13 +368,31 @@ std::string SetsText(const ordered_json& model) {
     return text.empty() ? text : "  sets\n" + text;
 }
 
+std::string Joined(const std::vector<std::string>& words) {
+    std::string text;
+    for (const std::string& word : words) text += (text.empty() ? "" : ", ") + word;
+    return text;
+}
+
+/// One of the step's numbers, or a dash where its class has none.
+std::string NumberIn(const ordered_json& object, const char* key) {
+    return object.contains(key) ? NumberText(object[key]) : "-";
+}
+
 std::string StepsText(const ordered_json& steps) {
+    if (steps.empty()) return Heading("steps", 0);
     TextTable table;
+    table.Row({"", "name", "procedure", "nlgeom", "period", "initial", "min", "max", "load cases"});
     std::size_t place = 0;
     for (const ordered_json& step : steps) {
-        std::vector<std::string> row = {std::to_string(place++), step["name"], step["class"]};
-        if (step["perturbation"].get<bool>()) row.push_back("perturbation");
-        if (step["explicit"].get<bool>()) row.push_back("explicit");
+        std::vector<std::string> row = {std::to_string(place++), step["name"], step["procedure"]};
+        if (step.contains("increments")) {
+            const ordered_json& increments = step["increments"];
+            const auto loadCases = step["loadCases"].get<std::vector<std::string>>();
+            row.insert(row.end(), {step["nlgeom"].get<bool>() ? "on" : "off", NumberIn(step, "period"),
+                                   NumberIn(increments, "initial"), NumberIn(increments, "min"),
+                                   NumberIn(increments, "max"), loadCases.empty() ? "-" : Joined(loadCases)});
+        }
         table.Row(std::move(row));
     }
     return Heading("steps", steps.size()) + table.Text("    ");

@@ -58,6 +58,21 @@ def on_bolt_hole(name):
 NODE_SETS = {"CLAMPED-FACE": on_wall_back, **{name: on_bolt_hole(name) for name in BOLT_HOLES}}
 SURFACES = {"LOADED-FACE": on_base_top, "BORE": on_bore}
 
+# The bracket is loaded, then watched in small motions about that state: bent both ways, its modes, the
+# response to a shaking machine and to a sudden stop.
+DAMPING = {"directDamping": {"rows": [{"firstMode": 1, "lastMode": 12, "value": 0.02}]}}
+STEPS = [
+    {"name": "Initial", "class": "kprC_InitialStep"},
+    {"name": "Tighten", "class": "kprC_StaticStep", "description": "Large displacements, in increments of a tenth",
+     "nlgeom": "ON", "initialInc": 0.1, "maxInc": 0.2, "restart": {"class": "kprC_StandardRestart", "frequency": 5},
+     "monitor": {"class": "kprC_StandardMonitor", "region": "TIP", "dof": 3}},
+    {"name": "Bend", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {"Down": {}, "Sideways": {}}},
+    {"name": "Modes", "class": "kprC_FrequencyStep", "numEigen": 12},
+    {"name": "Shake", "class": "kprC_SteadyStateModalStep",
+     "frequencies": [{"lower": 10, "upper": 2000, "points": 40}], **DAMPING},
+    {"name": "Stop", "class": "kprC_ModalDynamicsStep", "timePeriod": 0.05, "timeIncrement": 1e-4, **DAMPING},
+]
+
 
 def exact_measures():
     """Volume of the solid and areas of its surfaces, in closed form."""
@@ -204,7 +219,7 @@ def model_of(nodes, elements):
             "sets": [{"name": "BOLTS", "kind": "node", "members": member(labels=bolts)},
                      {"name": "TIP", "kind": "node", "members": member(labels=[tip])},
                      {"name": "PAD", "kind": "surface", "members": member(facets=surfaces["LOADED-FACE"])}]},
-        "steps": [{"name": "Initial", "class": "kprC_InitialStep"}]}}}
+        "steps": STEPS}}}
 
 
 def triangle(points):
@@ -278,6 +293,7 @@ def check(document):
         require(abs(area / exact_areas[name] - 1.0) < 1e-2,
                 f"{name}: area {exact_areas[name]:.2f} expected, {area:.2f} found")
 
+    require(model["steps"] == STEPS, "the steps are others than those of this script")
     for entry in model["assembly"]["sets"]:
         for part in entry["members"]:
             require(part["instance"] in model["assembly"]["instances"], f"{entry['name']}: unknown instance")

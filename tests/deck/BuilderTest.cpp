@@ -2,6 +2,8 @@
 #include "deck/oif_Builder.h"
 #include "deck/oif_Comment.h"
 #include "deck/oif_Writer.h"
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
 #include "support/DeckTest.h"
 #include "support/TestFolder.h"
 
@@ -102,31 +104,43 @@ TEST(Builder, OpeningTextWithoutLineEnd_RunsIntoTheBannerOnPurpose) {
 }
 
 TEST(Builder, StepsWithAndWithoutLoadCases_CloseInTheRightPlace) {
-    KnowTestSteps();
     TestStore store;
     kprC_InitialStep initial;
     initial.solverInput = "initial text";
     // Load cases of the initial step can't be; it has none.
     store.model.steps.Append("Initial", initial);
-    TestGeneralStep plain;
+    kprC_StaticStep plain;
     plain.solverInput = "plain text\n";
     store.model.steps.Append("Plain", plain);
-    TestPerturbationStep cases;
+    kprC_SteadyStateModalStep cases;
     cases.solverInput = "body text";
     cases.loadCases.Insert("B", klcC_LoadCase());
     cases.loadCases.Insert("A", klcC_LoadCase());
     store.model.steps.Append("Cases", cases);
+    const std::string banner = "** ----------------------------------------------------------------\n** \n";
     EXPECT_EQ(WrittenDeck(store), "**\n** PARTS\n**\n"
                                   "**\n** ASSEMBLY\n**\n"
                                   "*Assembly, name=Assembly\n"
                                   "*End Assembly\n"
-                                  "initial text\n"
-                                  "plain text\n"
-                                  "*End Step\n"
-                                  "body text\n"
-                                  "*End Load Case\n"
-                                  "*End Load Case\n"
-                                  "*End Step\n");
+                                  "initial text\n" +
+                                      banner +
+                                      "** STEP: Plain\n** \n"
+                                      "*Step, name=Plain\n"
+                                      "*Static\n"
+                                      "1., 1., 1e-05, 1.\n"
+                                      "plain text\n"
+                                      "*End Step\n" +
+                                      banner +
+                                      "** STEP: Cases\n** \n"
+                                      "*Step, name=Cases, perturbation\n"
+                                      "*Steady State Dynamics\n"
+                                      "body text\n"
+                                      "** \n** LOAD CASES\n** \n"
+                                      "*Load Case, name=A\n"
+                                      "*End Load Case\n"
+                                      "*Load Case, name=B\n"
+                                      "*End Load Case\n"
+                                      "*End Step\n");
 }
 
 TEST(Builder, TwoInstancesOfOnePart_CloseThePartOnce) {

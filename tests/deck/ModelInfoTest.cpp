@@ -1,3 +1,6 @@
+#include "store_interface/records/steps/kprC_DynamicSteps.h"
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
 #include "support/DeckTest.h"
 
 namespace {
@@ -25,11 +28,10 @@ TEST(Model, NoSteps_HaveNoNames) {
 }
 
 TEST(Model, PerturbationThenGeneral_NamesBoth) {
-    KnowTestSteps();
     TestStore store;
     store.model.steps.Append("Initial", kprC_InitialStep());
-    store.model.steps.Append("Freq", TestPerturbationStep());
-    store.model.steps.Append("Load", TestGeneralStep());
+    store.model.steps.Append("Freq", kprC_FrequencyStep());
+    store.model.steps.Append("Load", kprC_StaticStep());
     EXPECT_EQ(store.Info().Model().FirstAnalysisStepName(), "Freq");
     EXPECT_EQ(store.Info().Model().FirstGeneralAnalysisStepName(), "Load");
 }
@@ -209,19 +211,17 @@ TEST(ModelInfo, OtherFormat_NumbersThroughTheWholeModel) {
 }
 
 TEST(ModelInfo, ExplicitStepInLastPlace_MakesTheJobExplicit) {
-    KnowTestSteps();
     TestStore store;
     store.model.steps.Append("Initial", kprC_InitialStep());
-    store.model.steps.Append("A", TestGeneralStep());
-    store.model.steps.Append("B", TestExplicitStep());
+    store.model.steps.Append("A", kprC_StaticStep());
+    store.model.steps.Append("B", kprC_ExplicitDynamicsStep());
     EXPECT_TRUE(store.Info().ExplicitJob());
     EXPECT_EQ(store.Info().AnalysisProduct(), kprC_AnalysisProductEnm::EXPLICIT);
 }
 
 TEST(ModelInfo, ExplicitStepInFirstPlace_DoesNot) {
-    KnowTestSteps();
     TestStore store;
-    store.model.steps.Append("A", TestExplicitStep());
+    store.model.steps.Append("A", kprC_ExplicitDynamicsStep());
     EXPECT_FALSE(store.Info().ExplicitJob());
     EXPECT_EQ(store.Info().AnalysisProduct(), kprC_AnalysisProductEnm::IMPLICIT);
 }

@@ -66,6 +66,15 @@ TEST(ModelFileSchema, EveryField_IsThereWithItsDocumentation) {
     EXPECT_GT(fields, 40);
 }
 
+TEST(ModelFileSchema, ListsWithDefaults_TakeNullItemsAndOthersDoNot) {
+    const auto items = [](const char* className, const char* field) {
+        return Schema().at("$defs").at(className).at("properties").at(field).at("items");
+    };
+    const Json number = {{"type", "number"}};
+    EXPECT_EQ(items("kprC_TypicalControls", "lineSearch"), (Json{{"anyOf", {number, {{"type", "null"}}}}}));
+    EXPECT_EQ(items("kprC_FrequencyStep", "residualModeSets"), (Json{{"type", "string"}}));
+}
+
 TEST(ModelFileSchema, EveryReference_HasItsDefinition) {
     std::vector<std::string> references;
     CollectReferences(Schema(), references);

@@ -351,6 +351,35 @@ class Refusals(ProgramTest):
         })
 
 
+class CannotBeExpressed(ProgramTest):
+    def setUp(self):
+        super().setUp()
+        self.put("model.json", changed(lambda model: model["steps"].extend([
+            {"name": "Fine", "class": "kprC_StaticStep"},
+            {"name": "Whirl", "class": "kprC_ComplexFrequencyStep"},
+        ])))
+        (self.folder / "model.inp").write_bytes(OLD_DECK)
+
+    def test_StepThatNoDeckCanCarry_IsCodeFourAndLeavesTheOldDeck(self):
+        run = self.run_program("write", "model.json")
+        self.assertEqual((run.returncode, run.output), (4, ""))
+        lines = run.errors.splitlines()
+        self.assertRegex(lines[0], r"^model\.json: warning: .*/steps/2/class: found a complex frequency step")
+        self.assertEqual(lines[1:], ["Unimplemented function to write out *Step card", "step 'Whirl'"])
+        self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
+        self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+    def test_InJson_TextAndContextAreMembers(self):
+        run = self.run_program("write", "model.json", "--json")
+        self.assertEqual((run.returncode, run.errors), (4, ""))
+        result = json.loads(run.output)
+        self.assertEqual(result["exitCode"], 4)
+        self.assertEqual(result["messages"][-1], {
+            "severity": "error", "text": "Unimplemented function to write out *Step card",
+            "context": "step 'Whirl'"})
+        self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
+
+
 class Signals(ProgramTest):
     def test_RunThatIsEnded_LeavesTheOldDeckAndNoDebris(self):
         self.put("model.json", large_model(300000))
@@ -400,7 +429,56 @@ class OtherCommands(ProgramTest):
                          "  sets\n"
                          "    part ROD  1 node sets  0 element sets  0 surfaces\n"
                          "  steps (1)\n"
-                         "    0  Initial  kprC_InitialStep\n")
+                         "       name     procedure  nlgeom  period  initial  min  max  load cases\n"
+                         "    0  Initial  initial\n")
+
+    def test_Info_ShowsTheAnalysisAsATableOfSteps(self):
+        self.put("model.json", changed(lambda model: model["steps"].extend([
+            {"name": "Press", "class": "kprC_StaticStep", "nlgeom": "ON", "timePeriod": 2.5, "initialInc": 0.1,
+             "maxInc": 0.5},
+            {"name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+             "loadCases": {"up": {}, "down": {}}},
+            {"name": "Hit", "class": "kprC_ExplicitDynamicsStep", "timePeriod": 1e-3, "suppressed": True},
+            {"name": "Snap", "class": "kprC_StaticRiksStep"},
+        ])))
+        run = self.run_program("info", "model.json")
+        self.assertEqual(run.returncode, 0, run.errors)
+        self.assertTrue(run.output.endswith(
+            "  steps (5)\n"
+            "       name     procedure                   nlgeom  period  initial  min    max    load cases\n"
+            "    0  Initial  initial\n"
+            "    1  Press    static                      on      2.5     0.1      1e-05  0.5    -\n"
+            "    2  Cases    static linear perturbation  off     -       -        -      -      down, up\n"
+            "    3  Hit      explicit dynamics           on      0.001   0        -      -      -\n"
+            "    4  Snap     static riks                 off     1       1        1e-05  1e+36  -\n"), run.output)
+        model = json.loads(self.run_program("info", "model.json", "--json").output)["models"]["Default Model"]
+        self.assertEqual(model["steps"][0], {
+            "name": "Initial", "class": "kprC_InitialStep", "procedure": "initial", "perturbation": False,
+            "explicit": False, "suppressed": False})
+        self.assertEqual(model["steps"][2], {
+            "name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+            "procedure": "static linear perturbation", "perturbation": True, "explicit": False,
+            "suppressed": False, "nlgeom": False, "increments": {}, "loadCases": ["down", "up"]})
+        self.assertEqual(model["steps"][3], {
+            "name": "Hit", "class": "kprC_ExplicitDynamicsStep", "procedure": "explicit dynamics",
+            "perturbation": False, "explicit": True, "suppressed": True, "nlgeom": True, "period": 0.001,
+            "increments": {"initial": 0.0}, "loadCases": []})
+
+    def test_Check_ForetellsWhatIsOddAboutSteps(self):
+        self.put("model.json", changed(lambda model: model["steps"].extend([
+            {"name": "A", "class": "kprC_StaticStep", "loadCases": {"up": {}}},
+            {"name": "B", "class": "kprC_StaticStep", "suppressed": True},
+            {"name": "C", "class": "kprC_ComplexFrequencyStep"},
+        ])))
+        run = self.run_program("check", "model.json")
+        steps = "model.json: warning: /models/Default Model/steps/"
+        self.assertEqual((run.returncode, run.output), (0, "model.json: no errors\n"))
+        self.assertEqual(run.errors.splitlines(), [
+            steps + "1/loadCases: found load cases, expected none: this procedure allows none",
+            steps + "2/suppressed: found true, which changes nothing: a suppressed step is written like any "
+                    "other",
+            steps + "3/class: found a complex frequency step, of which no deck can be written: writing fails "
+                    "with \"Unimplemented function to write out *Step card\""])
 
     def test_InfoInJson_HasTheSame(self):
         model = json.loads(self.run_program("info", "model.json", "--json").output)["models"]["Default Model"]

@@ -73,29 +73,6 @@ private:
     std::unique_ptr<oif_ModelInfo> info_;
 };
 
-/// A general, a linear perturbation and an explicit step, by the numbers of their procedures.
-class TestGeneralStep final : public cls_RecordOf<TestGeneralStep, kprC_AnalysisStep> {
-public:
-    static constexpr cls_ClassInfo Class{"TestGeneralStep", "a general step", 0x23C0073};
-};
-class TestPerturbationStep final : public cls_RecordOf<TestPerturbationStep, kprC_AnalysisStep> {
-public:
-    static constexpr cls_ClassInfo Class{"TestPerturbationStep", "a perturbation step", 0x23C006A};
-};
-class TestExplicitStep final : public cls_RecordOf<TestExplicitStep, kprC_AnalysisStep> {
-public:
-    static constexpr cls_ClassInfo Class{"TestExplicitStep", "an explicit step", 0x23C0069};
-};
-
-/// Makes the store know the step classes above, unless it knows classes of their numbers already.
-inline void KnowTestSteps() {
-    if (cls_Classes().Find(TestGeneralStep::TypeId()) == nullptr) cls_Classes().Add<TestGeneralStep>();
-    if (cls_Classes().Find(TestPerturbationStep::TypeId()) == nullptr)
-        cls_Classes().Add<TestPerturbationStep>();
-    if (cls_Classes().Find(TestExplicitStep::TypeId()) == nullptr) cls_Classes().Add<TestExplicitStep>();
-}
-
-
 /// The text that the action raises as an exception of the system; "nothing raised" when it raises none.
 template <class Action>
 std::string Raised(const Action& action) {

@@ -82,8 +82,7 @@ const cls_FieldTable& kprC_ImplicitDynamicsStep::Fields() {
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
             .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
                                                  "0 automatic, 1 direct (fixed increments)")
             .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
@@ -123,8 +122,7 @@ const cls_FieldTable& kprC_ExplicitDynamicsStep::Fields() {
                 "timeIncrementationMethod",
                 "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
             .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
             .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
@@ -144,8 +142,7 @@ const cls_FieldTable& kprC_TempDisplacementDynamicsStep::Fields() {
             .Field<&R::timeIncrementationMethod>(
                 "timeIncrementationMethod",
                 "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
             .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
@@ -164,8 +161,7 @@ const cls_FieldTable& kprC_SubspaceDynamicsStep::Fields() {
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
             .Field<&R::vectors>("vectors", "number of modes used; 0 = all, then no *Select Eigenmodes")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::initialInc>("initialInc", "fixed time increment (time)")
             .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
             .Field<&R::amplitude>("amplitude",

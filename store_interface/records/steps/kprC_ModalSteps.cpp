@@ -54,7 +54,8 @@ const cls_FieldTable& kprC_ResponseSpectrumComponent::Fields() {
     using R = kprC_ResponseSpectrumComponent;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::spectrumName>("spectrumName", "spectrum, written as it stands")
+            .Field<&R::spectrumName>("spectrumName",
+                                     "name of the spectrum, written as it stands, without quotes")
             .RefersTo("amplitude")
             .Field<&R::x>("x", "direction cosine, global X")
             .Field<&R::y>("y", "direction cosine, global Y")
@@ -94,7 +95,9 @@ const cls_FieldTable& kprC_FrequencyStep::Fields() {
             .Field<&R::maxIterations>("maxIterations",
                                       "subspace: largest number of iterations, always written")
             .Field<&R::eigensolver>("eigensolver", "0 subspace, 1 Lanczos, 2 AMS")
-            .Field<&R::dampingProjection>("dampingProjection", "false (0) writes damping projection=off")
+            .Field<&R::dampingProjection>(
+                "dampingProjection",
+                "false: damping is not projected on the modes (AMS, and Lanczos with sim)")
             .Field<&R::minEigen>("minEigen", "lower frequency bound (cycles per time)")
             .Field<&R::blockSize>("blockSize", "Lanczos: block size")
             .Field<&R::maxBlocks>("maxBlocks", "Lanczos: largest number of blocks")
@@ -147,24 +150,18 @@ const cls_FieldTable& kprC_ModalDynamicsStep::Fields() {
             .Field<&R::continueAnalysis>("continueAnalysis",
                                          "go on from the state of the step before, if that is a linear "
                                          "perturbation static or a modal dynamics step")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::timeIncrement>("timeIncrement", "fixed time increment (time)")
             .Field<&R::amplitude>("amplitude",
                                   "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
             .Field<&R::compositeDamping>("compositeDamping",
-                                         "modal damping definition, or absent; the fields stand in the order "
-                                         "in which they are written")
-            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
-                                                       "stand in the order in which they are written")
-            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
-                                                           "stand in the order in which they are written")
+                                         "composite damping by mode; null or absent: none")
+            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
+            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
             .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "modal damping definition, or absent; the fields stand in "
-                                                 "the order in which they are written")
+                                                 "direct damping by frequency; null or absent: none")
             .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "modal damping definition, or absent; the fields stand in "
-                                                   "the order in which they are written");
+                                                   "Rayleigh damping by frequency; null or absent: none");
     return fields;
 }
 
@@ -175,24 +172,17 @@ const cls_FieldTable& kprC_RandomResponseStep::Fields() {
             .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
             .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
             .Field<&R::compositeDamping>("compositeDamping",
-                                         "modal damping definition, or absent; the fields stand in the order "
-                                         "in which they are written")
-            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
-                                                       "stand in the order in which they are written")
-            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
-                                                           "stand in the order in which they are written")
+                                         "composite damping by mode; null or absent: none")
+            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
+            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
             .Field<&R::structuralDamping>("structuralDamping",
-                                          "modal damping definition, or absent; the fields stand in the "
-                                          "order in which they are written")
+                                          "structural damping by mode; null or absent: none")
             .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "modal damping definition, or absent; the fields stand in "
-                                                 "the order in which they are written")
+                                                 "direct damping by frequency; null or absent: none")
             .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "modal damping definition, or absent; the fields stand in "
-                                                   "the order in which they are written")
+                                                   "Rayleigh damping by frequency; null or absent: none")
             .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
-                                                     "modal damping definition, or absent; the fields stand "
-                                                     "in the order in which they are written");
+                                                     "structural damping by frequency; null or absent: none");
     return fields;
 }
 
@@ -218,18 +208,13 @@ const cls_FieldTable& kprC_ResponseSpectrumStep::Fields() {
             .Field<&R::sum>("sum", "0 ABS, 1 CQC, 2 NRL, 3 SRSS, 4 TENP")
             .Field<&R::components>("components", "directions of excitation, one data line each")
             .Field<&R::compositeDamping>("compositeDamping",
-                                         "modal damping definition, or absent; the fields stand in the order "
-                                         "in which they are written")
-            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
-                                                       "stand in the order in which they are written")
-            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
-                                                           "stand in the order in which they are written")
+                                         "composite damping by mode; null or absent: none")
+            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
+            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
             .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "modal damping definition, or absent; the fields stand in "
-                                                 "the order in which they are written")
+                                                 "direct damping by frequency; null or absent: none")
             .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "modal damping definition, or absent; the fields stand in "
-                                                   "the order in which they are written");
+                                                   "Rayleigh damping by frequency; null or absent: none");
     return fields;
 }
 
@@ -255,24 +240,17 @@ const cls_FieldTable& kprC_SteadyStateModalStep::Fields() {
             .Field<&R::subdivideUsingEigenfrequencies>(
                 "subdivideUsingEigenfrequencies", "whether the ranges are divided at the natural frequencies")
             .Field<&R::compositeDamping>("compositeDamping",
-                                         "modal damping definition, or absent; the fields stand in the order "
-                                         "in which they are written")
-            .Field<&R::directDamping>("directDamping", "modal damping definition, or absent; the fields "
-                                                       "stand in the order in which they are written")
-            .Field<&R::rayleighDamping>("rayleighDamping", "modal damping definition, or absent; the fields "
-                                                           "stand in the order in which they are written")
+                                         "composite damping by mode; null or absent: none")
+            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
+            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
             .Field<&R::structuralDamping>("structuralDamping",
-                                          "modal damping definition, or absent; the fields stand in the "
-                                          "order in which they are written")
+                                          "structural damping by mode; null or absent: none")
             .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "modal damping definition, or absent; the fields stand in "
-                                                 "the order in which they are written")
+                                                 "direct damping by frequency; null or absent: none")
             .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "modal damping definition, or absent; the fields stand in "
-                                                   "the order in which they are written")
+                                                   "Rayleigh damping by frequency; null or absent: none")
             .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
-                                                     "modal damping definition, or absent; the fields stand "
-                                                     "in the order in which they are written");
+                                                     "structural damping by frequency; null or absent: none");
     return fields;
 }
 

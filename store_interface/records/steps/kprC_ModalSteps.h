@@ -115,7 +115,7 @@ class kprC_ComplexFrequencyStep final : public kprC_ProcedureOf<kprC_ComplexFreq
 public:
     static constexpr cls_ClassInfo Class{
         "kprC_ComplexFrequencyStep",
-        "Complex eigenvalue extraction. The writer refuses it in oif_Step::Write.", 0x23C007D};
+        "Complex eigenvalue extraction. Of a model with such a step no deck can be written.", 0x23C007D};
 
     int numEigen = cls_UnsetInt;
     double shift = 0.0;

@@ -38,10 +38,9 @@ const cls_FieldTable& kprC_StaticStep::Fields() {
                                "direct method only: accept the increment after the last allowed iteration")
             .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
                                                      "own spelling (written as it stands); empty = none")
-            .RefersTo("set")
-            .Field<&R::solutionTechnique>("solutionTechnique",
-                                          "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
-                                          "SolutionTechnique(), writes nothing");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
     return fields;
 }
 
@@ -66,15 +65,14 @@ const cls_FieldTable& kprC_StaticRiksStep::Fields() {
                                "direct method only: accept the increment after the last allowed iteration")
             .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
                                                      "own spelling (written as it stands); empty = none")
-            .RefersTo("set")
             .Field<&R::nodeMonitored>("nodeMonitored", "whether a displacement of region ends the step")
             .Field<&R::region>("region", "node set that is monitored")
             .Field<&R::dof>("dof", "degree of freedom monitored, 1 to 6")
             .Field<&R::dofValue>("dofValue", "displacement (length) or rotation (radians) that ends the step")
             .Field<&R::longTerm>("longTerm", "long-term (fully relaxed) response of time-dependent materials")
-            .Field<&R::solutionTechnique>("solutionTechnique",
-                                          "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
-                                          "SolutionTechnique(), writes nothing");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
     return fields;
 }
 
@@ -83,9 +81,9 @@ const cls_FieldTable& kprC_GeostaticStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::solutionTechnique>("solutionTechnique",
-                                          "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
-                                          "SolutionTechnique(), writes nothing");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
     return fields;
 }
 
@@ -134,9 +132,9 @@ const cls_FieldTable& kprC_SoilsStep::Fields() {
                                   "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
             .Field<&R::extrapolation>("extrapolation",
                                       "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::solutionTechnique>("solutionTechnique",
-                                          "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
-                                          "SolutionTechnique(), writes nothing");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
     return fields;
 }
 
@@ -159,7 +157,7 @@ const cls_FieldTable& kprC_ViscoStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::creepIntegration>("creepIntegration", "1 explicit")
+            .Field<&R::creepIntegration>("creepIntegration", "0 automatic, 1 explicit")
             .Field<&R::cetol>(
                 "cetol",
                 "largest creep strain error per increment (no unit); always written by the automatic method")
@@ -181,9 +179,9 @@ const cls_FieldTable& kprC_ViscoStep::Fields() {
                                   "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
             .Field<&R::extrapolation>("extrapolation",
                                       "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::solutionTechnique>("solutionTechnique",
-                                          "0 full Newton, 1 separated, 2 quasi-Newton; read only through "
-                                          "SolutionTechnique(), writes nothing");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
     return fields;
 }
 

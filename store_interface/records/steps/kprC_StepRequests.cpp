@@ -75,9 +75,9 @@ const cls_FieldTable& kprC_StandardDiagnosticPrint::Fields() {
             .Field<&R::contact>("contact", "points that open and close")
             .Field<&R::frequency>("frequency", "increments between two prints")
             .Field<&R::modelChange>("modelChange", "removed and reactivated elements")
-            .Field<&R::solve>("solve",
-                              "never written from this record; takes the value of a perturbation record and "
-                              "is what the next one is compared with. A model file leaves it out");
+            .Field<&R::solve>("solve", "never written from this record; takes the value of a perturbation "
+                                       "record and is what the next one is compared with")
+            .NotModelData();
     return fields;
 }
 

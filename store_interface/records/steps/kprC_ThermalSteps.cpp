@@ -23,8 +23,7 @@ const cls_FieldTable& kprC_CoupledTempDisplacementStep::Fields() {
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
             .Field<&R::response>("response", "0 steady state, otherwise transient")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::stabilizationMethod>(
                 "stabilizationMethod",
                 "0 none, 1 by dissipated energy fraction, 2 by damping factor; other values write nothing")
@@ -56,8 +55,7 @@ const cls_FieldTable& kprC_CoupledThermalElectricStep::Fields() {
             .Field<&R::response>("response", "0 steady state, otherwise transient")
             .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; unset = "
                                    "the step ends with its period")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
                                                  "0 automatic, 1 direct (fixed increments)")
             .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
@@ -82,8 +80,7 @@ const cls_FieldTable& kprC_HeatTransferStep::Fields() {
             .Field<&R::response>("response", "0 steady state, otherwise transient")
             .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; unset = "
                                    "the step ends with its period")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
                                                  "0 automatic, 1 direct (fixed increments)")
             .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
@@ -107,8 +104,7 @@ const cls_FieldTable& kprC_MassDiffusionStep::Fields() {
             .Field<&R::response>("response", "0 steady state, otherwise transient")
             .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; 0 = the "
                                    "step ends with its period")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
+            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
             .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
                                                  "0 automatic, 1 direct (fixed increments)")
             .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")

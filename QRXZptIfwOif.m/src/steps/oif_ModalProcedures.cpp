@@ -1,0 +1,223 @@
+#include "steps/oif_ModalProcedures.h"
+
+#include "mesh/oif_SetName.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
+
+#include <utility>
+
+namespace {
+
+using Eigensolver = kprC_FrequencyStep::EigensolverEnm;
+using AcousticCoupling = kprC_FrequencyStep::AcousticCouplingEnm;
+
+constexpr double kComplexMaxEigenDefault = 1e18;
+/// From so many points on a range can be biased.
+constexpr int kPointsForBias = 4;
+
+/// One line for each frequency range, with `ending` behind it.
+template <class Row>
+void WriteRanges(utl_Stream& stream, const cow_List<Row>& ranges, const char* ending = "") {
+    for (int i = 0; i < ranges.Length(); ++i) {
+        const Row& range = ranges[i];
+        stream << range.lower << ", " << range.upper << ", " << range.points << ", ";
+        if (range.points >= kPointsForBias) stream << range.bias;
+        stream << ending << endl;
+    }
+}
+
+template <class Step>
+bool IsLinear(const Step& step) {
+    return step.frequencyScale == kprC_Step::FrequencyScaleEnm::LINEAR;
+}
+
+/// The ranges of procedures that give their scale in each line.
+template <class Step>
+void WriteRangesWithScale(utl_Stream& stream, const Step& step) {
+    WriteRanges(stream, step.frequencies, IsLinear(step) ? ", 1" : ", ");
+}
+
+template <class Step>
+void WriteScaleAndInterval(utl_Stream& stream, const Step& step) {
+    if (IsLinear(step)) stream << ", frequency scale=LINEAR";
+    if (!step.subdivideUsingEigenfrequencies) stream << ", interval=RANGE";
+}
+
+void WriteFrictionDamping(utl_Stream& stream, bool frictionDamping) {
+    stream << ", friction damping=" << oif_YesOrNo(frictionDamping);
+}
+
+/// Null for a number outside the enumeration.
+const char* CouplingText(AcousticCoupling coupling) {
+    switch (coupling) {
+    case AcousticCoupling::OFF: return ", acoustic coupling=off";
+    case AcousticCoupling::ON: return ", acoustic coupling=on";
+    case AcousticCoupling::PROJECTION: return ", acoustic coupling=projection";
+    }
+    return nullptr;
+}
+
+const char* SumText(kprC_ResponseSpectrumStep::SumEnm sum) {
+    using Sum = kprC_ResponseSpectrumStep::SumEnm;
+    switch (sum) {
+    case Sum::ABS: return "ABS";
+    case Sum::CQC: return "CQC";
+    case Sum::NRL: return "NRL";
+    case Sum::SRSS: return "SRSS";
+    case Sum::TENP: return "TENP";
+    }
+    nex_Raise("Unknown response spectrum summation type");
+}
+
+const char* ProjectionText(kprC_SteadyStateSubspaceStep::ProjectionEnm projection) {
+    using Projection = kprC_SteadyStateSubspaceStep::ProjectionEnm;
+    switch (projection) {
+    case Projection::NONE: return nullptr;
+    case Projection::CONSTANT: return "=CONSTANT";
+    case Projection::EIGENFREQUENCY: return "=EIGENFREQUENCY";
+    case Projection::PROPERTY_CHANGE: return "=PROPERTY CHANGE";
+    case Projection::RANGE: return "=RANGE";
+    }
+    return nullptr;
+}
+
+} // namespace
+
+const char* oif_Frequency::EigensolverText() const {
+    switch (step_.eigensolver) {
+    case Eigensolver::SUBSPACE: return ", eigensolver=subspace";
+    case Eigensolver::LANCZOS: return ", eigensolver=Lanczos";
+    case Eigensolver::AMS: return ", eigensolver=AMS";
+    }
+    return nullptr;
+}
+
+void oif_Frequency::Write(utl_Stream& stream) const {
+    stream << "*Frequency" << EigensolverText();
+    if (step_.eigensolver == Eigensolver::LANCZOS) {
+        stream << (step_.sim ? ", sim" : ", sim=NO");
+        if (step_.sim && !step_.dampingProjection) stream << ", damping projection=off";
+        stream << CouplingText(step_.acousticCoupling);
+    }
+    stream << (step_.normalization == kprC_FrequencyStep::NormalizationEnm::DISPLACEMENT
+                   ? ", normalization=displacement"
+                   : ", normalization=mass");
+    // The blanks around the equals sign are part of the text.
+    if (step_.propertyEvaluationFrequency != cls_UnsetDouble)
+        stream << ", property evaluation = " << step_.propertyEvaluationFrequency;
+    if (step_.residualModes &&
+        (step_.eigensolver == Eigensolver::LANCZOS || step_.eigensolver == Eigensolver::AMS))
+        stream << ", residual modes";
+    if (step_.eigensolver == Eigensolver::AMS) WriteAmsParameters(stream);
+    stream << endl;
+    WriteData(stream);
+}
+
+void oif_Frequency::WriteAmsParameters(utl_Stream& stream) const {
+    // Coupling that is on is said for Lanczos only.
+    if (step_.acousticCoupling != AcousticCoupling::ON) stream << CouplingText(step_.acousticCoupling);
+    if (!step_.dampingProjection) stream << ", damping projection=off";
+    if (step_.nsetRegion.SetName().IsEmpty()) return;
+    stream << ", nset="
+           << oif_SetName(step_.nsetRegion, *modelInfo_).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+}
+
+void oif_Frequency::WriteData(utl_Stream& stream) const {
+    switch (step_.eigensolver) {
+    case Eigensolver::LANCZOS:
+        oif_WriteItems(stream, step_.numEigen, step_.minEigen, step_.maxEigen, step_.shift, step_.blockSize,
+                       step_.maxBlocks);
+        stream << endl;
+        break;
+    case Eigensolver::SUBSPACE:
+        oif_WriteItems(stream, step_.numEigen, step_.maxEigen, step_.shift);
+        stream << ", " << step_.vectors << ", " << step_.maxIterations << endl;
+        break;
+    case Eigensolver::AMS: WriteAmsData(stream); break;
+    }
+}
+
+void oif_Frequency::WriteAmsData(utl_Stream& stream) const {
+    const std::pair<double, double> factorsAndDefaults[] = {{step_.substructureCutoffMultiplier, 5.0},
+                                                            {step_.firstCutoffMultiplier, 1.7},
+                                                            {step_.secondCutoffMultiplier, 1.1},
+                                                            {step_.acousticRangeFactor, 1.0}};
+    oif_WriteItems(stream, step_.numEigen, step_.minEigen, step_.maxEigen);
+    for (const auto& [factor, defaultFactor] : factorsAndDefaults) {
+        stream << ", ";
+        oif_WriteUnless(stream, factor, defaultFactor);
+    }
+    stream << endl;
+    if (!step_.residualModes) return;
+    for (int i = 0; i < step_.residualModeValues.Length(); ++i) {
+        stream << oif_SetName(step_.residualModeSets[i], true)
+                      .UniqueSetName(oif_SetName::regionContext::ASSEMBLY)
+               << ", " << step_.residualModeValues[i] << endl;
+    }
+}
+
+void oif_ComplexFrequency::Write(utl_Stream& stream) const {
+    stream << "*Complex Frequency";
+    WriteFrictionDamping(stream, step_.frictionDamping);
+    stream << endl;
+    oif_WriteItems(stream, step_.numEigen, step_.minEigen);
+    stream << ", ";
+    if (step_.maxEigen < kComplexMaxEigenDefault || step_.minEigen != cls_UnsetDouble)
+        stream << step_.maxEigen;
+    stream << ", ";
+    oif_WriteUnless(stream, step_.shift, 0.0);
+    stream << endl;
+}
+
+void oif_ModalDynamics::Write(utl_Stream& stream) const {
+    const bool canContinue = previousProcedure_ == kprC_StaticLinearPerturbationStep::TypeId() ||
+                             previousProcedure_ == kprC_ModalDynamicsStep::TypeId();
+    stream << "*Modal dynamic, continue=" << oif_YesOrNo(step_.continueAnalysis && canContinue) << endl
+           << step_.timeIncrement << ", " << step_.timePeriod << endl;
+}
+
+void oif_RandomResponse::Write(utl_Stream& stream) const {
+    stream << "*Random Response" << endl;
+    WriteRangesWithScale(stream, step_);
+}
+
+void oif_ResponseSpectrum::Write(utl_Stream& stream) const {
+    using Comp = kprC_ResponseSpectrumStep::CompEnm;
+    stream << "*Response spectrum";
+    if (step_.comp == Comp::ALGEBRAIC) stream << ", comp=ALGEBRAIC";
+    if (step_.comp == Comp::SRSS) stream << ", comp=SRSS";
+    stream << ", sum=";
+    stream << SumText(step_.sum) << endl;
+    for (int i = 0; i < step_.components.Length(); ++i) {
+        const kprC_ResponseSpectrumComponent& component = step_.components[i];
+        // No blank behind the first comma.
+        stream << component.spectrumName << "," << component.x << ", " << component.y << ", " << component.z
+               << ", " << component.scale << endl;
+    }
+}
+
+void oif_SteadyStateDirect::Write(utl_Stream& stream) const {
+    stream << "*Steady State Dynamics" << (step_.complex ? ", direct" : ", direct=REAL ONLY");
+    if (step_.subdivideUsingEigenfrequencies) stream << ", interval=EIGENFREQUENCY";
+    stream << endl;
+    WriteRangesWithScale(stream, step_);
+}
+
+void oif_SteadyStateModal::Write(utl_Stream& stream) const {
+    stream << "*Steady State Dynamics";
+    WriteScaleAndInterval(stream, step_);
+    stream << endl;
+    WriteRanges(stream, step_.frequencies);
+}
+
+void oif_SteadyStateSubspace::Write(utl_Stream& stream) const {
+    stream << "*Steady State Dynamics, subspace projection" << ProjectionText(step_.projection);
+    if (step_.projection == kprC_SteadyStateSubspaceStep::ProjectionEnm::PROPERTY_CHANGE) {
+        stream << ", damping change=" << step_.dampingChange
+               << ", stiffness change=" << step_.stiffnessChange;
+    }
+    if (!step_.complex) stream << ", real only";
+    WriteScaleAndInterval(stream, step_);
+    WriteFrictionDamping(stream, step_.frictionDamping);
+    stream << endl;
+    WriteRanges(stream, step_.frequencies);
+}
