@@ -2,6 +2,16 @@
 
 #include "store_interface/records/cls_ClassRegistrar.h"
 
+#include <algorithm>
+
+void mdf_RecordCheck::Columns(const char* field, const cow_2DArray<double>& table, const char* names) {
+    const std::string_view list(names);
+    const auto expected = 1 + static_cast<int>(std::count(list.begin(), list.end(), ','));
+    if (table.IsEmpty() || table.NumColumns() == expected) return;
+    Error(field, "found rows of " + std::to_string(table.NumColumns()) + ", expected rows of " +
+                     std::to_string(expected) + ": " + names);
+}
+
 void mdf_RecordCheck::NotNegative(const char* field, int value) {
     if (value < 0) Error(field, "found " + std::to_string(value) + ", expected 0 or more");
 }
@@ -13,6 +23,7 @@ void mdf_RecordCheck::NotNegative(const char* field, double value) {
 const mdf_RecordChecks& mdf_RecordChecks::All() {
     static const mdf_RecordChecks checks = [] {
         mdf_RecordChecks all;
+        mdf_AddAmplitudeChecks(all);
         mdf_AddStepChecks(all);
         return all;
     }();

@@ -2,7 +2,7 @@
 #define QRX_MODEL_FILE_MDF_RECORDCHECKS_H
 
 #include "model_file/mdf_Diagnostics.h"
-#include "store_interface/records/cls_Record.h"
+#include "store_interface/records/cls_FieldTable.h"
 
 #include <functional>
 #include <unordered_map>
@@ -19,6 +19,8 @@ public:
     void Warning(const char* field, const std::string& text) {
         diagnostics_.Warning(mdf_Path(path_, std::string_view(field)), text);
     }
+    /// An error unless the table has no rows, or as many columns as there are names, such as "time, value".
+    void Columns(const char* field, const cow_2DArray<double>& table, const char* names);
     /// An error unless the number is 0 or more.
     void NotNegative(const char* field, int value);
     void NotNegative(const char* field, double value);
@@ -49,6 +51,7 @@ private:
         checks_;
 };
 
+void mdf_AddAmplitudeChecks(mdf_RecordChecks& checks);
 void mdf_AddStepChecks(mdf_RecordChecks& checks);
 
 #endif

@@ -27,6 +27,10 @@ std::string Steps(const std::string& steps) {
     return Model(R"("steps": [)" + steps + "]");
 }
 
+std::string Amplitude(const std::string& members) {
+    return Model(R"("amplitudes": {"A": {)" + members + "}}");
+}
+
 const std::string connectionTypes =
     "NONE (0), BEAM (1), BUSHING (2), CVJOINT (3), CYLINDRICAL (4), HINGE (5), PLANAR (6), RETRACTOR (7), "
     "SLIPRING (8), TRANSLATOR (9), UJOINT (10), WELD (11)";
@@ -56,6 +60,31 @@ const FindingCase recordCases[] = {
      {"@/sections/S/states: found an unknown member 'states', expected one of assembledType, "
       "translationalType, "
       "rotationalType, class"}},
+
+    {"AmplitudeTableOfThreeColumns",
+     Amplitude(R"("class": "kamC_Tabular", "table": [[0, 1, 2]])"),
+     {"@/amplitudes/A/table: found rows of 3, expected rows of 2: time, value"}},
+    {"SmoothStepTableOfOneColumn",
+     Amplitude(R"("class": "kamC_SmoothStep", "table": [[0], [1]])"),
+     {"@/amplitudes/A/table: found rows of 1, expected rows of 2: time, value"}},
+    {"PeriodicTableOfThreeColumns",
+     Amplitude(R"("class": "kamC_Periodic", "table": [[0, 1, 2]])"),
+     {"@/amplitudes/A/table: found rows of 3, expected rows of 2: cosine term, sine term"}},
+    {"PsdTableOfTwoColumns",
+     Amplitude(R"("class": "kamC_PsdDefinition", "table": [[0, 1]])"),
+     {"@/amplitudes/A/table: found rows of 2, expected rows of 3: real part, imaginary part, frequency"}},
+    {"SpectrumTableOfTwoColumns",
+     Amplitude(R"("class": "kamC_Spectrum", "table": [[0, 1]])"),
+     {"@/amplitudes/A/table: found rows of 2, expected rows of 3: magnitude, frequency, fraction of critical "
+      "damping"}},
+    {"AmplitudeWithoutClass",
+     Amplitude(""),
+     {"@/amplitudes/A/class: found nothing, expected one of kamC_Tabular, kamC_EquallySpaced, kamC_Periodic, "
+      "kamC_Modulated, kamC_Decay, kamC_SolutionDependent, kamC_SmoothStep, kamC_PsdDefinition, "
+      "kamC_Spectrum"}},
+    {"NumberInTheListOfAnAmplitudeAsNull",
+     Amplitude(R"("class": "kamC_EquallySpaced", "values": [1, null])"),
+     {"@/amplitudes/A/values/1: found null, expected a number"}},
 
     {"EnumUnknownName",
      Section(R"(, "assembledType": "HINGES")"),

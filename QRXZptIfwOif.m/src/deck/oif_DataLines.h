@@ -1,0 +1,31 @@
+#ifndef QRX_OIF_DATALINES_H
+#define QRX_OIF_DATALINES_H
+
+#include "foundation/utl_Stream.h"
+
+/// Writes values in data lines of at most `perLine`: ", " between two of a line, and nothing but its end
+/// behind the last.
+class oif_DataLines {
+public:
+    oif_DataLines(utl_Stream& stream, int perLine) : stream_(stream), perLine_(perLine) {}
+
+    template <class Value>
+    oif_DataLines& Add(const Value& value) {
+        if (onLine_ > 0) stream_ << ", ";
+        stream_ << value;
+        if (++onLine_ == perLine_) End();
+        return *this;
+    }
+    /// Ends a line that has been begun; after a full line there is none.
+    void End() {
+        if (onLine_ > 0) stream_.LineBreak();
+        onLine_ = 0;
+    }
+
+private:
+    utl_Stream& stream_;
+    int perLine_;
+    int onLine_ = 0;
+};
+
+#endif
