@@ -116,10 +116,13 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_LinearCtrl",
                                          "Controls of the iterative linear equation solver."};
 
+    static constexpr int maxIterationsDef() { return 0; }
+    static constexpr double relativeToleranceDef() { return 0.0; }
+
     bool useDefault = false;
     bool resetOnly = false;
-    double relativeTolerance = 0.0;
-    int maxIterations = 0;
+    double relativeTolerance = relativeToleranceDef();
+    int maxIterations = maxIterationsDef();
 
     static const cls_FieldTable& Fields();
 };

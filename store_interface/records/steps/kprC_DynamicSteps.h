@@ -21,11 +21,15 @@ public:
     enum class RollingDirectionEnm : int { X = 0, Y = 1, Z = 2, NONE = 3 };
     enum class FrequencyKindEnm : int { NONE = 0, NUMBER_INTERVAL = 1 };
 
+    static constexpr double dtDef() { return 0.0; }
+    static constexpr double factorDef() { return 0.0; }
+    static constexpr int frequencyDef() { return 0; }
+
     MassScalingTypeEnm type = MassScalingTypeEnm::SEMI_AUTOMATIC;
     rgnC_Region region;
-    int frequency = 0;
-    double dt = 0.0;
-    double factor = 0.0;
+    int frequency = frequencyDef();
+    double dt = dtDef();
+    double factor = factorDef();
     int numberInterval = 1;
     FrequencyKindEnm frequencyKind = FrequencyKindEnm::NONE;
     double feedRate = 0.0;
@@ -55,19 +59,24 @@ public:
 
     enum class InitialConditionsEnm : int { DEFAULT = 0, COMPUTE = 1, NONE = 2 };
 
+    static constexpr double alphaDef() { return cls_UnsetDouble; }
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::PROCEDURE_DEFAULT; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     bool adiabatic = false;
     double timePeriod = 1.0;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     double haftol = 0.0;
     bool nohaf = false;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::PROCEDURE_DEFAULT;
-    double alpha = cls_UnsetDouble;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
+    double alpha = alphaDef();
     bool noStop = false;
     InitialConditionsEnm initialConditions = InitialConditionsEnm::DEFAULT;
 
@@ -86,12 +95,15 @@ public:
         FIXED = 3
     };
 
+    static constexpr double maxIncrementDef() { return cls_UnsetDouble; }
+    static constexpr double scaleFactorDef() { return 1.0; }
+
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
     bool adiabatic = false;
     double timePeriod = 1.0;
     double initialInc = 0.0;
-    double maxIncrement = cls_UnsetDouble;
-    double scaleFactor = 1.0;
+    double maxIncrement = maxIncrementDef();
+    double scaleFactor = scaleFactorDef();
     double linearBulkViscosity = 0.06;
     double quadraticBulkViscosity = 1.2;
     cow_List<kprC_MassScaling> massScaling;
@@ -108,10 +120,13 @@ public:
 
     kprC_ExplicitDynamicsStep::TimeIncrementationEnm timeIncrementationMethod =
         kprC_ExplicitDynamicsStep::TimeIncrementationEnm::AUTOMATIC;
+    static constexpr double maxIncrementDef() { return cls_UnsetDouble; }
+    static constexpr double scaleFactorDef() { return 1.0; }
+
     double timePeriod = 1.0;
     double initialInc = 0.0;
-    double maxIncrement = cls_UnsetDouble;
-    double scaleFactor = 1.0;
+    double maxIncrement = maxIncrementDef();
+    double scaleFactor = scaleFactorDef();
     double linearBulkViscosity = 0.06;
     double quadraticBulkViscosity = 1.2;
     cow_List<kprC_MassScaling> massScaling;
@@ -126,12 +141,16 @@ public:
         "kprC_SubspaceDynamicsStep",
         "Explicit integration of the equations projected on the modes of an earlier step.", 0x23C0078};
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr int maxNumIncDef() { return 100; }
+    static constexpr int vectorsDef() { return 0; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
-    int vectors = 0;
+    int vectors = vectorsDef();
     double timePeriod = 1.0;
     double initialInc = 1.0;
-    int maxNumInc = 100;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
+    int maxNumInc = maxNumIncDef();
+    AmplitudeEnm amplitude = amplitudeDef();
 
     static const cls_FieldTable& Fields();
 };

@@ -82,25 +82,37 @@ public:
     enum class NormalizationEnm : int { DISPLACEMENT = 0, MASS = 1 };
     enum class AcousticCouplingEnm : int { OFF = 0, ON = 1, PROJECTION = 2 };
 
-    int numEigen = cls_UnsetInt;
-    double maxEigen = cls_UnsetDouble;
-    double shift = cls_UnsetDouble;
+    static constexpr double acousticRangeFactorDef() { return 1.0; }
+    static constexpr int blockSizeDef() { return cls_UnsetInt; }
+    static constexpr double firstCutoffMultiplierDef() { return 1.7; }
+    static constexpr int maxBlocksDef() { return cls_UnsetInt; }
+    static constexpr double maxEigenDef() { return cls_UnsetDouble; }
+    static constexpr double minEigenDef() { return cls_UnsetDouble; }
+    static constexpr int numEigenDef() { return cls_UnsetInt; }
+    static constexpr double propertyEvaluationFrequencyDef() { return cls_UnsetDouble; }
+    static constexpr double secondCutoffMultiplierDef() { return 1.1; }
+    static constexpr double shiftDef() { return cls_UnsetDouble; }
+    static constexpr double substructureCutoffMultiplierDef() { return 5.0; }
+
+    int numEigen = numEigenDef();
+    double maxEigen = maxEigenDef();
+    double shift = shiftDef();
     int vectors = 18;
     int maxIterations = 30;
     EigensolverEnm eigensolver = EigensolverEnm::LANCZOS;
     bool dampingProjection = true;
-    double minEigen = cls_UnsetDouble;
-    int blockSize = cls_UnsetInt;
-    int maxBlocks = cls_UnsetInt;
+    double minEigen = minEigenDef();
+    int blockSize = blockSizeDef();
+    int maxBlocks = maxBlocksDef();
     NormalizationEnm normalization = NormalizationEnm::DISPLACEMENT;
-    double propertyEvaluationFrequency = cls_UnsetDouble;
+    double propertyEvaluationFrequency = propertyEvaluationFrequencyDef();
     AcousticCouplingEnm acousticCoupling = AcousticCouplingEnm::ON;
     bool residualModes = false;
     bool sim = false;
-    double substructureCutoffMultiplier = 5.0;
-    double firstCutoffMultiplier = 1.7;
-    double secondCutoffMultiplier = 1.1;
-    double acousticRangeFactor = 1.0;
+    double substructureCutoffMultiplier = substructureCutoffMultiplierDef();
+    double firstCutoffMultiplier = firstCutoffMultiplierDef();
+    double secondCutoffMultiplier = secondCutoffMultiplierDef();
+    double acousticRangeFactor = acousticRangeFactorDef();
     cow_List<cow_String> residualModeSets;
     cow_List<int> residualModeValues;
     rgnC_Region nsetRegion;
@@ -117,11 +129,16 @@ public:
         "kprC_ComplexFrequencyStep",
         "Complex eigenvalue extraction. Of a model with such a step no deck can be written.", 0x23C007D};
 
-    int numEigen = cls_UnsetInt;
-    double shift = 0.0;
+    static constexpr double maxEigenDef() { return 1e+18; }
+    static constexpr double minEigenDef() { return cls_UnsetDouble; }
+    static constexpr int numEigenDef() { return cls_UnsetInt; }
+    static constexpr double shiftDef() { return 0.0; }
+
+    int numEigen = numEigenDef();
+    double shift = shiftDef();
     bool frictionDamping = false;
-    double minEigen = cls_UnsetDouble;
-    double maxEigen = 1e+18;
+    double minEigen = minEigenDef();
+    double maxEigen = maxEigenDef();
 
     static const cls_FieldTable& Fields();
 };
@@ -131,10 +148,12 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_ModalDynamicsStep",
                                          "Transient dynamics by modal superposition.", 0x23C006F};
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+
     bool continueAnalysis = false;
     double timePeriod = 1.0;
     double timeIncrement = 1.0;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
+    AmplitudeEnm amplitude = amplitudeDef();
     mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
     mdl_ObjCow<kprC_DirectDamping> directDamping;
     mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
@@ -191,10 +210,12 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateDirectStep",
                                          "Harmonic response by direct solution.", 0x23C0076};
 
+    static constexpr bool subdivideUsingEigenfrequenciesDef() { return false; }
+
     bool complex = true;
     cow_List<kprC_SteadyStateDirectFrequency> frequencies;
     FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
-    bool subdivideUsingEigenfrequencies = false;
+    bool subdivideUsingEigenfrequencies = subdivideUsingEigenfrequenciesDef();
 
     static const cls_FieldTable& Fields();
 };
@@ -204,9 +225,11 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateModalStep",
                                          "Harmonic response on the modes of an earlier step.", 0x23C0077};
 
+    static constexpr bool subdivideUsingEigenfrequenciesDef() { return true; }
+
     cow_List<kprC_SteadyStateModalFrequency> frequencies;
     FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
-    bool subdivideUsingEigenfrequencies = true;
+    bool subdivideUsingEigenfrequencies = subdivideUsingEigenfrequenciesDef();
     mdl_ObjCow<kprC_CompositeDamping> compositeDamping;
     mdl_ObjCow<kprC_DirectDamping> directDamping;
     mdl_ObjCow<kprC_RayleighDamping> rayleighDamping;
@@ -232,11 +255,13 @@ public:
         RANGE = 4
     };
 
+    static constexpr bool subdivideUsingEigenfrequenciesDef() { return true; }
+
     bool complex = true;
     cow_List<kprC_SteadyStateSubspaceFrequency> frequencies;
     FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
     bool frictionDamping = false;
-    bool subdivideUsingEigenfrequencies = true;
+    bool subdivideUsingEigenfrequencies = subdivideUsingEigenfrequenciesDef();
     ProjectionEnm projection = ProjectionEnm::NONE;
     double dampingChange = 0.1;
     double stiffnessChange = 0.1;

@@ -12,18 +12,22 @@ public:
 
     enum class StabilizationEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::RAMP; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     bool adiabatic = false;
     double timePeriod = 1.0;
     StabilizationEnm stabilizationMethod = StabilizationEnm::NONE;
     double stabilizationMagnitude = 0.0002;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
-    AmplitudeEnm amplitude = AmplitudeEnm::RAMP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     bool noStop = false;
     cow_String fullyPlastic;
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
@@ -37,16 +41,21 @@ public:
     static constexpr cls_ClassInfo Class{
         "kprC_StaticRiksStep", "Static analysis with arc length control, for unstable collapse.", 0x23C0074};
 
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr double maxArcIncDef() { return 1e+36; }
+    static constexpr double maxLPFDef() { return cls_UnsetDouble; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     bool adiabatic = false;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialArcInc = 1.0;
     double totalArc = 1.0;
     double minArcInc = 1e-05;
-    double maxArcInc = 1e+36;
-    double maxLPF = cls_UnsetDouble;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    double maxArcInc = maxArcIncDef();
+    double maxLPF = maxLPFDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     bool noStop = false;
     cow_String fullyPlastic;
     bool nodeMonitored = false;
@@ -83,22 +92,27 @@ public:
     enum class ResponseEnm : int { TRANSIENT = 0, STEADY_STATE = 1 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr double endDef() { return cls_UnsetDouble; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     ResponseEnm response = ResponseEnm::TRANSIENT;
-    double end = cls_UnsetDouble;
+    double end = endDef();
     double timePeriod = 1.0;
     StabilizationMethodEnm stabilizationMethod = StabilizationMethodEnm::NONE;
     double stabilizationMagnitude = 0.0002;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     bool creep = true;
     double cetol = 0.0;
     double utol = 0.0;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
 
     static const cls_FieldTable& Fields();
@@ -114,6 +128,10 @@ public:
     enum class CreepIntegrationEnm : int { AUTOMATIC = 0, EXPLICIT = 1 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     CreepIntegrationEnm creepIntegration = CreepIntegrationEnm::AUTOMATIC;
     double cetol = 0.0;
@@ -121,12 +139,12 @@ public:
     StabilizationMethodEnm stabilizationMethod = StabilizationMethodEnm::NONE;
     double stabilizationMagnitude = 0.0002;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
 
     static const cls_FieldTable& Fields();
@@ -141,7 +159,9 @@ public:
                                          "are reset, at a given temperature.",
                                          0x23C0065};
 
-    double refTemp = cls_UnsetDouble;
+    static constexpr double refTempDef() { return cls_UnsetDouble; }
+
+    double refTemp = refTempDef();
     NlgeomEnm nlgeom = NlgeomEnm::ON;
 
     static const cls_FieldTable& Fields();
@@ -153,14 +173,19 @@ public:
 
     enum class EigensolverEnm : int { SUBSPACE = 0, LANCZOS = 1 };
 
+    static constexpr int blockSizeDef() { return cls_UnsetInt; }
+    static constexpr int maxBlocksDef() { return cls_UnsetInt; }
+    static constexpr double maxEigenDef() { return cls_UnsetDouble; }
+    static constexpr double minEigenDef() { return cls_UnsetDouble; }
+
     int numEigen = 10;
-    double maxEigen = cls_UnsetDouble;
+    double maxEigen = maxEigenDef();
     int vectors = 18;
     int maxIterations = 30;
     EigensolverEnm eigensolver = EigensolverEnm::SUBSPACE;
-    double minEigen = cls_UnsetDouble;
-    int blockSize = cls_UnsetInt;
-    int maxBlocks = cls_UnsetInt;
+    double minEigen = minEigenDef();
+    int blockSize = blockSizeDef();
+    int maxBlocks = maxBlocksDef();
 
     static const cls_FieldTable& Fields();
 };

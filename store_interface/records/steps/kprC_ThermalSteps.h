@@ -13,21 +13,25 @@ public:
     enum class CreepEnm : int { AUTOMATIC = 0, EXPLICIT = 1, NONE = 2 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     ResponseEnm response = ResponseEnm::TRANSIENT;
     double timePeriod = 1.0;
     StabilizationMethodEnm stabilizationMethod = StabilizationMethodEnm::NONE;
     double stabilizationMagnitude = 0.0002;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     double deltmx = 0.0;
     double cetol = 0.0;
     CreepEnm creep = CreepEnm::AUTOMATIC;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
 
     static const cls_FieldTable& Fields();
@@ -40,18 +44,24 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_CoupledThermalElectricStep",
                                          "Coupled thermal-electrical conduction.", 0x23C0068};
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr double endDef() { return cls_UnsetDouble; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+    static constexpr double mxdemDef() { return 0.1; }
+
     ResponseEnm response = ResponseEnm::TRANSIENT;
-    double end = cls_UnsetDouble;
+    double end = endDef();
     double timePeriod = 1.0;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     double deltmx = 0.0;
-    double mxdem = 0.1;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    double mxdem = mxdemDef();
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
 
     static const cls_FieldTable& Fields();
@@ -61,18 +71,24 @@ class kprC_HeatTransferStep final : public kprC_ProcedureOf<kprC_HeatTransferSte
 public:
     static constexpr cls_ClassInfo Class{"kprC_HeatTransferStep", "Uncoupled heat transfer.", 0x23C006C};
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr double endDef() { return cls_UnsetDouble; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+    static constexpr double mxdemDef() { return 0.1; }
+
     ResponseEnm response = ResponseEnm::TRANSIENT;
-    double end = cls_UnsetDouble;
+    double end = endDef();
     double timePeriod = 1.0;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     double deltmx = 0.0;
-    double mxdem = 0.1;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    double mxdem = mxdemDef();
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
 
     static const cls_FieldTable& Fields();
 };
@@ -81,17 +97,22 @@ class kprC_MassDiffusionStep final : public kprC_ProcedureOf<kprC_MassDiffusionS
 public:
     static constexpr cls_ClassInfo Class{"kprC_MassDiffusionStep", "Mass diffusion.", 0x23C006E};
 
+    static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
+    static constexpr double endDef() { return 0.0; }
+    static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
+    static constexpr int maxNumIncDef() { return 100; }
+
     ResponseEnm response = ResponseEnm::TRANSIENT;
-    double end = 0.0;
+    double end = endDef();
     double timePeriod = 1.0;
     TimeIncrementationEnm timeIncrementationMethod = TimeIncrementationEnm::AUTOMATIC;
-    int maxNumInc = 100;
+    int maxNumInc = maxNumIncDef();
     double initialInc = 1.0;
     double minInc = 1e-05;
     double maxInc = 1.0;
     double dcmax = 0.0;
-    AmplitudeEnm amplitude = AmplitudeEnm::STEP;
-    ExtrapolationEnm extrapolation = ExtrapolationEnm::LINEAR;
+    AmplitudeEnm amplitude = amplitudeDef();
+    ExtrapolationEnm extrapolation = extrapolationDef();
 
     static const cls_FieldTable& Fields();
 };
