@@ -11,7 +11,8 @@
 #include "store_interface/records/materials/kmaC_Material.h"
 #include "store_interface/records/output/korC_Output.h"
 #include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
-#include "store_interface/records/sections/kseC_Section.h"
+#include "store_interface/records/sections/kbpC_BeamProfile.h"
+#include "store_interface/records/sections/kseC_ConnectorSection.h"
 
 #include <map>
 #include <memory>

@@ -1,6 +1,7 @@
 #include "store_interface/records/interactions/kinC_Interaction.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/interactions/kinC_ActuatorSensor.h"
 
 bool kinC_Interaction::HasStep(const cow_String& stepName) const {
     // IsActive() knows status 14 too, which interactions never have.
@@ -20,4 +21,5 @@ void cls_RegisterInteractionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kinC_ContactControls>();
     registrar.Add<kinC_ContactInitialization>();
     registrar.Add<kinC_ContactStabilization>();
+    cls_RegisterActuatorSensorRecords(registrar);
 }

@@ -9,69 +9,18 @@ class cls_ClassRegistrar;
 class kseC_Section : public cls_AbstractRecordOf<kseC_Section> {
 public:
     static constexpr cls_ClassInfo Class{"kseC_Section", "what an element set is made of"};
+
+    /// The material, of sections that name one for the whole set; else empty.
+    virtual cow_String MaterialName() const { return {}; }
+    /// Shells with rebar layers.
+    virtual bool HasRebar() const { return false; }
+    /// Some rebar layer has no orientation of its own.
+    virtual bool UsesRebarOrientation() const { return false; }
+    /// Appends the names of orientations in layers that the list doesn't hold yet.
+    virtual void AddUserOrientations(cow_List<cow_String>&) const {}
+    /// The number of temperature points through the thickness; 0 for a gradient. The argument is ignored.
+    virtual int NumTempPoints(bool) const { return 0; }
 };
-
-/// A cross-section of beams; held by name in the model's profile map.
-class kbpC_BeamProfile : public cls_AbstractRecordOf<kbpC_BeamProfile> {
-public:
-    static constexpr cls_ClassInfo Class{"kbpC_BeamProfile", "a cross-section of beams"};
-};
-
-/// Connector elements of the assembly: kind of connection and behaviour.
-class kseC_ConnectorSection final : public cls_RecordOf<kseC_ConnectorSection, kseC_Section> {
-public:
-    static constexpr cls_ClassInfo Class{"kseC_ConnectorSection", "connector elements of the assembly"};
-
-    enum class AssembledTypeEnm : int {
-        NONE = 0,
-        BEAM = 1,
-        BUSHING = 2,
-        CVJOINT = 3,
-        CYLINDRICAL = 4,
-        HINGE = 5,
-        PLANAR = 6,
-        RETRACTOR = 7,
-        SLIPRING = 8,
-        TRANSLATOR = 9,
-        UJOINT = 10,
-        WELD = 11
-    };
-    enum class TranslationalTypeEnm : int {
-        NONE = 0,
-        ACCELEROMETER = 1,
-        AXIAL = 2,
-        CARTESIAN = 3,
-        JOIN = 4,
-        LINK = 5,
-        PROJECTION_CARTESIAN = 6,
-        RADIAL_THRUST = 7,
-        SLIDE_PLANE = 8,
-        SLOT = 9
-    };
-    enum class RotationalTypeEnm : int {
-        NONE = 0,
-        ALIGN = 1,
-        CARDAN = 2,
-        CONSTANT_VELOCITY = 3,
-        EULER = 4,
-        FLEXION_TORSION = 5,
-        FLOW_CONVERTER = 6,
-        PROJECTION_FLEXION_TORSION = 7,
-        REVOLUTE = 8,
-        ROTATION = 9,
-        ROTATION_ACCELEROMETER = 10,
-        UNIVERSAL = 11
-    };
-
-    AssembledTypeEnm assembledType = AssembledTypeEnm::NONE;
-    TranslationalTypeEnm translationalType = TranslationalTypeEnm::NONE;
-    RotationalTypeEnm rotationalType = RotationalTypeEnm::NONE;
-
-    static const cls_FieldTable& Fields();
-};
-const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::AssembledTypeEnm);
-const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::TranslationalTypeEnm);
-const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::RotationalTypeEnm);
 
 void cls_RegisterSectionRecords(cls_ClassRegistrar& registrar);
 

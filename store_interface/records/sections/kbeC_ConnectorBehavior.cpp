@@ -1,0 +1,491 @@
+#include "store_interface/records/sections/kbeC_ConnectorBehavior.h"
+
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorOptions::InterpolationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "LINEAR", "LINEAR"}, {1, "LOGARITHMIC", "LOGARITHMIC"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorOptions::InterpolationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorOptions::ExtrapolationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "CONSTANT", "CONSTANT"}, {1, "LINEAR", "LINEAR"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorOptions::ExtrapolationEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorOptions::Fields() {
+    using R = kbeC_ConnectorOptions;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::useBehaviorRegularization>("useBehaviorRegularization",
+                                                  "true: no 'regularize=' and no 'rtol='.")
+            .Field<&R::regularize>("regularize",
+                                   "'regularize=ON' (then 'rtol=' follows) or 'regularize=OFF'.")
+            .Field<&R::useBehaviorRtol>("useBehaviorRtol",
+                                        "true: 'rtol=' with 0.03; false: with `regularization`.")
+            .Field<&R::regularization>("regularization", "tolerance (fraction)")
+            .Field<&R::useBehaviorRateFactor>("useBehaviorRateFactor", "true: no 'rate filter factor='.")
+            .Field<&R::rateFactor>("rateFactor", "rate filter factor; 0.9 writes nothing")
+            .Field<&R::interpolation>("interpolation", "between rates. 1: 'rate interpolation=LOGARITHMIC'.")
+            .Field<&R::useBehaviorExtrapolation>("useBehaviorExtrapolation", "true: no 'extrapolation='.")
+            .Field<&R::extrapolation>("extrapolation", "1 'LINEAR', else 'CONSTANT'.");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_CDCTerm::OperatorEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "SQUARE_ROOT", "SQUARE ROOT"}, {1, "SUM", "SUM"}, {2, "MACAULEY_SUM", "MACAULEY SUM"}};
+    static constexpr omu_EnumTable table{"kbeC_CDCTerm::OperatorEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_CDCTerm::SignEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "POSITIVE", "POSITIVE"}, {1, "NEGATIVE", "NEGATIVE"}};
+    static constexpr omu_EnumTable table{"kbeC_CDCTerm::SignEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_CDCTerm::IndependentKindEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "POSITION", "POSITION"},
+                                           {1, "CONSTITUTIVE_MOTION", "CONSTITUTIVE MOTION"}};
+    static constexpr omu_EnumTable table{"kbeC_CDCTerm::IndependentKindEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_CDCTerm::Fields() {
+    using R = kbeC_CDCTerm;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::operatorType>("operatorType",
+                                     "`operator`, a reserved word in C++ (both the C++ member and the JSON "
+                                     "key are operatorType); How the components are added: 0 square root of "
+                                     "the sum of squares (nothing written), 1 sum, 2 Macauley sum.")
+            .Field<&R::sign>("sign", "1: ', sign=NEGATIVE'.")
+            .Field<&R::independentGiven>(
+                "independentGiven", "true: the table depends on positions or motions, by independentKind.")
+            .Field<&R::independentKind>("independentKind",
+                                        "0 position, 1 constitutive motion; read only with independentGiven.")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::components>(
+                "components",
+                "connector components 1 to 6, in the user's order; the components that the term is made of")
+            .Field<&R::table>("table",
+                              "one scale factor per component, then the independent variable's columns if "
+                              "given, temperature if temperatureDependency, field variables")
+            .Field<&R::options>("options", "regularization group");
+    return fields;
+}
+
+const cls_FieldTable& kbeC_DerivedComponent::Fields() {
+    using R = kbeC_DerivedComponent;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::terms>("terms", "the terms, each a keyword of its own under the one name");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorPotential::SignEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "ABS", "ABS"}, {1, "MACAULEY", "MACAULEY"}, {2, "NONE", "NONE"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorPotential::SignEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorPotential::Fields() {
+    using R = kbeC_ConnectorPotential;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::useDerived>(
+                "useDerived",
+                "0: `component` is written; any other value: the generated name of derivedComponent.")
+            .Field<&R::component>("component", "component number 1 to 6.")
+            .Field<&R::negative>("negative", "any value but 0: ', -1.0' in place of ', 1.0'.")
+            .Field<&R::scaleFactor>("scaleFactor", "scaling factor (no unit).")
+            .Field<&R::radius>("radius",
+                               "effective radius (length for moments), not written for a maximum operator.")
+            .Field<&R::exponentFactor>("exponentFactor", "exponent of the term (no unit).")
+            .Field<&R::sign>("sign", "which part of the component's value counts.")
+            .Field<&R::derivedComponent>(
+                "derivedComponent", "the derived component of the term, read only if useDerived isn't 0");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorElasticity::BehaviorEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "LINEAR", "LINEAR"}, {1, "NONLINEAR", "NONLINEAR"}, {2, "RIGID", "RIGID"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorElasticity::BehaviorEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorElasticity::CouplingEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "UNCOUPLED", "UNCOUPLED"},
+                                           {1, "COUPLED", "COUPLED"},
+                                           {2, "COUPLED_POSITION", "COUPLED POSITION"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorElasticity::CouplingEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorElasticity::Fields() {
+    using R = kbeC_ConnectorElasticity;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::behavior>("behavior", "")
+            .Field<&R::coupling>("coupling", "With a linear behaviour only 0 and 1 write a keyword; with a "
+                                             "nonlinear one 2 is POSITION and 1 CONSTITUTIVE MOTION.")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::frequencyDependency>(
+                "frequencyDependency",
+                "linear: the table has a frequency column (cycles per time) after the data columns.")
+            .Field<&R::table>(
+                "table",
+                "linear uncoupled: one stiffness per entry of `components`, in that order; linear coupled: "
+                "the entries of the symmetric matrix of the given components, row by row up to the diagonal, "
+                "lower component number first; nonlinear uncoupled: force or moment, then motion; nonlinear "
+                "coupled: one force per entry of `components`, then the independent components' motions. "
+                "Then frequency, temperature, field variables as the flags say")
+            .Field<&R::independentComponents>("independentComponents",
+                                              "components on which a coupled nonlinear table depends")
+            .Field<&R::components>("components", "connector components 1 to 6, in the user's order")
+            .Field<&R::options>("options", "regularization group");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamping::BehaviorEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "LINEAR", "LINEAR"}, {1, "NONLINEAR", "NONLINEAR"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamping::BehaviorEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamping::CouplingEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "UNCOUPLED", "UNCOUPLED"},
+                                           {1, "COUPLED", "COUPLED"},
+                                           {2, "COUPLED_POSITION", "COUPLED POSITION"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamping::CouplingEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorDamping::Fields() {
+    using R = kbeC_ConnectorDamping;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::behavior>("behavior", "")
+            .Field<&R::coupling>("coupling", "With a linear behaviour only 0 and 1 write a keyword; with a "
+                                             "nonlinear one 2 is POSITION and 1 CONSTITUTIVE MOTION.")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::frequencyDependency>(
+                "frequencyDependency",
+                "linear: the table has a frequency column (cycles per time) after the data columns.")
+            .Field<&R::table>(
+                "table",
+                "linear uncoupled: one damping coefficient per entry of `components`, in that order; linear "
+                "coupled: the entries of the symmetric matrix of the given components, row by row up to the "
+                "diagonal, lower component number first; nonlinear uncoupled: force or moment, then motion; "
+                "nonlinear coupled: one force per entry of `components`, then the independent components' "
+                "motions. Then frequency, temperature, field variables as the flags say")
+            .Field<&R::independentComponents>("independentComponents",
+                                              "components on which a coupled nonlinear table depends")
+            .Field<&R::components>("components", "connector components 1 to 6, in the user's order")
+            .Field<&R::options>("options", "regularization group");
+    return fields;
+}
+
+const cls_FieldTable& kbeC_ConnectorStop::Fields() {
+    using R = kbeC_ConnectorStop;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::minMotion>("minMotion",
+                                  "length, or angle in radians for components 4 to 6; unset: blank")
+            .Field<&R::maxMotion>("maxMotion", "length, or angle in radians; unset: blank")
+            .Field<&R::components>("components", "connector components 1 to 6, in the user's order");
+    return fields;
+}
+
+const cls_FieldTable& kbeC_ConnectorFailure::Fields() {
+    using R = kbeC_ConnectorFailure;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::releaseComponent>(
+                "releaseComponent", "component that is released; unset: no ', release=' (all components)")
+            .Field<&R::minMotion>("minMotion", "length or angle in radians; unset: blank")
+            .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
+            .Field<&R::minForce>("minForce", "force or moment; unset: blank")
+            .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
+            .Field<&R::components>("components", "connector components 1 to 6, in the user's order");
+    return fields;
+}
+
+const cls_FieldTable& kbeC_ConnectorLock::Fields() {
+    using R = kbeC_ConnectorLock;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::lockingComponent>("lockingComponent",
+                                         "component that is locked; unset: no ', lock=' (all components)")
+            .Field<&R::minMotion>("minMotion", "length or angle in radians; unset: blank")
+            .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
+            .Field<&R::minForce>("minForce", "force or moment; unset: blank")
+            .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
+            .Field<&R::components>("components", "connector components 1 to 6, in the user's order");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_TangentialBehavior::FormulationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "TABLE", "TABLE"},
+                                           {1, "EXPONENTIAL_DECAY", "EXPONENTIAL DECAY"}};
+    static constexpr omu_EnumTable table{"kbeC_TangentialBehavior::FormulationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_TangentialBehavior::SlipToleranceTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "FRACTION", "FRACTION"}, {1, "ABSOLUTE", "ABSOLUTE"}};
+    static constexpr omu_EnumTable table{"kbeC_TangentialBehavior::SlipToleranceTypeEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_TangentialBehavior::Fields() {
+    using R = kbeC_TangentialBehavior;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::formulation>("formulation", "0 table, 1 exponential decay.")
+            .Field<&R::slipRateDependency>("slipRateDependency", "the table has a slip rate column.")
+            .Field<&R::pressureDependency>("pressureDependency", "the table has a contact force column.")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
+            .Field<&R::testData>("testData",
+                                 "1: ', test data' and the data in three lines (formulation 1 only).")
+            .Field<&R::shearStressLimit>(
+                "shearStressLimit", "stress or force; ', taumax=', formulation 0 only; unset: not written")
+            .Field<&R::slipToleranceType>("slipToleranceType", "0 fraction, 1 absolute.")
+            .Field<&R::fraction>("fraction", "slip tolerance (no unit); 0.0001 writes nothing")
+            .Field<&R::elasticSlip>("elasticSlip", "length; elastic slip, slipToleranceType 1 only.")
+            .Field<&R::table>(
+                "table", "formulation 0: coefficient, slip rate, contact force, temperature, field "
+                         "variables, as the flags say; formulation 1: one row, read value by value in row "
+                         "order: static coefficient, kinetic coefficient, decay coefficient; with test data: "
+                         "static coefficient, second coefficient, its slip rate, coefficient at infinity");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorFriction::FormulationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "PREDEFINED", "PREDEFINED"},
+                                           {1, "USER_DEFINED", "USER DEFINED"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorFriction::FormulationEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorFriction::ContactForceTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "COMPONENT_NUMBER", "COMPONENT NUMBER"},
+                                           {1, "DERIVED_COMPONENT", "DERIVED COMPONENT"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorFriction::ContactForceTypeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorFriction::IndependentKindEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "POSITION", "POSITION"}, {1, "CONSTITUTIVE_MOTION", "CONSTITUTIVE MOTION"}, {2, "NONE", "NONE"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorFriction::IndependentKindEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorFriction::PotentialOperatorEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "SUM", "SUM"}, {1, "MAXIMUM", "MAX"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorFriction::PotentialOperatorEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorFriction::Fields() {
+    using R = kbeC_ConnectorFriction;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::formulation>("formulation", "predefined by the connection type, or user-defined")
+            .Field<&R::component>(
+                "component",
+                "user-defined form: component of the slip direction; unset, 0 or negative: no ', component='")
+            .Field<&R::contactForceType>("contactForceType",
+                                         "user-defined form: where the contact force comes from")
+            .Field<&R::contactForceComponent>("contactForceComponent",
+                                              "user-defined form, contactForceType 0: component number 1 to "
+                                              "6; unset: no ', contact force='")
+            .Field<&R::contactForceDerived>("contactForceDerived",
+                                            "user-defined form, contactForceType 1: the derived component "
+                                            "that the generated name 'BO-' i '-DC' stands for")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::contactArea>("contactArea", "the contact area flag of step 4: the table has the "
+                                                   "column ahead of temperature that is otherwise left blank")
+            .Field<&R::independentKind>("independentKind", "on what the internal contact force depends")
+            .Field<&R::independentComponents>(
+                "independentComponents",
+                "user-defined form, independentKind 0 or 1: the independent components")
+            .Field<&R::stickStiffness>("stickStiffness",
+                                       "force per length or moment per angle; unset: not written")
+            .Field<&R::table>(
+                "table", "predefined: the geometric constants and internal contact forces that the "
+                         "connection type asks for; user-defined: internal contact force, independent "
+                         "components, the contact area column if contactArea, temperature, field variables")
+            .Field<&R::tangentialBehavior>("tangentialBehavior", "present: '*Friction' follows")
+            .Field<&R::potentials>("potentials", "terms of the friction potential")
+            .Field<&R::potentialOperator>("potentialOperator", "1: ', operator=MAX'")
+            .Field<&R::forcePotentialExponent>("forcePotentialExponent",
+                                               "exponent of the potential (no unit); 2.0 writes nothing")
+            .Field<&R::options>(
+                "options",
+                "regularization group; only its regularize and extrapolation parts are written here");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorPlasticity::PotentialOperatorEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "SUM", "SUM"}, {1, "MAXIMUM", "MAX"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorPlasticity::PotentialOperatorEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorPlasticity::IsotropicTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "TABULAR", "Tabular"},
+                                           {1, "EXPONENTIAL_LAW", "Exponential Law"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorPlasticity::IsotropicTypeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorPlasticity::KinematicTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "HALF_CYCLE", "Half Cycle"}, {1, "STABILIZED", "Stabilized"}, {2, "PARAMETERS", "Parameters"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorPlasticity::KinematicTypeEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorPlasticity::Fields() {
+    using R = kbeC_ConnectorPlasticity;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::components>(
+                "components",
+                "connector components 1 to 6, in the user's order; not looked at with potentials")
+            .Field<&R::isotropicHardening>("isotropicHardening", "isotropic hardening is present")
+            .Field<&R::isotropicType>("isotropicType", "how isotropic hardening is defined")
+            .Field<&R::isotropicDependencies>("isotropicDependencies",
+                                              "number of field variables of isotropicTable")
+            .Field<&R::isotropicTemperatureDependency>("isotropicTemperatureDependency",
+                                                       "isotropicTable has a temperature column")
+            .Field<&R::isotropicTable>(
+                "isotropicTable", "tabular: yield force, plastic motion, plastic motion rate; exponential "
+                                  "law: initial force, Q, b; then temperature, field variables")
+            .Field<&R::isotropicOptions>("isotropicOptions", "regularization group of the isotropic part")
+            .Field<&R::kinematicHardening>("kinematicHardening", "kinematic hardening is present")
+            .Field<&R::kinematicType>("kinematicType", "how kinematic hardening is defined")
+            .Field<&R::kinematicDependencies>("kinematicDependencies",
+                                              "number of field variables of kinematicTable")
+            .Field<&R::kinematicTemperatureDependency>("kinematicTemperatureDependency",
+                                                       "kinematicTable has a temperature column")
+            .Field<&R::kinematicTable>(
+                "kinematicTable",
+                "half cycle and stabilized: yield force, plastic motion (stabilized also motion range); "
+                "parameters: yield force, C, gamma; then temperature, field variables")
+            .Field<&R::kinematicOptions>("kinematicOptions", "regularization group of the kinematic part")
+            .Field<&R::potentials>("potentials", "terms of the yield potential (coupled plasticity)")
+            .Field<&R::potentialOperator>("potentialOperator", "1: ', operator=MAX'")
+            .Field<&R::forcePotentialExponent>("forcePotentialExponent",
+                                               "exponent of the potential (no unit); 2.0 writes nothing");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamage::PotentialOperatorEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "SUM", "SUM"}, {1, "MAXIMUM", "MAX"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamage::PotentialOperatorEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamage::CriterionEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "FORCE", "Force"}, {1, "MOTION", "Motion"}, {2, "PLASTIC_MOTION", "Plastic Motion"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamage::CriterionEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamage::EvolutionTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "MOTION", "Motion"}, {1, "ENERGY", "Energy"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamage::EvolutionTypeEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamage::SofteningEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "LINEAR", "Linear"}, {1, "EXPONENTIAL", "Exponential"}, {2, "TABULAR", "Tabular"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamage::SofteningEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamage::DegradationEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "MAXIMUM", "Maximum"},
+                                           {1, "MULTIPLICATIVE", "Multiplicative"}};
+    static constexpr omu_EnumTable table{"kbeC_ConnectorDamage::DegradationEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
+    using R = kbeC_ConnectorDamage;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
+            .Field<&R::modeMixDependency>(
+                "modeMixDependency",
+                "the flag of the first member: with criterion 2 the tables carry a mode-mix ratio column")
+            .Field<&R::components>(
+                "components",
+                "connector components 1 to 6, in the user's order; not looked at with initiationPotentials")
+            .Field<&R::criterion>("criterion", "what initiates damage")
+            .Field<&R::initiationDependencies>("initiationDependencies",
+                                               "number of field variables of initiationTable")
+            .Field<&R::initiationTemperatureDependency>("initiationTemperatureDependency",
+                                                        "initiationTable has a temperature column")
+            .Field<&R::initiationTable>("initiationTable",
+                                        "criterion 0 and 1: lower bound (-1e36 = none), upper bound (1e36 = "
+                                        "none) of force or motion; criterion 2: plastic motion, mode-mix "
+                                        "ratio if modeMixDependency; then temperature, field variables")
+            .Field<&R::initiationOptions>("initiationOptions", "regularization group of the initiation")
+            .Field<&R::initiationPotentials>("initiationPotentials", "terms of the initiation potential")
+            .Field<&R::initiationPotentialOperator>("initiationPotentialOperator", "1: ', operator=MAX'")
+            .Field<&R::initiationPotentialExponent>("initiationPotentialExponent",
+                                                    "exponent of the initiation potential (no unit)")
+            .Field<&R::evolution>("evolution", "damage evolution exists")
+            .Field<&R::evolutionType>("evolutionType", "by motion or by energy")
+            .Field<&R::softening>("softening", "read for evolutionType MOTION only.")
+            .Field<&R::useAffected>("useAffected",
+                                    "true: 'affected components' and the line of affectedComponents")
+            .Field<&R::affectedComponents>("affectedComponents", "components that the damage acts on")
+            .Field<&R::degradation>("degradation", "1: 'degradation=Multiplicative'.")
+            .Field<&R::evolutionDependencies>("evolutionDependencies",
+                                              "number of field variables of evolutionTable")
+            .Field<&R::evolutionTemperatureDependency>("evolutionTemperatureDependency",
+                                                       "evolutionTable has a temperature column")
+            .Field<&R::evolutionTable>(
+                "evolutionTable",
+                "motion, linear softening: motion at failure; exponential: motion, law parameter; tabular: "
+                "damage variable, motion; energy: dissipated energy; then the mode-mix ratio if criterion 2 "
+                "and modeMixDependency, temperature, field variables")
+            .Field<&R::evolutionOptions>("evolutionOptions", "regularization group of the evolution")
+            .Field<&R::evolutionPotentials>("evolutionPotentials", "terms of the evolution potential")
+            .Field<&R::evolutionPotentialOperator>("evolutionPotentialOperator", "1: ', operator=MAX'")
+            .Field<&R::evolutionPotentialExponent>("evolutionPotentialExponent",
+                                                   "exponent of the evolution potential (no unit)");
+    return fields;
+}
+
+void cls_RegisterConnectorBehaviorRecords(cls_ClassRegistrar& registrar) {
+    registrar.Add<kbeC_ConnectorBehaviorOption>();
+    registrar.Add<kbeC_ConnectorOptions>();
+    registrar.Add<kbeC_CDCTerm>();
+    registrar.Add<kbeC_DerivedComponent>();
+    registrar.Add<kbeC_ConnectorPotential>();
+    registrar.Add<kbeC_ConnectorElasticity>();
+    registrar.Add<kbeC_ConnectorDamping>();
+    registrar.Add<kbeC_ConnectorStop>();
+    registrar.Add<kbeC_ConnectorFailure>();
+    registrar.Add<kbeC_ConnectorLock>();
+    registrar.Add<kbeC_TangentialBehavior>();
+    registrar.Add<kbeC_ConnectorFriction>();
+    registrar.Add<kbeC_ConnectorPlasticity>();
+    registrar.Add<kbeC_ConnectorDamage>();
+}

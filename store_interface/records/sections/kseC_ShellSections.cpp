@@ -1,0 +1,197 @@
+#include "store_interface/records/sections/kseC_ShellSections.h"
+
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+const cls_FieldTable& kseC_RebarLayer::Fields() {
+    using R = kseC_RebarLayer;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::area>("area", "area of one bar (length squared); required.")
+            .Field<&R::orientationName>("orientationName",
+                                        "name of the layer's own orientation; non-empty: the layer gets a "
+                                        "'*Rebar Layer' of its own and no angle")
+            .RefersTo("orientation")
+            .Field<&R::orientationAngle>("orientationAngle", "angle in degrees of the bars.")
+            .Field<&R::spacing>("spacing", "length; distance of the bars, written with spacingType 0.")
+            .Field<&R::position>("position", "length; distance of the layer from the mid-surface.")
+            .Field<&R::angularSpacing>(
+                "angularSpacing", "angle in degrees between the bars, written with any spacingType but 0.")
+            .Field<&R::name>("name", "name of the layer, first item of its data line; required")
+            .Field<&R::materialName>("materialName", "material of the bars; required")
+            .RefersTo("material");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kseC_RebarLayers::SpacingTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "CONSTANT", "CONSTANT"}, {1, "ANGULAR", "ANGULAR"}};
+    static constexpr omu_EnumTable table{"kseC_RebarLayers::SpacingTypeEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& kseC_RebarLayers::Fields() {
+    using R = kseC_RebarLayers;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::spacingType>("spacingType", "1: 'angular spacing' is written.")
+            .Field<&R::layers>("layers", "the layers; empty: nothing is written");
+    return fields;
+}
+
+const cls_FieldTable& kseC_TransverseShearShell::Fields() {
+    using R = kseC_TransverseShearShell;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::k11>("k11", "force per length; 0 takes the value of k22.")
+            .Field<&R::k22>("k22", "force per length; 0 then takes the value of k11.")
+            .Field<&R::k12>("k12", "force per length; always written.");
+    return fields;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kseC_GeometryShellSection::PoissonDefinitionEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "DEFAULT", "DEFAULT"}, {1, "VALUE", "VALUE"}};
+    static constexpr omu_EnumTable table{"kseC_GeometryShellSection::PoissonDefinitionEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kseC_GeometryShellSection::IntegrationRuleEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "SIMPSON", "SIMPSON"}, {1, "GAUSS", "GAUSS"}};
+    static constexpr omu_EnumTable table{"kseC_GeometryShellSection::IntegrationRuleEnm", rows};
+    return table;
+}
+
+const omu_EnumTable& omu_EnumTableOf(kseC_GeometryShellSection::TemperatureModeEnm) {
+    static constexpr omu_EnumRow rows[] = {{0, "GRADIENT", "GRADIENT"}, {1, "POINTWISE", "POINTWISE"}};
+    static constexpr omu_EnumTable table{"kseC_GeometryShellSection::TemperatureModeEnm", rows};
+    return table;
+}
+
+namespace {
+
+template <class Layer>
+void AddOrientationsOf(const cow_List<Layer>& layers, cow_List<cow_String>& names) {
+    for (int i = 0; i < layers.Length(); ++i) {
+        const cow_String& name = layers[i].orientationName;
+        bool known = name.IsEmpty();
+        for (int j = 0; j < names.Length(); ++j) known = known || names[j] == name;
+        if (!known) names.Append(name);
+    }
+}
+
+} // namespace
+
+bool kseC_GeometryShellSection::HasRebar() const {
+    return !rebars.IsNull() && rebars.ConstGet().layers.Length() > 0;
+}
+
+bool kseC_GeometryShellSection::UsesRebarOrientation() const {
+    if (!HasRebar()) return false;
+    const auto& layers = rebars.ConstGet().layers;
+    for (int i = 0; i < layers.Length(); ++i) {
+        if (layers[i].orientationName.IsEmpty()) return true;
+    }
+    return false;
+}
+
+void kseC_GeometryShellSection::AddUserOrientations(cow_List<cow_String>& names) const {
+    if (HasRebar()) AddOrientationsOf(rebars.ConstGet().layers, names);
+}
+
+int kseC_GeometryShellSection::NumTempPoints(bool) const {
+    return temperatureMode == TemperatureModeEnm::POINTWISE ? temperaturePoints : 0;
+}
+
+void kseC_CompositeShellSection::AddUserOrientations(cow_List<cow_String>& names) const {
+    AddOrientationsOf(layers, names);
+    kseC_GeometryShellSection::AddUserOrientations(names);
+}
+
+const cls_FieldTable& kseC_GeometryShellSection::Fields() {
+    using R = kseC_GeometryShellSection;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kseC_ShellSection::Fields())
+            .Field<&R::useGeneralKeyword>(
+                "useGeneralKeyword",
+                "true: '*Shell General Section' (properties computed before the analysis, no integration "
+                "points on the data lines); false: '*Shell Section'.")
+            .Field<&R::poissonDefinition>("poissonDefinition",
+                                          "0 the solver's own change of thickness, else `poisson` is written")
+            .Field<&R::poisson>("poisson",
+                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0.")
+            .Field<&R::integrationRule>("integrationRule",
+                                        "rule through the thickness; 0 writes no parameter")
+            .Field<&R::temperatureMode>("temperatureMode",
+                                        "1: 'temperature=' and temperaturePoints are written.")
+            .Field<&R::temperaturePoints>(
+                "temperaturePoints",
+                "number of temperature points through the thickness, read only with temperatureMode 1.")
+            .Field<&R::thicknessModulus>(
+                "thicknessModulus",
+                "stress; effective modulus in thickness direction. Unset: no 'thickness modulus=' and no "
+                "'stack direction='; set but not positive: only 'stack direction=' can be written")
+            .Field<&R::rebars>("rebars", "rebar layers of the shell")
+            .Field<&R::transverseShear>(
+                "transverseShear",
+                "given transverse shear stiffness; present: '*Transverse Shear' follows the section");
+    return fields;
+}
+
+const cls_FieldTable& kseC_HomogenousShellSection::Fields() {
+    using R = kseC_HomogenousShellSection;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kseC_GeometryShellSection::Fields())
+            .Field<&R::thickness>("thickness", "length; shell thickness; required.")
+            .Field<&R::integrationPoints>(
+                "integrationPoints",
+                "number of integration points through the thickness; not written with useGeneralKeyword.")
+            .Field<&R::materialName>("materialName", "material; required")
+            .RefersTo("material");
+    return fields;
+}
+
+const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
+    using R = kseC_CompositeShellLayer;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::thickness>("thickness", "length; thickness of the layer; required.")
+            .Field<&R::integrationPoints>(
+                "integrationPoints",
+                "number of integration points of the layer; not written with useGeneralKeyword.")
+            .Field<&R::materialName>("materialName", "material of the layer; required")
+            .RefersTo("material")
+            .Field<&R::orientationName>(
+                "orientationName",
+                "name of an orientation of the layer; non-empty: it stands in place of the angle")
+            .RefersTo("orientation")
+            .Field<&R::orientationAngle>(
+                "orientationAngle",
+                "angle in degrees to the section's orientation; written when orientationName is empty.");
+    return fields;
+}
+
+const cls_FieldTable& kseC_CompositeShellSection::Fields() {
+    using R = kseC_CompositeShellSection;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kseC_GeometryShellSection::Fields())
+            .Field<&R::layers>("layers", "layers in stacking order, from the bottom side up");
+    return fields;
+}
+
+const cls_FieldTable& kseC_UserShellSection::Fields() {
+    using R = kseC_UserShellSection;
+    static const cls_FieldTable fields = cls_Describe<R>(kseC_ShellSection::Fields())
+                                             .Field<&R::symmetric>("symmetric", "false writes 'unsymm'.");
+    return fields;
+}
+
+void cls_RegisterShellSectionRecords(cls_ClassRegistrar& registrar) {
+    registrar.Add<kseC_ShellSection>();
+    registrar.Add<kseC_RebarLayer>();
+    registrar.Add<kseC_RebarLayers>();
+    registrar.Add<kseC_TransverseShearShell>();
+    registrar.Add<kseC_GeometryShellSection>();
+    registrar.Add<kseC_HomogenousShellSection>();
+    registrar.Add<kseC_CompositeShellLayer>();
+    registrar.Add<kseC_CompositeShellSection>();
+    registrar.Add<kseC_GeneralShellSection>();
+    registrar.Add<kseC_UserShellSection>();
+}
