@@ -54,6 +54,25 @@ const omu_EnumTable& omu_EnumTableOf(kseC_ConnectorSection::RotationalTypeEnm) {
     return table;
 }
 
+const cls_FieldTable& kseC_GasketSection::Fields() {
+    using R = kseC_GasketSection;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kseC_Section::Fields())
+            .Field<&R::crossSection>("crossSection",
+                                     "cross-section area, width or out-of-plane thickness, by element type")
+            .Field<&R::initialGap>("initialGap", "initial gap (length)")
+            .Field<&R::initialThickness>("initialThickness",
+                                         "initial thickness (length); unset: taken from the nodes")
+            .Field<&R::initialVoid>("initialVoid", "initial void (length)")
+            .Field<&R::stabilizationStiffness>("stabilizationStiffness",
+                                               "stabilization stiffness (stress); unset: none is written")
+            .Field<&R::materialName>("materialName",
+                                     "material, or gasket behaviour if that material has gasket options")
+            .RefersTo("material")
+            .Required();
+    return fields;
+}
+
 const cls_FieldTable& kseC_ConnectorSection::Fields() {
     using R = kseC_ConnectorSection;
     static const cls_FieldTable fields =
@@ -68,5 +87,6 @@ const cls_FieldTable& kseC_ConnectorSection::Fields() {
 void cls_RegisterSectionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kseC_Section>();
     registrar.Add<kbpC_BeamProfile>();
+    registrar.Add<kseC_GasketSection>();
     registrar.Add<kseC_ConnectorSection>();
 }

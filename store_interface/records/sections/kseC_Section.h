@@ -17,6 +17,21 @@ public:
     static constexpr cls_ClassInfo Class{"kbpC_BeamProfile", "a cross-section of beams"};
 };
 
+/// Gasket elements: measures and the material, which gasket options turn into a gasket behaviour.
+class kseC_GasketSection final : public cls_RecordOf<kseC_GasketSection, kseC_Section> {
+public:
+    static constexpr cls_ClassInfo Class{"kseC_GasketSection", "gasket elements"};
+
+    double crossSection = 1.0;
+    double initialGap = 0.0;
+    double initialThickness = cls_UnsetDouble;
+    double initialVoid = 0.0;
+    double stabilizationStiffness = cls_UnsetDouble;
+    cow_String materialName;
+
+    static const cls_FieldTable& Fields();
+};
+
 /// Connector elements of the assembly: kind of connection and behaviour.
 class kseC_ConnectorSection final : public cls_RecordOf<kseC_ConnectorSection, kseC_Section> {
 public:
