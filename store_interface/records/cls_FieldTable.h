@@ -210,6 +210,12 @@ public:
         fields_.push_back(field);
         return *this;
     }
+    /// Lets `describe` declare fields here, for groups of fields that many classes have.
+    template <class Describe>
+    cls_Describe& With(const Describe& describe) {
+        describe(*this);
+        return *this;
+    }
     cls_Describe& RefersTo(const char* kind) {
         fields_.back().refersTo = kind;
         return *this;

@@ -3,11 +3,14 @@
 
 #include "deck/oif_Component.h"
 
-/// Materials of the model.
+/// The materials of the model in the order of their names, below one banner.
 class oif_MaterialBuilder final : public oif_ComponentOf<oif_MaterialBuilder> {
 public:
     using oif_ComponentOf::oif_ComponentOf;
     void Build() override;
+
+private:
+    bool IsOfGasketSection(const cow_String& materialName) const;
 };
 
 #endif

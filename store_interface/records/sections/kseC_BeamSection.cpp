@@ -70,7 +70,8 @@ const cls_FieldTable& kseC_BeamSection::Fields() {
             .Field<&R::fluidValue6>(
                 "fluidValue6",
                 "length; local 2-coordinate of the cross-section's centre; third item, 0.0 leaves it blank.")
-            .Field<&R::profileName>("profileName", "key in the model's profile map; required")
+            .Field<&R::profileName>("profileName", "key in the model's profile map")
+            .Required()
             .RefersTo("profile")
             .Field<&R::materialName>("materialName", "material, integrated section only")
             .RefersTo("material")

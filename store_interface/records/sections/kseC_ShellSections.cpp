@@ -6,7 +6,8 @@ const cls_FieldTable& kseC_RebarLayer::Fields() {
     using R = kseC_RebarLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::area>("area", "area of one bar (length squared); required.")
+            .Field<&R::area>("area", "area of one bar (length squared).")
+            .Required()
             .Field<&R::orientationName>("orientationName",
                                         "name of the layer's own orientation; non-empty: the layer gets a "
                                         "'*Rebar Layer' of its own and no angle")
@@ -16,8 +17,10 @@ const cls_FieldTable& kseC_RebarLayer::Fields() {
             .Field<&R::position>("position", "length; distance of the layer from the mid-surface.")
             .Field<&R::angularSpacing>(
                 "angularSpacing", "angle in degrees between the bars, written with any spacingType but 0.")
-            .Field<&R::name>("name", "name of the layer, first item of its data line; required")
-            .Field<&R::materialName>("materialName", "material of the bars; required")
+            .Field<&R::name>("name", "name of the layer, first item of its data line")
+            .Required()
+            .Field<&R::materialName>("materialName", "material of the bars")
+            .Required()
             .RefersTo("material");
     return fields;
 }
@@ -139,11 +142,13 @@ const cls_FieldTable& kseC_HomogenousShellSection::Fields() {
     using R = kseC_HomogenousShellSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_GeometryShellSection::Fields())
-            .Field<&R::thickness>("thickness", "length; shell thickness; required.")
+            .Field<&R::thickness>("thickness", "length; shell thickness.")
+            .Required()
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points through the thickness; not written with useGeneralKeyword.")
-            .Field<&R::materialName>("materialName", "material; required")
+            .Field<&R::materialName>("materialName", "material")
+            .Required()
             .RefersTo("material");
     return fields;
 }
@@ -152,11 +157,13 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
     using R = kseC_CompositeShellLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::thickness>("thickness", "length; thickness of the layer; required.")
+            .Field<&R::thickness>("thickness", "length; thickness of the layer.")
+            .Required()
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points of the layer; not written with useGeneralKeyword.")
-            .Field<&R::materialName>("materialName", "material of the layer; required")
+            .Field<&R::materialName>("materialName", "material of the layer")
+            .Required()
             .RefersTo("material")
             .Field<&R::orientationName>(
                 "orientationName",

@@ -9,7 +9,8 @@ const cls_FieldTable& kseC_HomogenousSolidSection::Fields() {
             .Field<&R::thickness>("thickness",
                                   "length; plane or cross-section thickness of two-dimensional and "
                                   "one-dimensional elements; always written on the data line.")
-            .Field<&R::materialName>("materialName", "material of the elements; required")
+            .Field<&R::materialName>("materialName", "material of the elements")
+            .Required()
             .RefersTo("material");
     return fields;
 }
@@ -22,7 +23,8 @@ const cls_FieldTable& kseC_CompositeSolidLayer::Fields() {
             .Field<&R::integrationPoints>("integrationPoints",
                                           "number of integration points of the layer (odd).")
             .Field<&R::materialName>("materialName",
-                                     "material of the layer; required. Written without quotes")
+                                     "material of the layer; stands in the deck without quotes")
+            .Required()
             .RefersTo("material")
             .Field<&R::orientationAngle>("orientationAngle",
                                          "angle in degrees to the section's orientation.");
@@ -45,7 +47,8 @@ const cls_FieldTable& kseC_TrussSection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
             .Field<&R::area>("area", "area of the cross-section (length squared).")
-            .Field<&R::materialName>("materialName", "material; required")
+            .Field<&R::materialName>("materialName", "material")
+            .Required()
             .RefersTo("material");
     return fields;
 }
@@ -65,7 +68,8 @@ const cls_FieldTable& kseC_MembraneSection::Fields() {
                                           "0 the solver's own change of thickness, else `poisson` is written")
             .Field<&R::poisson>("poisson",
                                 "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0.")
-            .Field<&R::materialName>("materialName", "material; required")
+            .Field<&R::materialName>("materialName", "material")
+            .Required()
             .RefersTo("material");
     return fields;
 }
@@ -82,8 +86,9 @@ const cls_FieldTable& kseC_GasketSection::Fields() {
             .Field<&R::initialVoid>("initialVoid", "length; initial void.")
             .Field<&R::stabilizationStiffness>("stabilizationStiffness",
                                                "stress; unset: no 'stabilization stiffness='")
-            .Field<&R::materialName>(
-                "materialName", "material, or gasket behaviour if that material has gasket options; required")
+            .Field<&R::materialName>("materialName",
+                                     "material, or gasket behaviour if that material has gasket options")
+            .Required()
             .RefersTo("material");
     return fields;
 }

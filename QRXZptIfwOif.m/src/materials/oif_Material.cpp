@@ -1,0 +1,45 @@
+#include "materials/oif_Material.h"
+
+#include "keyword_layer/qkw_QuorixName.h"
+#include "materials/oif_MaterialOption.h"
+
+void oif_Material::Write(utl_Stream& stream) const {
+    const kmaC_Material& m = material_;
+    stream << "*Material, name=" << qkw_QuorixName(name_, false);
+    if (!m.regularization.IsNull()) {
+        const kmaC_Regularization& r = m.regularization.ConstGet();
+        if (r.rtol != r.rtolDef()) stream << ", rtol=" << r.rtol;
+        if (r.strainRateRegularization != r.strainRateRegularizationDef()) {
+            using Form = kmaC_Regularization::StrainRateRegularizationEnm;
+            stream << ", strain rate regularization="
+                   << omu_PrimEnum<Form, 1>(r.strainRateRegularization).GetString();
+        }
+    }
+    stream.LineBreak();
+
+    const bool hasViscoelastic = !m.viscoelastic.IsNull();
+    oif_WriteOptions(stream, m.acousticMedium, m.capPlasticity, m.clayPlasticity, m.concrete, m.conductivity,
+                     m.creep, m.damping, m.deformationPlasticity, m.density, m.depvar, m.dielectric,
+                     m.diffusivity, m.druckerPrager);
+    if (!m.elastic.IsNull()) oif_Elastic(m.elastic.ConstGet(), hasViscoelastic).Write(stream);
+    oif_WriteOptions(stream, m.electricalConductivity, m.eos, m.expansion, m.foam, m.gel, m.heatGeneration);
+    if (!m.hyperelastic.IsNull()) {
+        oif_Hyperelastic(m.hyperelastic.ConstGet(), hasViscoelastic).Write(stream);
+    }
+    if (!m.hyperfoam.IsNull()) oif_Hyperfoam(m.hyperfoam.ConstGet(), hasViscoelastic).Write(stream);
+    oif_WriteOptions(stream, m.hypoelastic, m.inelasticHeatFraction, m.jouleHeatFraction, m.latentHeat,
+                     m.moistureSwelling, m.permeability, m.piezoelectric, m.plastic, m.poreFluidExpansion,
+                     m.porousBulkModuli, m.porousElastic, m.porousMetalPlasticity, m.solubility, m.sorption,
+                     m.specificHeat, m.swelling, m.userDefinedField, m.userMaterial, m.userOutputVariables);
+    // Out of the alphabet from here on.
+    oif_WriteOptions(stream, m.viscoelastic, m.castIronPlasticity, m.viscous, m.mohrCoulomb,
+                     m.concreteDamagedPlasticity);
+}
+
+void oif_GasketBehavior::Write(utl_Stream& stream) const {
+    const kmaC_Material& m = material_;
+    // The name goes out bare here, whatever it holds.
+    stream << "*Gasket behavior, name=" << name_ << endl;
+    oif_WriteOptions(stream, m.creep, m.depvar, m.expansion, m.membraneElastic, m.thicknessBehavior,
+                     m.transShearElastic, m.userOutputVariables);
+}
