@@ -1,5 +1,6 @@
 #include "mesh/oif_InstanceBuilder.h"
 
+#include "deck/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
@@ -7,17 +8,7 @@
 
 namespace {
 
-constexpr int kWidth = 12;
-constexpr int kPrecision = 15;
 constexpr double kPi = 3.141592653589793;
-
-void PrintTriple(utl_Stream& stream, double x, double y, double z) {
-    stream.Print(x, kWidth, kPrecision);
-    stream << ", ";
-    stream.Print(y, kWidth, kPrecision);
-    stream << ", ";
-    stream.Print(z, kWidth, kPrecision);
-}
 
 } // namespace
 
@@ -46,16 +37,13 @@ void oif_Instance::Write(utl_Stream& stream) const {
     const bool turned = angle > gsl_Util::Instance().AngleTolerance();
     // A turn alone still has its line of zeros.
     if (turned || translation.ComputeMagnitude() > gsl_Util::Instance().LengthTolerance()) {
-        PrintTriple(stream, translation.X(), translation.Y(), translation.Z());
+        oif_PrintGeometry(stream, {translation.X(), translation.Y(), translation.Z()});
         stream << endl;
     }
     if (!turned) return;
     const gsl_Point second = point + axis;
-    PrintTriple(stream, point.X(), point.Y(), point.Z());
-    stream << ", ";
-    PrintTriple(stream, second.X(), second.Y(), second.Z());
-    stream << ", ";
-    stream.Print(angle * 180.0 / kPi, kWidth, kPrecision);
+    oif_PrintGeometry(
+        stream, {point.X(), point.Y(), point.Z(), second.X(), second.Y(), second.Z(), angle * 180.0 / kPi});
     stream << endl;
 }
 
