@@ -37,8 +37,8 @@ private:
     bool IsRequested(const cow_String& fullName) const;
 
     cow_List<cow_String> requestedSets_;
-    cow_Map<cow_String, cow_List<cow_String>>
-        setsOfLayup_; // by owner.layup, as are the next two by owner.set
+    // The keys are "owner.layup" in the first, "owner.set" in the next two.
+    cow_Map<cow_String, cow_List<cow_String>> setsOfLayup_;
     cow_Map<cow_String, cow_List<int>> pointsOfSet_;
     cow_Map<cow_String, cow_List<cow_String>> rewiredSets_;
     cow_Map<cow_String, cow_String> ownerOfInstance_;

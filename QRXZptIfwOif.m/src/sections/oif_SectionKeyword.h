@@ -1,6 +1,7 @@
 #ifndef QRX_OIF_SECTIONKEYWORD_H
 #define QRX_OIF_SECTIONKEYWORD_H
 
+#include "deck/oif_KeywordLine.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/records/sections/kseC_Section.h"
 
@@ -17,7 +18,14 @@ protected:
     const cow_String& SetName() const { return setName_; }
     const kseC_Section& Section() const { return section_.ConstGet(); }
     const cow_String& OrientationName() const { return orientationName_; }
-    const cow_String& ControlsName() const { return controlsName_; }
+    void WriteControls(oif_KeywordLine& line) const {
+        line.ValueIf(!controlsName_.IsEmpty(), "controls=", controlsName_);
+    }
+    /// Of the orientation and the controls.
+    void WriteNames(oif_KeywordLine& line) const {
+        line.ValueIf(!orientationName_.IsEmpty(), "orientation=", orientationName_);
+        WriteControls(line);
+    }
 
 private:
     cow_String setName_;

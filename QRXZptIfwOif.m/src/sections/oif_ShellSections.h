@@ -24,7 +24,11 @@ public:
 private:
     void WriteHomogeneous(utl_Stream& stream, const kseC_HomogenousShellSection& shell) const;
     void WriteComposite(utl_Stream& stream, const kseC_CompositeShellSection& shell) const;
-    [[noreturn]] void WriteUser(utl_Stream& stream, const kseC_UserShellSection& shell) const;
+    void WriteUser(utl_Stream& stream, const kseC_UserShellSection& shell) const;
+    oif_KeywordLine KeywordLine(utl_Stream& stream, const kseC_GeometryShellSection& shell) const;
+    static void WriteTemperature(oif_KeywordLine& line, const kseC_GeometryShellSection& shell);
+    void WriteOptions(oif_KeywordLine& line, const kseC_GeometryShellSection& shell) const;
+    static void WriteRebars(utl_Stream& stream, const kseC_GeometryShellSection& shell);
 
     double offset_;
 };
