@@ -4,12 +4,18 @@
 
 #include <algorithm>
 
-void mdf_RecordCheck::Columns(const char* field, const cow_2DArray<double>& table, const char* names) {
+void mdf_RecordCheck::Columns(const char* field, const cow_2DArray<double>& table, const char* names,
+                              int fieldVariables) {
     const std::string_view list(names);
-    const auto expected = 1 + static_cast<int>(std::count(list.begin(), list.end(), ','));
+    const long long expected = 1 + std::count(list.begin(), list.end(), ',') + std::max(fieldVariables, 0);
     if (table.IsEmpty() || table.NumColumns() == expected) return;
-    Error(field, "found rows of " + std::to_string(table.NumColumns()) + ", expected rows of " +
-                     std::to_string(expected) + ": " + names);
+    std::string text = "found rows of " + std::to_string(table.NumColumns()) + ", expected rows of " +
+                       std::to_string(expected) + ": " + names;
+    if (fieldVariables > 0) {
+        text += ", " + std::to_string(fieldVariables) +
+                (fieldVariables == 1 ? " field variable" : " field variables");
+    }
+    Error(field, text);
 }
 
 void mdf_RecordCheck::NotNegative(const char* field, int value) {
@@ -24,6 +30,7 @@ const mdf_RecordChecks& mdf_RecordChecks::All() {
     static const mdf_RecordChecks checks = [] {
         mdf_RecordChecks all;
         mdf_AddAmplitudeChecks(all);
+        mdf_AddSectionChecks(all);
         mdf_AddStepChecks(all);
         return all;
     }();

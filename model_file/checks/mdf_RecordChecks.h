@@ -19,8 +19,10 @@ public:
     void Warning(const char* field, const std::string& text) {
         diagnostics_.Warning(mdf_Path(path_, std::string_view(field)), text);
     }
-    /// An error unless the table has no rows, or as many columns as there are names, such as "time, value".
-    void Columns(const char* field, const cow_2DArray<double>& table, const char* names);
+    /// An error unless the table has no rows, or as many columns as there are names, such as "time, value",
+    /// and field variables behind them.
+    void Columns(const char* field, const cow_2DArray<double>& table, const char* names,
+                 int fieldVariables = 0);
     /// An error unless the number is 0 or more.
     void NotNegative(const char* field, int value);
     void NotNegative(const char* field, double value);
@@ -52,6 +54,7 @@ private:
 };
 
 void mdf_AddAmplitudeChecks(mdf_RecordChecks& checks);
+void mdf_AddSectionChecks(mdf_RecordChecks& checks);
 void mdf_AddStepChecks(mdf_RecordChecks& checks);
 
 #endif
