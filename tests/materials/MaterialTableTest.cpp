@@ -229,6 +229,24 @@ TEST(RecordTable, Sort_ByTheLastColumn_KeepsTheOrderOfEqualRows) {
     EXPECT_EQ(table.Values(), Table({{5, -1}, {2, 5}, {4, 5}, {1, 7}, {3, 7}}));
 }
 
+TEST(RecordTable, Sort_OfBothZeros_TakesThemForEqual) {
+    kmaC_MaterialTable table = Table({{1, 0.0}, {2, -0.0}, {3, 0.0}});
+    table.Sort(1);
+    EXPECT_EQ(table.Values(), Table({{1, 0}, {2, 0}, {3, 0}}));
+}
+
+TEST(RecordTable, Sort_OfManyRowsWithNaN_PutsThemLast) {
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    kmaC_MaterialTable table(200, 2);
+    for (int row = 0; row < 200; ++row) {
+        table.Put(row, 0, row);
+        table.Put(row, 1, row % 3 == 0 ? nan : 200 - row);
+    }
+    table.Sort(1);
+    for (int row = 1; row < 133; ++row) EXPECT_LT(table.ConstGet(row - 1, 1), table.ConstGet(row, 1));
+    for (int row = 133; row < 200; ++row) EXPECT_EQ(table.ConstGet(row, 0), 3 * (row - 133));
+}
+
 TEST(RecordTable, Sort_ByTwoColumns_LooksAtTheFirstOfThemFirst) {
     kmaC_MaterialTable table = Table({{1, 2, 1}, {2, 1, 9}, {3, 1, 2}});
     table.Sort(2);
