@@ -1,5 +1,6 @@
 #include "model_file/checks/mdf_MaterialChecks.h"
 
+#include "store_interface/records/sections/kseC_SolidSections.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
