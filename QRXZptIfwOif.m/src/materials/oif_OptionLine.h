@@ -10,56 +10,36 @@
 /// parameter, once it is past its limit.
 class oif_OptionLine {
 public:
-    oif_OptionLine(utl_Stream& stream, const char* keyword) : stream_(stream) { stream_ << keyword; }
+    oif_OptionLine(utl_Stream& stream, const char* keyword);
 
     /// The comma that a parameter stands behind.
-    oif_OptionLine& Separator() {
-        stream_ << ", ";
-        stream_.OptionalLineBreak();
-        return *this;
-    }
-    oif_OptionLine& Word(const char* word) {
-        Separator();
-        stream_ << word;
-        return *this;
-    }
-    template <class E>
-    oif_OptionLine& EnumText(E value) {
-        stream_ << omu_PrimEnum<E, 1>(value).GetString();
-        return *this;
-    }
+    oif_OptionLine& Separator();
     /// Text that brings its own comma, or none.
-    oif_OptionLine& Text(const char* text) {
-        stream_ << text;
-        return *this;
-    }
-    oif_OptionLine& WordIf(bool condition, const char* word) { return condition ? Word(word) : *this; }
-    /// A parameter with a number, or with the text of an enumeration's value.
-    template <class V>
-    oif_OptionLine& Value(const char* name, V value) {
-        Word(name);
-        if constexpr (std::is_enum_v<V>) {
-            EnumText(value);
-        } else {
-            stream_ << value;
-        }
-        return *this;
+    oif_OptionLine& Text(const char* text);
+    oif_OptionLine& Text(const cow_String& text);
+    oif_OptionLine& Word(const char* word);
+    oif_OptionLine& WordIf(bool condition, const char* word);
+    oif_OptionLine& Value(const char* name, int value);
+    oif_OptionLine& Value(const char* name, double value);
+    /// With the text of an enumeration's value.
+    template <class E>
+    requires std::is_enum_v<E> oif_OptionLine& Value(const char* name, E value) {
+        return Word(name).Text(omu_PrimEnum<E, 1>(value).GetString());
     }
     template <class V>
     oif_OptionLine& ValueUnless(const char* name, V value, V theDefault) {
         return value == theDefault ? *this : Value(name, value);
     }
-    oif_OptionLine& Dependencies(int count) { return count > 0 ? Value("dependencies=", count) : *this; }
+    /// Only a positive number.
+    oif_OptionLine& Dependencies(int count);
     /// 1 is orthotropic, 2 anisotropic.
+    oif_OptionLine& Direction(int type);
     template <class E>
     oif_OptionLine& Direction(E type) {
-        return WordIf(static_cast<int>(type) == 1, "type=ORTHO")
-            .WordIf(static_cast<int>(type) == 2, "type=ANISO");
+        return Direction(static_cast<int>(type));
     }
-    oif_OptionLine& Moduli(bool longTerm) {
-        return Word(longTerm ? "moduli=LONG TERM" : "moduli=INSTANTANEOUS");
-    }
-    void End() { stream_.LineBreak(); }
+    oif_OptionLine& Moduli(bool longTerm);
+    void End();
 
 private:
     utl_Stream& stream_;

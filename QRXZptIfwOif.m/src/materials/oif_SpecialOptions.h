@@ -25,27 +25,19 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Volume
 
 /// Without temperatures, field variables keep their place: a blank column stands where the temperature
 /// would be. `table` is of `columns` columns in the record.
-inline void oif_KeepFieldColumns(oif_MaterialTable& table, int columns, bool temperatureDependency,
-                                 int dependencies) {
-    if (!temperatureDependency && dependencies > 0) table.InsertEmptyColumn(columns - dependencies);
-}
-template <class R>
-void oif_KeepFieldColumns(oif_MaterialTable& table, const R& option) {
-    oif_KeepFieldColumns(table, option.table.NumColumns(), option.temperatureDependency, option.dependencies);
-}
+void oif_KeepFieldColumns(oif_MaterialTable& table, int columns, bool temperatureDependency,
+                          int dependencies);
 
 /// The table of a kmaC_DependentOption.
+oif_MaterialTable oif_DependentTable(const kmaC_MaterialTable& values, bool temperatureDependency,
+                                     int dependencies);
 template <class R>
 oif_MaterialTable oif_DependentTable(const R& option) {
-    oif_MaterialTable table(option.table, option.dependencies, option.temperatureDependency);
-    oif_KeepFieldColumns(table, option);
-    return table;
+    return oif_DependentTable(option.table, option.temperatureDependency, option.dependencies);
 }
 
 /// A table in which nothing is inserted.
-inline oif_MaterialTable oif_PlainTable(const kmaC_MaterialTable& values) {
-    return oif_MaterialTable(values, 0, false);
-}
+oif_MaterialTable oif_PlainTable(const kmaC_MaterialTable& values);
 
 /// One data line, or more of eight cells each.
 template <class Values>
