@@ -52,6 +52,7 @@ private:
 };
 
 void mdf_AddAmplitudeChecks(mdf_RecordChecks& checks);
+void mdf_AddConnectorChecks(mdf_RecordChecks& checks);
 void mdf_AddStepChecks(mdf_RecordChecks& checks);
 
 #endif

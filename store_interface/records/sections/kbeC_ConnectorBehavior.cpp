@@ -58,9 +58,8 @@ const cls_FieldTable& kbeC_CDCTerm::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::operatorType>("operatorType",
-                                     "`operator`, a reserved word in C++ (both the C++ member and the JSON "
-                                     "key are operatorType); How the components are added: 0 square root of "
-                                     "the sum of squares (nothing written), 1 sum, 2 Macauley sum.")
+                                     "how the components are added: by the square root of the sum of squares, "
+                                     "by their sum, or by the sum of their positive values")
             .Field<&R::sign>("sign", "1: ', sign=NEGATIVE'.")
             .Field<&R::independentGiven>(
                 "independentGiven", "true: the table depends on positions or motions, by independentKind.")
