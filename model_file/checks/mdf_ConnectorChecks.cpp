@@ -54,10 +54,12 @@ public:
         const int found = table.NumColumns();
         if (found >= least_ && found <= least_ + optional_) return;
         std::string expected = std::to_string(least_);
-        if (optional_ == kAny) expected += " or more";
-        else if (optional_ > 0) expected += " to " + std::to_string(least_ + optional_);
-        check.Error(field,
-                    "found rows of " + std::to_string(found) + ", expected rows of " + expected + ": " + what_);
+        if (optional_ == kAny)
+            expected += " or more";
+        else if (optional_ > 0)
+            expected += " to " + std::to_string(least_ + optional_);
+        check.Error(field, "found rows of " + std::to_string(found) + ", expected rows of " + expected +
+                               ": " + what_);
     }
     static constexpr long long kAny = cls_UnsetInt;
 
@@ -78,7 +80,8 @@ void CheckSpring(const R& record, int motions, mdf_RecordCheck& check) {
     const int count = record.components.Length();
     const bool isUncoupled = record.coupling == R::CouplingEnm::UNCOUPLED;
     const auto dependent = [&](Columns columns) {
-        columns.Dependent(record.temperatureDependency, record.dependencies).Check("table", record.table, check);
+        columns.Dependent(record.temperatureDependency, record.dependencies)
+            .Check("table", record.table, check);
     };
     if (record.behavior == R::BehaviorEnm::LINEAR) {
         const bool isMatrix = record.coupling == R::CouplingEnm::COUPLED;
