@@ -3,6 +3,20 @@
 
 #include "foundation/utl_Stream.h"
 
+#include <initializer_list>
+
+/// Geometry on a data line, with all its digits: ", " between the values, no line end.
+inline void oif_PrintGeometry(utl_Stream& stream, std::initializer_list<double> values) {
+    constexpr int width = 12;
+    constexpr int precision = 15;
+    const char* separator = "";
+    for (const double value : values) {
+        stream << separator;
+        stream.Print(value, width, precision);
+        separator = ", ";
+    }
+}
+
 /// Writes values in data lines of at most `perLine`: ", " between two of a line, and nothing but its end
 /// behind the last.
 class oif_DataLines {

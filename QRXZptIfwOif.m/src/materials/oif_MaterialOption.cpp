@@ -62,13 +62,7 @@ constexpr auto kHardening = [](auto& line, const auto& o) {
 constexpr auto kZero = [](auto& line, const auto& o) { line.ValueUnless("zero=", o.zero, o.zeroDef()); };
 /// Without rates, what follows keeps its place behind a blank column.
 constexpr auto kRateColumn = [](auto& table, const auto& o) {
-    const int columns = o.table.NumColumns() - o.dependencies;
-    if (o.rateGiven) return;
-    if (o.temperatureDependency) {
-        table.InsertEmptyColumn(columns - 1);
-    } else if (o.dependencies > 0) {
-        table.InsertEmptyColumn(columns);
-    }
+    if (!o.rateGiven) oif_KeepDependentColumns(table, o);
 };
 /// Of a table of two columns the third stays away, since none is ever added at the end.
 constexpr auto kThirdColumnBlank = [](auto& table, const auto&) { table.InsertEmptyColumn(2); };

@@ -50,4 +50,36 @@ inline utl_Stream& operator<<(utl_Stream& stream, const oif_MaterialTable& table
     return stream;
 }
 
+/// Without temperatures, field variables keep their place: a blank column stands where the temperature
+/// would be. `table` is of `columns` columns in the record.
+inline void oif_KeepFieldColumns(oif_MaterialTable& table, int columns, bool temperatureDependency,
+                                 int dependencies) {
+    if (!temperatureDependency && dependencies > 0) table.InsertEmptyColumn(columns - dependencies);
+}
+template <class R>
+void oif_KeepFieldColumns(oif_MaterialTable& table, const R& option) {
+    oif_KeepFieldColumns(table, option.table.NumColumns(), option.temperatureDependency, option.dependencies);
+}
+
+/// A table that may depend on the temperature and on field variables, these in their places.
+template <class Values>
+oif_MaterialTable oif_DependentTable(const Values& values, int dependencies, bool temperatureDependency) {
+    oif_MaterialTable table(values, dependencies, temperatureDependency);
+    oif_KeepFieldColumns(table, values.NumColumns(), temperatureDependency, dependencies);
+    return table;
+}
+template <class R>
+oif_MaterialTable oif_DependentTable(const R& option) {
+    return oif_DependentTable(option.table, option.dependencies, option.temperatureDependency);
+}
+
+/// A blank column for data that the record's table leaves out just ahead of temperature and field variables;
+/// without those nothing has to keep its place.
+template <class R>
+void oif_KeepDependentColumns(oif_MaterialTable& table, const R& option) {
+    if (!option.temperatureDependency && option.dependencies <= 0) return;
+    table.InsertEmptyColumn(option.table.NumColumns() - option.dependencies -
+                            (option.temperatureDependency ? 1 : 0));
+}
+
 #endif

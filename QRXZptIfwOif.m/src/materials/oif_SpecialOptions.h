@@ -23,25 +23,6 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_UserMa
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Viscoelastic& option);
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_VolumetricTestData& option);
 
-/// Without temperatures, field variables keep their place: a blank column stands where the temperature
-/// would be. `table` is of `columns` columns in the record.
-inline void oif_KeepFieldColumns(oif_MaterialTable& table, int columns, bool temperatureDependency,
-                                 int dependencies) {
-    if (!temperatureDependency && dependencies > 0) table.InsertEmptyColumn(columns - dependencies);
-}
-template <class R>
-void oif_KeepFieldColumns(oif_MaterialTable& table, const R& option) {
-    oif_KeepFieldColumns(table, option.table.NumColumns(), option.temperatureDependency, option.dependencies);
-}
-
-/// The table of a kmaC_DependentOption.
-template <class R>
-oif_MaterialTable oif_DependentTable(const R& option) {
-    oif_MaterialTable table(option.table, option.dependencies, option.temperatureDependency);
-    oif_KeepFieldColumns(table, option);
-    return table;
-}
-
 /// A table in which nothing is inserted.
 inline oif_MaterialTable oif_PlainTable(const kmaC_MaterialTable& values) {
     return oif_MaterialTable(values, 0, false);

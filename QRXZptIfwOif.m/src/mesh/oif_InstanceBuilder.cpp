@@ -1,23 +1,18 @@
 #include "mesh/oif_InstanceBuilder.h"
 
+#include "deck/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 #include "mesh/oif_SetName.h"
+#include "sections/oif_ConnectorOptions.h"
+#include "sections/oif_ConnectorSection.h"
+
+#include <set>
 
 namespace {
 
-constexpr int kWidth = 12;
-constexpr int kPrecision = 15;
 constexpr double kPi = 3.141592653589793;
-
-void PrintTriple(utl_Stream& stream, double x, double y, double z) {
-    stream.Print(x, kWidth, kPrecision);
-    stream << ", ";
-    stream.Print(y, kWidth, kPrecision);
-    stream << ", ";
-    stream.Print(z, kWidth, kPrecision);
-}
 
 } // namespace
 
@@ -46,16 +41,13 @@ void oif_Instance::Write(utl_Stream& stream) const {
     const bool turned = angle > gsl_Util::Instance().AngleTolerance();
     // A turn alone still has its line of zeros.
     if (turned || translation.ComputeMagnitude() > gsl_Util::Instance().LengthTolerance()) {
-        PrintTriple(stream, translation.X(), translation.Y(), translation.Z());
+        oif_PrintGeometry(stream, {translation.X(), translation.Y(), translation.Z()});
         stream << endl;
     }
     if (!turned) return;
     const gsl_Point second = point + axis;
-    PrintTriple(stream, point.X(), point.Y(), point.Z());
-    stream << ", ";
-    PrintTriple(stream, second.X(), second.Y(), second.Z());
-    stream << ", ";
-    stream.Print(angle * 180.0 / kPi, kWidth, kPrecision);
+    oif_PrintGeometry(
+        stream, {point.X(), point.Y(), point.Z(), second.X(), second.Y(), second.Z(), angle * 180.0 / kPi});
     stream << endl;
 }
 
@@ -76,22 +68,78 @@ void oif_InstanceBuilder::CreateMesh() {
         AddInstanceDefinition(key, oif_Node(instance, ModelInfo()));
         AddInstanceDefinition(key, oif_ElementFromMesh(instance, ModelInfo()));
     });
+    CreateConnectors();
+}
 
-    const ptoC_PartAttributeList& assignments = Info().View().Assembly().ConstGetSectionAssignment();
+void oif_InstanceBuilder::CreateConnectors() {
+    const odiK_Assembly& assembly = Info().View().Assembly();
+    const ptoC_PartAttributeList& orientations = assembly.ConstGetConnectorOrientation();
+    const auto orientationOf = [&](const rgnC_Region& region) {
+        for (int i = 0; i < orientations.Size(); ++i) {
+            if (!(orientations.ConstGet(i).RegionRef() == region)) continue;
+            return nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientations.ConstGet(i), NEX_HERE);
+        }
+        return ptoC_ConnectorOrientation();
+    };
+    std::set<cow_String> sectionsDone;
+    const ptoC_PartAttributeList& assignments = assembly.ConstGetSectionAssignment();
     for (int i = 0; i < assignments.Size(); ++i) {
         const auto& assignment =
             nex_canDynamicCastRef<ptoC_SectionAssignment>(assignments.ConstGet(i), NEX_HERE);
-        const nex_Context context("section assignment of the assembly", assignment.SectionName());
-        oif_SetName setName(assignment.RegionRef(), ModelInfo());
+        const cow_String& name = assignment.SectionName();
+        const nex_Context context("section assignment of the assembly", name);
+        const rgnC_Region& region = assignment.RegionRef();
+        const oif_SetName setName(region, ModelInfo());
         const cow_String printed = setName.UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
-        if (!Model().Sections().IsMember(assignment.SectionName())) continue;
+        if (!Model().Sections().IsMember(name)) continue;
+        const kseC_Section& anySection = Model().Sections().ConstGet(name);
         // Sections of other kinds belong to the instances.
-        if (Model().Sections().ConstGet(assignment.SectionName()).DynTypeId() !=
-            kseC_ConnectorSection::TypeId()) {
-            continue;
-        }
+        if (anySection.DynTypeId() != kseC_ConnectorSection::TypeId()) continue;
         if (setName.InstanceName().IsEmpty()) {
-            AddAssemblyDefinition(oif_AssemblyElement(assignment.RegionRef(), printed, Info()));
+            AddAssemblyDefinition(oif_AssemblyElement(region, printed, Info()));
         }
+        const auto& section = nex_canDynamicCastRef<kseC_ConnectorSection>(anySection, NEX_HERE);
+        AddAssemblyDefinition(
+            oif_NewConnectorSection(name, printed, section, orientationOf(region), ModelInfo()));
+        if (sectionsDone.insert(name).second) CreateConnectorBehaviors(name, section);
+    }
+}
+
+void oif_InstanceBuilder::CreateConnectorBehaviors(const cow_String& name,
+                                                   const kseC_ConnectorSection& section) {
+    if (kseC_Utils::IsConnectorSectionEmpty(section)) return;
+    AddModelDefinition(oif_ConnectorBehavior(name, section.regularize, section.useBehaviorRegularization,
+                                             section.regularization, section.extrapolationLinear,
+                                             section.integrationExplicit));
+    AddModelDefinition(oif_ConnectorConstitutiveReference(section));
+    oif_DerivedComponents derived;
+    const auto addWithDerived = [&](const auto& keyword) {
+        keyword.GetDerivedComponents(derived);
+        AddModelDefinition(keyword);
+    };
+    for (int i = 0; i < section.options.Length(); ++i) {
+        const kbeC_ConnectorBehaviorOption& option = section.options[i].ConstGet();
+        const unsigned type = option.DynTypeId();
+        if (type == kbeC_ConnectorElasticity::TypeId()) {
+            AddModelDefinition(oif_ConnectorElasticity(static_cast<const kbeC_ConnectorElasticity&>(option)));
+        } else if (type == kbeC_ConnectorDamping::TypeId()) {
+            AddModelDefinition(oif_ConnectorDamping(static_cast<const kbeC_ConnectorDamping&>(option)));
+        } else if (type == kbeC_ConnectorStop::TypeId()) {
+            AddModelDefinition(oif_ConnectorStop(static_cast<const kbeC_ConnectorStop&>(option)));
+        } else if (type == kbeC_ConnectorLock::TypeId()) {
+            AddModelDefinition(oif_ConnectorLock(static_cast<const kbeC_ConnectorLock&>(option)));
+        } else if (type == kbeC_ConnectorFailure::TypeId()) {
+            AddModelDefinition(oif_ConnectorFailure(static_cast<const kbeC_ConnectorFailure&>(option)));
+        } else if (type == kbeC_ConnectorFriction::TypeId()) {
+            addWithDerived(
+                oif_ConnectorFriction(static_cast<const kbeC_ConnectorFriction&>(option), ModelInfo(), i));
+        } else if (type == kbeC_ConnectorPlasticity::TypeId()) {
+            addWithDerived(oif_ConnectorPlasticity(static_cast<const kbeC_ConnectorPlasticity&>(option), i));
+        } else if (type == kbeC_ConnectorDamage::TypeId()) {
+            addWithDerived(oif_ConnectorDamage(static_cast<const kbeC_ConnectorDamage&>(option), i));
+        }
+    }
+    for (mdl_MapString2ObjCowIT<kbeC_DerivedComponent> it(derived); !it.IsDone(); it.Next()) {
+        AddModelDefinition(oif_DerivedComponent(it.CurrentKey(), it.CurrentValue()));
     }
 }

@@ -19,8 +19,8 @@ private:
     gsl_Matrix placement_;
 };
 
-/// Opens the instances' blocks and puts their meshes in them; and for each connector section assignment of
-/// the assembly its connector elements.
+/// Opens the instances' blocks and puts their meshes in them; writes for each connector section assignment of
+/// the assembly its connector elements and their section, and once for each such section its behaviour.
 class oif_InstanceBuilder final : public oif_ComponentOf<oif_InstanceBuilder> {
 public:
     using oif_ComponentOf::oif_ComponentOf;
@@ -29,6 +29,9 @@ public:
 private:
     void CreateInstances();
     void CreateMesh();
+    void CreateConnectors();
+    /// The behaviour, its options in order, and behind them all derived components that they refer to.
+    void CreateConnectorBehaviors(const cow_String& name, const kseC_ConnectorSection& section);
 };
 
 #endif

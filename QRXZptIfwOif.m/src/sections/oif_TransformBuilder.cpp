@@ -1,3 +1,86 @@
 #include "sections/oif_TransformBuilder.h"
 
-void oif_TransformBuilder::Build() {}
+#include "mesh/oif_Set.h"
+#include "mesh/oif_SetName.h"
+#include "sections/oif_Orientation.h"
+
+#include <map>
+#include <set>
+#include <vector>
+
+namespace {
+
+constexpr unsigned kSymmetryCondition = 0x298000E;
+
+} // namespace
+
+void oif_TransformBuilder::Build() {
+    CollectCsysRegionsList();
+    WriteTransforms();
+    WriteConnectorOrientations();
+}
+
+void oif_TransformBuilder::CollectCsysRegionsList() {
+    const auto append = [this](const dtmC_DatumRef& datum, const rgnC_Region& region) {
+        datums_.Append(datum);
+        regions_.Append(region);
+    };
+    for (kprC_PropagatingContainerIT<kbcC_BC> it(Model().BCs()); !it.IsDone(); it.Next()) {
+        const kbcC_BC& condition = it.CurrentValue();
+        if (condition.suppressed) continue;
+        // A symmetry condition counts also without a system.
+        if (condition.datum.IsNullRef() && condition.DynTypeId() != kSymmetryCondition) continue;
+        append(condition.datum, condition.region);
+    }
+}
+
+void oif_TransformBuilder::WriteTransforms() {
+    struct System {
+        dtmC_DatumRef datum;
+        cow_List<cow_String> members;
+        std::set<cow_String> known;
+    };
+    std::vector<System> systems; // in the order of their first region
+    std::map<int, std::size_t> placeOf;
+    for (int i = 0; i < regions_.Length(); ++i) {
+        const cow_String member =
+            oif_SetName(regions_[i], ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+        const auto [place, isNew] = placeOf.emplace(datums_[i].Id(), systems.size());
+        if (isNew) systems.push_back({datums_[i], {}, {}});
+        System& system = systems[place->second];
+        if (system.known.insert(member).second) system.members.Append(member);
+    }
+    for (const System& system : systems) {
+        const cow_String name = ConstGetDatumName(system.datum);
+        AddAssemblyDefinition(oif_Nset(name, system.members));
+        AddAssemblyDefinition(oif_Transform(Store(), system.datum, name));
+    }
+}
+
+void oif_TransformBuilder::WriteConnectorOrientations() {
+    const ptoC_PartAttributeList& orientations = Info().View().Assembly().ConstGetConnectorOrientation();
+    for (int i = 0; i < orientations.Size(); ++i) {
+        const auto& ends =
+            nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientations.ConstGet(i), NEX_HERE);
+        // The place in the list counts here, whatever the record's own name is.
+        const cow_String name = cow_String("ConnOri-") + cow_String(i);
+        WriteOrientation(ends.ConstGetCsys1(), ends.ConstGetAngle1(), name + "-1", ends.ConstGetAxis1());
+        WriteOrientation(ends.ConstGetCsys2(), ends.ConstGetAngle2(), name + "-2", ends.ConstGetAxis2());
+    }
+}
+
+void oif_TransformBuilder::WriteOrientation(const dtmC_DatumRef& datum, double angle,
+                                            const cow_String& suffix,
+                                            ptoC_MaterialOrientation::axisEnm axis) {
+    if (datum.IsNullRef()) return;
+    const cow_String name = ModelInfo().GetOrientationName(datum, angle, suffix);
+    for (int i = 0; i < orientationNames_.Length(); ++i) {
+        if (orientationNames_[i] == name) return;
+    }
+    orientationNames_.Append(name);
+    AddAssemblyDefinition(oif_Orientation(Store(), datum, name, true, angle, axis));
+}
+
+cow_String oif_TransformBuilder::ConstGetDatumName(const dtmC_DatumRef& datum) const {
+    return cow_String("_T-") + oif_SetName::Unquote(ModelInfo().GetOrientationName(datum, 0.0, cow_String()));
+}
