@@ -1,5 +1,6 @@
 #include "tools/ModelChecks.h"
 
+#include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/sections/kseC_BeamSection.h"
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"

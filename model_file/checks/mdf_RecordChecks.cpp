@@ -30,6 +30,7 @@ const mdf_RecordChecks& mdf_RecordChecks::All() {
     static const mdf_RecordChecks checks = [] {
         mdf_RecordChecks all;
         mdf_AddAmplitudeChecks(all);
+        mdf_AddMaterialChecks(all);
         mdf_AddSectionChecks(all);
         mdf_AddStepChecks(all);
         return all;
@@ -45,4 +46,14 @@ void mdf_RecordChecks::Run(const cls_Record& record, mdf_RecordCheck& report) co
         if (found == checks_.end()) continue;
         for (const auto& check : found->second) check(record, report);
     }
+}
+
+std::string mdf_RecordChecks::TableHint(const cls_Record& record, const char* field) const {
+    const cls_ClassRegistrar& classes = cls_Classes();
+    for (const cls_ClassEntry* entry = classes.Find(record.DynTypeId()); entry != nullptr;
+         entry = classes.Find(entry->baseId)) {
+        const auto found = tableHints_.find(entry->info.Id());
+        if (found != tableHints_.end()) return found->second(record, field);
+    }
+    return {};
 }

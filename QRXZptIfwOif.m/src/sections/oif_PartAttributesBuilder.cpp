@@ -133,7 +133,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
     writtenOrientations_ = {};
     const ptoC_PartAttributeList& assignments =
         instance.Shortcut().ConstGet().ConstGetSectionAssignment();
-    for (int key = 0; key < groups.Size(); ++key) {
+    for (int key = 0; key < groups.Count(); ++key) {
         // Elements without a section have no keyword, but their group uses up a number.
         if (groups.SectionIndex(key) == -1) continue;
         const auto& assignment = nex_canDynamicCastRef<ptoC_SectionAssignment>(
@@ -158,7 +158,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
             group.controls = elemCtrlMap_.ConstGet(controlsIndex);
             group.controlsName = cow_String("EC-") + cow_String(controlsIndex + 1);
             text = text + ", (Controls:" + group.controlsName + ")";
-        } else if (elemCtrlMap_.Size() > 0) {
+        } else if (elemCtrlMap_.Count() > 0) {
             text = text + ", (Controls:Default)";
         }
         group.controls.SetElemLibrary(ElemLibrary());

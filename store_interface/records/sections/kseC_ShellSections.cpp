@@ -7,7 +7,6 @@ const cls_FieldTable& kseC_RebarLayer::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::area>("area", "area of one bar (length squared)")
-            .Required()
             .Field<&R::orientationName>("orientationName",
                                         "name of the layer's own orientation; non-empty: the layer gets a "
                                         "'*Rebar Layer' of its own and no angle")
@@ -143,7 +142,6 @@ const cls_FieldTable& kseC_HomogenousShellSection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_GeometryShellSection::Fields())
             .Field<&R::thickness>("thickness", "length; shell thickness")
-            .Required()
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points through the thickness; not written with useGeneralKeyword")
@@ -158,7 +156,6 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::thickness>("thickness", "length; thickness of the layer")
-            .Required()
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points of the layer; not written with useGeneralKeyword")
