@@ -57,7 +57,7 @@ private:
 ///     *Beam General Section, elset=SET, poisson = 0.3, density=7800., section=GENERAL
 ///     1., 2., 0., 3., 4.
 ///     0.,0.,-1.
-///     210000., 80000.
+///     210000.,80000.
 class oif_BeamGeneralSection final : public qkw_KeywordOf<oif_BeamGeneralSection>,
                                      private oif_BeamSectionCommon {
 public:
