@@ -2,6 +2,7 @@
 
 #include "materials/Materials.h"
 #include "materials/oif_MaterialBuilder.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
 #include "store_interface/records/sections/kseC_Section.h"
 
 namespace {
