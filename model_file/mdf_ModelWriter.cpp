@@ -170,7 +170,7 @@ private:
         if (!model.ConstAssemblyMesh().IsNull()) WriteMesh(*model.ConstAssemblyMesh(), true);
         WriteAssemblySets(model);
         WriteAttributes("sectionAssignments", model, model.AssemblyObject().sectionAssignments);
-        WriteAttributes("connectorOrientations", model, model.AssemblyObject().connectorOrientations);
+        WriteConnectorOrientations(model);
         out_.EndObject();
     }
 
@@ -195,6 +195,19 @@ private:
         own("materialOrientations", instance.ownMaterialOrientations);
         own("beamOrientations", instance.ownBeamOrientations);
         out_.EndObject();
+    }
+
+    void WriteConnectorOrientations(const odiK_Model& model) {
+        const ptoC_PartAttributeList& stored = model.AssemblyObject().connectorOrientations;
+        ptoC_PartAttributeList list;
+        for (int i = 0; i < stored.Size(); ++i) {
+            ptoC_ConnectorOrientation orientation =
+                nex_canDynamicCastRef<ptoC_ConnectorOrientation>(stored.ConstGet(i), NEX_HERE);
+            // The name of its place comes back by itself.
+            if (orientation.name == odiK_Assembly::ConnectorOrientationName(i)) orientation.name = {};
+            list.Append(orientation);
+        }
+        WriteAttributes("connectorOrientations", model, list);
     }
 
     void WriteAttributes(const char* key, const odiK_Model& model, const ptoC_PartAttributeList& list) {

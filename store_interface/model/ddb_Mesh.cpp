@@ -3,15 +3,14 @@
 #include "store_interface/model/ddb_Assembly.h"
 
 ddb_PartInstance ddb_ScopedNodeData::getPartInstance(int index) const {
-    const auto place = static_cast<std::size_t>(index - NumNodes());
     const auto& foreign = mesh_->Nodes().foreign;
-    if (index < NumNodes() || place >= foreign.size()) {
-        cow_RaiseOutOfRange(index, NumNodes() + static_cast<int>(foreign.size()));
-    }
-    const auto instance = model_->Instances().find(foreign[place].instanceName);
-    if (instance == model_->Instances().end()) {
-        cow_RaiseNoSuchKey("ddb_InstanceContainer", foreign[place].instanceName);
-    }
+    const int ends = NumNodes() + static_cast<int>(foreign.size());
+    const bool isOwn = index < NumNodes();
+    if (index < 0 || index >= ends || isNativeNode(index)) cow_RaiseOutOfRange(index, ends);
+    const cow_String& name =
+        isOwn ? instanceName_ : foreign[static_cast<std::size_t>(index - NumNodes())].instanceName;
+    const auto instance = model_->Instances().find(name);
+    if (instance == model_->Instances().end()) cow_RaiseNoSuchKey("ddb_InstanceContainer", name);
     return ddb_PartInstance(ddb_BaseInstance(instance->second, model_));
 }
 

@@ -30,8 +30,10 @@ private:
 /// View on the nodes of a mesh.
 class ddb_NodeData {
 public:
-    ddb_NodeData(const cow_CountedHld<odiK_Mesh>& mesh, const cow_CountedHld<odiK_Model>& model)
-        : mesh_(mesh), model_(model) {}
+    /// `instanceName` is empty for the assembly's mesh.
+    ddb_NodeData(const cow_CountedHld<odiK_Mesh>& mesh, const cow_CountedHld<odiK_Model>& model,
+                 const cow_String& instanceName)
+        : mesh_(mesh), model_(model), instanceName_(instanceName) {}
 
     /// Number of the mesh's own nodes.
     int NumNodes() const { return mesh_->Nodes().NumNodes(); }
@@ -46,13 +48,15 @@ public:
 protected:
     cow_CountedHld<odiK_Mesh> mesh_;
     cow_CountedHld<odiK_Model> model_;
+    cow_String instanceName_;
 };
 
-/// The same, with the answer to whom a node belongs. Only the assembly's mesh has nodes of others.
+/// The same, with the answer to whom a node belongs: in an instance's mesh to the instance, in the assembly's
+/// to the assembly itself (a native node) or to an instance.
 class ddb_ScopedNodeData : public ddb_NodeData {
 public:
     explicit ddb_ScopedNodeData(const ddb_NodeData& nodes) : ddb_NodeData(nodes) {}
-    bool isNativeNode(int index) const { return index < NumNodes(); }
+    bool isNativeNode(int index) const { return instanceName_.IsEmpty() && index < NumNodes(); }
     /// The instance that a node that is not native belongs to; raises when there is none.
     ddb_PartInstance getPartInstance(int index) const;
 };
@@ -149,7 +153,7 @@ public:
              const cow_String& instanceName, int meshIndex)
         : mesh_(mesh), model_(model), instanceName_(instanceName), meshIndex_(meshIndex) {}
 
-    ddb_NodeData nodeData() const { return {mesh_, model_}; }
+    ddb_NodeData nodeData() const { return {mesh_, model_, instanceName_}; }
     ddb_ElementData elementData() const { return ddb_ElementData(mesh_); }
     ddb_SetList set() const { return {model_, instanceName_}; }
     int meshIndex() const { return meshIndex_; }

@@ -45,9 +45,13 @@ std::string PathOfSet(const cow_String& owner, int id) {
 
 } // namespace
 
+cow_String odiK_Assembly::ConnectorOrientationName(int place) {
+    return cow_String("ConnOri-") + cow_String(place);
+}
+
 void odiK_Assembly::AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation) {
     ptoC_ConnectorOrientation named(orientation);
-    if (named.name.IsEmpty()) named.name = cow_String("ConnOri-") + cow_String(connectorOrientations.Size());
+    if (named.name.IsEmpty()) named.name = ConnectorOrientationName(connectorOrientations.Size());
     connectorOrientations.Append(named);
 }
 

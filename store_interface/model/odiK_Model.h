@@ -82,7 +82,9 @@ struct odiK_Assembly {
 
     const ptoC_PartAttributeList& ConstGetSectionAssignment() const { return sectionAssignments; }
     const ptoC_PartAttributeList& ConstGetConnectorOrientation() const { return connectorOrientations; }
-    /// Appends; an orientation without a name gets "ConnOri-" and its place.
+    /// "ConnOri-" and the place in the list, from 0.
+    static cow_String ConnectorOrientationName(int place);
+    /// Appends; an orientation without a name gets that of its place.
     void AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation);
 };
 

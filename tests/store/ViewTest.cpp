@@ -299,6 +299,13 @@ TEST_F(StoreViews, AssemblysMesh_KnowsWhomItsNodesBelongTo) {
     EXPECT_EQ(Items(labels), (Ints{100}));
 }
 
+TEST_F(StoreViews, NodesOfAnInstancesMesh_BelongToTheInstance) {
+    const ddb_ScopedNodeData nodes(Instance("I-2").mesh().nodeData());
+    EXPECT_FALSE(nodes.isNativeNode(0));
+    EXPECT_EQ(nodes.getPartInstance(0).name(), "I-2");
+    EXPECT_NE(Raised([&] { nodes.getPartInstance(-1); }), "nothing raised");
+}
+
 TEST_F(StoreViews, NodeOfAnInstanceThatIsNotThere_Raises) {
     model->AssemblyMesh().AddForeignNode("gone", 1);
     model->AssemblyMesh().AddForeignNode("H", 1);

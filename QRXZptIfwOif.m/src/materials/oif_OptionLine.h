@@ -4,19 +4,16 @@
 #include "deck/oif_KeywordLine.h"
 
 /// The keyword line of a material option.
-class oif_OptionLine final : public oif_KeywordLineOf<oif_OptionLine> {
+class oif_OptionLine final : public oif_KeywordLine {
 public:
-    using oif_KeywordLineOf::oif_KeywordLineOf;
+    using oif_KeywordLine::oif_KeywordLine;
 
     /// 1 is orthotropic, 2 anisotropic.
     template <class E>
-    oif_OptionLine& Direction(E type) {
-        return WordIf(static_cast<int>(type) == 1, "type=ORTHO")
-            .WordIf(static_cast<int>(type) == 2, "type=ANISO");
+    void Direction(E type) {
+        WordIf(static_cast<int>(type) == 1, "type=ORTHO").WordIf(static_cast<int>(type) == 2, "type=ANISO");
     }
-    oif_OptionLine& Moduli(bool longTerm) {
-        return Word(longTerm ? "moduli=LONG TERM" : "moduli=INSTANTANEOUS");
-    }
+    void Moduli(bool longTerm) { Word(longTerm ? "moduli=LONG TERM" : "moduli=INSTANTANEOUS"); }
 };
 
 #endif

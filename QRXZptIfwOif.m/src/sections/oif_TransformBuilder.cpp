@@ -63,7 +63,7 @@ void oif_TransformBuilder::WriteConnectorOrientations() {
         const auto& ends =
             nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientations.ConstGet(i), NEX_HERE);
         // The place in the list counts here, whatever the record's own name is.
-        const cow_String name = cow_String("ConnOri-") + cow_String(i);
+        const cow_String name = odiK_Assembly::ConnectorOrientationName(i);
         WriteOrientation(ends.ConstGetCsys1(), ends.ConstGetAngle1(), name + "-1", ends.ConstGetAxis1());
         WriteOrientation(ends.ConstGetCsys2(), ends.ConstGetAngle2(), name + "-2", ends.ConstGetAxis2());
     }

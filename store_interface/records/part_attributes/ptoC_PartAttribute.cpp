@@ -52,8 +52,9 @@ const cls_FieldTable& ptoC_ConnectorOrientation::Fields() {
     using R = ptoC_ConnectorOrientation;
     static const cls_FieldTable fields =
         cls_Describe<R>(ptoC_PartAttribute::Fields())
-            .Field<&R::name>("name", "name of the orientation, given by the store")
-            .NotModelData()
+            .Field<&R::name>("name",
+                             "by which connector sections name the orientation; empty: 'ConnOri-' and "
+                             "the place in the assembly's list, counted from 0")
             .Field<&R::csys1>("csys1", "coordinate system of the first end")
             .Field<&R::axis1>("axis1", "axis of the additional rotation at the first end")
             .Field<&R::angle1>("angle1", "angle of the additional rotation at the first end in degrees")

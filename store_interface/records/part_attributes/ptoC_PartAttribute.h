@@ -67,7 +67,8 @@ public:
     static constexpr cls_ClassInfo Class{
         "ptoC_ConnectorOrientation", "gives the two ends of the connectors of a region their orientations"};
 
-    /// "ConnOri-" and the record's place in the assembly's list, from 0; set by the store.
+    /// By which connector sections name the orientation. The store gives one without a name "ConnOri-" and
+    /// the place in the assembly's list, from 0; only under that name orientations are defined.
     cow_String name;
     dtmC_DatumRef csys1;
     ptoC_MaterialOrientation::axisEnm axis1 = ptoC_MaterialOrientation::axisEnm::AXIS_1;

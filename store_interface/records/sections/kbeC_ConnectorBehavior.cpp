@@ -18,18 +18,20 @@ const cls_FieldTable& kbeC_ConnectorOptions::Fields() {
     using R = kbeC_ConnectorOptions;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::useBehaviorRegularization>("useBehaviorRegularization",
-                                                  "true: no 'regularize=' and no 'rtol='.")
-            .Field<&R::regularize>("regularize",
-                                   "'regularize=ON' (then 'rtol=' follows) or 'regularize=OFF'.")
+            .Field<&R::useBehaviorRegularization>(
+                "useBehaviorRegularization",
+                "tables are regularized as the behaviour says; nothing of regularization is written")
+            .Field<&R::regularize>("regularize", "tables are regularized")
             .Field<&R::useBehaviorRtol>("useBehaviorRtol",
-                                        "true: 'rtol=' with 0.03; false: with `regularization`.")
-            .Field<&R::regularization>("regularization", "tolerance (fraction)")
-            .Field<&R::useBehaviorRateFactor>("useBehaviorRateFactor", "true: no 'rate filter factor='.")
-            .Field<&R::rateFactor>("rateFactor", "rate filter factor; 0.9 writes nothing")
-            .Field<&R::interpolation>("interpolation", "between rates. 1: 'rate interpolation=LOGARITHMIC'.")
-            .Field<&R::useBehaviorExtrapolation>("useBehaviorExtrapolation", "true: no 'extrapolation='.")
-            .Field<&R::extrapolation>("extrapolation", "1 'LINEAR', else 'CONSTANT'.");
+                                        "the usual tolerance 0.03 in place of regularization")
+            .Field<&R::regularization>("regularization", "tolerance of regularized tables, as a fraction")
+            .Field<&R::useBehaviorRateFactor>("useBehaviorRateFactor",
+                                              "the rate filter factor is the usual one")
+            .Field<&R::rateFactor>("rateFactor", "factor that rates are filtered by (no unit)")
+            .Field<&R::interpolation>("interpolation", "between rates")
+            .Field<&R::useBehaviorExtrapolation>("useBehaviorExtrapolation",
+                                                 "tables are extrapolated as the behaviour says")
+            .Field<&R::extrapolation>("extrapolation", "beyond a table's ends");
     return fields;
 }
 
@@ -57,20 +59,16 @@ const cls_FieldTable& kbeC_CDCTerm::Fields() {
     using R = kbeC_CDCTerm;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::operatorType>("operatorType",
-                                     "`operator`, a reserved word in C++ (both the C++ member and the JSON "
-                                     "key are operatorType); How the components are added: 0 square root of "
-                                     "the sum of squares (nothing written), 1 sum, 2 Macauley sum.")
-            .Field<&R::sign>("sign", "1: ', sign=NEGATIVE'.")
-            .Field<&R::independentGiven>(
-                "independentGiven", "true: the table depends on positions or motions, by independentKind.")
-            .Field<&R::independentKind>("independentKind",
-                                        "0 position, 1 constitutive motion; read only with independentGiven.")
-            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
-            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
-            .Field<&R::components>(
-                "components",
-                "connector components 1 to 6, in the user's order; the components that the term is made of")
+            .Field<&R::operatorType>(
+                "operatorType", "how the components are added: by the square root of the sum of squares, "
+                                "by their sum, or by the sum of their positive values")
+            .Field<&R::sign>("sign", "the sign of the term")
+            .Field<&R::independentGiven>("independentGiven", "the table depends on components")
+            .Field<&R::independentKind>("independentKind", "on which values of components the table depends")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column")
+            .Field<&R::components>("components",
+                                   "the components that the term is made of, 1 to 6, in the user's order")
             .Field<&R::table>("table",
                               "one scale factor per component, then the independent variable's columns if "
                               "given, temperature if temperatureDependency, field variables")
@@ -97,18 +95,16 @@ const cls_FieldTable& kbeC_ConnectorPotential::Fields() {
     using R = kbeC_ConnectorPotential;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::useDerived>(
-                "useDerived",
-                "0: `component` is written; any other value: the generated name of derivedComponent.")
-            .Field<&R::component>("component", "component number 1 to 6.")
-            .Field<&R::negative>("negative", "any value but 0: ', -1.0' in place of ', 1.0'.")
-            .Field<&R::scaleFactor>("scaleFactor", "scaling factor (no unit).")
-            .Field<&R::radius>("radius",
-                               "effective radius (length for moments), not written for a maximum operator.")
-            .Field<&R::exponentFactor>("exponentFactor", "exponent of the term (no unit).")
+            .Field<&R::useDerived>("useDerived", "0: the term is a component, otherwise a derived component")
+            .Field<&R::component>("component", "component, 1 to 6")
+            .Field<&R::negative>("negative", "not 0: the term counts negative")
+            .Field<&R::scaleFactor>("scaleFactor", "scaling factor (no unit)")
+            .Field<&R::radius>(
+                "radius", "effective radius (length, for moments); not asked for with a maximum operator")
+            .Field<&R::exponentFactor>("exponentFactor", "exponent of the term (no unit)")
             .Field<&R::sign>("sign", "which part of the component's value counts.")
-            .Field<&R::derivedComponent>(
-                "derivedComponent", "the derived component of the term, read only if useDerived isn't 0");
+            .Field<&R::derivedComponent>("derivedComponent",
+                                         "the derived component of the term, with useDerived");
     return fields;
 }
 
@@ -131,14 +127,14 @@ const cls_FieldTable& kbeC_ConnectorElasticity::Fields() {
     using R = kbeC_ConnectorElasticity;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .Field<&R::behavior>("behavior", "")
-            .Field<&R::coupling>("coupling", "With a linear behaviour only 0 and 1 write a keyword; with a "
-                                             "nonlinear one 2 is POSITION and 1 CONSTITUTIVE MOTION.")
-            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
-            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::behavior>("behavior", "how force depends on motion")
+            .Field<&R::coupling>(
+                "coupling", "how components depend on each other; on positions only in a nonlinear behaviour")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column")
             .Field<&R::frequencyDependency>(
                 "frequencyDependency",
-                "linear: the table has a frequency column (cycles per time) after the data columns.")
+                "the table of a linear behaviour has a frequency column (cycles per time) behind its data")
             .Field<&R::table>(
                 "table",
                 "linear uncoupled: one stiffness per entry of `components`, in that order; linear coupled: "
@@ -171,14 +167,14 @@ const cls_FieldTable& kbeC_ConnectorDamping::Fields() {
     using R = kbeC_ConnectorDamping;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .Field<&R::behavior>("behavior", "")
-            .Field<&R::coupling>("coupling", "With a linear behaviour only 0 and 1 write a keyword; with a "
-                                             "nonlinear one 2 is POSITION and 1 CONSTITUTIVE MOTION.")
-            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
-            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
+            .Field<&R::behavior>("behavior", "how force depends on motion")
+            .Field<&R::coupling>(
+                "coupling", "how components depend on each other; on positions only in a nonlinear behaviour")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column")
             .Field<&R::frequencyDependency>(
                 "frequencyDependency",
-                "linear: the table has a frequency column (cycles per time) after the data columns.")
+                "the table of a linear behaviour has a frequency column (cycles per time) behind its data")
             .Field<&R::table>(
                 "table",
                 "linear uncoupled: one damping coefficient per entry of `components`, in that order; linear "
@@ -253,14 +249,14 @@ const cls_FieldTable& kbeC_TangentialBehavior::Fields() {
             .Field<&R::slipRateDependency>("slipRateDependency", "the table has a slip rate column.")
             .Field<&R::pressureDependency>("pressureDependency", "the table has a contact force column.")
             .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
-            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
-            .Field<&R::testData>("testData",
-                                 "1: ', test data' and the data in three lines (formulation 1 only).")
-            .Field<&R::shearStressLimit>(
-                "shearStressLimit", "stress or force; ', taumax=', formulation 0 only; unset: not written")
-            .Field<&R::slipToleranceType>("slipToleranceType", "0 fraction, 1 absolute.")
-            .Field<&R::fraction>("fraction", "slip tolerance (no unit); 0.0001 writes nothing")
-            .Field<&R::elasticSlip>("elasticSlip", "length; elastic slip, slipToleranceType 1 only.")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table")
+            .Field<&R::testData>("testData", "1: the exponential decay is given by test data")
+            .Field<&R::shearStressLimit>("shearStressLimit",
+                                         "limit of shear stress or force, with a table of coefficients")
+            .Field<&R::slipToleranceType>("slipToleranceType",
+                                          "how much slip sticking allows: a fraction or a length")
+            .Field<&R::fraction>("fraction", "allowed elastic slip as a fraction (no unit)")
+            .Field<&R::elasticSlip>("elasticSlip", "allowed elastic slip (length)")
             .Field<&R::table>(
                 "table", "formulation 0: coefficient, slip rate, contact force, temperature, field "
                          "variables, as the flags say; formulation 1: one row, read value by value in row "
@@ -302,38 +298,33 @@ const cls_FieldTable& kbeC_ConnectorFriction::Fields() {
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::formulation>("formulation", "predefined by the connection type, or user-defined")
             .Field<&R::component>(
-                "component",
-                "user-defined form: component of the slip direction; unset, 0 or negative: no ', component='")
+                "component", "user-defined: component of the slip direction; unset or not positive: none")
             .Field<&R::contactForceType>("contactForceType",
-                                         "user-defined form: where the contact force comes from")
+                                         "user-defined: where the contact force comes from")
             .Field<&R::contactForceComponent>("contactForceComponent",
-                                              "user-defined form, contactForceType 0: component number 1 to "
-                                              "6; unset: no ', contact force='")
+                                              "user-defined: component of the contact force, 1 to 6")
             .Field<&R::contactForceDerived>("contactForceDerived",
-                                            "user-defined form, contactForceType 1: the derived component "
-                                            "that the generated name 'BO-' i '-DC' stands for")
-            .Field<&R::dependencies>("dependencies", "number of field variables of the table.")
-            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
-            .Field<&R::contactArea>("contactArea", "the contact area flag of step 4: the table has the "
-                                                   "column ahead of temperature that is otherwise left blank")
+                                            "user-defined: the derived component that is the contact force")
+            .Field<&R::dependencies>("dependencies", "number of field variables of the table")
+            .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column")
+            .Field<&R::contactArea>(
+                "contactArea",
+                "the table of user-defined friction has a column of contact areas ahead of the temperature")
             .Field<&R::independentKind>("independentKind", "on what the internal contact force depends")
             .Field<&R::independentComponents>(
-                "independentComponents",
-                "user-defined form, independentKind 0 or 1: the independent components")
+                "independentComponents", "user-defined: the components that the contact force depends on")
             .Field<&R::stickStiffness>("stickStiffness",
-                                       "force per length or moment per angle; unset: not written")
+                                       "stiffness of sticking (force per length or moment per angle)")
             .Field<&R::table>(
                 "table", "predefined: the geometric constants and internal contact forces that the "
                          "connection type asks for; user-defined: internal contact force, independent "
                          "components, the contact area column if contactArea, temperature, field variables")
-            .Field<&R::tangentialBehavior>("tangentialBehavior", "present: '*Friction' follows")
+            .Field<&R::tangentialBehavior>("tangentialBehavior", "friction coefficient; none: not given here")
             .Field<&R::potentials>("potentials", "terms of the friction potential")
-            .Field<&R::potentialOperator>("potentialOperator", "1: ', operator=MAX'")
+            .Field<&R::potentialOperator>("potentialOperator", "how the terms of the potential are joined")
             .Field<&R::forcePotentialExponent>("forcePotentialExponent",
-                                               "exponent of the potential (no unit); 2.0 writes nothing")
-            .Field<&R::options>(
-                "options",
-                "regularization group; only its regularize and extrapolation parts are written here");
+                                               "exponent of the potential (no unit)")
+            .Field<&R::options>("options", "regularization group; rates play no part here");
     return fields;
 }
 
@@ -361,9 +352,8 @@ const cls_FieldTable& kbeC_ConnectorPlasticity::Fields() {
     using R = kbeC_ConnectorPlasticity;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .Field<&R::components>(
-                "components",
-                "connector components 1 to 6, in the user's order; not looked at with potentials")
+            .Field<&R::components>("components",
+                                   "components, 1 to 6, in the user's order; not looked at with potentials")
             .Field<&R::isotropicHardening>("isotropicHardening", "isotropic hardening is present")
             .Field<&R::isotropicType>("isotropicType", "how isotropic hardening is defined")
             .Field<&R::isotropicDependencies>("isotropicDependencies",
@@ -386,9 +376,9 @@ const cls_FieldTable& kbeC_ConnectorPlasticity::Fields() {
                 "parameters: yield force, C, gamma; then temperature, field variables")
             .Field<&R::kinematicOptions>("kinematicOptions", "regularization group of the kinematic part")
             .Field<&R::potentials>("potentials", "terms of the yield potential (coupled plasticity)")
-            .Field<&R::potentialOperator>("potentialOperator", "1: ', operator=MAX'")
+            .Field<&R::potentialOperator>("potentialOperator", "how the terms of the potential are joined")
             .Field<&R::forcePotentialExponent>("forcePotentialExponent",
-                                               "exponent of the potential (no unit); 2.0 writes nothing");
+                                               "exponent of the potential (no unit)");
     return fields;
 }
 
@@ -430,11 +420,10 @@ const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::modeMixDependency>(
-                "modeMixDependency",
-                "the flag of the first member: with criterion 2 the tables carry a mode-mix ratio column")
+                "modeMixDependency", "with plastic motion as criterion, the tables have a mode-mix column")
             .Field<&R::components>(
                 "components",
-                "connector components 1 to 6, in the user's order; not looked at with initiationPotentials")
+                "components, 1 to 6, in the user's order; not looked at with initiationPotentials")
             .Field<&R::criterion>("criterion", "what initiates damage")
             .Field<&R::initiationDependencies>("initiationDependencies",
                                                "number of field variables of initiationTable")
@@ -446,16 +435,18 @@ const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
                                         "ratio if modeMixDependency; then temperature, field variables")
             .Field<&R::initiationOptions>("initiationOptions", "regularization group of the initiation")
             .Field<&R::initiationPotentials>("initiationPotentials", "terms of the initiation potential")
-            .Field<&R::initiationPotentialOperator>("initiationPotentialOperator", "1: ', operator=MAX'")
+            .Field<&R::initiationPotentialOperator>("initiationPotentialOperator",
+                                                    "how the terms of the initiation potential are joined")
             .Field<&R::initiationPotentialExponent>("initiationPotentialExponent",
                                                     "exponent of the initiation potential (no unit)")
             .Field<&R::evolution>("evolution", "damage evolution exists")
             .Field<&R::evolutionType>("evolutionType", "by motion or by energy")
-            .Field<&R::softening>("softening", "read for evolutionType MOTION only.")
-            .Field<&R::useAffected>("useAffected",
-                                    "true: 'affected components' and the line of affectedComponents")
+            .Field<&R::softening>("softening", "how force falls, of an evolution by motion")
+            .Field<&R::useAffected>(
+                "useAffected",
+                "the damage acts on affectedComponents, otherwise on the components that it is of")
             .Field<&R::affectedComponents>("affectedComponents", "components that the damage acts on")
-            .Field<&R::degradation>("degradation", "1: 'degradation=Multiplicative'.")
+            .Field<&R::degradation>("degradation", "how damages of several mechanisms are joined")
             .Field<&R::evolutionDependencies>("evolutionDependencies",
                                               "number of field variables of evolutionTable")
             .Field<&R::evolutionTemperatureDependency>("evolutionTemperatureDependency",
@@ -467,7 +458,8 @@ const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
                 "and modeMixDependency, temperature, field variables")
             .Field<&R::evolutionOptions>("evolutionOptions", "regularization group of the evolution")
             .Field<&R::evolutionPotentials>("evolutionPotentials", "terms of the evolution potential")
-            .Field<&R::evolutionPotentialOperator>("evolutionPotentialOperator", "1: ', operator=MAX'")
+            .Field<&R::evolutionPotentialOperator>("evolutionPotentialOperator",
+                                                   "how the terms of the evolution potential are joined")
             .Field<&R::evolutionPotentialExponent>("evolutionPotentialExponent",
                                                    "exponent of the evolution potential (no unit)");
     return fields;

@@ -13,10 +13,9 @@ public:
 
 class kbeC_ConnectorOptions final : public cls_RecordOf<kbeC_ConnectorOptions> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbeC_ConnectorOptions",
-        "How an option's tables are regularized and extrapolated; attached to options, absent means: nothing "
-        "written. A present group with its default values writes nothing either."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorOptions",
+                                         "How an option's tables are regularized, filtered and extrapolated; "
+                                         "by default as the behaviour says."};
 
     enum class InterpolationEnm : int { LINEAR = 0, LOGARITHMIC = 1 };
     enum class ExtrapolationEnm : int { CONSTANT = 0, LINEAR = 1 };

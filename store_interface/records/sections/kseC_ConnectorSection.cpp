@@ -88,36 +88,29 @@ const cls_FieldTable& kseC_ConnectorSection::Fields() {
     using R = kseC_ConnectorSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
-            .Field<&R::assembledType>("assembledType",
-                                      "first of the three connection types . Not 0: the other two are not "
-                                      "looked at by GetConnectionTypeAsString")
-            .Field<&R::translationalType>("translationalType", "second of the three connection types")
-            .Field<&R::rotationalType>("rotationalType", "third of the three connection types")
-            .Field<&R::regularize>("regularize", "false: 'regularize=OFF' on '*Connector Behavior'.")
-            .Field<&R::useBehaviorRegularization>(
-                "useBehaviorRegularization",
-                "true: the regularization tolerance of the analysis holds, no 'rtol='.")
-            .Field<&R::regularization>(
-                "regularization", "tolerance (fraction) of the regularization of tables; 0.03 writes nothing")
-            .Field<&R::extrapolationLinear>("extrapolationLinear", "true: 'extrapolation=LINEAR'.")
-            .Field<&R::integrationExplicit>("integrationExplicit", "true: ', integration=EXPLICIT'.")
-            .Field<&R::contactAngle>("contactAngle", "angle of contact around the ring (assembledType 8 "
-                                                     "only), passed unchanged; unset: left blank")
-            .Field<&R::materialFlowFactor>(
-                "materialFlowFactor", "factor that converts material flow into rotation; 1.0 writes nothing")
-            .Field<&R::massPerLength>(
-                "massPerLength",
-                "the leading connection parameter (name free by 'Connector sections and behaviours'): mass "
-                "per reference length of the belt, first item of the line of assembledType 8")
+            .Field<&R::assembledType>(
+                "assembledType",
+                "first of the three connection types; a connection is of this one or of the two basic ones")
+            .Field<&R::translationalType>("translationalType",
+                                          "second of the three connection types, of translations")
+            .Field<&R::rotationalType>("rotationalType", "third of the three connection types, of rotations")
+            .Field<&R::regularize>("regularize", "tables of the behaviour are regularized")
+            .Field<&R::useBehaviorRegularization>("useBehaviorRegularization",
+                                                  "the tolerance of the analysis holds, not regularization")
+            .Field<&R::regularization>("regularization", "tolerance of regularized tables, as a fraction")
+            .Field<&R::extrapolationLinear>("extrapolationLinear", "tables are extrapolated linearly")
+            .Field<&R::integrationExplicit>("integrationExplicit", "the behaviour is integrated explicitly")
+            .Field<&R::contactAngle>("contactAngle",
+                                     "angle of contact around the ring of a slipring, passed unchanged")
+            .Field<&R::materialFlowFactor>("materialFlowFactor",
+                                           "factor that turns material flow into rotation (no unit)")
+            .Field<&R::massPerLength>("massPerLength", "mass per reference length of the belt of a slipring")
             .Field<&R::constitutiveReference>(
-                "constitutiveReference", "exactly six: reference lengths (components 1 to 3) and angles in "
-                                         "degrees (components 4 to 6) of the constitutive response. Unset "
-                                         "here is -DBL_MAX, not DBL_MAX; JSON null stands for an unset item")
+                "constitutiveReference", "exactly six: reference lengths of components 1 to 3, reference "
+                                         "angles of components 4 to 6 in degrees; null for one that is unset")
             .Length(6)
             .DefaultItems<UnsetReference>()
-            .Field<&R::options>(
-                "options",
-                "behaviour options in the user's order; the index (0-based) goes into generated names");
+            .Field<&R::options>("options", "options of the behaviour, in the user's order");
     return fields;
 }
 
