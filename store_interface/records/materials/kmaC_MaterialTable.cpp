@@ -18,7 +18,7 @@ void kmaC_MaterialTable::Sort(int n) {
     std::sort(order.begin(), order.end(), [&](int a, int b) {
         for (int i = 0; i < n; ++i) {
             const std::weak_ordering compared = std::weak_order(key(a)[i], key(b)[i]);
-            if (compared != 0) return compared < 0;
+            if (std::is_neq(compared)) return std::is_lt(compared);
         }
         return a < b;
     });
