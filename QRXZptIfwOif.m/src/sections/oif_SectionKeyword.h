@@ -9,12 +9,13 @@
 /// in the form that the deck has them in; an orientation or controls of empty name are left out.
 template <class T>
 class oif_SectionKeywordOf : public qkw_KeywordOf<T> {
-protected:
+public:
     oif_SectionKeywordOf(const cow_String& setName, const mdl_ObjCow<kseC_Section>& section,
                          const cow_String& orientationName, const cow_String& controlsName)
         : setName_(setName), section_(section), orientationName_(orientationName),
           controlsName_(controlsName) {}
 
+protected:
     const cow_String& SetName() const { return setName_; }
     const kseC_Section& Section() const { return section_.ConstGet(); }
     const cow_String& OrientationName() const { return orientationName_; }

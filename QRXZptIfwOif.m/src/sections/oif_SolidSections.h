@@ -13,9 +13,7 @@
 /// nor composite raises "Unknown solid section type" behind the parameters.
 class oif_SolidSection final : public oif_SectionKeywordOf<oif_SolidSection> {
 public:
-    oif_SolidSection(const cow_String& setName, const mdl_ObjCow<kseC_Section>& section,
-                     const cow_String& orientationName, const cow_String& controlsName)
-        : oif_SectionKeywordOf(setName, section, orientationName, controlsName) {}
+    using oif_SectionKeywordOf::oif_SectionKeywordOf;
     void Write(utl_Stream& stream) const override;
 };
 
@@ -24,9 +22,7 @@ public:
 ///     0.1,
 class oif_MembraneSection final : public oif_SectionKeywordOf<oif_MembraneSection> {
 public:
-    oif_MembraneSection(const cow_String& setName, const mdl_ObjCow<kseC_Section>& section,
-                        const cow_String& orientationName, const cow_String& controlsName)
-        : oif_SectionKeywordOf(setName, section, orientationName, controlsName) {}
+    using oif_SectionKeywordOf::oif_SectionKeywordOf;
     void Write(utl_Stream& stream) const override;
 };
 
