@@ -11,11 +11,6 @@ namespace {
 
 constexpr int kComponents = 6;
 
-template <class Enm>
-int Number(Enm value) {
-    return static_cast<int>(value);
-}
-
 bool Contains(const cow_List<int>& list, int item) {
     for (int i = 0; i < list.Length(); ++i) {
         if (list[i] == item) return true;
@@ -319,7 +314,7 @@ void oif_ConnectorFriction::WriteTangentialBehavior(utl_Stream& stream) const {
     using Tangential = kbeC_TangentialBehavior;
     const Tangential& tangential = option_.tangentialBehavior.ConstGet();
     stream << "*Friction";
-    if (Number(product_) == 0) {
+    if (product_ == kprC_AnalysisProductEnm::IMPLICIT) {
         if (tangential.slipToleranceType == Tangential::SlipToleranceTypeEnm::ABSOLUTE) {
             stream << ", elastic slip=" << tangential.elasticSlip;
         } else if (tangential.fraction != Tangential::fractionDef()) {
