@@ -7,10 +7,12 @@ namespace {
 class Fixed final : public cls_RecordOf<Fixed, kbcC_BC> {
 public:
     static constexpr cls_ClassInfo Class{"TestFixed", "a condition"};
+    cls_Record* NewState(unsigned) const override { return new kbcC_BCState(); }
 };
 class Symmetry final : public cls_RecordOf<Symmetry, kbcC_BC> {
 public:
     static constexpr cls_ClassInfo Class{"TestSymmetry", "a symmetry condition", 0x298000E};
+    cls_Record* NewState(unsigned) const override { return new kbcC_BCState(); }
 };
 
 class Transforms : public testing::Test {
