@@ -10,6 +10,7 @@
 #include <new>
 #include <type_traits>
 #include <utility>
+#include <vector>
 
 /// The 32 bits of the single-precision float nearest to n.
 inline int getFloatMask(int n) {
@@ -182,6 +183,17 @@ public:
         if (count < 0) cow_RaiseNegative(count, "cow_List: length");
         while (count_ < count) Append(T());
         if (count < count_) Shorten(count);
+    }
+
+    /// Puts the items in ascending order; equal ones keep theirs.
+    void Sort() {
+        std::vector<T> items;
+        items.reserve(static_cast<std::size_t>(count_));
+        for (int i = 0; i < count_; ++i) items.push_back(UncheckedConstGet(i));
+        std::stable_sort(items.begin(), items.end());
+        cow_List sorted{cow_ListConstruct(count_)};
+        for (T& item : items) sorted.Append(std::move(item));
+        Swap(sorted);
     }
 
     /// The longest run of items from `index` on that lies in one piece; `length` gets its length.

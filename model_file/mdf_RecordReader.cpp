@@ -59,6 +59,7 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
     }
     const int errorsBefore = diagnostics_.NumErrors();
     const cls_FieldTable& table = record.DynFields();
+    std::vector<const cls_Field*> refusedTables;
     std::vector<std::string> known = FieldNames(table);
     for (const std::string& other : others) {
         if (std::find(known.begin(), known.end(), other) == known.end()) known.push_back(other);
@@ -71,7 +72,10 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
         const mdf_Path place(path, field.name);
         if (json != nullptr) {
             const bool mayBeUnset = cls_IsUnset(*field.type, field.In(record));
-            if (!ReadValue(*field.type, field.In(record), *json, place, field, mayBeUnset)) continue;
+            if (!ReadValue(*field.type, field.In(record), *json, place, field, mayBeUnset)) {
+                if (field.type->Kind() == cls_FieldKind::Table) refusedTables.push_back(&field);
+                continue;
+            }
         } else if (field.defaultItems != nullptr) {
             // The defaults may be others than those of a new record.
             static_cast<const cls_ListType&>(*field.type).Clear(field.In(record));
@@ -81,6 +85,10 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
         const bool missing =
             json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
         if (missing) diagnostics_.Error(place, std::string("found nothing, expected ") + field.doc);
+    }
+    for (const cls_Field* field : refusedTables) {
+        const std::string hint = mdf_RecordChecks::All().TableHint(record, field->name);
+        if (!hint.empty()) diagnostics_.Error(mdf_Path(path, field->name), hint);
     }
     for (const cls_Field& field : table.All()) CompleteList(field, record, path);
     if (diagnostics_.NumErrors() != errorsBefore) return;

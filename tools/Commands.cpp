@@ -4,6 +4,7 @@
 #include "foundation/nex_Exception.h"
 #include "model_file/mdf_ModelFile.h"
 #include "tools/DeckFile.h"
+#include "tools/ModelChecks.h"
 #include "tools/ModelSummary.h"
 
 #include <algorithm>
@@ -159,7 +160,13 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
 
 ExitCode RunCheck(const std::string& model, RunReport& report) {
     ExitCode code;
-    if (ReadModel(model, report, code) != nullptr) report.Print(model + ": no errors\n");
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    if (odb == nullptr) return code;
+    const char* name = odb_Odb::DefaultModelName();
+    for (const ModelFinding& finding : FindingsOf(*odb->FindModel(name))) {
+        report.Warning(model, std::string("/models/") + name + finding.place + ": " + finding.text);
+    }
+    report.Print(model + ": no errors\n");
     return code;
 }
 

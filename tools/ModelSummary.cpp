@@ -1,5 +1,6 @@
 #include "tools/ModelSummary.h"
 
+#include "model_file/checks/mdf_MaterialChecks.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
 
@@ -182,12 +183,24 @@ Found Suppressed(const odb_Odb&, const odiK_Model& model) {
     return Named(std::move(names));
 }
 
+Found IdleOptions(const odiK_Model& model, bool ofGasket) {
+    std::vector<std::string> names;
+    for (const mdf_IdleOption& idle : mdf_IdleGasketOptions(model)) {
+        if (idle.ofGasket == ofGasket) names.push_back(Text(idle.material) + " " + idle.option);
+    }
+    return Named(std::move(names));
+}
+
 constexpr LeftOutRule kLeftOutRules[] = {
     {"other models", "a deck is always written from \"Default Model\"", OtherModels},
     {"parts without an instance", "only instances show a mesh", IdleParts},
     {"entries of the assembly", "they are no part instances", OtherEntries},
     {"nodes of the assembly", "there is no node block for the assembly", AssemblyNodes},
     {"surface elements", "their element types are not written", SurfaceElements},
+    {"gasket options", "no gasket section names their materials",
+     [](const odb_Odb&, const odiK_Model& model) { return IdleOptions(model, false); }},
+    {"other options of gasket materials", "a gasket behaviour has no place for them",
+     [](const odb_Odb&, const odiK_Model& model) { return IdleOptions(model, true); }},
     {"incident wave properties", "they are not written", IncidentWaveProperties},
     {"time points", "their points are not written",
      [](const odb_Odb&, const odiK_Model& model) { return Named(NamesIn(model.timePoints)); }},

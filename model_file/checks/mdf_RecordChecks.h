@@ -19,8 +19,10 @@ public:
     void Warning(const char* field, const std::string& text) {
         diagnostics_.Warning(mdf_Path(path_, std::string_view(field)), text);
     }
-    /// An error unless the table has no rows, or as many columns as there are names, such as "time, value".
-    void Columns(const char* field, const cow_2DArray<double>& table, const char* names);
+    /// An error unless the table has no rows, or as many columns as there are names, such as "time, value",
+    /// and field variables behind them.
+    void Columns(const char* field, const cow_2DArray<double>& table, const char* names,
+                 int fieldVariables = 0);
     /// An error unless the number is 0 or more.
     void NotNegative(const char* field, int value);
     void NotNegative(const char* field, double value);
@@ -44,15 +46,27 @@ public:
             check(static_cast<const T&>(record), report);
         });
     }
+    /// Adds what is to be said when a table of a record of class T, or of a class derived from it, can't be
+    /// read: how many columns it needs; empty for nothing.
+    template <class T>
+    void AddTableHint(std::string (*hint)(const T&, const char* field)) {
+        tableHints_[T::TypeId()] = [hint](const cls_Record& record, const char* field) {
+            return hint(static_cast<const T&>(record), field);
+        };
+    }
     void Run(const cls_Record& record, mdf_RecordCheck& report) const;
+    std::string TableHint(const cls_Record& record, const char* field) const;
 
 private:
     std::unordered_map<unsigned, std::vector<std::function<void(const cls_Record&, mdf_RecordCheck&)>>>
         checks_;
+    std::unordered_map<unsigned, std::function<std::string(const cls_Record&, const char*)>> tableHints_;
 };
 
 void mdf_AddAmplitudeChecks(mdf_RecordChecks& checks);
 void mdf_AddConnectorChecks(mdf_RecordChecks& checks);
+void mdf_AddMaterialChecks(mdf_RecordChecks& checks);
+void mdf_AddSectionChecks(mdf_RecordChecks& checks);
 void mdf_AddStepChecks(mdf_RecordChecks& checks);
 
 #endif

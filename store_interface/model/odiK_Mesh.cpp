@@ -154,8 +154,7 @@ void odiK_Mesh::FinishElements(odiK_Problems& problems) {
 }
 
 bool odiK_Mesh::FindElement(int label, int& classIndex, int& place) const {
-    if (indexedClasses_ != classes_.size()) IndexElements();
-    const int index = elementIndex_.Find(label);
+    const int index = FindElementIndex(label);
     if (index < 0) return false;
     const auto next = std::upper_bound(
         classes_.begin(), classes_.end(), index,

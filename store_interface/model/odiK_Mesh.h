@@ -98,6 +98,11 @@ public:
     int FindSet(const cow_String& name) const;
     /// The class and the place in it of an element; false when there is none.
     bool FindElement(int label, int& classIndex, int& place) const;
+    /// The place of an element among all elements of the mesh, or -1.
+    int FindElementIndex(int label) const {
+        if (indexedClasses_ != classes_.size()) IndexElements();
+        return elementIndex_.Find(label);
+    }
     int FindNode(int label) const { return nodes_.index.Find(label); }
 
     /// Appends the subsets that the members of the input give: one for nodes, for elements and facets one for

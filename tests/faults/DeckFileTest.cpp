@@ -137,7 +137,7 @@ TEST_F(DeckFileTest, NothingFails_ReplacesTheOldDeckAndLeavesNothingElse) {
     ASSERT_TRUE(Write(Real(), realDevice));
     const std::string deck = folder_.Text("job.inp");
     EXPECT_EQ(deck.rfind("*Heading\n**\n** PARTS\n", 0), 0U);
-    EXPECT_TRUE(deck.ends_with("*End Assembly\n"));
+    EXPECT_TRUE(deck.ends_with("*Plastic, rate=0.\n0.,0.\n0.,0.\n"));
     EXPECT_EQ(result_.bytes, static_cast<long long>(deck.size()));
     EXPECT_EQ(result_.folderSyncError, 0);
     EXPECT_EQ(result_.removeError, 0);

@@ -28,5 +28,14 @@ void FillStore(odb_Odb& odb, int nodes) {
     const std::vector<int> tip = {2};
     const std::vector<odiK_MemberInput> members = {{"A", tip, {}}, {"B", tip, {}}};
     model.AddAssemblySet("TIPS", res_SetTypeEnm::NODES, members);
+    kmaC_Material material;
+    kmaC_Plastic plastic;
+    plastic.rateDependentTable = true;
+    plastic.table = kmaC_MaterialTable(2, 3);
+    material.plastic = plastic;
+    kmaC_Hyperelastic hyperelastic;
+    hyperelastic.table = kmaC_MaterialTable(1, 9);
+    material.hyperelastic = hyperelastic;
+    model.materials.Insert("M", material);
     model.steps.Append("Initial", kprC_InitialStep());
 }

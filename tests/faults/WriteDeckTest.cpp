@@ -119,7 +119,8 @@ TEST(WriteDeck, Summary_CountsInstancesAndNamesWhatIsLeftOut) {
     EXPECT_EQ(written["bytes"], folder.Text("job.inp").size());
     // Two instances of 4 nodes, 3 trusses and 2 surface elements.
     EXPECT_EQ(written["counts"], nlohmann::json::parse(R"({"parts": 1, "instances": 2, "nodes": 8,
-        "elements": 6, "nodeSets": 3, "elementSets": 2, "surfaces": 2, "steps": 1})"));
+        "elements": 6, "nodeSets": 3, "elementSets": 2, "surfaces": 2, "steps": 1,
+        "materials": 1})"));
     std::string leftOut;
     for (const auto& entry : written["leftOut"]) {
         leftOut +=
@@ -151,6 +152,7 @@ TEST(WriteDeck, SummaryForPeople_ListsTheSame) {
               "      2  element sets\n"
               "      2  surfaces\n"
               "      1  steps\n"
+              "      1  materials\n"
               "left out, since a deck can't carry it:\n"
               "      1  other models (a deck is always written from \"Default Model\"): Study\n");
 }

@@ -33,6 +33,35 @@ std::vector<int> Values(const cow_List<Tracked>& list) {
     return values;
 }
 
+/// Ordered by the first only.
+struct Ranked {
+    int rank;
+    char tag;
+    friend bool operator<(const Ranked& a, const Ranked& b) { return a.rank < b.rank; }
+};
+
+TEST(cow_ListSort, Numbers_ComeInAscendingOrder) {
+    cow_List<int> list(3, 1, 2, 1, -5);
+    const cow_List<int> copy(list);
+    list.Sort();
+    EXPECT_EQ(Items(list), (std::vector<int>{-5, 1, 1, 2, 3}));
+    EXPECT_EQ(Items(copy), (std::vector<int>{3, 1, 2, 1, -5}));
+}
+
+TEST(cow_ListSort, EqualItems_KeepTheirOrder) {
+    cow_List<Ranked> list(Ranked{2, 'a'}, Ranked{1, 'b'}, Ranked{2, 'c'}, Ranked{1, 'd'});
+    list.Sort();
+    std::string tags;
+    for (int i = 0; i < list.Length(); ++i) tags += list[i].tag;
+    EXPECT_EQ(tags, "bdac");
+}
+
+TEST(cow_ListSort, EmptyList_StaysEmpty) {
+    cow_List<int> list;
+    list.Sort();
+    EXPECT_TRUE(list.IsEmpty());
+}
+
 TEST(getFloatMask, SomeNumbers_GiveTheBitsOfTheFloat) {
     EXPECT_EQ(getFloatMask(0), 0);
     EXPECT_EQ(getFloatMask(1), 0x3f800000);

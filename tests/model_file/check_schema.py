@@ -90,7 +90,7 @@ def main():
     validator = jsonschema.Draft202012Validator(schema)
 
     failures = 0
-    paths = [os.path.join(source, "examples/bracket/bracket.json")]
+    paths = sorted(glob.glob(os.path.join(source, "examples/**/*.json"), recursive=True))
     paths += sorted(glob.glob(os.path.join(source, "tests/decks/**/*.json"), recursive=True))
     good = [(path, load(path)) for path in paths] + [("the sample", sample())]
     for name, document in good:

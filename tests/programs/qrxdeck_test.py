@@ -431,6 +431,26 @@ class OtherCommands(ProgramTest):
         result = json.loads(self.run_program("check", "model.json", "--json").output)
         self.assertEqual((result["exitCode"], [m["severity"] for m in result["messages"]]), (0, ["warning"]))
 
+    def test_Check_OfGasketOptionsThatNothingAsksFor_WarnsOfThem(self):
+        self.put("model.json", changed(lambda model: model.update(
+            materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
+        run = self.run_program("check", "model.json")
+        self.assertEqual((run.returncode, run.errors),
+                         (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
+                             "gasket section names this material, so this will not stand in the deck\n"))
+        run = self.run_program("write", "model.json")
+        self.assertRegex(run.output, r"left out, since a deck can't carry it:\n +1  gasket options \(no gasket "
+                                     r"section names their materials\): RING membraneElastic\n$")
+
+    def test_Check_OfAGasketWithFurtherOptions_WarnsOfThem(self):
+        self.put("model.json", changed(lambda model: model.update(
+            materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}},
+            sections={"S": {"class": "kseC_GasketSection", "materialName": "RING"}})))
+        run = self.run_program("write", "model.json")
+        self.assertIn("/materials/RING/density: the material is a gasket behaviour", run.errors)
+        self.assertRegex(run.output, r" +1  other options of gasket materials \(a gasket behaviour has no place "
+                                     r"for them\): RING density\n$")
+
     def test_Check_OfAModelNamedLikeACommand_Works(self):
         self.put("info", MODEL)
         run = self.run_program("check", "info")

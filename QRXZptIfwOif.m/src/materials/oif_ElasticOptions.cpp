@@ -14,7 +14,7 @@ void WriteTestData(utl_Stream& stream, const char* keyword, const R& option) {
     if (!option.lateralStrainGiven && (option.temperatureDependency || option.dependencies >= 1)) {
         table.InsertEmptyColumn(2);
     }
-    oif_KeepFieldColumns(table, option);
+    oif_KeepFieldColumns(table, option.table.NumColumns(), option.temperatureDependency, option.dependencies);
     stream << table;
 }
 
@@ -158,7 +158,7 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Viscoe
     };
     if (option.timeDomain) {
         switch (option.time) {
-        case Time::PRONY: line.Text("time=").EnumText(option.time); break;
+        case Time::PRONY: line.Text("time=").Text(omu_PrimEnum<Time, 1>(option.time).GetString()); break;
         case Time::CREEP_TEST_DATA: fitted("time=CREEP TEST DATA"); break;
         case Time::RELAXATION_TEST_DATA: fitted("time=RELAXATION TEST DATA"); break;
         case Time::FREQUENCY_DATA: fitted("time=FREQUENCY DATA"); break;
@@ -167,7 +167,9 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Viscoe
         switch (option.frequency) {
         case Frequency::FORMULA:
         case Frequency::TABULAR:
-        case Frequency::PRONY: line.Text("frequency=").EnumText(option.frequency); break;
+        case Frequency::PRONY:
+            line.Text("frequency=").Text(omu_PrimEnum<Frequency, 1>(option.frequency).GetString());
+            break;
         case Frequency::CREEP_TEST_DATA: fitted("frequency=CREEP TEST DATA"); break;
         case Frequency::RELAXATION_TEST_DATA: fitted("frequency=RELAXATION TEST DATA"); break;
         }

@@ -31,11 +31,8 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Acoust
     stream << oif_DependentTable(option);
     if (!option.volumetricDrag) return;
     start("*Acoustic Medium, Volumetric Drag", option.volumetricDragDependencies);
-    oif_MaterialTable drag(option.volumetricDragTable, option.volumetricDragDependencies,
-                           option.volumetricDragTemperatureDependency);
-    oif_KeepFieldColumns(drag, option.volumetricDragTable.NumColumns(),
-                         option.volumetricDragTemperatureDependency, option.volumetricDragDependencies);
-    stream << drag;
+    stream << oif_DependentTable(option.volumetricDragTable, option.volumetricDragDependencies,
+                                 option.volumetricDragTemperatureDependency);
 }
 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Sorption& option) {

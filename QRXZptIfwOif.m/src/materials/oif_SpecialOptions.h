@@ -24,9 +24,7 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Viscoe
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_VolumetricTestData& option);
 
 /// A table in which nothing is inserted.
-inline oif_MaterialTable oif_PlainTable(const kmaC_MaterialTable& values) {
-    return oif_MaterialTable(values, 0, false);
-}
+oif_MaterialTable oif_PlainTable(const kmaC_MaterialTable& values);
 
 /// One data line, or more of eight cells each.
 template <class Values>

@@ -1,3 +1,336 @@
 #include "sections/oif_PartAttributesBuilder.h"
 
-void oif_PartAttributesBuilder::Build() {}
+#include "deck/oif_Comment.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_Set.h"
+#include "mesh/oif_SetName.h"
+#include "sections/oif_BeamSections.h"
+#include "sections/oif_ElementControls.h"
+#include "sections/oif_Orientation.h"
+#include "sections/oif_PointInertia.h"
+#include "sections/oif_ShellSections.h"
+#include "sections/oif_SolidSections.h"
+#include "store_interface/records/sections/kbpC_BeamProfile.h"
+#include "store_interface/records/sections/kseC_BeamSection.h"
+#include "store_interface/records/sections/kseC_PointSection.h"
+#include "store_interface/records/sections/kseC_ShellSections.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
+
+#include <vector>
+
+namespace {
+
+/// The region's set as comments name it.
+cow_String NameInComment(const rgnC_Region& region) {
+    return region.ConstSet().Data().Internal() ? cow_String("Picked") : region.SetName();
+}
+
+bool IsShellSection(unsigned type) {
+    return cls_Classes().InheritanceCheck(type, kseC_ShellSection::TypeId());
+}
+
+} // namespace
+
+void oif_PartAttributesBuilder::Build() {
+    ForEachPartInstance([&](const cow_String& name, const ddb_PartInstance& instance) {
+        const nex_Context context("instance", name);
+        InitializePropertyArray(instance);
+        SetSectionsInArray(instance);
+        SetElemCtrlInArray(instance);
+        SetBeamOriInArray(instance);
+        SetMatOriInArray(instance);
+        ProcessPropertyArray(instance);
+    });
+    CreateElementControls();
+}
+
+void oif_PartAttributesBuilder::InitializePropertyArray(const ddb_PartInstance& instance) {
+    const ddb_ElementData elements = instance.elementData();
+    properties_ = cow_List<bme_Property>{cow_ListConstruct(elements.numElements())};
+    for (int i = 0; i < elements.numClasses(); ++i) {
+        for (const int label : elements.elementClass(i).userElementLabelsAsFlatArray()) {
+            bme_Property property;
+            property.elementLabel = label;
+            properties_.Append(property);
+        }
+    }
+}
+
+int oif_PartAttributesBuilder::Stamp(const ddb_PartInstance& instance, const rgnC_Region& region,
+                                     int bme_Property::*index, int value) {
+    const oif_Set set(region.ConstSet().Data(), instance);
+    const cow_List<int>& labels = set.Labels();
+    if (properties_.IsEmpty()) return labels.Length();
+    const odiK_Mesh& mesh = instance.mesh().mesh();
+    for (int i = 0; i < labels.Length(); ++i) {
+        // A label that the mesh doesn't have falls on the first element.
+        properties_.Get(std::max(mesh.FindElementIndex(labels.UncheckedConstGet(i)), 0)).*index = value;
+    }
+    return labels.Length();
+}
+
+void oif_PartAttributesBuilder::SetSectionsInArray(const ddb_PartInstance& instance) {
+    assignmentSize_.clear();
+    const ptoC_PartAttributeList& assignments =
+        instance.Shortcut().ConstGet().ConstGetSectionAssignment();
+    for (int i = 0; i < assignments.Size(); ++i) {
+        const auto& assignment =
+            nex_canDynamicCastRef<ptoC_SectionAssignment>(assignments.ConstGet(i), NEX_HERE);
+        assignmentSize_[i] = Stamp(instance, assignment.RegionRef(), &bme_Property::SectionIndex, i);
+    }
+}
+
+void oif_PartAttributesBuilder::SetElemCtrlInArray(const ddb_PartInstance& instance) {
+    const bme_ElementData elements(instance.mesh().mesh());
+    for (unsigned i = 0; i < elements.NumClasses(); ++i) {
+        const bme_ElementClass elementClass = elements.GetClass(i);
+        const bme_ElemCtrlParams& controls = elementClass.GetElemControlParams();
+        if (controls.IsDefault(ElemLibrary())) continue;
+        int key = 0;
+        while (key < nextElemCtrlKey_ && elemCtrlMap_.ConstGet(key) != controls) ++key;
+        if (key == nextElemCtrlKey_) elemCtrlMap_.Insert(nextElemCtrlKey_++, controls);
+        const int first = elementClass.FirstElementIndex();
+        for (int k = 0; k < elementClass.NumElements(); ++k) properties_.Get(first + k).ElemCtrlIndex = key;
+    }
+}
+
+void oif_PartAttributesBuilder::SetBeamOriInArray(const ddb_PartInstance& instance) {
+    const ddb_BeamOrientationContainer orientations = instance.beamOrientations();
+    for (int i = 0; i < orientations.size(); ++i) {
+        Stamp(instance, orientations.get(i).region().Region(), &bme_Property::BeamOriIndex, i);
+    }
+}
+
+void oif_PartAttributesBuilder::SetMatOriInArray(const ddb_PartInstance& instance) {
+    const ddb_MaterialOrientationContainer orientations = instance.materialOrientations();
+    for (int i = 0; i < orientations.size(); ++i) {
+        Stamp(instance, orientations.get(i).region().Region(), &bme_Property::MatOriIndex, i);
+    }
+}
+
+void oif_PartAttributesBuilder::ProcessPropertyArray(const ddb_PartInstance& instance) {
+    if (properties_.IsEmpty()) return;
+    std::vector<cow_List<bme_Property>> groups;
+    std::size_t current = 0;
+    for (int i = 0; i < properties_.Length(); ++i) {
+        const bme_Property& property = properties_.UncheckedConstGet(i);
+        // Neighbours mostly belong together. No two groups are equal, so it's the same whichever is asked
+        // first.
+        if (groups.empty() || !(groups[current].UncheckedConstGet(0) == property)) {
+            current = 0;
+            while (current < groups.size() && !(groups[current].UncheckedConstGet(0) == property)) ++current;
+            if (current == groups.size()) groups.emplace_back();
+        }
+        groups[current].Append(property);
+    }
+    bme_MapPropertyArray map;
+    for (std::size_t key = 0; key < groups.size(); ++key) map.Insert(static_cast<int>(key), groups[key]);
+    CreateSetsAndAttributes(instance, map);
+}
+
+void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& instance,
+                                                        const bme_MapPropertyArray& groups) {
+    writtenOrientations_ = {};
+    const ptoC_PartAttributeList& assignments =
+        instance.Shortcut().ConstGet().ConstGetSectionAssignment();
+    for (int key = 0; key < groups.Count(); ++key) {
+        // Elements without a section have no keyword, but their group uses up a number.
+        if (groups.SectionIndex(key) == -1) continue;
+        const auto& assignment = nex_canDynamicCastRef<ptoC_SectionAssignment>(
+            assignments.ConstGet(groups.SectionIndex(key)), NEX_HERE);
+        const cow_List<int> labels = groups.ElementIds(key);
+        const bool isPartial = labels.Length() != assignmentSize_[groups.SectionIndex(key)];
+
+        Group group;
+        group.offset = assignment.Offset();
+        oif_SetName setName(assignment.RegionRef(), ModelInfo());
+        group.setName = oif_SetName::QuoteIfNeeded(
+            isPartial
+                ? setName.UniqueSetName(assignment.RegionRef().SetName() + PartSetString() +
+                                            cow_String(key + 1),
+                                        oif_SetName::regionContext::INSTANCE)
+                : setName.UniqueSetName(oif_SetName::regionContext::INSTANCE));
+
+        cow_String text = cow_String(RegionString()) + "(" + assignment.SectionName() + ":" +
+                          NameInComment(assignment.RegionRef()) + ")";
+        const int controlsIndex = groups.ElemCtrlIndex(key);
+        if (controlsIndex != -1) {
+            group.controls = elemCtrlMap_.ConstGet(controlsIndex);
+            group.controlsName = cow_String("EC-") + cow_String(controlsIndex + 1);
+            text = text + ", (Controls:" + group.controlsName + ")";
+        } else if (elemCtrlMap_.Count() > 0) {
+            text = text + ", (Controls:Default)";
+        }
+        group.controls.SetElemLibrary(ElemLibrary());
+
+        group.beamOriIndex = groups.BeamOriIndex(key);
+        if (group.beamOriIndex != -1) {
+            const auto& orientation =
+                instance.beamOrientations().beamOrientations().ConstGet(group.beamOriIndex);
+            text = text + ", (Beam Orientation:" + NameInComment(orientation.RegionRef()) + ")";
+        }
+        if (const int index = groups.MatOriIndex(key); index != -1) {
+            const auto& orientation = nex_canDynamicCastRef<ptoC_MaterialOrientation>(
+                instance.materialOrientations().materialOrientations().ConstGet(index), NEX_HERE);
+            text = text + ", (Material Orientation:" + NameInComment(orientation.RegionRef()) + ")";
+            if (!orientation.datum.IsNullRef()) {
+                group.orientationName = cow_String("Ori-") + cow_String(index + 1);
+                if (!Info().V6Format()) {
+                    group.orientationName =
+                        qkw_QuorixName(instance.name(), false).Printable() + "_" + group.orientationName;
+                }
+                CreateMaterialOrientation(instance, orientation, group.orientationName);
+            }
+        }
+
+        AddInstanceDefinition(instance.name(), oif_Comment(text));
+        if (isPartial) {
+            AddInstanceDefinition(instance.name(), oif_Elset(labels, group.setName, cow_String(), true));
+        }
+        CreateSection(instance, assignment.SectionName(), group);
+    }
+}
+
+void oif_PartAttributesBuilder::CreateMaterialOrientation(const ddb_PartInstance& instance,
+                                                          const ptoC_MaterialOrientation& orientation,
+                                                          const cow_String& name) {
+    for (int i = 0; i < writtenOrientations_.Length(); ++i) {
+        if (writtenOrientations_[i] == name) return;
+    }
+    writtenOrientations_.Append(name);
+    AddInstanceDefinition(instance.name(), oif_Orientation(Store(), orientation, name, gsl_Matrix()));
+}
+
+void oif_PartAttributesBuilder::CreateSection(const ddb_PartInstance& instance, const cow_String& name,
+                                              const Group& group) {
+    if (!Model().Sections().IsMember(name)) return;
+    const nex_Context context("section", name);
+    const kseC_Section& section = Model().Sections().ConstGet(name);
+    const unsigned type = section.DynTypeId();
+    if (type != kseC_BeamSection::TypeId()) {
+        AddInstanceDefinition(instance.name(), oif_Comment(cow_String("Section: ") + name));
+    }
+    Group passed = group;
+    if (ElemLibrary() == bme_ElemLibrary::NONE) passed.controlsName = {};
+
+    if (type == kseC_HomogenousSolidSection::TypeId() || type == kseC_CompositeSolidSection::TypeId()) {
+        CreateSolidSection(instance, section, passed);
+    } else if (IsShellSection(type)) {
+        CreateShellSection(instance, section, passed);
+    } else if (type == kseC_BeamSection::TypeId()) {
+        CreateBeamSection(instance, name, section, passed);
+    } else if (type == kseC_TrussSection::TypeId()) {
+        CreateTrussSection(instance, section, passed);
+    } else if (type == kseC_MembraneSection::TypeId()) {
+        CreateMembraneSection(instance, section, passed);
+    } else if (type == kseC_GasketSection::TypeId()) {
+        CreateGasketSection(instance, section, passed);
+    } else if (type == kseC_PointSection::TypeId()) {
+        CreatePointSection(instance, section, passed);
+    }
+}
+
+void oif_PartAttributesBuilder::CreateSolidSection(const ddb_PartInstance& instance,
+                                                   const kseC_Section& section, const Group& group) {
+    AddInstanceDefinition(instance.name(), oif_SolidSection(group.setName, section, group.orientationName,
+                                                            group.controlsName));
+    AddHourglassStiffness(instance, group);
+}
+
+void oif_PartAttributesBuilder::CreateTrussSection(const ddb_PartInstance& instance,
+                                                   const kseC_Section& section, const Group& group) {
+    // The orientation stands in the controls' place; a truss writes neither.
+    AddInstanceDefinition(instance.name(),
+                          oif_SolidSection(group.setName, section, cow_String(), group.orientationName));
+}
+
+void oif_PartAttributesBuilder::CreateShellSection(const ddb_PartInstance& instance,
+                                                   const kseC_Section& section, const Group& group) {
+    if (section.DynTypeId() == kseC_UserShellSection::TypeId()) {
+        AddInstanceDefinition(instance.name(),
+                              oif_ShellGeneralSection(group.setName, section, group.orientationName,
+                                                      group.controlsName, group.offset));
+    } else {
+        AddInstanceDefinition(instance.name(), oif_ShellSection(group.setName, section, group.orientationName,
+                                                                group.controlsName, group.offset));
+    }
+    const auto* geometry = nex_canDynamicCastPtr<kseC_GeometryShellSection>(&section);
+    if (geometry != nullptr && !geometry->transverseShear.IsNull()) {
+        AddInstanceDefinition(instance.name(), oif_TransverseShear(geometry->transverseShear.ConstGet()));
+    }
+    AddHourglassStiffness(instance, group);
+}
+
+void oif_PartAttributesBuilder::CreateMembraneSection(const ddb_PartInstance& instance,
+                                                      const kseC_Section& section, const Group& group) {
+    AddInstanceDefinition(instance.name(), oif_MembraneSection(group.setName, section, group.orientationName,
+                                                               group.controlsName));
+    AddHourglassStiffness(instance, group);
+}
+
+void oif_PartAttributesBuilder::CreateGasketSection(const ddb_PartInstance& instance,
+                                                    const kseC_Section& section, const Group& group) {
+    const cow_String material = section.MaterialName();
+    bool hasBehavior = false;
+    if (Model().Materials().IsMember(material)) {
+        const kmaC_Material& record = Model().Materials().ConstGet(material);
+        hasBehavior = !record.thicknessBehavior.IsNull() || !record.transShearElastic.IsNull() ||
+                      !record.membraneElastic.IsNull();
+    }
+    AddInstanceDefinition(instance.name(),
+                          oif_GasketSection(group.setName, section, hasBehavior, group.orientationName));
+    AddHourglassStiffness(instance, group);
+}
+
+void oif_PartAttributesBuilder::CreatePointSection(const ddb_PartInstance& instance,
+                                                   const kseC_Section& section, const Group& group) {
+    const auto& point = nex_canDynamicCastRef<kseC_PointSection>(section, NEX_HERE);
+    const oif_Mass mass(group.setName, point);
+    if (!mass.IsEmpty()) AddInstanceDefinition(instance.name(), mass);
+    const oif_RotaryI inertia(group.setName, point, group.orientationName);
+    if (!inertia.IsEmpty()) AddInstanceDefinition(instance.name(), inertia);
+}
+
+void oif_PartAttributesBuilder::CreateBeamSection(const ddb_PartInstance& instance, const cow_String& name,
+                                                  const kseC_Section& section, const Group& group) {
+    const auto& beam = nex_canDynamicCastRef<kseC_BeamSection>(section, NEX_HERE);
+    AddInstanceDefinition(instance.name(), oif_Comment(cow_String("Section: ") + name +
+                                                       "  Profile: " + beam.profileName));
+    const kbpC_BeamProfile& profile = Model().BeamProfiles().ConstGet(beam.profileName);
+    gsl_Vector vector(0.0, 0.0, -1.0);
+    if (group.beamOriIndex != -1) {
+        const auto& orientation = instance.beamOrientations().beamOrientations().ConstGet(group.beamOriIndex);
+        vector = nex_canDynamicCastRef<ptoC_BeamOrientation>(orientation, NEX_HERE).vector;
+    }
+    if (beam.integration == kseC_BeamSection::IntegrationEnm::DURING_ANALYSIS) {
+        AddInstanceDefinition(instance.name(), oif_BeamSection(group.setName, section, vector, profile));
+    } else {
+        AddInstanceDefinition(instance.name(),
+                              oif_BeamGeneralSection(group.setName, section, vector, profile));
+    }
+}
+
+void oif_PartAttributesBuilder::AddHourglassStiffness(const ddb_PartInstance& instance, const Group& group) {
+    if (IsStandard()) AddInstanceDefinition(instance.name(), oif_HourglassStiffness(group.controls));
+}
+
+void oif_PartAttributesBuilder::CreateElementControls() {
+    bool hasComment = false;
+    // The defaults, "EC-0", would come first; they are never written.
+    for (int key = 0; key < nextElemCtrlKey_; ++key) {
+        const oif_SectionControls controls(elemCtrlMap_.ConstGet(key), cow_String("EC-") + cow_String(key + 1),
+                                           IsStandard());
+        if (controls.IsEmpty()) continue;
+        if (!hasComment) AddModelDefinition(oif_Comment("\nELEMENT CONTROLS\n"));
+        hasComment = true;
+        AddModelDefinition(controls);
+    }
+}
+
+bme_ElemLibrary oif_PartAttributesBuilder::ElemLibrary() const {
+    switch (Info().AnalysisProduct()) {
+    case kprC_AnalysisProductEnm::IMPLICIT: return bme_ElemLibrary::STANDARD;
+    case kprC_AnalysisProductEnm::EXPLICIT: return bme_ElemLibrary::EXPLICIT;
+    default: return bme_ElemLibrary::NONE;
+    }
+}

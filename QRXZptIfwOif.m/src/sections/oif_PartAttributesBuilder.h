@@ -2,12 +2,73 @@
 #define QRX_OIF_PARTATTRIBUTESBUILDER_H
 
 #include "deck/oif_Component.h"
+#include "store_interface/records/sections/kseC_Section.h"
 
-/// Sections and orientations of the instances' elements.
+#include <map>
+
+/// Sections of the instances' elements. The model gives sections, controls and orientations each on a region
+/// of its own; the deck has one section for each group of elements with the same combination of them.
 class oif_PartAttributesBuilder final : public oif_ComponentOf<oif_PartAttributesBuilder> {
 public:
     using oif_ComponentOf::oif_ComponentOf;
     void Build() override;
+
+    static const char* PartSetString() { return "_I"; }
+    static const char* RegionString() { return "Region: "; }
+
+private:
+    /// What a group's section keywords refer to.
+    struct Group {
+        cow_String setName;
+        int beamOriIndex = -1;
+        cow_String orientationName;
+        cow_String controlsName;
+        bme_ElemCtrlParams controls;
+        double offset = 0.0;
+    };
+
+    void InitializePropertyArray(const ddb_PartInstance& instance);
+    void SetSectionsInArray(const ddb_PartInstance& instance);
+    void SetElemCtrlInArray(const ddb_PartInstance& instance);
+    void SetBeamOriInArray(const ddb_PartInstance& instance);
+    void SetMatOriInArray(const ddb_PartInstance& instance);
+    void ProcessPropertyArray(const ddb_PartInstance& instance);
+    void CreateSetsAndAttributes(const ddb_PartInstance& instance, const bme_MapPropertyArray& groups);
+    void CreateElementControls();
+
+    void CreateSection(const ddb_PartInstance& instance, const cow_String& name, const Group& group);
+    void CreateSolidSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                            const Group& group);
+    void CreateShellSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                            const Group& group);
+    void CreateBeamSection(const ddb_PartInstance& instance, const cow_String& name,
+                           const kseC_Section& section, const Group& group);
+    void CreateTrussSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                            const Group& group);
+    void CreateMembraneSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                               const Group& group);
+    void CreateGasketSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                             const Group& group);
+    void CreatePointSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                            const Group& group);
+    void CreateMaterialOrientation(const ddb_PartInstance& instance,
+                                   const ptoC_MaterialOrientation& orientation, const cow_String& name);
+
+    /// Sets an index of the properties of all elements in the region; gives the number of its labels.
+    int Stamp(const ddb_PartInstance& instance, const rgnC_Region& region, int bme_Property::*index,
+              int value);
+    void AddHourglassStiffness(const ddb_PartInstance& instance, const Group& group);
+    bme_ElemLibrary ElemLibrary() const;
+    bool IsStandard() const { return ElemLibrary() == bme_ElemLibrary::STANDARD; }
+
+    // Distinct controls other than the defaults, over all instances, so that equal ones share a name.
+    cow_Map<int, bme_ElemCtrlParams> elemCtrlMap_;
+    int nextElemCtrlKey_ = 0;
+    // Of the instance at hand: an entry for each element, in the order of the mesh.
+    cow_List<bme_Property> properties_;
+    cow_List<cow_String> writtenOrientations_;
+    /// Labels that each section assignment names, also those that later assignments take over.
+    std::map<int, int> assignmentSize_;
 };
 
 #endif

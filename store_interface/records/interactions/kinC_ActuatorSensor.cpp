@@ -6,9 +6,9 @@ const cls_FieldTable& kinC_ActuatorSensor::Fields() {
     using R = kinC_ActuatorSensor;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_Interaction::Fields())
-            .Field<&R::coordinates>("coordinates", "number of coordinates; 0: no ', coordinates='.")
-            .Field<&R::unsymm>("unsymm", "true: ', unsymm'.")
-            .Field<&R::variables>("variables", "number of solution-dependent variables; always written.")
+            .Field<&R::coordinates>("coordinates", "number of coordinates; 0: no ', coordinates='")
+            .Field<&R::unsymm>("unsymm", "true: ', unsymm'")
+            .Field<&R::variables>("variables", "number of solution-dependent variables; always written")
             .Field<&R::elementType>("elementType",
                                     "the element type text, behind 'type='; written as it stands")
             .Field<&R::nodeSetText>(

@@ -1,6 +1,7 @@
 #include "store_interface/records/materials/kmaC_MaterialTable.h"
 
 #include <algorithm>
+#include <compare>
 #include <numeric>
 #include <utility>
 #include <vector>
@@ -12,8 +13,14 @@ void kmaC_MaterialTable::Sort(int n) {
     std::vector<int> order(static_cast<std::size_t>(rows));
     std::iota(order.begin(), order.end(), 0);
     const auto key = [&](int row) { return values_.ConstRow(row) + (columns - n); };
-    std::stable_sort(order.begin(), order.end(), [&](int a, int b) {
-        return std::lexicographical_compare(key(a), key(a) + n, key(b), key(b) + n);
+    // Stable by the row numbers, since std::stable_sort would try to get memory behind our back. A weak order
+    // takes NaN too, which a program may have put there.
+    std::sort(order.begin(), order.end(), [&](int a, int b) {
+        for (int i = 0; i < n; ++i) {
+            const std::weak_ordering compared = std::weak_order(key(a)[i], key(b)[i]);
+            if (compared != 0) return compared < 0;
+        }
+        return a < b;
     });
     cow_2DArray<double> sorted(rows, columns);
     for (int row = 0; row < rows; ++row) {

@@ -7,15 +7,15 @@ class cls_ClassRegistrar;
 
 class kbpC_BeamProfile : public cls_AbstractRecordOf<kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbpC_BeamProfile", "Base of the beam profiles; held by name in the model's profile map."};
+    static constexpr cls_ClassInfo Class{"kbpC_BeamProfile",
+                                         "cross-section of beams; held by name in the model"};
 };
 
 class kbpC_GeneralizedProfile final : public cls_RecordOf<kbpC_GeneralizedProfile, kbpC_BeamProfile> {
 public:
     static constexpr cls_ClassInfo Class{
         "kbpC_GeneralizedProfile",
-        "Profile given by its section properties; writes values only in a general section."};
+        "cross-section given by its properties; only a general section writes them"};
 
     double area = 0.0;
     double i11 = 0.0;
@@ -30,7 +30,7 @@ public:
 
 class kbpC_CircularProfile final : public cls_RecordOf<kbpC_CircularProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_CircularProfile", "Solid circle."};
+    static constexpr cls_ClassInfo Class{"kbpC_CircularProfile", "solid circle"};
 
     double r = 0.0;
 
@@ -39,7 +39,7 @@ public:
 
 class kbpC_HexagonalProfile final : public cls_RecordOf<kbpC_HexagonalProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_HexagonalProfile", "Hollow hexagon."};
+    static constexpr cls_ClassInfo Class{"kbpC_HexagonalProfile", "hollow hexagon"};
 
     double r = 0.0;
     double t = 0.0;
@@ -49,7 +49,7 @@ public:
 
 class kbpC_PipeProfile final : public cls_RecordOf<kbpC_PipeProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_PipeProfile", "Pipe."};
+    static constexpr cls_ClassInfo Class{"kbpC_PipeProfile", "pipe"};
 
     double r = 0.0;
     double t = 0.0;
@@ -60,7 +60,7 @@ public:
 
 class kbpC_IbeamProfile final : public cls_RecordOf<kbpC_IbeamProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_IbeamProfile", "I section."};
+    static constexpr cls_ClassInfo Class{"kbpC_IbeamProfile", "I section"};
 
     double l = 0.0;
     double h = 0.0;
@@ -75,7 +75,7 @@ public:
 
 class kbpC_BoxProfile final : public cls_RecordOf<kbpC_BoxProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_BoxProfile", "Hollow rectangle."};
+    static constexpr cls_ClassInfo Class{"kbpC_BoxProfile", "hollow rectangle"};
 
     double a = 0.0;
     double b = 0.0;
@@ -90,8 +90,7 @@ public:
 
 class kbpC_ArbitraryProfile final : public cls_RecordOf<kbpC_ArbitraryProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_ArbitraryProfile",
-                                         "Thin-walled profile of straight segments."};
+    static constexpr cls_ClassInfo Class{"kbpC_ArbitraryProfile", "thin-walled profile of straight segments"};
 
     cow_2DArray<double> table;
 
@@ -100,7 +99,7 @@ public:
 
 class kbpC_RectangularProfile final : public cls_RecordOf<kbpC_RectangularProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_RectangularProfile", "Solid rectangle."};
+    static constexpr cls_ClassInfo Class{"kbpC_RectangularProfile", "solid rectangle"};
 
     double a = 0.0;
     double b = 0.0;
@@ -110,7 +109,7 @@ public:
 
 class kbpC_LbeamProfile final : public cls_RecordOf<kbpC_LbeamProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_LbeamProfile", "L section."};
+    static constexpr cls_ClassInfo Class{"kbpC_LbeamProfile", "L section"};
 
     double a = 0.0;
     double b = 0.0;
@@ -122,8 +121,8 @@ public:
 
 class kbpC_TbeamProfile final : public cls_RecordOf<kbpC_TbeamProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbpC_TbeamProfile", "T section; written as an I section in the order l, h, 0, b, 0, tf, tw."};
+    static constexpr cls_ClassInfo Class{"kbpC_TbeamProfile",
+                                         "T section; written as an I section without a bottom flange"};
 
     double b = 0.0;
     double h = 0.0;
@@ -136,7 +135,7 @@ public:
 
 class kbpC_TrapezoidalProfile final : public cls_RecordOf<kbpC_TrapezoidalProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_TrapezoidalProfile", "Solid trapezoid."};
+    static constexpr cls_ClassInfo Class{"kbpC_TrapezoidalProfile", "solid trapezoid"};
 
     double a = 0.0;
     double b = 0.0;

@@ -9,8 +9,7 @@ class kseC_TransverseShearBeam final : public cls_RecordOf<kseC_TransverseShearB
 public:
     static constexpr cls_ClassInfo Class{
         "kseC_TransverseShearBeam",
-        "Transverse shear stiffness given for a beam. No builder makes its keyword and no section holds it: "
-        "it exists for oif_TransverseShear's own interface."};
+        "transverse shear stiffness given for a beam; for programs, as no section holds one"};
 
     double k11 = 0.0;
     double k22 = 0.0;
@@ -21,7 +20,7 @@ public:
 class kseC_BeamSection final : public cls_RecordOf<kseC_BeamSection, kseC_Section> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kseC_BeamSection", "Beam elements: profile, material or material constants, and options."};
+        "kseC_BeamSection", "beam elements: profile, material or material constants, and options"};
 
     enum class IntegrationEnm : int { BEFORE_ANALYSIS = 0, DURING_ANALYSIS = 1 };
     enum class TemperatureVarEnm : int { GRADIENTS = 0, VALUES = 1 };

@@ -2,45 +2,38 @@
 
 #include "store_interface/records/cls_ClassRegistrar.h"
 
+namespace {
+
+template <class R>
+void DescribeInertia(cls_Describe<R>& fields) {
+    fields.template Field<&R::mass>("mass", "mass; 0.0: no '*Mass'")
+        .template Field<&R::i11>("i11", "rotary inertia (mass times length squared)")
+        .template Field<&R::i12>("i12", "product of inertia (mass times length squared)")
+        .template Field<&R::i13>("i13", "product of inertia (mass times length squared)")
+        .template Field<&R::i22>("i22", "rotary inertia (mass times length squared)")
+        .template Field<&R::i23>("i23", "product of inertia (mass times length squared)")
+        .template Field<&R::i33>("i33", "rotary inertia (mass times length squared)")
+        .template Field<&R::massAlphaDamping>("massAlphaDamping",
+                                              "mass-proportional damping (1/time) of the mass")
+        .template Field<&R::massCompositeDamping>("massCompositeDamping",
+                                                  "fraction of critical damping of the mass")
+        .template Field<&R::rotaryAlphaDamping>("rotaryAlphaDamping",
+                                                "mass-proportional damping (1/time) of the rotary inertia")
+        .template Field<&R::rotaryCompositeDamping>("rotaryCompositeDamping",
+                                                    "fraction of critical damping of the rotary inertia");
+}
+
+} // namespace
+
 const cls_FieldTable& kseC_PointSection::Fields() {
-    using R = kseC_PointSection;
     static const cls_FieldTable fields =
-        cls_Describe<R>(kseC_Section::Fields())
-            .Field<&R::mass>("mass", "mass; 0.0: no '*Mass'.")
-            .Field<&R::i11>("i11", "rotary inertia (mass times length squared)")
-            .Field<&R::i12>("i12", "product of inertia")
-            .Field<&R::i13>("i13", "product of inertia")
-            .Field<&R::i22>("i22", "rotary inertia")
-            .Field<&R::i23>("i23", "product of inertia")
-            .Field<&R::i33>("i33", "rotary inertia")
-            .Field<&R::massAlphaDamping>("massAlphaDamping", "mass-proportional damping (1/time) of the mass")
-            .Field<&R::massCompositeDamping>("massCompositeDamping",
-                                             "fraction of critical damping of the mass")
-            .Field<&R::rotaryAlphaDamping>("rotaryAlphaDamping",
-                                           "mass-proportional damping (1/time) of the rotary inertia")
-            .Field<&R::rotaryCompositeDamping>("rotaryCompositeDamping",
-                                               "fraction of critical damping of the rotary inertia");
+        cls_Describe<kseC_PointSection>(kseC_Section::Fields()).With(DescribeInertia<kseC_PointSection>);
     return fields;
 }
 
 const cls_FieldTable& kefC_PointMassInertia::Fields() {
-    using R = kefC_PointMassInertia;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::mass>("mass", "mass; 0.0: no '*Mass'.")
-            .Field<&R::i11>("i11", "rotary inertia (mass times length squared)")
-            .Field<&R::i12>("i12", "product of inertia")
-            .Field<&R::i13>("i13", "product of inertia")
-            .Field<&R::i22>("i22", "rotary inertia")
-            .Field<&R::i23>("i23", "product of inertia")
-            .Field<&R::i33>("i33", "rotary inertia")
-            .Field<&R::massAlphaDamping>("massAlphaDamping", "mass-proportional damping (1/time) of the mass")
-            .Field<&R::massCompositeDamping>("massCompositeDamping",
-                                             "fraction of critical damping of the mass")
-            .Field<&R::rotaryAlphaDamping>("rotaryAlphaDamping",
-                                           "mass-proportional damping (1/time) of the rotary inertia")
-            .Field<&R::rotaryCompositeDamping>("rotaryCompositeDamping",
-                                               "fraction of critical damping of the rotary inertia");
+    static const cls_FieldTable fields = cls_Describe<kefC_PointMassInertia>(cls_Record::Fields())
+                                             .With(DescribeInertia<kefC_PointMassInertia>);
     return fields;
 }
 

@@ -5,10 +5,9 @@
 
 class cls_ClassRegistrar;
 
-class kseC_PointSection final : public cls_RecordOf<kseC_PointSection, kseC_Section> {
+/// Mass and rotary inertia at a point.
+class kseC_PointInertia {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_PointSection", "Point mass and rotary inertia elements."};
-
     static constexpr double i11Def() { return 0.0; }
     static constexpr double i12Def() { return 0.0; }
     static constexpr double i13Def() { return 0.0; }
@@ -31,28 +30,20 @@ public:
     double massCompositeDamping = massCompositeDampingDef();
     double rotaryAlphaDamping = rotaryAlphaDampingDef();
     double rotaryCompositeDamping = rotaryCompositeDampingDef();
+};
+
+class kseC_PointSection final : public cls_RecordOf<kseC_PointSection, kseC_Section>,
+                                public kseC_PointInertia {
+public:
+    static constexpr cls_ClassInfo Class{"kseC_PointSection", "point mass and rotary inertia elements"};
 
     static const cls_FieldTable& Fields();
 };
 
-class kefC_PointMassInertia final : public cls_RecordOf<kefC_PointMassInertia> {
+/// An inertia of the model itself; for programs, as no model holds one.
+class kefC_PointMassInertia final : public cls_RecordOf<kefC_PointMassInertia>, public kseC_PointInertia {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kefC_PointMassInertia", "Engineering-feature point inertia: the same values as kseC_PointSection. "
-                                 "No container of the model view holds it and no builder makes its keywords; "
-                                 "it exists for the constructors of oif_Mass and oif_RotaryI."};
-
-    double mass = 0.0;
-    double i11 = 0.0;
-    double i12 = 0.0;
-    double i13 = 0.0;
-    double i22 = 0.0;
-    double i23 = 0.0;
-    double i33 = 0.0;
-    double massAlphaDamping = 0.0;
-    double massCompositeDamping = 0.0;
-    double rotaryAlphaDamping = 0.0;
-    double rotaryCompositeDamping = 0.0;
+    static constexpr cls_ClassInfo Class{"kefC_PointMassInertia", "point mass and rotary inertia at a place"};
 
     static const cls_FieldTable& Fields();
 };

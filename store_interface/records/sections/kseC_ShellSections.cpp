@@ -6,17 +6,16 @@ const cls_FieldTable& kseC_RebarLayer::Fields() {
     using R = kseC_RebarLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::area>("area", "area of one bar (length squared).")
-            .Required()
+            .Field<&R::area>("area", "area of one bar (length squared)")
             .Field<&R::orientationName>("orientationName",
                                         "name of the layer's own orientation; non-empty: the layer gets a "
                                         "'*Rebar Layer' of its own and no angle")
             .RefersTo("orientation")
-            .Field<&R::orientationAngle>("orientationAngle", "angle in degrees of the bars.")
-            .Field<&R::spacing>("spacing", "length; distance of the bars, written with spacingType 0.")
-            .Field<&R::position>("position", "length; distance of the layer from the mid-surface.")
+            .Field<&R::orientationAngle>("orientationAngle", "angle in degrees of the bars")
+            .Field<&R::spacing>("spacing", "length; distance of the bars, written with spacingType 0")
+            .Field<&R::position>("position", "length; distance of the layer from the mid-surface")
             .Field<&R::angularSpacing>(
-                "angularSpacing", "angle in degrees between the bars, written with any spacingType but 0.")
+                "angularSpacing", "angle in degrees between the bars, written with any spacingType but 0")
             .Field<&R::name>("name", "name of the layer, first item of its data line")
             .Required()
             .Field<&R::materialName>("materialName", "material of the bars")
@@ -35,7 +34,7 @@ const cls_FieldTable& kseC_RebarLayers::Fields() {
     using R = kseC_RebarLayers;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::spacingType>("spacingType", "1: 'angular spacing' is written.")
+            .Field<&R::spacingType>("spacingType", "1: 'angular spacing' is written")
             .Field<&R::layers>("layers", "the layers; empty: nothing is written");
     return fields;
 }
@@ -44,9 +43,9 @@ const cls_FieldTable& kseC_TransverseShearShell::Fields() {
     using R = kseC_TransverseShearShell;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::k11>("k11", "force per length; 0 takes the value of k22.")
-            .Field<&R::k22>("k22", "force per length; 0 then takes the value of k11.")
-            .Field<&R::k12>("k12", "force per length; always written.");
+            .Field<&R::k11>("k11", "force per length; 0 takes the value of k22")
+            .Field<&R::k22>("k22", "force per length; 0 then takes the value of k11")
+            .Field<&R::k12>("k12", "force per length; always written");
     return fields;
 }
 
@@ -115,18 +114,18 @@ const cls_FieldTable& kseC_GeometryShellSection::Fields() {
             .Field<&R::useGeneralKeyword>(
                 "useGeneralKeyword",
                 "true: '*Shell General Section' (properties computed before the analysis, no integration "
-                "points on the data lines); false: '*Shell Section'.")
+                "points on the data lines); false: '*Shell Section'")
             .Field<&R::poissonDefinition>("poissonDefinition",
                                           "0 the solver's own change of thickness, else `poisson` is written")
             .Field<&R::poisson>("poisson",
-                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0.")
+                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0")
             .Field<&R::integrationRule>("integrationRule",
                                         "rule through the thickness; 0 writes no parameter")
             .Field<&R::temperatureMode>("temperatureMode",
-                                        "1: 'temperature=' and temperaturePoints are written.")
+                                        "1: 'temperature=' and temperaturePoints are written")
             .Field<&R::temperaturePoints>(
                 "temperaturePoints",
-                "number of temperature points through the thickness, read only with temperatureMode 1.")
+                "number of temperature points through the thickness, read only with temperatureMode 1")
             .Field<&R::thicknessModulus>(
                 "thicknessModulus",
                 "stress; effective modulus in thickness direction. Unset: no 'thickness modulus=' and no "
@@ -142,11 +141,10 @@ const cls_FieldTable& kseC_HomogenousShellSection::Fields() {
     using R = kseC_HomogenousShellSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_GeometryShellSection::Fields())
-            .Field<&R::thickness>("thickness", "length; shell thickness.")
-            .Required()
+            .Field<&R::thickness>("thickness", "length; shell thickness")
             .Field<&R::integrationPoints>(
                 "integrationPoints",
-                "number of integration points through the thickness; not written with useGeneralKeyword.")
+                "number of integration points through the thickness; not written with useGeneralKeyword")
             .Field<&R::materialName>("materialName", "material")
             .Required()
             .RefersTo("material");
@@ -157,11 +155,10 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
     using R = kseC_CompositeShellLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::thickness>("thickness", "length; thickness of the layer.")
-            .Required()
+            .Field<&R::thickness>("thickness", "length; thickness of the layer")
             .Field<&R::integrationPoints>(
                 "integrationPoints",
-                "number of integration points of the layer; not written with useGeneralKeyword.")
+                "number of integration points of the layer; not written with useGeneralKeyword")
             .Field<&R::materialName>("materialName", "material of the layer")
             .Required()
             .RefersTo("material")
@@ -171,7 +168,7 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
             .RefersTo("orientation")
             .Field<&R::orientationAngle>(
                 "orientationAngle",
-                "angle in degrees to the section's orientation; written when orientationName is empty.");
+                "angle in degrees to the section's orientation; written when orientationName is empty");
     return fields;
 }
 
@@ -186,7 +183,7 @@ const cls_FieldTable& kseC_CompositeShellSection::Fields() {
 const cls_FieldTable& kseC_UserShellSection::Fields() {
     using R = kseC_UserShellSection;
     static const cls_FieldTable fields = cls_Describe<R>(kseC_ShellSection::Fields())
-                                             .Field<&R::symmetric>("symmetric", "false writes 'unsymm'.");
+                                             .Field<&R::symmetric>("symmetric", "false writes 'unsymm'");
     return fields;
 }
 

@@ -7,15 +7,12 @@ class cls_ClassRegistrar;
 
 class kseC_ShellSection : public cls_AbstractRecordOf<kseC_ShellSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kseC_ShellSection",
-        "Base of the shell sections. A class derived from it that is neither homogeneous, composite nor user "
-        "ends the write with 'Shell general section unimplemented'."};
+    static constexpr cls_ClassInfo Class{"kseC_ShellSection", "shell elements"};
 };
 
 class kseC_RebarLayer final : public cls_RecordOf<kseC_RebarLayer> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_RebarLayer", "One rebar layer."};
+    static constexpr cls_ClassInfo Class{"kseC_RebarLayer", "one rebar layer"};
 
     double area = 0.0;
     cow_String orientationName;
@@ -31,7 +28,7 @@ public:
 
 class kseC_RebarLayers final : public cls_RecordOf<kseC_RebarLayers> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_RebarLayers", "The rebar layers of a shell."};
+    static constexpr cls_ClassInfo Class{"kseC_RebarLayers", "the rebar layers of a shell"};
 
     enum class SpacingTypeEnm : int { CONSTANT = 0, ANGULAR = 1 };
 
@@ -45,7 +42,7 @@ const omu_EnumTable& omu_EnumTableOf(kseC_RebarLayers::SpacingTypeEnm);
 class kseC_TransverseShearShell final : public cls_RecordOf<kseC_TransverseShearShell> {
 public:
     static constexpr cls_ClassInfo Class{"kseC_TransverseShearShell",
-                                         "Transverse shear stiffness given for a shell."};
+                                         "transverse shear stiffness given for a shell"};
 
     double k11 = 0.0;
     double k22 = 0.0;
@@ -56,9 +53,8 @@ public:
 
 class kseC_GeometryShellSection : public cls_AbstractRecordOf<kseC_GeometryShellSection, kseC_ShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kseC_GeometryShellSection",
-        "Base of the shells whose stiffness follows from thickness and material."};
+    static constexpr cls_ClassInfo Class{"kseC_GeometryShellSection",
+                                         "shells whose stiffness follows from thickness and material"};
 
     enum class PoissonDefinitionEnm : int { DEFAULT = 0, VALUE = 1 };
     enum class IntegrationRuleEnm : int { SIMPSON = 0, GAUSS = 1 };
@@ -92,8 +88,7 @@ const omu_EnumTable& omu_EnumTableOf(kseC_GeometryShellSection::TemperatureModeE
 class kseC_HomogenousShellSection final
     : public cls_RecordOf<kseC_HomogenousShellSection, kseC_GeometryShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_HomogenousShellSection",
-                                         "Shell of one material (the spelling of the name is the rules's)."};
+    static constexpr cls_ClassInfo Class{"kseC_HomogenousShellSection", "shell of one material"};
 
     double thickness = 0.0;
     int integrationPoints = 5;
@@ -106,7 +101,7 @@ public:
 
 class kseC_CompositeShellLayer final : public cls_RecordOf<kseC_CompositeShellLayer> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_CompositeShellLayer", "One layer of a composite shell."};
+    static constexpr cls_ClassInfo Class{"kseC_CompositeShellLayer", "one layer of a composite shell"};
 
     double thickness = 0.0;
     int integrationPoints = 3;
@@ -120,7 +115,7 @@ public:
 class kseC_CompositeShellSection final
     : public cls_RecordOf<kseC_CompositeShellSection, kseC_GeometryShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_CompositeShellSection", "Shell of stacked layers."};
+    static constexpr cls_ClassInfo Class{"kseC_CompositeShellSection", "shell of stacked layers"};
 
     cow_List<kseC_CompositeShellLayer> layers;
 
@@ -131,17 +126,14 @@ public:
 
 class kseC_GeneralShellSection final : public cls_RecordOf<kseC_GeneralShellSection, kseC_ShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kseC_GeneralShellSection", "The intermediate general shell (stiffness given as such) of 'Continuum, "
-                                    "shell and membrane sections': recognised, and its write raises 'Shell "
-                                    "general section unimplemented'. Name chosen; no field is read."};
+    static constexpr cls_ClassInfo Class{"kseC_GeneralShellSection",
+                                         "shell of given stiffness; no deck can be written of it"};
 };
 
 class kseC_UserShellSection final : public cls_RecordOf<kseC_UserShellSection, kseC_ShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_UserShellSection",
-                                         "Shell whose behaviour comes from user code; its write always ends "
-                                         "in 'Shell general section unimplemented'."};
+    static constexpr cls_ClassInfo Class{
+        "kseC_UserShellSection", "shell whose behaviour comes from user code; no deck can be written of it"};
 
     bool symmetric = true;
 

@@ -8,7 +8,7 @@ const cls_FieldTable& kseC_HomogenousSolidSection::Fields() {
         cls_Describe<R>(kseC_SolidSection::Fields())
             .Field<&R::thickness>("thickness",
                                   "length; plane or cross-section thickness of two-dimensional and "
-                                  "one-dimensional elements; always written on the data line.")
+                                  "one-dimensional elements; always written on the data line")
             .Field<&R::materialName>("materialName", "material of the elements")
             .Required()
             .RefersTo("material");
@@ -19,15 +19,14 @@ const cls_FieldTable& kseC_CompositeSolidLayer::Fields() {
     using R = kseC_CompositeSolidLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::thickness>("thickness", "relative thickness of the layer (no unit).")
+            .Field<&R::thickness>("thickness", "relative thickness of the layer (no unit)")
             .Field<&R::integrationPoints>("integrationPoints",
-                                          "number of integration points of the layer (odd).")
+                                          "number of integration points of the layer (odd)")
             .Field<&R::materialName>("materialName",
                                      "material of the layer; stands in the deck without quotes")
             .Required()
             .RefersTo("material")
-            .Field<&R::orientationAngle>("orientationAngle",
-                                         "angle in degrees to the section's orientation.");
+            .Field<&R::orientationAngle>("orientationAngle", "angle in degrees to the section's orientation");
     return fields;
 }
 
@@ -37,7 +36,7 @@ const cls_FieldTable& kseC_CompositeSolidSection::Fields() {
         cls_Describe<R>(kseC_SolidSection::Fields())
             .Field<&R::symmetric>(
                 "symmetric",
-                "true: with at least 2 layers the whole list is written once more in reverse order.")
+                "true: with at least 2 layers the whole list is written once more in reverse order")
             .Field<&R::layers>("layers", "layers in stacking order; at least one for a usable deck");
     return fields;
 }
@@ -46,7 +45,7 @@ const cls_FieldTable& kseC_TrussSection::Fields() {
     using R = kseC_TrussSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
-            .Field<&R::area>("area", "area of the cross-section (length squared).")
+            .Field<&R::area>("area", "area of the cross-section (length squared)")
             .Field<&R::materialName>("materialName", "material")
             .Required()
             .RefersTo("material");
@@ -63,11 +62,11 @@ const cls_FieldTable& kseC_MembraneSection::Fields() {
     using R = kseC_MembraneSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
-            .Field<&R::thickness>("thickness", "length; membrane thickness.")
+            .Field<&R::thickness>("thickness", "length; membrane thickness")
             .Field<&R::poissonDefinition>("poissonDefinition",
                                           "0 the solver's own change of thickness, else `poisson` is written")
             .Field<&R::poisson>("poisson",
-                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0.")
+                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0")
             .Field<&R::materialName>("materialName", "material")
             .Required()
             .RefersTo("material");
@@ -79,11 +78,11 @@ const cls_FieldTable& kseC_GasketSection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
             .Field<&R::crossSection>("crossSection",
-                                     "cross-section area, width or out-of-plane thickness, by element type.")
-            .Field<&R::initialGap>("initialGap", "length; initial gap.")
+                                     "cross-section area, width or out-of-plane thickness, by element type")
+            .Field<&R::initialGap>("initialGap", "length; initial gap")
             .Field<&R::initialThickness>("initialThickness", "length; initial gasket thickness; unset: taken "
                                                              "from the nodes, the data line starts with ', '")
-            .Field<&R::initialVoid>("initialVoid", "length; initial void.")
+            .Field<&R::initialVoid>("initialVoid", "length; initial void")
             .Field<&R::stabilizationStiffness>("stabilizationStiffness",
                                                "stress; unset: no 'stabilization stiffness='")
             .Field<&R::materialName>("materialName",

@@ -7,15 +7,13 @@ class cls_ClassRegistrar;
 
 class kseC_SolidSection : public cls_AbstractRecordOf<kseC_SolidSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_SolidSection", "Base of the continuum sections."};
+    static constexpr cls_ClassInfo Class{"kseC_SolidSection", "continuum elements"};
 };
 
 class kseC_HomogenousSolidSection final
     : public cls_RecordOf<kseC_HomogenousSolidSection, kseC_SolidSection> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kseC_HomogenousSolidSection",
-        "Continuum elements of one material (the spelling of the name is the rules's)."};
+    static constexpr cls_ClassInfo Class{"kseC_HomogenousSolidSection", "continuum elements of one material"};
 
     double thickness = 1.0;
     cow_String materialName;
@@ -28,7 +26,7 @@ public:
 class kseC_CompositeSolidLayer final : public cls_RecordOf<kseC_CompositeSolidLayer> {
 public:
     static constexpr cls_ClassInfo Class{"kseC_CompositeSolidLayer",
-                                         "One layer of a composite continuum section."};
+                                         "one layer of a composite continuum section"};
 
     double thickness = 1.0;
     int integrationPoints = 1;
@@ -41,7 +39,7 @@ public:
 class kseC_CompositeSolidSection final : public cls_RecordOf<kseC_CompositeSolidSection, kseC_SolidSection> {
 public:
     static constexpr cls_ClassInfo Class{"kseC_CompositeSolidSection",
-                                         "Continuum elements of stacked layers."};
+                                         "continuum elements of stacked layers"};
 
     bool symmetric = false;
     cow_List<kseC_CompositeSolidLayer> layers;
@@ -51,7 +49,7 @@ public:
 
 class kseC_TrussSection final : public cls_RecordOf<kseC_TrussSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_TrussSection", "Truss elements."};
+    static constexpr cls_ClassInfo Class{"kseC_TrussSection", "truss elements"};
 
     double area = 1.0;
     cow_String materialName;
@@ -63,7 +61,7 @@ public:
 
 class kseC_MembraneSection final : public cls_RecordOf<kseC_MembraneSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_MembraneSection", "Membrane elements."};
+    static constexpr cls_ClassInfo Class{"kseC_MembraneSection", "membrane elements"};
 
     enum class PoissonDefinitionEnm : int { DEFAULT = 0, VALUE = 1 };
 
@@ -82,9 +80,7 @@ const omu_EnumTable& omu_EnumTableOf(kseC_MembraneSection::PoissonDefinitionEnm)
 
 class kseC_GasketSection final : public cls_RecordOf<kseC_GasketSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kseC_GasketSection", "Gasket elements. The first four are the data values in the record's order; "
-                              "the deck's order is initialThickness, initialGap, initialVoid, crossSection."};
+    static constexpr cls_ClassInfo Class{"kseC_GasketSection", "gasket elements"};
 
     static constexpr double initialThicknessDef() { return cls_UnsetDouble; }
     static constexpr double stabilizationStiffnessDef() { return cls_UnsetDouble; }

@@ -1,0 +1,87 @@
+#include "sections/oif_SolidSections.h"
+
+#include "deck/oif_KeywordLine.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
+
+namespace {
+
+using Material = qkw_QuorixName;
+
+void WriteTruss(utl_Stream& stream, const cow_String& setName, const kseC_TrussSection& truss) {
+    oif_KeywordLine(stream, "*Solid Section, elset=")
+        .Text(setName)
+        .Value("material=", Material(truss.materialName, false))
+        .End();
+    stream << truss.area << "," << endl;
+}
+
+/// Numbers have no point here, and the material's name no quotes.
+void WriteLayer(utl_Stream& stream, const kseC_CompositeSolidLayer& layer) {
+    stream << cow_String(layer.thickness) << ", " << cow_String(layer.integrationPoints) << ", "
+           << layer.materialName << ", " << cow_String(layer.orientationAngle) << endl;
+}
+
+void WriteLayers(utl_Stream& stream, const kseC_CompositeSolidSection& solid) {
+    const auto& layers = solid.layers;
+    for (int i = 0; i < layers.Length(); ++i) WriteLayer(stream, layers[i]);
+    // The whole list once more, so the layer in the middle stands twice; but not a single one.
+    if (!solid.symmetric || layers.Length() < 2) return;
+    for (int i = layers.Length() - 1; i >= 0; --i) WriteLayer(stream, layers[i]);
+}
+
+} // namespace
+
+void oif_SolidSection::Write(utl_Stream& stream) const {
+    const kseC_Section& section = Section();
+    if (section.DynTypeId() == kseC_TrussSection::TypeId()) {
+        WriteTruss(stream, SetName(), nex_canDynamicCastRef<kseC_TrussSection>(section, NEX_HERE));
+        return;
+    }
+    if (nex_canDynamicCastPtr<kseC_SolidSection>(&section) == nullptr) {
+        nex_Raise("Neither solid nor truss section type");
+    }
+    const bool isComposite = section.DynTypeId() == kseC_CompositeSolidSection::TypeId();
+    oif_KeywordLine line(stream, "*Solid Section, elset=");
+    line.Text(SetName()).WordIf(isComposite, "composite");
+    WriteNames(line);
+    if (isComposite) {
+        line.End();
+        WriteLayers(stream, nex_canDynamicCastRef<kseC_CompositeSolidSection>(section, NEX_HERE));
+        return;
+    }
+    if (section.DynTypeId() != kseC_HomogenousSolidSection::TypeId()) {
+        nex_Raise("Unknown solid section type");
+    }
+    const auto& solid = nex_canDynamicCastRef<kseC_HomogenousSolidSection>(section, NEX_HERE);
+    line.Value("material=", Material(solid.materialName, false)).End();
+    stream << solid.thickness << "," << endl;
+}
+
+void oif_MembraneSection::Write(utl_Stream& stream) const {
+    const auto& membrane = nex_canDynamicCastRef<kseC_MembraneSection>(Section(), NEX_HERE);
+    oif_KeywordLine line(stream, "*Membrane Section, elset=");
+    line.Text(SetName()).Value("material=", Material(membrane.materialName, false));
+    WriteNames(line);
+    line.ValueIf(membrane.poissonDefinition != membrane.poissonDefinitionDef(), "poisson=", membrane.poisson)
+        .End();
+    stream << membrane.thickness << "," << endl;
+}
+
+void oif_GasketSection::Write(utl_Stream& stream) const {
+    if (Section().DynTypeId() != kseC_GasketSection::TypeId()) return;
+    const auto& gasket = nex_canDynamicCastRef<kseC_GasketSection>(Section(), NEX_HERE);
+    oif_KeywordLine line(stream, "*Gasket Section, elset=");
+    line.Text(SetName());
+    stream.OptionalLineBreak();
+    line.Text(isBehavior_ ? ", behavior=" : ", material=").Text(Material(gasket.materialName, false));
+    WriteNames(line);
+    if (gasket.stabilizationStiffness != gasket.stabilizationStiffnessDef()) {
+        stream.OptionalLineBreak();
+        line.Text(", stabilization stiffness=").Text(gasket.stabilizationStiffness);
+    }
+    line.End();
+    if (gasket.initialThickness != gasket.initialThicknessDef()) stream << gasket.initialThickness;
+    stream << ", " << gasket.initialGap << ", " << gasket.initialVoid << ", " << gasket.crossSection << endl;
+}

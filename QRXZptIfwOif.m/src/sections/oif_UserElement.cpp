@@ -1,0 +1,29 @@
+#include "sections/oif_UserElement.h"
+
+#include "deck/oif_DataLines.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+#include <limits>
+
+void oif_UserElement::Write(utl_Stream& stream) const {
+    const auto* sensor = nex_canDynamicCastPtr<kinC_ActuatorSensor>(interaction_.Referent());
+    if (sensor == nullptr) return;
+    stream << "*User Element, type=" << sensor->elementType << ", nodes=1";
+    if (sensor->coordinates != 0) stream << ", coordinates=" << sensor->coordinates;
+    stream << ", properties=" << realProperties_;
+    stream.OptionalLineBreak();
+    stream << ", i properties=" << intProperties_;
+    if (sensor->unsymm) stream << ", unsymm";
+    stream << ", variables=" << sensor->variables << endl << sensor->nodeSetText << endl;
+}
+
+void oif_UelProperty::Write(utl_Stream& stream) const {
+    const auto* property = nex_canDynamicCastPtr<kinC_ActuatorSensorProp>(property_.Referent());
+    if (property == nullptr) return;
+    stream << "*Uel Property" << parameters_ << endl;
+    // All on one line, however many.
+    oif_DataLines line(stream, std::numeric_limits<int>::max());
+    for (int i = 0; i < property->realProperties.Length(); ++i) line.Add(property->realProperties[i]);
+    for (int i = 0; i < property->intProperties.Length(); ++i) line.Add(property->intProperties[i]);
+    line.End();
+}

@@ -1,0 +1,111 @@
+#include "tools/ModelChecks.h"
+
+#include "model_file/mdf_ModelFile.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+/// "place: text" of each finding in a model with these members.
+std::vector<std::string> Findings(const std::string& members) {
+    mdf_Report report;
+    const auto odb = mdf_ReadModelText(
+        R"({"format": "qrx-model/1", "models": {"Default Model": {)" + members + "}}}", "test", report);
+    for (const mdf_Message& message : report.messages) {
+        EXPECT_FALSE(message.isError) << message.pointer << ": " << message.text;
+    }
+    std::vector<std::string> found;
+    if (odb == nullptr) return found;
+    for (const ModelFinding& finding : FindingsOf(*odb->FindModel(odb_Odb::DefaultModelName()))) {
+        found.push_back(finding.place + ": " + finding.text);
+    }
+    return found;
+}
+
+using Texts = std::vector<std::string>;
+
+/// A part P with four elements of the type, of which the set SOME holds the first three, and two instances.
+std::string Part(const std::string& type, const std::string& attributes) {
+    return R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
+        "elements": [{"type": ")" +
+           type + R"(", "labels": [1, 2, 3, 4], "connectivity": [[1, 2], [1, 2], [1, 2], [1, 2]]}],
+        "sets": [{"name": "SOME", "kind": "element", "labels": [1, 2, 3]}, {"name": "ALL", "kind": "element", "labels": [1, 2, 3, 4]}]})" +
+           attributes + R"(}}, "assembly": {"instances": {"A": {"part": "P"}, "B": {"part": "P"}}})";
+}
+
+const std::string kSteel = R"("materials": {"Steel": {}},)";
+const std::string kSolid =
+    R"("sections": {"S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)";
+const std::string kOnAll = R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "S"}])";
+
+} // namespace
+
+TEST(ModelChecks, ElementsWithoutASection_AreCountedOnceForAllInstancesOfAPart) {
+    EXPECT_EQ(Findings(Part("C3D8", "")), Texts{"/parts/P: 4 elements have no section"});
+    EXPECT_EQ(Findings(kSteel + kSolid +
+                       Part("C3D8", R"(, "sectionAssignments": [{"region": "SOME", "sectionName": "S"}])")),
+              Texts{"/parts/P: 1 element has no section"});
+}
+
+TEST(ModelChecks, WholeModel_HasNothingToSay) {
+    EXPECT_EQ(Findings(kSteel + kSolid + Part("C3D8", kOnAll)), Texts{});
+}
+
+TEST(ModelChecks, RigidSurfaceAndConnectorElements_NeedNoSection) {
+    EXPECT_EQ(Findings(Part("R3D4", "")), Texts{});
+    EXPECT_EQ(Findings(Part("SURF3D4", "")), Texts{});
+    EXPECT_EQ(Findings(Part("CONN3D2", "")), Texts{});
+}
+
+TEST(ModelChecks, ElementTypeThatCannotTakeTheSection_IsNamed) {
+    EXPECT_EQ(Findings(kSteel + kSolid + Part("S4R", kOnAll)),
+              Texts{"/parts/P: 4 elements of type 'S4R' can't take the section 'S' "
+                    "(kseC_HomogenousSolidSection)"});
+    EXPECT_EQ(Findings(kSteel + kSolid + Part("b31", kOnAll)),
+              Texts{"/parts/P: 4 elements of type 'b31' can't take the section 'S' "
+                    "(kseC_HomogenousSolidSection)"});
+}
+
+TEST(ModelChecks, TrussElements_TakeSolidAndTrussSections) {
+    EXPECT_EQ(Findings(kSteel + kSolid + Part("T3D2", kOnAll)), Texts{});
+    EXPECT_EQ(Findings(kSteel +
+                       R"("sections": {"S": {"class": "kseC_TrussSection", "materialName": "Steel"}},)" +
+                       Part("T3D2", kOnAll)),
+              Texts{});
+}
+
+TEST(ModelChecks, UnknownElementType_TakesAnySection) {
+    EXPECT_EQ(Findings(kSteel + kSolid + Part("SPRINGA", kOnAll)), Texts{});
+}
+
+TEST(ModelChecks, LaterAssignment_DecidesWhichSectionAnElementHas) {
+    EXPECT_EQ(Findings(kSteel + R"("sections": {
+                 "Shell": {"class": "kseC_HomogenousShellSection", "materialName": "Steel"},
+                 "Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)" +
+                       Part("S4", R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"},
+                                                              {"region": "SOME", "sectionName": "Shell"}])")),
+              Texts{"/parts/P: 1 element of type 'S4' can't take the section 'Solid' "
+                    "(kseC_HomogenousSolidSection)"});
+}
+
+TEST(ModelChecks, MaterialThatNoSectionUses_IsNamed) {
+    EXPECT_EQ(Findings(R"("materials": {"a/b": {}, "Bars": {}, "Ply": {}, "Steel": {}},
+        "sections": {
+          "S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"},
+          "C": {"class": "kseC_CompositeShellSection", "layers": [{"materialName": "Ply"}],
+                "rebars": {"layers": [{"name": "L", "materialName": "Bars"}]}}})"),
+              Texts{"/materials/a~1b: no section uses the material"});
+}
+
+TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
+    EXPECT_EQ(Findings(kSteel + kSolid + R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
+        "elements": [{"type": "MASS", "labels": [1], "connectivity": [[1]]}],
+        "sets": [{"name": "ALL", "kind": "element", "labels": [1]}]}}},
+        "assembly": {"instances": {"A": {"part": "P"},
+          "B": {"part": "P", "sectionAssignments": [{"region": "ALL", "sectionName": "S"}]}}})"),
+              (Texts{"/parts/P: 1 element has no section",
+                     "/assembly/instances/B: 1 element of type 'MASS' can't take the section 'S' "
+                     "(kseC_HomogenousSolidSection)"}));
+}
