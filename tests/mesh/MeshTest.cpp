@@ -166,6 +166,17 @@ TEST(Element, ClassForm_HasAKeywordLineOfItsOwn) {
     EXPECT_EQ(Written(oif_Element(0, 0, elements, "E")), "*Element, type=T3D2, elset=E\n1, 0, 1\n");
 }
 
+TEST(AssemblyElement, ElementsOfAnInstance_ShowTheInstanceToo) {
+    TestStore store;
+    store.AddPart("P", {1, 2}).mesh->AddElements("T3D2", {5}, 2, {1, 2});
+    store.model.AddInstance("my inst", "P");
+    const int labels[] = {5};
+    const odiK_MemberInput members[] = {{"my inst", labels, {}}};
+    store.model.AddAssemblySet("OWN", res_SetTypeEnm::ELEMENTS, members);
+    EXPECT_EQ(Written(oif_AssemblyElement(store.model.Region("", "OWN"), "OWN", store.Info())),
+              "*Element, type=CONN3D2\n5, \"my inst\".1, \"my inst\".2\n");
+}
+
 TEST(AssemblyElement, Ends_ShowTheirInstance) {
     TestStore store;
     store.AddPart("P", {1, 2});

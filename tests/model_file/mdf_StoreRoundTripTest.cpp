@@ -129,10 +129,13 @@ TEST(StoreRoundTrip, Assembly_WithForeignEndsSetsAndOrientations_StaysTheSame) {
                      {"name": "nothing", "kind": "surface", "members": []}],
             "sectionAssignments": [{"region": "wires", "sectionName": "S"}, {"region": "j.ALL", "sectionName": "S"}],
             "connectorOrientations": [{"region": {"set": "dot.ted"}, "csys1": "D", "axis2": 1, "angle2": 3, "orient2sameAs1": true},
-                                      {"region": {"instance": "i.1", "set": "ALL"}, "csys2": "D"}]})");
+                                      {"region": {"instance": "i.1", "set": "ALL"}, "csys2": "D", "name": "mine"}]})");
     EXPECT_TRUE(Has(text, R"("i.1.10")"));
     EXPECT_TRUE(Has(text, R"({"set": "dot.ted"})"));
     EXPECT_TRUE(Has(text, R"({"instance": "i.1", "set": "ALL"})"));
+    // Of orientations only a name that isn't that of their place.
+    EXPECT_TRUE(Has(text, R"("name": "mine")"));
+    EXPECT_FALSE(Has(text, "ConnOri-"));
 }
 
 TEST(StoreRoundTrip, RecordsStepsStatesAndSector_StayTheSame) {

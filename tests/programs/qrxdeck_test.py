@@ -380,6 +380,24 @@ class CannotBeExpressed(ProgramTest):
         self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
 
 
+class WrongDatum(ProgramTest):
+    def test_ConnectorOnADatumThatIsNoSystem_IsCodeFourAndLeavesTheOldDeck(self):
+        def orient(model):
+            model["datums"] = [{"name": "Corner", "type": "point"}]
+            model["assembly"]["sets"] = [{"name": "TIP", "kind": "node",
+                                          "members": [{"instance": "ROD-1", "labels": [2]}]}]
+            model["assembly"]["connectorOrientations"] = [{"region": "TIP", "csys1": "Corner"}]
+
+        self.put("model.json", changed(orient))
+        (self.folder / "model.inp").write_bytes(OLD_DECK)
+        run = self.run_program("write", "model.json")
+        self.assertEqual((run.returncode, run.output), (4, ""))
+        self.assertEqual(run.errors.splitlines(),
+                         ["Wrong datum type during input generation", "orientation 'Corner'"])
+        self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
+        self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+
 class Signals(ProgramTest):
     def test_RunThatIsEnded_LeavesTheOldDeckAndNoDebris(self):
         self.put("model.json", large_model(300000))

@@ -1,8 +1,8 @@
 #include "sections/oif_ConnectorOptions.h"
 
+#include "deck/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
-#include "materials/oif_OptionLine.h"
 
 #include <algorithm>
 #include <initializer_list>
@@ -10,11 +10,6 @@
 namespace {
 
 constexpr int kComponents = 6;
-
-template <class Enm>
-int Number(Enm value) {
-    return static_cast<int>(value);
-}
 
 bool Contains(const cow_List<int>& list, int item) {
     for (int i = 0; i < list.Length(); ++i) {
@@ -38,7 +33,7 @@ void WriteDependencies(utl_Stream& stream, int count) {
 
 using Options = mdl_ObjCow<kbeC_ConnectorOptions>;
 
-void WriteRegularization(oif_OptionLine& line, const Options& group) {
+void WriteRegularization(oif_KeywordLine& line, const Options& group) {
     if (group.IsNull()) return;
     const kbeC_ConnectorOptions& options = group.ConstGet();
     if (!options.useBehaviorRegularization) {
@@ -56,7 +51,7 @@ void WriteRegularization(oif_OptionLine& line, const Options& group) {
     }
 }
 
-void WriteOptions(oif_OptionLine& line, const Options& group) {
+void WriteOptions(oif_KeywordLine& line, const Options& group) {
     if (group.IsNull()) return;
     WriteRegularization(line, group);
     const kbeC_ConnectorOptions& options = group.ConstGet();
@@ -68,7 +63,7 @@ void WriteOptions(oif_OptionLine& line, const Options& group) {
 }
 
 void WriteOptionsAndEnd(utl_Stream& stream, const Options& group) {
-    oif_OptionLine line(stream, "");
+    oif_KeywordLine line(stream, "");
     WriteOptions(line, group);
     line.End();
 }
@@ -291,7 +286,7 @@ void oif_ConnectorFriction::Write(utl_Stream& stream) const {
     } else {
         stream << ", predefined";
     }
-    oif_OptionLine line(stream, "");
+    oif_KeywordLine line(stream, "");
     line.Dependencies(option_.dependencies)
         .WordIf(option_.independentKind == Friction::IndependentKindEnm::POSITION,
                 "independent components=POSITION")
@@ -319,7 +314,7 @@ void oif_ConnectorFriction::WriteTangentialBehavior(utl_Stream& stream) const {
     using Tangential = kbeC_TangentialBehavior;
     const Tangential& tangential = option_.tangentialBehavior.ConstGet();
     stream << "*Friction";
-    if (Number(product_) == 0) {
+    if (product_ == kprC_AnalysisProductEnm::IMPLICIT) {
         if (tangential.slipToleranceType == Tangential::SlipToleranceTypeEnm::ABSOLUTE) {
             stream << ", elastic slip=" << tangential.elasticSlip;
         } else if (tangential.fraction != Tangential::fractionDef()) {
@@ -405,7 +400,7 @@ void oif_ConnectorDamage::Write(utl_Stream& stream) const {
     using Criterion = kbeC_ConnectorDamage::CriterionEnm;
     ForEachComponent(option_.components, option_.initiationPotentials, [&](const cow_String& component) {
         stream << "*Connector Damage Initiation" << component;
-        oif_OptionLine line(stream, "");
+        oif_KeywordLine line(stream, "");
         line.WordIf(option_.criterion == Criterion::MOTION, "criterion=Motion")
             .WordIf(option_.criterion == Criterion::PLASTIC_MOTION, "criterion=Plastic Motion")
             .ValueUnless("dependencies=", option_.initiationDependencies, 0);
@@ -433,7 +428,7 @@ void oif_ConnectorDamage::WriteEvolution(utl_Stream& stream) const {
     const bool hasMix =
         option_.criterion == Damage::CriterionEnm::PLASTIC_MOTION && option_.modeMixDependency;
     stream << "*Connector Damage Evolution, type=" << (isEnergy ? "Energy" : "Motion");
-    oif_OptionLine line(stream, "");
+    oif_KeywordLine line(stream, "");
     if (softens) {
         const bool isExponential = option_.softening == Damage::SofteningEnm::EXPONENTIAL;
         line.Word("softening=").Text(isExponential ? "Exponential" : "Tabular");

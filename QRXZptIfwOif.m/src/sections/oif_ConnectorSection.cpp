@@ -1,7 +1,7 @@
 #include "sections/oif_ConnectorSection.h"
 
+#include "deck/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
-#include "materials/oif_OptionLine.h"
 
 #include <string>
 
@@ -93,7 +93,7 @@ void oif_NewConnectorSection::Write(utl_Stream& stream) const {
 
 void oif_ConnectorBehavior::Write(utl_Stream& stream) const {
     stream << "*Connector Behavior, name=" << qkw_QuorixName(name_, false);
-    oif_OptionLine line(stream, integrationExplicit_ ? ", integration=EXPLICIT" : "");
+    oif_KeywordLine line(stream, integrationExplicit_ ? ", integration=EXPLICIT" : "");
     if (!regularize_) {
         line.Word("regularize=OFF");
     } else if (!useBehaviorRegularization_) {

@@ -52,6 +52,7 @@ void oif_TransformBuilder::WriteTransforms() {
     }
     for (const System& system : systems) {
         const cow_String name = ConstGetDatumName(system.datum);
+        const nex_Context context("transform", name);
         AddAssemblyDefinition(oif_Nset(name, system.members));
         AddAssemblyDefinition(oif_Transform(Store(), system.datum, name));
     }
@@ -78,6 +79,7 @@ void oif_TransformBuilder::WriteOrientation(const dtmC_DatumRef& datum, double a
         if (orientationNames_[i] == name) return;
     }
     orientationNames_.Append(name);
+    const nex_Context context("orientation", name);
     AddAssemblyDefinition(oif_Orientation(Store(), datum, name, true, angle, axis));
 }
 
