@@ -5,8 +5,22 @@
 #include <iterator>
 #include <stdexcept>
 
+namespace {
+
+constexpr std::string_view kGoldenPrefix = "tests/decks/";
+
+bool IsNameCharacter(char c) {
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '_';
+}
+
+} // namespace
+
+std::filesystem::path ProjectFolder() {
+    return QRX_PROJECT_FOLDER;
+}
+
 std::filesystem::path DeckFolder() {
-    return QRX_DECK_FOLDER;
+    return ProjectFolder() / kGoldenPrefix;
 }
 
 std::vector<std::string> DeckNames(std::string_view extension) {
@@ -16,6 +30,35 @@ std::vector<std::string> DeckNames(std::string_view extension) {
     }
     std::sort(names.begin(), names.end());
     return names;
+}
+
+std::vector<std::string> GoldenPairs() {
+    std::vector<std::string> paths = DeckNames(".json");
+    for (std::string& path : paths) path.insert(0, kGoldenPrefix);
+    return paths;
+}
+
+std::vector<std::string> ExamplePairs() {
+    std::vector<std::string> paths;
+    for (const auto& folder : std::filesystem::directory_iterator(ProjectFolder() / "examples")) {
+        if (!folder.is_directory()) continue;
+        for (const auto& entry : std::filesystem::directory_iterator(folder)) {
+            std::filesystem::path file = entry.path();
+            if (file.extension() != ".json") continue;
+            if (!std::filesystem::exists(file.replace_extension(".inp"))) continue;
+            paths.push_back("examples/" + folder.path().filename().string() + "/" + file.stem().string());
+        }
+    }
+    std::sort(paths.begin(), paths.end());
+    return paths;
+}
+
+std::string TestNameOfPair(const std::string& path) {
+    std::string name = path.starts_with(kGoldenPrefix) ? path.substr(kGoldenPrefix.size()) : path;
+    for (char& c : name) {
+        if (!IsNameCharacter(c)) c = '_';
+    }
+    return name;
 }
 
 std::string ReadBytes(const std::filesystem::path& path) {

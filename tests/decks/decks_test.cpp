@@ -34,20 +34,22 @@ std::string ErrorsOf(const mdf_Report& report) {
     return lines;
 }
 
-// One golden deck. What the test wrote stays in its folder when it differs from what was expected.
+// One golden deck, or one of an example. What the test wrote stays in its folder when it differs from what
+// was expected.
 class Deck : public testing::TestWithParam<std::string> {
 protected:
     void SetUp() override {
         std::random_device random;
-        folder_ = fs::temp_directory_path() / ("qrx-deck-" + std::to_string(random()) + "-" + GetParam());
+        folder_ = fs::temp_directory_path() /
+                  ("qrx-deck-" + std::to_string(random()) + "-" + TestNameOfPair(GetParam()));
         fs::create_directories(folder_);
     }
     void TearDown() override {
         if (!HasFailure()) fs::remove_all(folder_);
     }
 
-    fs::path ModelPath() const { return DeckFolder() / (GetParam() + ".json"); }
-    fs::path ExpectedPath() const { return DeckFolder() / (GetParam() + ".inp"); }
+    fs::path ModelPath() const { return ProjectFolder() / (GetParam() + ".json"); }
+    fs::path ExpectedPath() const { return ProjectFolder() / (GetParam() + ".inp"); }
 
     std::unique_ptr<odb_Odb> Store() const {
         mdf_Report report;
@@ -143,13 +145,37 @@ TEST_P(Deck, Written_FromShuffledContainers_HasTheExpectedBytes) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Golden, Deck, testing::ValuesIn(DeckNames(".json")),
-                         [](const auto& deck) { return deck.param; });
+INSTANTIATE_TEST_SUITE_P(Golden, Deck, testing::ValuesIn(GoldenPairs()),
+                         [](const auto& pair) { return TestNameOfPair(pair.param); });
+INSTANTIATE_TEST_SUITE_P(Example, Deck, testing::ValuesIn(ExamplePairs()),
+                         [](const auto& pair) { return TestNameOfPair(pair.param); });
 
 TEST(DeckFolder, Files_OfModelsAndDecks_ArePairs) {
     const std::vector<std::string> models = DeckNames(".json");
     EXPECT_FALSE(models.empty());
     EXPECT_EQ(models, DeckNames(".inp"));
+}
+
+TEST(ExamplePairs, Examples_WithTheirDeck_AreTakenAndOthersAreNot) {
+    const std::vector<std::string> pairs = ExamplePairs();
+    const std::set<std::string> taken(pairs.begin(), pairs.end());
+    EXPECT_TRUE(taken.contains("examples/assembly/assembly"));
+    EXPECT_TRUE(taken.contains("examples/materials/materials"));
+    EXPECT_FALSE(taken.contains("examples/bracket/bracket"));
+}
+
+TEST(ExamplePairs, Models_Read_RaiseNoMessage) {
+    for (const std::string& pair : ExamplePairs()) {
+        mdf_Report report;
+        EXPECT_NE(mdf_ReadModelFile((ProjectFolder() / (pair + ".json")).string(), report), nullptr);
+        EXPECT_TRUE(report.messages.empty()) << pair << '\n' << ErrorsOf(report);
+    }
+}
+
+TEST(TestNameOfPair, Pairs_OfBothKinds_HaveNamesOfLettersDigitsAndUnderscores) {
+    EXPECT_EQ(TestNameOfPair("tests/decks/label_widths"), "label_widths");
+    EXPECT_EQ(TestNameOfPair("examples/assembly/assembly"), "examples_assembly_assembly");
+    EXPECT_EQ(TestNameOfPair("examples/a-b/c d.2"), "examples_a_b_c_d_2");
 }
 
 TEST(RewritingOfDecks, Asked_WithTheFlag_IsRefusedInCiOnly) {
