@@ -38,7 +38,7 @@ const FindingCase connectorCases[] = {
     {"BasicTypes", Section(R"("translationalType": "JOIN", "rotationalType": "REVOLUTE")"), {}},
     {"ReferenceOfFive",
      Section(R"("constitutiveReference": [1, 2, 3, 4, 5])"),
-     {"@/sections/C/constitutiveReference: found 5 items, expected 6"}},
+     {"@/sections/C/constitutiveReference: found an array of 5 items, expected an array of 6 items"}},
     {"ComponentsOutsideAndTwice",
      Option("Stop", R"("components": [0, 7, 3, 3])"),
      {kOption + "components: found 0, expected components from 1 to 6",

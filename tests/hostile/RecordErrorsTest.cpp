@@ -31,6 +31,12 @@ std::string Amplitude(const std::string& members) {
     return Model(R"("amplitudes": {"A": {)" + members + "}}");
 }
 
+const std::string connectorMembers =
+    "assembledType, translationalType, rotationalType, regularize, useBehaviorRegularization, "
+    "regularization, "
+    "extrapolationLinear, integrationExplicit, contactAngle, materialFlowFactor, massPerLength, "
+    "constitutiveReference, options, class";
+
 const std::string connectionTypes =
     "NONE (0), BEAM (1), BUSHING (2), CVJOINT (3), CYLINDRICAL (4), HINGE (5), PLANAR (6), RETRACTOR (7), "
     "SLIPRING (8), TRANSLATOR (9), UJOINT (10), WELD (11)";
@@ -51,15 +57,12 @@ const FindingCase recordCases[] = {
      {"@/timePoints/T/class: found 1, expected the name of a class"}},
     {"UnknownMember",
      Section(R"(, "assembledtype": "WELD", "assembly": 1)"),
-     {"@/sections/S/assembledtype: found an unknown member 'assembledtype', expected one of assembledType, "
-      "translationalType, rotationalType, class; did you mean 'assembledType'?",
-      "@/sections/S/assembly: found an unknown member 'assembly', expected one of assembledType, "
-      "translationalType, rotationalType, class"}},
+     {"@/sections/S/assembledtype: found an unknown member 'assembledtype', expected one of " +
+          connectorMembers + "; did you mean 'assembledType'?",
+      "@/sections/S/assembly: found an unknown member 'assembly', expected one of " + connectorMembers}},
     {"StatesWhereThereAreNone",
      Section(R"(, "states": {})"),
-     {"@/sections/S/states: found an unknown member 'states', expected one of assembledType, "
-      "translationalType, "
-      "rotationalType, class"}},
+     {"@/sections/S/states: found an unknown member 'states', expected one of " + connectorMembers}},
 
     {"AmplitudeTableOfThreeColumns",
      Amplitude(R"("class": "kamC_Tabular", "table": [[0, 1, 2]])"),

@@ -101,9 +101,9 @@ const FindingCase referenceCases[] = {
       "to"}},
     {"ConnectorOrientationWithAName",
      Whole(R"("connectorOrientations": [{"region": "I.ALL", "name": "X"}])"),
-     {"@/assembly/connectorOrientations/0/name: found an unknown member 'name', expected one of region, "
-      "csys1, "
-      "axis1, angle1, orient2sameAs1, csys2, axis2, angle2, class"}},
+     {"warning @/assembly/connectorOrientations/0/name: found 'X', which is best left out: where an angle "
+      "isn't 0, the connector section refers to an orientation that is defined under 'ConnOri-' and its "
+      "place"}},
 
     {"AttributesAsObject",
      Model(R"("parts": {"P": {"sectionAssignments": {}}})"),

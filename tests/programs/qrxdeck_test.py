@@ -22,12 +22,12 @@ MODEL = {
     "format": "qrx-model/1",
     "models": {
         "Default Model": {
-            "topLevelSolverInput": ["*Heading", "One truss"],
+            "topLevelSolverInput": ["*Heading", "One rigid link"],
             "parts": {
                 "ROD": {
                     "mesh": {
                         "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [2.5, 0, 0]]},
-                        "elements": [{"type": "T3D2", "labels": [1], "connectivity": [[1, 2]]}],
+                        "elements": [{"type": "R2D2", "labels": [1], "connectivity": [[1, 2]]}],
                         "sets": [{"name": "TIP", "kind": "node", "labels": [2]}],
                     }
                 }
@@ -40,7 +40,7 @@ MODEL = {
 
 DECK = b"""\
 *Heading
-One truss
+One rigid link
 **
 ** PARTS
 **
@@ -55,7 +55,7 @@ One truss
 *Node
       1,           0.,           0.,           0.
       2,          2.5,           0.,           0.
-*Element, type=T3D2
+*Element, type=R2D2
 1, 1, 2
 *Nset, nset=TIP
 2,\x20
@@ -384,9 +384,9 @@ class WrongDatum(ProgramTest):
     def test_ConnectorOnADatumThatIsNoSystem_IsCodeFourAndLeavesTheOldDeck(self):
         def orient(model):
             model["datums"] = [{"name": "Corner", "type": "point"}]
-            model["assembly"]["sets"] = [{"name": "TIP", "kind": "node",
-                                          "members": [{"instance": "ROD-1", "labels": [2]}]}]
-            model["assembly"]["connectorOrientations"] = [{"region": "TIP", "csys1": "Corner"}]
+            model["assembly"]["sets"] = [{"name": "WIRE", "kind": "element",
+                                          "members": [{"instance": "ROD-1", "labels": [1]}]}]
+            model["assembly"]["connectorOrientations"] = [{"region": "WIRE", "csys1": "Corner"}]
 
         self.put("model.json", changed(orient))
         (self.folder / "model.inp").write_bytes(OLD_DECK)
@@ -437,7 +437,9 @@ class OtherCommands(ProgramTest):
         run = self.run_program("check", "model.json")
         self.assertEqual((run.returncode, run.errors),
                          (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
-                             "gasket section names this material, so this will not stand in the deck\n"))
+                             "gasket section names this material, so this will not stand in the deck\n"
+                             "model.json: warning: /models/Default Model/materials/RING: no section uses the "
+                             "material\n"))
         run = self.run_program("write", "model.json")
         self.assertRegex(run.output, r"left out, since a deck can't carry it:\n +1  gasket options \(no gasket "
                                      r"section names their materials\): RING membraneElastic\n$")
@@ -461,7 +463,7 @@ class OtherCommands(ProgramTest):
         self.assertEqual((run.returncode, run.errors), (0, ""))
         self.assertEqual(run.output, 'model "Default Model"\n'
                          "  parts (1)\n"
-                         "    ROD  2 nodes, 1 elements: 1 T3D2\n"
+                         "    ROD  2 nodes, 1 elements: 1 R2D2\n"
                          "  instances (1)\n"
                          "    ROD-1  of ROD  moved by (0, 1, 0)\n"
                          "  sets\n"
@@ -520,7 +522,7 @@ class OtherCommands(ProgramTest):
 
     def test_InfoInJson_HasTheSame(self):
         model = json.loads(self.run_program("info", "model.json", "--json").output)["models"]["Default Model"]
-        self.assertEqual(model["parts"]["ROD"]["mesh"], {"nodes": 2, "elements": 1, "elementTypes": {"T3D2": 1}})
+        self.assertEqual(model["parts"]["ROD"]["mesh"], {"nodes": 2, "elements": 1, "elementTypes": {"R2D2": 1}})
         self.assertEqual(model["parts"]["ROD"]["sets"], {"node": {"TIP": 1}, "element": {}, "surface": {}})
         self.assertEqual(model["instances"]["ROD-1"]["translation"], [0, 1, 0])
         self.assertEqual([step["class"] for step in model["steps"]], ["kprC_InitialStep"])
