@@ -5,6 +5,7 @@
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "tools/InteractionChecks.h"
 
 #include <algorithm>
 #include <map>
@@ -230,5 +231,6 @@ std::vector<ModelFinding> FindingsOf(const odiK_Model& model) {
     Findings findings;
     FindSectionsOfMeshes(model, findings);
     FindIdleMaterials(model, findings);
+    FindInteractionProblems(model, findings);
     return findings;
 }

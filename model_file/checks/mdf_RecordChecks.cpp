@@ -31,6 +31,7 @@ const mdf_RecordChecks& mdf_RecordChecks::All() {
         mdf_RecordChecks all;
         mdf_AddAmplitudeChecks(all);
         mdf_AddConnectorChecks(all);
+        mdf_AddInteractionChecks(all);
         mdf_AddMaterialChecks(all);
         mdf_AddSectionChecks(all);
         mdf_AddStepChecks(all);

@@ -193,6 +193,7 @@ public:
     }
 
 protected:
+    bool KnowsStep(const cow_String& stepName) const { return steps_.IsMember(stepName); }
     /// Puts a copy of the state in the place of the step's; no status changes. An unknown step raises.
     void ReplaceState(const cow_String& stepName, const S& state) {
         const int index = steps_.IndexOf(stepName);
