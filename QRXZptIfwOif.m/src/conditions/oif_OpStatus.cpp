@@ -1,7 +1,6 @@
 #include "conditions/oif_OpStatus.h"
 
 #include "mesh/oif_SetName.h"
-#include "store_interface/records/conditions/kloC_BoltLoad.h"
 
 #include <algorithm>
 #include <string>
@@ -92,6 +91,30 @@ bool oif_BCOpStatus::Writes(const kbcC_BC& bc, const cow_String& stepName, bool 
     case Status::DEACTIVATED_FROM_BASE_STATE: return true;
     case Status::PROPAGATED:
     case Status::PROPAGATED_FROM_BASE_STATE: return inLoadCase || OpNew(bc.DynTypeId(), stepName);
+    default: return false;
+    }
+}
+
+const float* oif_BCOpStatus::ScaleIn(const klcC_LoadCase& loadCase, const cow_String& name, Status status) {
+    static constexpr float unscaled = 1.0F;
+    if (const float* scale = loadCase.bcs.Find(name)) return scale;
+    return loadCase.baseStateBCs && IsOfBaseState(status) ? &unscaled : nullptr;
+}
+
+bool oif_BCOpStatus::IsOfBaseState(Status status) {
+    return status == Status::PROPAGATED_FROM_BASE_STATE || status == Status::MODIFIED_FROM_BASE_STATE;
+}
+
+bool oif_BCOpStatus::WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool opMod) {
+    if (load.suppressed) return false;
+    const Status status = load.Status(stepName);
+    const auto& method = load.BoltState(stepName).boltMethod;
+    const bool byForce = method.ConstGet() == Method::APPLY_FORCE;
+    switch (status) {
+    case Status::CREATED: return !byForce;
+    case Status::PROPAGATED: return !byForce && !opMod;
+    case Status::MODIFIED: return !byForce || method.IsModified();
+    case Status::DEACTIVATED: return true;
     default: return false;
     }
 }

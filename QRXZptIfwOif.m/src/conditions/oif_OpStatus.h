@@ -2,6 +2,7 @@
 #define QRX_OIF_OPSTATUS_H
 
 #include "keyword_layer/qkw_ModelInfo.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
 
 #include <span>
 
@@ -65,6 +66,15 @@ public:
     /// Whether the condition is written in the step: in each load case that takes it, or without load cases
     /// in the step itself.
     bool Writes(const kbcC_BC& bc, const cow_String& stepName, bool inLoadCase) const;
+    /// The condition's factor in the load case, where one of the base state may act without being named;
+    /// null if the case doesn't take it.
+    static const float* ScaleIn(const klcC_LoadCase& loadCase, const cow_String& name,
+                                mdl_PropagationStatusEnm status);
+    /// Status 9 or 10.
+    static bool IsOfBaseState(mdl_PropagationStatusEnm status);
+    /// Whether the bolt load stands among the boundary conditions of the step: while its length is given, and
+    /// when that ends. `opMod` is false in a load case and where the family's flag is set.
+    static bool WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool opMod);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kbcC_BC>& bcs,
