@@ -40,13 +40,14 @@ void oif_BoundaryConditionBuilder::Build() {
 }
 
 void oif_BoundaryConditionBuilder::ConfigureOpStatus() {
-    opStatus_ = OpStatusOf(Model());
+    opStatus_ = OpStatusOf(Model().BCs(), Model().Loads(), Model().Steps());
 }
 
-oif_BCOpStatus oif_BoundaryConditionBuilder::OpStatusOf(const qkw_Model& model) {
+oif_BCOpStatus oif_BoundaryConditionBuilder::OpStatusOf(const kprC_PropagatingContainer<kbcC_BC>& bcs,
+                                                        const kprC_PropagatingContainer<kloC_Load>& loads,
+                                                        const kprC_StepContainer& steps) {
     oif_BCOpStatus opStatus;
-    const kprC_StepContainer& steps = model.Steps();
-    opStatus.Configure(model.BCs(), model.Loads(), steps.Keys());
+    opStatus.Configure(bcs, loads, steps.Keys());
     for (int i = 1; i < steps.Size(); ++i) {
         if (steps.StepAt(i).ProcedureType() == kBuckling) opStatus.ForceOpNew(i);
     }
@@ -67,22 +68,14 @@ void oif_BoundaryConditionBuilder::BuildElementSets() {
 
 void oif_BoundaryConditionBuilder::CreateAllBCs(const cow_String& stepName) {
     if (!Model().Steps().IsMember(stepName)) return;
-    const kprC_AnalysisStep* step = AnalysisStep(stepName);
-    const bool hasLoadCases = step != nullptr && !step->loadCases.IsEmpty();
+    const kprC_Step& step = Model().Steps().ConstGet(stepName);
     for (kprC_PropagatingContainerIT<kbcC_BC> it(Model().BCs()); !it.IsDone(); it.Next()) {
         const kbcC_BC& bc = it.CurrentValue();
         const cow_String& name = it.CurrentKey();
         if (bc.suppressed) continue;
         const nex_Context context("boundary condition", name);
-        if (!hasLoadCases) {
-            AllBCDetails(bc, name, stepName, cow_String(), 1.0F);
-            continue;
-        }
-        for (mdl_MapString2ObjCowIT<klcC_LoadCase> cases(step->loadCases); !cases.IsDone(); cases.Next()) {
-            const klcC_LoadCase& loadCase = cases.CurrentValue();
-            if (const float* scale = oif_BCOpStatus::ScaleIn(loadCase, name, bc.Status(stepName))) {
-                AllBCDetails(bc, name, stepName, cases.CurrentKey(), *scale);
-            }
+        for (const auto& [loadCase, scale] : oif_BCOpStatus::Places(step, name, bc.Status(stepName))) {
+            AllBCDetails(bc, name, stepName, loadCase, scale);
         }
     }
 }

@@ -16,7 +16,9 @@ public:
     void Build() override;
 
     /// The flags of the model's conditions. A buckling step says all of them anew.
-    static oif_BCOpStatus OpStatusOf(const qkw_Model& model);
+    static oif_BCOpStatus OpStatusOf(const kprC_PropagatingContainer<kbcC_BC>& bcs,
+                                     const kprC_PropagatingContainer<kloC_Load>& loads,
+                                     const kprC_StepContainer& steps);
     /// The comment above the keyword of a condition, or of a bolt load. Without a load case there is no
     /// scale factor.
     static cow_String Comment(const cow_String& name, unsigned typeId, const cow_String& loadCaseName,
