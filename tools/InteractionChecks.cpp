@@ -22,7 +22,43 @@ std::string Quoted(const cow_String& name) {
 }
 
 // As rgnC_Region::FlagWord() gives them.
-enum RegionKind { NODE_SET = 1, SURFACE = 8 };
+constexpr int kNodeSet = 1;
+constexpr int kSurface = 8;
+constexpr int kEither = kNodeSet | kSurface;
+
+/// A region of the interactions of a class and of those derived from it, and the kinds that it may be of.
+struct RegionRule {
+    unsigned (*typeId)();
+    const char* member;
+    const rgnC_Region& (*region)(const kinC_Interaction& interaction);
+    int kinds;
+};
+
+#define QRX_REGION(Class, member, kinds)                                                                     \
+    RegionRule {                                                                                             \
+        Class::TypeId, "/" #member,                                                                          \
+            [](const kinC_Interaction& interaction) -> const rgnC_Region& {                                  \
+                return static_cast<const Class&>(interaction).member;                                        \
+            },                                                                                               \
+            kinds                                                                                            \
+    }
+
+// The rules of the first class that fits hold.
+constexpr RegionRule kRegionRules[] = {
+    QRX_REGION(kinC_SurfaceToSurfaceContact, master, kSurface),
+    QRX_REGION(kinC_SurfaceToSurfaceContact, slave, kEither),
+    QRX_REGION(kinC_SelfContact, surface, kEither),
+    QRX_REGION(kinC_ConcFilmCondition, surface, kNodeSet),
+    QRX_REGION(kinC_FilmCondition, surface, kSurface),
+    QRX_REGION(kinC_ConcRadiationToAmbient, surface, kNodeSet),
+    QRX_REGION(kinC_RadiationToAmbient, surface, kSurface),
+    QRX_REGION(kinC_AcousticImpedance, surface, kSurface),
+    QRX_REGION(kinC_IncidentWave, source, kNodeSet),
+    QRX_REGION(kinC_IncidentWave, standoff, kNodeSet),
+    QRX_REGION(kinC_IncidentWave, surface, kSurface),
+};
+
+#undef QRX_REGION
 
 bool IsOneOf(unsigned typeId, std::initializer_list<unsigned> ids) {
     return std::find(ids.begin(), ids.end(), typeId) != ids.end();
@@ -63,65 +99,53 @@ private:
                     {kinC_ConcFilmCondition::TypeId(), kinC_AcousticImpedance::TypeId(),
                      kinC_IncidentWave::TypeId()}) &&
             model_.steps.Size() > 1) {
-            Add("", "writing fails with \"\"Unimplemented interaction->statusKey conversion\" == 0\": no deck "
-                    "with an analysis step can have the interaction");
+            Add("",
+                "writing fails with \"\"Unimplemented interaction->statusKey conversion\" == 0\": no deck "
+                "with an analysis step can have the interaction");
         }
         if (interaction_.DynTypeId() != kinC_CavityRadiation::TypeId()) return;
         ForEachAnalysisStep([&](const cow_String& step) {
             if (interaction_.GetPropStatus(step) <= Status::INSTANCE_NOT_APPLICABLE) return;
-            Add("", "writing fails with \"Error in cavity radiation history status.\": the cavity radiates in "
-                    "step " + Quoted(step) + ", which builds on its base state");
+            Add("",
+                "writing fails with \"Error in cavity radiation history status.\": the cavity radiates in "
+                "step " +
+                    Quoted(step) + ", which builds on its base state");
         });
     }
 
-    void CheckRegion(const std::string& member, const rgnC_Region& region, std::initializer_list<int> kinds) {
+    void CheckRegion(const std::string& member, const rgnC_Region& region, int kinds) {
+        const std::string needed = kinds == kNodeSet   ? "a node set"
+                                   : kinds == kSurface ? "a surface"
+                                                       : "a surface or a node set";
         if (!region.HasValue()) {
-            Add(member, "there is no region");
-            return;
+            Add(member, "found nothing, needed is " + needed);
+        } else if ((region.FlagWord() & kinds) == 0) {
+            Add(member, "found " + Quoted(region.SetName()) + ", which is " + KindOf(region) +
+                            "; needed is " + needed);
         }
-        if (std::find(kinds.begin(), kinds.end(), region.FlagWord()) != kinds.end()) return;
-        const bool takesNodes = *kinds.begin() == NODE_SET;
-        Add(member, Quoted(region.SetName()) + " is " +
-                        (region.FlagWord() == NODE_SET  ? "a node set"
-                         : region.FlagWord() == SURFACE ? "a surface"
-                                                        : "an element set") +
-                        (takesNodes ? ", a node set is needed"
-                         : kinds.size() > 1 ? ", a surface or a node set is needed"
-                                            : ", a surface is needed"));
     }
 
     void CheckRegions() {
-        const kinC_Interaction& interaction = interaction_;
-        const auto as = [&]<class T>(const T*) { return nex_canDynamicCastPtr<T>(&interaction); };
-        if (const auto* contact = as(static_cast<const kinC_SurfaceToSurfaceContact*>(nullptr))) {
-            // A master needs faces.
-            CheckRegion("/master", contact->master, {SURFACE});
-            CheckRegion("/slave", contact->slave, {SURFACE, NODE_SET});
-        } else if (const auto* self = as(static_cast<const kinC_SelfContact*>(nullptr))) {
-            CheckRegion("/surface", self->surface, {SURFACE, NODE_SET});
-        } else if (const auto* film = as(static_cast<const kinC_FilmCondition*>(nullptr))) {
-            CheckRegion("/surface", film->surface,
-                        {film->DynTypeId() == kinC_FilmCondition::TypeId() ? SURFACE : NODE_SET});
-        } else if (const auto* radiation = as(static_cast<const kinC_RadiationToAmbient*>(nullptr))) {
-            CheckRegion("/surface", radiation->surface,
-                        {radiation->DynTypeId() == kinC_RadiationToAmbient::TypeId() ? SURFACE : NODE_SET});
-        } else if (const auto* impedance = as(static_cast<const kinC_AcousticImpedance*>(nullptr))) {
-            CheckRegion("/surface", impedance->surface, {SURFACE});
-        } else if (const auto* wave = as(static_cast<const kinC_IncidentWave*>(nullptr))) {
-            CheckRegion("/source", wave->source, {NODE_SET});
-            CheckRegion("/standoff", wave->standoff, {NODE_SET});
-            CheckRegion("/surface", wave->surface, {SURFACE});
-        } else if (const auto* cavity = as(static_cast<const kinC_CavityRadiation*>(nullptr))) {
+        const RegionRule* first = nullptr;
+        for (const RegionRule& rule : kRegionRules) {
+            if (!cls_Classes().InheritanceCheck(interaction_.DynTypeId(), rule.typeId())) continue;
+            if (first == nullptr) first = &rule;
+            if (rule.typeId() == first->typeId())
+                CheckRegion(rule.member, rule.region(interaction_), rule.kinds);
+        }
+        if (const auto* cavity = nex_canDynamicCastPtr<kinC_CavityRadiation>(&interaction_)) {
             for (int i = 0; i < cavity->surfaces.Length(); ++i) {
-                CheckRegion("/surfaces/" + std::to_string(i), cavity->surfaces[i], {SURFACE});
+                CheckRegion("/surfaces/" + std::to_string(i), cavity->surfaces[i], kSurface);
             }
         }
     }
 
     void CheckPair(const kinC_ContactPair& pair) {
-        const bool isExplicitJob = AnalysisProductOf(model_) != kprC_AnalysisProductEnm::IMPLICIT;
-        const bool isExplicitPair = IsOneOf(pair.DynTypeId(), {kinC_SurfaceToSurfaceContactXpl::TypeId(),
-                                                               kinC_SelfContactXpl::TypeId()});
+        const bool isExplicitJob =
+            ddb_DdbStepContainer::AnalysisProductOf(model_.steps, model_.analysisProduct) !=
+            kprC_AnalysisProductEnm::IMPLICIT;
+        const bool isExplicitPair = IsOneOf(
+            pair.DynTypeId(), {kinC_SurfaceToSurfaceContactXpl::TypeId(), kinC_SelfContactXpl::TypeId()});
         if (isExplicitJob != isExplicitPair) {
             Add("", isExplicitPair ? "contact of the explicit solver in a job for the implicit one"
                                    : "contact of the implicit solver in a job for the explicit one");
@@ -155,6 +179,6 @@ private:
 void FindInteractionProblems(const odiK_Model& model, std::vector<ModelFinding>& findings) {
     for (kprC_PropagatingContainerIT<kinC_Interaction> it(model.interactions); !it.IsDone(); it.Next()) {
         if (it.CurrentValue().suppressed) continue;
-        Check(model, PlaceOf("interactions", it.CurrentKey()), it.CurrentValue(), findings).Run();
+        Check(model, Place("interactions", it.CurrentKey()), it.CurrentValue(), findings).Run();
     }
 }

@@ -6,6 +6,7 @@
 #include "store_interface/records/interactions/kinC_CyclicSymmetry.h"
 #include "store_interface/records/interactions/kinC_WaveInteractions.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
+#include "tools/TextTable.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -172,7 +173,8 @@ Found OfClass(const odb_Odb&, const odiK_Model& model) {
     std::vector<std::string> names;
     for (mdl_RepositoryIT it(model.*Member); !it.IsDone(); it.Next()) {
         const cls_Record& record = it.CurrentRecord();
-        if (record.DynTypeId() == T::TypeId() && !IsSuppressed(record)) names.push_back(Text(it.CurrentKey()));
+        if (record.DynTypeId() == T::TypeId() && !IsSuppressed(record))
+            names.push_back(Text(it.CurrentKey()));
     }
     return Named(std::move(names));
 }
@@ -208,7 +210,8 @@ constexpr LeftOutRule kLeftOutRules[] = {
      [](const odb_Odb&, const odiK_Model& model) { return IdleOptions(model, true); }},
     {"incident wave properties", "they are not written",
      OfClass<kinC_IncidentWaveProperty, &odiK_Model::interactionProperties>},
-    {"elastic foundations", "they have no keyword", OfClass<kinC_ElasticFoundation, &odiK_Model::interactions>},
+    {"elastic foundations", "they have no keyword",
+     OfClass<kinC_ElasticFoundation, &odiK_Model::interactions>},
     {"control elements", "they are not written", OfClass<kinC_ActuatorSensor, &odiK_Model::interactions>},
     {"properties of control elements", "they are not written",
      OfClass<kinC_ActuatorSensorProp, &odiK_Model::interactionProperties>},
@@ -297,37 +300,6 @@ ordered_json DescribeSteps(const kprC_StepContainer& steps) {
     }
     return list;
 }
-
-/// Columns of text, all but the last as wide as their widest cell. Widths count characters, not bytes.
-class TextTable {
-public:
-    void Row(std::vector<std::string> cells) { rows_.push_back(std::move(cells)); }
-    std::string Text(const std::string& indent) const {
-        std::vector<std::size_t> widths;
-        for (const auto& row : rows_) {
-            widths.resize(std::max(widths.size(), row.size()));
-            for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], Width(row[i]));
-        }
-        std::string text;
-        for (const auto& row : rows_) {
-            text += indent;
-            for (std::size_t i = 0; i < row.size(); ++i) {
-                text += row[i];
-                if (i + 1 < row.size()) text.append(widths[i] - Width(row[i]) + 2, ' ');
-            }
-            text += "\n";
-        }
-        return text;
-    }
-
-private:
-    static std::size_t Width(const std::string& cell) {
-        return static_cast<std::size_t>(std::count_if(
-            cell.begin(), cell.end(), [](char c) { return (static_cast<unsigned char>(c) & 0xC0) != 0x80; }));
-    }
-
-    std::vector<std::vector<std::string>> rows_;
-};
 
 std::string NumberText(double value) {
     char text[32];

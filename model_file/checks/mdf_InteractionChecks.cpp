@@ -23,8 +23,8 @@ std::string Count(int count, const char* singular) {
 void WarnOfColumns(mdf_RecordCheck& check, const char* field, const cow_2DArray<double>& table,
                    long long least, long long most) {
     if (table.IsEmpty() || (table.NumColumns() >= least && table.NumColumns() <= most)) return;
-    std::string text = "found rows of " + std::to_string(table.NumColumns()) + ", where the flags stand for " +
-                       std::to_string(least);
+    std::string text = "found rows of " + std::to_string(table.NumColumns()) +
+                       ", where the flags stand for " + std::to_string(least);
     if (most > least) text += " or " + std::to_string(most);
     check.Warning(field, text);
 }
@@ -33,7 +33,8 @@ void CheckPair(const kinC_SurfaceToSurfaceContact& contact, mdf_RecordCheck& che
     const bool isGiven = contact.initialClearance != kinC_SurfaceToSurfaceContact::initialClearanceDef() &&
                          contact.initialClearance != std::numeric_limits<double>::min();
     if (contact.clearanceType == kinC_ClearanceTypeEnm::SINGLE_VALUE && !isGiven) {
-        check.Error("initialClearance", "found nothing, expected the clearance of clearanceType SINGLE_VALUE");
+        check.Error("initialClearance",
+                    "found nothing, expected the clearance of clearanceType SINGLE_VALUE");
     }
 }
 
@@ -108,8 +109,11 @@ struct PairList {
 
 #define QRX_PAIR_LIST(states, pairs)                                                                         \
     PairList {                                                                                               \
-#states, #pairs, [](const kinC_ContactExpState& state) { return state.states.Length(); },            \
-            [](const kinC_ContactExp& contact) { return contact.pairs.Length(); }                            \
+#states, #pairs,                                                                                     \
+            [](const kinC_ContactExpState&                                                                   \
+                   state) { return state.states.Length(); },                                                 \
+                                                          [](const kinC_ContactExp&                          \
+                                                                 contact) { return contact.pairs.Length(); } \
     }
 
 constexpr PairList kPairLists[] = {
