@@ -3,14 +3,12 @@
 #include "model_file/checks/mdf_RecordChecks.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
-#include "store_interface/records/interactions/kinC_ContactControls.h"
 #include "store_interface/records/interactions/kinC_ContactExp.h"
 #include "store_interface/records/interactions/kinC_ContactProperty.h"
 #include "store_interface/records/interactions/kinC_FilmAndRadiation.h"
 #include "store_interface/records/interactions/kinC_WaveInteractions.h"
 
 #include <algorithm>
-#include <limits>
 
 namespace {
 
@@ -30,9 +28,8 @@ void WarnOfColumns(mdf_RecordCheck& check, const char* field, const cow_2DArray<
 }
 
 void CheckPair(const kinC_SurfaceToSurfaceContact& contact, mdf_RecordCheck& check) {
-    const bool isGiven = contact.initialClearance != kinC_SurfaceToSurfaceContact::initialClearanceDef() &&
-                         contact.initialClearance != std::numeric_limits<double>::min();
-    if (contact.clearanceType == kinC_ClearanceTypeEnm::SINGLE_VALUE && !isGiven) {
+    if (contact.clearanceType == kinC_ClearanceTypeEnm::SINGLE_VALUE &&
+        contact.initialClearance == kinC_SurfaceToSurfaceContact::initialClearanceDef()) {
         check.Error("initialClearance",
                     "found nothing, expected the clearance of clearanceType SINGLE_VALUE");
     }
@@ -163,7 +160,4 @@ void mdf_AddInteractionChecks(mdf_RecordChecks& checks) {
     checks.Add<kinC_ThermalConductance>(CheckConductance);
     checks.Add<kinC_FilmConditionProp>(CheckFilmProperty);
     checks.Add<kinC_AcousticImpedanceProp>(CheckImpedanceProperty);
-    checks.Add<kinC_StdContactControls>([](const kinC_StdContactControls& controls, mdf_RecordCheck& check) {
-        check.NotNegative("maxchp", controls.maxchp);
-    });
 }
