@@ -72,11 +72,11 @@ public:
         : model_(model), place_(place), interaction_(interaction), findings_(findings) {}
 
     void Run() {
+        CheckFailures();
         if (!IsBegun()) {
             Add("", "no step begins the interaction");
             return;
         }
-        CheckFailures();
         CheckRegions();
         const auto* pair = nex_canDynamicCastPtr<kinC_ContactPair>(&interaction_);
         if (pair != nullptr) CheckPair(*pair);
