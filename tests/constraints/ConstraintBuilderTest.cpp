@@ -9,9 +9,9 @@ public:
     static constexpr cls_ClassInfo Class{"TestUnknownConstraint", "a constraint that no keyword tells"};
 };
 
-class Constraints : public testing::Test {
+class ConstraintBuilder : public testing::Test {
 protected:
-    Constraints() {
+    ConstraintBuilder() {
         odiK_Part& part = store.AddPart("P", {1, 2});
         part.mesh->AddNodeSet("N", {1, 2});
         store.model.AddInstance("I", "P");
@@ -40,13 +40,13 @@ constexpr int kExplicit = 1;
 
 } // namespace
 
-TEST_F(Constraints, NoConstraint_HasNoBannerEither) {
+TEST_F(ConstraintBuilder, NoConstraint_HasNoBannerEither) {
     Build();
     EXPECT_EQ(model, "");
     EXPECT_EQ(assembly, "");
 }
 
-TEST_F(Constraints, Constraints_StandInTheOrderOfTheirNamesEachBehindItsComment) {
+TEST_F(ConstraintBuilder, Constraints_StandInTheOrderOfTheirNamesEachBehindItsComment) {
     kcoC_Coupling coupling;
     coupling.surface = coupling.refNode = store.model.Region("I", "N");
     store.model.constraints.Insert("d", coupling);
@@ -80,13 +80,13 @@ TEST_F(Constraints, Constraints_StandInTheOrderOfTheirNamesEachBehindItsComment)
               "** Constraint: g\n*Equation\n0\n");
 }
 
-TEST_F(Constraints, RigidBody_WithoutRegions_HasOnlyAnEmptyReferenceNode) {
+TEST_F(ConstraintBuilder, RigidBody_WithoutRegions_HasOnlyAnEmptyReferenceNode) {
     store.model.constraints.Insert("r", kcoC_RigidBody());
     Build();
     EXPECT_EQ(assembly, "** Constraint: r\n*Rigid Body, ref node=\n");
 }
 
-TEST_F(Constraints, CyclicModel_IsToldInTheModelAndAtItsTies) {
+TEST_F(ConstraintBuilder, CyclicModel_IsToldInTheModelAndAtItsTies) {
     MakeCyclic();
     store.model.constraints.Insert("plain", tie);
     tie.cyclicSymmetry = true;
@@ -98,7 +98,7 @@ TEST_F(Constraints, CyclicModel_IsToldInTheModelAndAtItsTies) {
                         "I_N_CNS_, I_N_CNS_\n");
 }
 
-TEST_F(Constraints, CyclicTieOfAModelThatIsNot_IsAPlainTie) {
+TEST_F(ConstraintBuilder, CyclicTieOfAModelThatIsNot_IsAPlainTie) {
     tie.cyclicSymmetry = true;
     store.model.constraints.Insert("t", tie);
     Build();
@@ -106,13 +106,13 @@ TEST_F(Constraints, CyclicTieOfAModelThatIsNot_IsAPlainTie) {
     EXPECT_EQ(assembly, "** Constraint: t\n*Tie, name=t, adjust=yes\nI_N_CNS_, I_N_CNS_\n");
 }
 
-TEST_F(Constraints, CyclicModelInAnExplicitAnalysis_Raises) {
+TEST_F(ConstraintBuilder, CyclicModelInAnExplicitAnalysis_Raises) {
     MakeCyclic();
     store.model.analysisProduct = kExplicit;
     EXPECT_EQ(Raised([this] { Build(); }), "Cyclic symmetry is not valid for Explicit.");
 }
 
-TEST_F(Constraints, UnknownConstraint_Raises) {
+TEST_F(ConstraintBuilder, UnknownConstraint_Raises) {
     store.model.constraints.Insert("u", Unknown());
     EXPECT_EQ(Raised([this] { Build(); }), "Unimplemented constraint type.");
 }

@@ -11,8 +11,8 @@ protected:
         part.mesh->AddElements("S4R", {1}, 4, {1, 2, 3, 4});
         part.mesh->AddNodeSet("N", {1, 2});
         part.mesh->AddElementSet("E 1", {1});
-        part.mesh->AddSurface("S", {{1, 1, {}}});
-        part.mesh->AddSurface("T", {{1, 2, {}}});
+        part.mesh->AddSurface("S", {{1, -1, "SPOS"}});
+        part.mesh->AddSurface("T", {{1, -1, "SNEG"}});
         store.model.AddInstance("I", "P");
     }
     rgnC_Region Region(const char* set) { return store.model.Region("I", set); }
