@@ -1,7 +1,7 @@
 #include "store_interface/records/conditions/kbcC_BC.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
-#include "store_interface/records/conditions/kloC_Load.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
 #include "store_interface/records/conditions/kpfC_Field.h"
 
 const omu_EnumTable& omu_EnumTableOf(kbcC_BC::DistribTypeEnum) {
@@ -79,6 +79,7 @@ void cls_RegisterConditionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kbcC_BC>();
     registrar.Add<kloC_LoadState>();
     registrar.Add<kloC_Load>();
+    cls_RegisterBoltLoadRecords(registrar);
     registrar.Add<kpfC_FieldState>();
     registrar.Add<kpfC_Field>();
 }

@@ -1,0 +1,117 @@
+#ifndef QRX_OIF_OPSTATUS_H
+#define QRX_OIF_OPSTATUS_H
+
+#include "keyword_layer/qkw_ModelInfo.h"
+
+#include <span>
+
+/// Which keyword families are written with ", op=NEW" in which steps. A keyword without it adds to what the
+/// steps before said and changes it; one with it wipes out all earlier definitions of its family, so that
+/// everything that goes on has to be said again. A builder configures its status once, before it makes any
+/// keyword; no flag is ever taken back.
+class oif_OpStatus {
+public:
+    virtual ~oif_OpStatus() = default;
+
+    /// Whether the family of the class is written with ", op=NEW" in the step. A class without a family and
+    /// an unknown step raise.
+    bool OpNew(unsigned int typeId, const cow_String& stepName) const;
+    /// Sets the flags of all families in the step; an index behind the last step is passed over.
+    void ForceOpNew(int stepIndex);
+
+protected:
+    oif_OpStatus() = default;
+    oif_OpStatus(const oif_OpStatus&) = default;
+    oif_OpStatus& operator=(const oif_OpStatus&) = default;
+
+    struct KeyRow {
+        unsigned typeId;
+        int key;
+    };
+    /// The family of the class; raises the text if no row has it.
+    static int FindKey(std::span<const KeyRow> rows, unsigned typeId, const char* failure);
+
+    void InitializeMembers(const cow_List<cow_String>& steps, int numberOfKeys);
+    void SetFlag(int key, int stepIndex) { opNewFlags.Get(key).Put(stepIndex, 1); }
+    /// Sets the flag of each object's family at the steps behind the initial one for which `test` holds;
+    /// `kind` is what messages call them.
+    template <class T, class Test>
+    void SetFlagsWhere(const char* kind, const kprC_PropagatingContainer<T>& objects, const Test& test) {
+        for (kprC_PropagatingContainerIT<T> it(objects); !it.IsDone(); it.Next()) {
+            const T& object = it.CurrentValue();
+            const nex_Context context(kind, it.CurrentKey());
+            for (int i = 1; i < stepNames.Length(); ++i) {
+                if (test(object, stepNames[i])) SetFlag(Key(object.DynTypeId()), i);
+            }
+        }
+    }
+
+    cow_List<cow_String> stepNames;
+    cow_Map<int, cow_List<int>> opNewFlags;
+
+private:
+    /// The family of a class of objects.
+    virtual int Key(unsigned int typeId) const = 0;
+
+    cow_Map<cow_String, int> stepIndices_;
+};
+
+/// "*Boundary" and "*Connector Motion".
+class oif_BCOpStatus final : public oif_OpStatus {
+public:
+    oif_BCOpStatus() = default;
+    void Configure(const kprC_PropagatingContainer<kbcC_BC>& bcs,
+                   const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps);
+    /// Whether the condition is written in the step: in each load case that takes it, or without load cases
+    /// in the step itself.
+    bool Writes(const kbcC_BC& bc, const cow_String& stepName, bool inLoadCase) const;
+
+private:
+    void PopulateMembers(const kprC_PropagatingContainer<kbcC_BC>& bcs,
+                         const kprC_PropagatingContainer<kloC_Load>& loads);
+    int Key(unsigned int typeId) const override;
+};
+
+/// The families of load keywords.
+class oif_LoadOpStatus final : public oif_OpStatus {
+public:
+    oif_LoadOpStatus() = default;
+    void Configure(const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps,
+                   const qkw_ModelInfo& modelInfo);
+    /// Whether the load is written in the step.
+    bool Writes(const kloC_Load& load, const cow_String& stepName) const;
+
+private:
+    void PopulateMembers(const kprC_PropagatingContainer<kloC_Load>& loads);
+    /// Two loads of one family on one region can't be told apart by keywords that add and change.
+    void ResolveOverlapRegions(const kprC_PropagatingContainer<kloC_Load>& loads,
+                               const qkw_ModelInfo& modelInfo);
+    int Key(unsigned int typeId) const override;
+};
+
+/// Predefined fields, each kind a family of its own.
+class oif_FieldOpStatus final : public oif_OpStatus {
+public:
+    oif_FieldOpStatus() = default;
+    void Configure(const kprC_PropagatingContainer<kpfC_Field>& fields, const cow_List<cow_String>& steps);
+    /// Whether the field is written in the step.
+    bool Writes(const kpfC_Field& field, const cow_String& stepName) const;
+
+private:
+    void PopulateMembers(const kprC_PropagatingContainer<kpfC_Field>& fields);
+    int Key(unsigned int typeId) const override;
+};
+
+/// The interactions that are ended and begun by op=NEW: concentrated film and its like.
+class oif_InteractionOpStatus final : public oif_OpStatus {
+public:
+    oif_InteractionOpStatus() = default;
+    void Configure(const kprC_PropagatingContainer<kinC_Interaction>& interactions,
+                   const cow_List<cow_String>& steps);
+
+private:
+    void PopulateMembers(const kprC_PropagatingContainer<kinC_Interaction>& interactions);
+    int Key(unsigned int typeId) const override;
+};
+
+#endif
