@@ -60,7 +60,7 @@ public:
     const cow_String& Name() const { return name; }
     PrintEnm Print() const { return print; }
     LocationEnm Location() const { return location; }
-    bool HasIdentifiers() const { return !componentDeckIds.IsEmpty() || !deckId.IsEmpty(); }
+    bool HasIdentifiers() const { return componentDeckIds.Count() > 0 || !deckId.IsEmpty(); }
     /// What decks call the variable or its component.
     cow_String InputFileIdentifier(const cow_String& variable) const;
     bool IsAllowed(unsigned stepType) const;
