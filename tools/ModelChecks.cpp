@@ -7,24 +7,13 @@
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "tools/InteractionChecks.h"
 
 #include <algorithm>
 #include <map>
 #include <optional>
 #include <set>
 #include <string_view>
-
-namespace {
-
-using Findings = std::vector<ModelFinding>;
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
-
-std::string Quoted(const cow_String& name) {
-    return "'" + Text(name) + "'";
-}
 
 std::string Place(const char* container, const cow_String& name) {
     std::string place = std::string("/") + container + "/";
@@ -38,6 +27,26 @@ std::string Place(const char* container, const cow_String& name) {
         }
     }
     return place;
+}
+
+const char* KindOf(const rgnC_Region& region) {
+    switch (region.FlagWord()) {
+    case 1: return "a node set";
+    case 2: return "an element set";
+    default: return "a surface";
+    }
+}
+
+namespace {
+
+using Findings = std::vector<ModelFinding>;
+
+std::string Text(const cow_String& text) {
+    return std::string(text.View());
+}
+
+std::string Quoted(const cow_String& name) {
+    return "'" + Text(name) + "'";
 }
 
 std::string Elements(int count) {
@@ -226,14 +235,6 @@ void FindSectionsOfMeshes(const odiK_Model& model, Findings& findings) {
     }
 }
 
-const char* KindOf(const rgnC_Region& region) {
-    switch (region.FlagWord()) {
-    case 1: return "a node set";
-    case 2: return "an element set";
-    default: return "a surface";
-    }
-}
-
 /// The names of the model's element sets, as lists of sets refer to them.
 std::set<std::string> ElementSetsOf(const odiK_Model& model) {
     std::set<std::string> names;
@@ -302,5 +303,6 @@ std::vector<ModelFinding> FindingsOf(const odiK_Model& model) {
     FindSectionsOfMeshes(model, findings);
     FindIdleMaterials(model, findings);
     FindOnConditions(model, findings);
+    FindInteractionProblems(model, findings);
     return findings;
 }

@@ -2,6 +2,9 @@
 
 #include "model_file/checks/mdf_MaterialChecks.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/interactions/kinC_ActuatorSensor.h"
+#include "store_interface/records/interactions/kinC_CyclicSymmetry.h"
+#include "store_interface/records/interactions/kinC_WaveInteractions.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
 #include "tools/TextTable.h"
 
@@ -164,11 +167,14 @@ Found SurfaceElements(const odb_Odb&, const odiK_Model& model) {
     return {CountMeshes(model).surfaceElements, {}};
 }
 
-Found IncidentWaveProperties(const odb_Odb&, const odiK_Model& model) {
+/// The objects of class T that are not suppressed.
+template <class T, auto Member>
+Found OfClass(const odb_Odb&, const odiK_Model& model) {
     std::vector<std::string> names;
-    for (mdl_RepositoryIT it(model.interactionProperties); !it.IsDone(); it.Next()) {
-        const cow_String className = cls_Classes().NameOf(it.CurrentRecord().DynTypeId());
-        if (className == "kinC_IncidentWaveProperty") names.push_back(Text(it.CurrentKey()));
+    for (mdl_RepositoryIT it(model.*Member); !it.IsDone(); it.Next()) {
+        const cls_Record& record = it.CurrentRecord();
+        if (record.DynTypeId() == T::TypeId() && !IsSuppressed(record))
+            names.push_back(Text(it.CurrentKey()));
     }
     return Named(std::move(names));
 }
@@ -202,7 +208,13 @@ constexpr LeftOutRule kLeftOutRules[] = {
      [](const odb_Odb&, const odiK_Model& model) { return IdleOptions(model, false); }},
     {"other options of gasket materials", "a gasket behaviour has no place for them",
      [](const odb_Odb&, const odiK_Model& model) { return IdleOptions(model, true); }},
-    {"incident wave properties", "they are not written", IncidentWaveProperties},
+    {"incident wave properties", "they are not written",
+     OfClass<kinC_IncidentWaveProperty, &odiK_Model::interactionProperties>},
+    {"elastic foundations", "they have no keyword",
+     OfClass<kinC_ElasticFoundation, &odiK_Model::interactions>},
+    {"control elements", "they are not written", OfClass<kinC_ActuatorSensor, &odiK_Model::interactions>},
+    {"properties of control elements", "they are not written",
+     OfClass<kinC_ActuatorSensorProp, &odiK_Model::interactionProperties>},
     {"time points", "their points are not written",
      [](const odb_Odb&, const odiK_Model& model) { return Named(NamesIn(model.timePoints)); }},
     {"adaptive mesh controls", "they are not written",

@@ -1,9 +1,10 @@
 #include "store_interface/model/ddb_Model.h"
 
-kprC_AnalysisProductEnm ddb_DdbStepContainer::AnalysisProduct() const {
-    if (analysisProduct_ != cls_UnsetInt) return static_cast<kprC_AnalysisProductEnm>(analysisProduct_);
-    for (int i = 1; i < size(); ++i) {
-        if (container().StepAt(i).Explicit()) return kprC_AnalysisProductEnm::EXPLICIT;
+kprC_AnalysisProductEnm ddb_DdbStepContainer::AnalysisProductOf(const kprC_StepContainer& steps,
+                                                                int analysisProduct) {
+    if (analysisProduct != cls_UnsetInt) return static_cast<kprC_AnalysisProductEnm>(analysisProduct);
+    for (int i = 1; i < steps.Size(); ++i) {
+        if (steps.StepAt(i).Explicit()) return kprC_AnalysisProductEnm::EXPLICIT;
     }
     return kprC_AnalysisProductEnm::IMPLICIT;
 }

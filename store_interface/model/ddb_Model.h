@@ -48,7 +48,10 @@ public:
         : ddb_Container(model, model->steps), analysisProduct_(analysisProduct) {}
     int size() const { return container().Size(); }
     /// The model's own when it is set; else EXPLICIT when a step behind the first is explicit, else IMPLICIT.
-    kprC_AnalysisProductEnm AnalysisProduct() const;
+    kprC_AnalysisProductEnm AnalysisProduct() const {
+        return AnalysisProductOf(container(), analysisProduct_);
+    }
+    static kprC_AnalysisProductEnm AnalysisProductOf(const kprC_StepContainer& steps, int analysisProduct);
     ddb_DdbStepIT createIterator() const { return ddb_DdbStepIT(container()); }
 
 private:

@@ -197,11 +197,12 @@ public:
     }
 
 protected:
+    bool KnowsStep(const cow_String& stepName) const { return steps_.IsMember(stepName); }
     /// Puts a copy of the state in the place of the step's; no status changes. An unknown step raises.
     void ReplaceState(const cow_String& stepName, const S& state) {
         const int index = steps_.IndexOf(stepName);
         if (index < 0) this->RaiseNoSuchStep(stepName);
-        auto& replaced = states_[static_cast<std::size_t>(index)];
+        auto& replaced = states_.Get()[static_cast<std::size_t>(index)];
         replaced.state = mdl_ObjCow<S>(state);
         replaced.hasState = true;
     }

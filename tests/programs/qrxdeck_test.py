@@ -273,7 +273,7 @@ class Refusals(ProgramTest):
     def test_UnknownCommand_IsNamed(self):
         self.assert_refused(self.run_program("wirte", "model.json"), 2,
                             "qrxdeck: error: there is no command 'wirte'; "
-                            "the commands are write, check, info and schema\n"
+                            "the commands are write, check, info, variables and schema\n"
                             "Run with --help for more information.\n")
 
     def test_WrongUsage_IsToldInJson(self):
@@ -396,6 +396,42 @@ class WrongDatum(ProgramTest):
                          ["Wrong datum type during input generation", "orientation 'Corner'"])
         self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
         self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+    def test_InteractionsWhoseFamilyCannotBeEnded_FailWithTheTextOfAnAssertion(self):
+        for name in ["kinC_ConcFilmCondition", "kinC_AcousticImpedance", "kinC_IncidentWave"]:
+            with self.subTest(interaction=name):
+                def add(model, name=name):
+                    model["steps"].append({"name": "Heat", "class": "kprC_HeatTransferStep"})
+                    model["interactions"] = {"Edge": {"class": name, "states": {"Heat": {}}}}
+                self.put("model.json", changed(add))
+                (self.folder / "model.inp").write_bytes(OLD_DECK)
+                run = self.run_program("write", "model.json")
+                self.assertEqual((run.returncode, run.output), (4, ""))
+                self.assertEqual(run.errors.splitlines(),
+                                 ['"Unimplemented interaction->statusKey conversion" == 0',
+                                  "step 'Heat', interaction 'Edge'"])
+                self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
+                self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+                check = self.run_program("check", "model.json")
+                self.assertEqual(check.returncode, 0)
+                self.assertIn("/interactions/Edge: writing fails with", check.errors)
+
+    def test_InteractionsThatNoDeckCarries_AreToldAsLeftOut(self):
+        self.put("model.json", changed(lambda model: model.update(
+            interactionProperties={"Wave": {"class": "kinC_IncidentWaveProperty"},
+                                   "Code": {"class": "kinC_ActuatorSensorProp"}},
+            interactions={"Bed": {"class": "kinC_ElasticFoundation", "states": {"Initial": {}}},
+                          "Off": {"class": "kinC_ElasticFoundation", "suppressed": True},
+                          "Valve": {"class": "kinC_ActuatorSensor", "states": {"Initial": {}}}})))
+        run = self.run_program("write", "model.json")
+        self.assertEqual(run.returncode, 0)
+        left_out = run.output[run.output.index("left out"):].splitlines()[1:]
+        self.assertEqual([" ".join(line.split()) for line in left_out], [
+            "1 incident wave properties (they are not written): Wave",
+            "1 elastic foundations (they have no keyword): Bed",
+            "1 control elements (they are not written): Valve",
+            "1 properties of control elements (they are not written): Code",
+            "1 suppressed objects (they are suppressed): Off"])
 
 
 class Signals(ProgramTest):

@@ -12,13 +12,19 @@
 
 bool kinC_Interaction::HasStep(const cow_String& stepName) const {
     // IsActive() knows status 14 too, which interactions never have.
-    return IsActive(Status(stepName)) && Status(stepName) != mdl_PropagationStatusEnm::FIELD_PROPAGATED;
+    const mdl_PropagationStatusEnm status = GetPropStatus(stepName);
+    return IsActive(status) && status != mdl_PropagationStatusEnm::FIELD_PROPAGATED;
 }
 
 bool kinC_Interaction::IsModified(const cow_String& stepName) const {
-    const mdl_PropagationStatusEnm status = Status(stepName);
+    const mdl_PropagationStatusEnm status = GetPropStatus(stepName);
     return status == mdl_PropagationStatusEnm::CREATED || status == mdl_PropagationStatusEnm::MODIFIED ||
            status == mdl_PropagationStatusEnm::DEACTIVATED;
+}
+
+const kinC_InteractionState& kinC_Interaction::DefaultState() const {
+    static const kinC_InteractionState state;
+    return state;
 }
 
 void kinC_Interaction::Insert(const cow_String& stepName, const kinC_InteractionState& state) {

@@ -17,9 +17,14 @@ public:
     static constexpr cls_ClassInfo Class{"kinC_Interaction", "contact or another interaction", 0x2A00010};
 
     mdl_PropagationFamilyEnm Family() const override { return mdl_PropagationFamilyEnm::INTERACTION; }
-    mdl_PropagationStatusEnm GetPropStatus(const cow_String& stepName) const { return Status(stepName); }
+    /// The status in the step; 0 for a step that is not there.
+    mdl_PropagationStatusEnm GetPropStatus(const cow_String& stepName) const {
+        return KnowsStep(stepName) ? Status(stepName) : mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
+    }
+    /// The state in the step; a default one for a step that is not there, such as the creating step of an
+    /// interaction that no step creates.
     const kinC_InteractionState& ConstGetState(const cow_String& stepName) const {
-        return ConstGetStateQuad(stepName).state.ConstGet();
+        return KnowsStep(stepName) ? ConstGetStateQuad(stepName).state.ConstGet() : DefaultState();
     }
     /// Whether it is in force in the step: status 1, 2, 3, 8, 9 or 10.
     bool HasStep(const cow_String& stepName) const;
@@ -32,6 +37,8 @@ public:
     cow_List<rgnC_Region> ConstGetContactNodeSets() const;
 
 protected:
+    /// A state as new, of the state class.
+    virtual const kinC_InteractionState& DefaultState() const;
     /// The surfaces that its contact keywords name, in declared order.
     virtual cow_List<rgnC_Region> ContactSurfaces() const { return {}; }
 };
@@ -44,6 +51,12 @@ public:
         return static_cast<const State&>(kinC_Interaction::ConstGetState(stepName));
     }
     cls_Record* NewState(unsigned) const override { return new State(); }
+
+protected:
+    const kinC_InteractionState& DefaultState() const override {
+        static const State state;
+        return state;
+    }
 };
 
 /// Properties that interactions refer to by name.

@@ -1,0 +1,89 @@
+#include "interactions/oif_ContactControls.h"
+
+#include "deck/oif_KeywordLine.h"
+#include "interactions/oif_InteractionNames.h"
+
+namespace {
+
+void WriteStabilization(utl_Stream& stream, oif_KeywordLine& line, const kinC_StdContactControls& controls) {
+    if (controls.stabilization == 0) return;
+    line.Word("stabilize");
+    if (controls.stabilization == 1) line.Text("=").Text(controls.dampCoef);
+    line.ValueUnless("tangent fraction=", controls.tangFraction, kinC_StdContactControls::tangFractionDef());
+    const bool hasZeroDamping = controls.zeroDampingChoice == 1;
+    if (controls.stabilization != 2 && controls.zeroDampingClearance == 0.0 && !hasZeroDamping) return;
+    stream << endl;
+    if (controls.eosFraction == 0.0) {
+        stream << " , ";
+    } else {
+        stream << controls.eosFraction << ", ";
+    }
+    stream << controls.zeroDampingClearance;
+    if (hasZeroDamping) stream << ", " << controls.zeroDamping;
+}
+
+} // namespace
+
+void oif_ContactControls::Write(utl_Stream& stream) const {
+    if (isNew_ && reset_) return;
+    const kinC_ContactControls& controls = controls_.ConstGet();
+    if (controls.DynTypeId() == kinC_ExpContactControls::TypeId()) {
+        WriteExplicit(stream, static_cast<const kinC_ExpContactControls&>(controls));
+    } else {
+        WriteStandard(stream, static_cast<const kinC_StdContactControls&>(controls));
+    }
+}
+
+void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContactControls& controls) const {
+    using Controls = kinC_ExpContactControls;
+    oif_KeywordLine line(stream, "*Contact Controls, cpset=");
+    line.Text(oif_Name(name_).Printable());
+    if (reset_) {
+        line.Text(", reset").End();
+        return;
+    }
+    const bool given[] = {controls.fastLocalTrk != Controls::fastLocalTrkDef(), controls.globTrkChoice != 0,
+                          controls.scalePenalty != Controls::scalePenaltyDef(),
+                          controls.warpCheckPeriod != Controls::warpCheckPeriodDef(),
+                          controls.warpCutoff != Controls::warpCutoffDef()};
+    // The line may not break ahead of the first one.
+    if (given[0]) line.Text(", fastlocaltrk=").Text(controls.fastLocalTrk ? "YES" : "NO");
+    line.ValueIf(given[1], "globtrkinc=", controls.globTrkInc)
+        .ValueIf(given[2], "scale penalty=", controls.scalePenalty)
+        .ValueIf(given[3], "warp check period=", controls.warpCheckPeriod)
+        .ValueIf(given[4], "warp cut off=", controls.warpCutoff);
+    // What isn't given goes back to its default.
+    const bool all = given[0] && given[1] && given[2] && given[3] && given[4];
+    line.WordIf(!all, "reset").End();
+}
+
+void oif_ContactControls::WriteStandard(utl_Stream& stream, const kinC_StdContactControls& controls) const {
+    using Controls = kinC_StdContactControls;
+    const auto begin = [&] { stream << "*Contact Controls, master=" << master_ << ", slave=" << slave_; };
+    if (!isNew_) {
+        begin();
+        // Former controls end on a line of their own before others begin.
+        stream << ", reset" << endl;
+    }
+    if (reset_ || controls.IsDefault()) return;
+    begin();
+    if (controls.relativeTolerance == 0) {
+        stream << ", absolutePenetrationTolerance=" << controls.absolutePenetrationTolerance;
+    } else if (controls.relativePenetrationTolerance != Controls::relativePenetrationToleranceDef()) {
+        stream << ", relativePenetrationTolerance=" << controls.relativePenetrationTolerance;
+    }
+    oif_KeywordLine line(stream, "");
+    line.ValueUnless("stiffnessScaleFactor=", controls.stiffnessScaleFactor,
+                     Controls::stiffnessScaleFactorDef())
+        .ValueIf(controls.limitSlideDistance, "slideDistance=", controls.slideDistance)
+        .WordIf(controls.delayedFrictionOnset != 0, "frictionOnset=DELAYED");
+    if (controls.automaticTolerances) {
+        line.Word("automaticTolerances");
+    } else {
+        line.ValueUnless("maxchp=", controls.maxchp, Controls::maxchpDef())
+            .ValueUnless("perrmx=", controls.perrmx, Controls::perrmxDef())
+            .ValueUnless("uerrmx=", controls.uerrmx, Controls::uerrmxDef());
+    }
+    WriteStabilization(stream, line, controls);
+    line.End();
+}

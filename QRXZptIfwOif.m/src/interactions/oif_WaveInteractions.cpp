@@ -1,0 +1,113 @@
+#include "interactions/oif_WaveInteractions.h"
+
+#include "interactions/oif_InteractionNames.h"
+#include "materials/oif_MaterialTable.h"
+
+namespace {
+
+constexpr const char* kBoundaryTypes[] = {"PLANAR",    "IMPROVED",   "CIRCULAR",
+                                          "SPHERICAL", "ELLIPTICAL", "PROLATE SPHEROIDAL"};
+enum BoundaryType { CIRCULAR = 2, SPHERICAL = 3, ELLIPTICAL = 4, PROLATE_SPHEROIDAL = 5 };
+enum BubbleModel { CHARGE = 1, DECAY = 2 };
+
+void WriteNumbers(utl_Stream& stream, std::initializer_list<double> values) {
+    for (const double value : values) stream << ", " << value;
+}
+
+} // namespace
+
+void oif_AcousticImpedance::WriteParameters(utl_Stream& stream) const {
+    const auto& impedance = Record<kinC_AcousticImpedance>();
+    if (impedance.nonreflecting != 0) {
+        const int type = impedance.boundaryType;
+        const bool isKnown = type >= 0 && type < static_cast<int>(std::size(kBoundaryTypes));
+        stream << ", nonreflecting=" << (isKnown ? kBoundaryTypes[type] : "");
+    } else {
+        stream << ", property=" << oif_Name(impedance.ConstGetState(Step()).property.ConstGet());
+    }
+    stream.OptionalLineBreak();
+}
+
+void oif_AcousticImpedance::WriteData(utl_Stream& stream) const {
+    const auto& impedance = Record<kinC_AcousticImpedance>();
+    stream << SetName();
+    if (impedance.nonreflecting != 1) return;
+    switch (impedance.boundaryType) {
+    case CIRCULAR:
+    case SPHERICAL: stream << ", " << impedance.radius; break;
+    case ELLIPTICAL:
+    case PROLATE_SPHEROIDAL: {
+        const gsl_Point& center = impedance.center;
+        const gsl_Vector axis = impedance.axis.Direction();
+        WriteNumbers(stream, {impedance.semiAxisA, impedance.semiAxisB, center.X(), center.Y(), center.Z(),
+                              axis.X(), axis.Y(), axis.Z()});
+        break;
+    }
+    default: break;
+    }
+}
+
+oif_AcousticImpedanceProp::oif_AcousticImpedanceProp(const cow_String& name,
+                                                     const kinC_InteractionProperty& property)
+    : name_(name), property_(nex_canDynamicCastRef<kinC_AcousticImpedanceProp>(property, NEX_HERE)) {}
+
+void oif_AcousticImpedanceProp::Write(utl_Stream& stream) const {
+    stream << "*Impedance Property, name=" << oif_Name(name_);
+    stream.OptionalLineBreak();
+    if (!property_.admittance) stream << ", data=IMPEDANCE";
+    stream << endl << oif_MaterialTable(property_.table, 0, property_.dependencies != 0);
+}
+
+oif_IncidentWave::oif_IncidentWave(const kinC_Interaction& interaction, const cow_String& step,
+                                   const cow_String& sourceName, const cow_String& standoffName,
+                                   const cow_String& surfaceName)
+    : wave_(nex_canDynamicCastRef<kinC_IncidentWave>(interaction, NEX_HERE)), step_(step),
+      sourceName_(sourceName), standoffName_(standoffName), surfaceName_(surfaceName) {}
+
+void oif_IncidentWave::Write(utl_Stream& stream) const {
+    if (wave_.GetPropStatus(step_) != mdl_PropagationStatusEnm::CREATED) return;
+    stream << "*Incident wave interaction";
+    switch (wave_.waveType) {
+    case 0: stream << ", pressure amplitude=" << oif_Name(wave_.amplitude); break;
+    case 1: stream << ", acceleration amplitude=" << oif_Name(wave_.amplitude); break;
+    default: stream << ", UNDEX"; break;
+    }
+    stream.OptionalLineBreak();
+    stream << ", property=" << oif_Name(wave_.property) << endl
+           << surfaceName_ << ", " << sourceName_ << ", " << standoffName_ << ", " << wave_.magnitude << endl;
+}
+
+oif_IncidentWaveProperty::oif_IncidentWaveProperty(const cow_String& name,
+                                                   const kinC_InteractionProperty& property)
+    : name_(name), property_(nex_canDynamicCastRef<kinC_IncidentWaveProperty>(property, NEX_HERE)),
+      depth_(property_.initialDepth) {}
+
+void oif_IncidentWaveProperty::Write(utl_Stream& stream) const {
+    stream << "*Incident Wave Interaction Property, name=" << oif_Name(name_);
+    stream.OptionalLineBreak();
+    if (property_.shape == 1) stream << ", type=SPHERE";
+    stream << endl << property_.speed << ", " << property_.density;
+    if (property_.bubbleModel == DECAY) {
+        WriteNumbers(stream, {property_.decayA, property_.decayB, property_.decayC});
+    }
+    stream << endl;
+    if (property_.bubbleModel == CHARGE) WriteCharge(stream);
+}
+
+void oif_IncidentWaveProperty::WriteCharge(utl_Stream& stream) const {
+    const kinC_IncidentWaveProperty& p = property_;
+    stream << "*UNDEX Charge Property" << endl << p.pressureConstant;
+    WriteNumbers(stream, {p.timeConstant, p.pressureExponent, p.timeExponent, p.adiabaticConstant,
+                          p.specificHeatRatio, p.chargeDensity, p.chargeMass});
+    stream << endl << p.fluidDensity;
+    WriteNumbers(stream, {p.fluidSoundSpeed, p.gravity, p.atmosphericPressure});
+    // The flag stands as a real.
+    stream << ", " << (p.waveEffects ? "1.0, " : "0.0, ") << p.dragCoefficient << ", " << p.dragExponent
+           << endl
+           << p.maximumTime << ", " << p.maximumSteps;
+    WriteNumbers(stream, {p.relativeStepControl, p.absoluteStepControl, p.stepControlExponent});
+    const gsl_Vector normal = normal_.Direction();
+    stream << endl << depth_;
+    WriteNumbers(stream, {normal.X(), normal.Y(), normal.Z()});
+    stream << endl;
+}
