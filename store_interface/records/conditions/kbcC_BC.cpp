@@ -2,7 +2,8 @@
 
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
-#include "store_interface/records/conditions/kpfC_Field.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
+#include "store_interface/records/conditions/kpfC_Fields.h"
 
 const omu_EnumTable& omu_EnumTableOf(kbcC_BC::DistribTypeEnum) {
     static constexpr omu_EnumRow rows[] = {
@@ -80,6 +81,8 @@ void cls_RegisterConditionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kloC_LoadState>();
     registrar.Add<kloC_Load>();
     cls_RegisterBoltLoadRecords(registrar);
+    cls_RegisterLoadRecords(registrar);
     registrar.Add<kpfC_FieldState>();
     registrar.Add<kpfC_Field>();
+    cls_RegisterFieldRecords(registrar);
 }
