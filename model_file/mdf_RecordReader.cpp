@@ -646,10 +646,10 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
 
 void mdf_RecordReader::Refer(const cls_Field& field, const std::string& name, const mdf_Path& path) {
     if (field.refersTo != nullptr && !name.empty())
-        references_.push_back({field.refersTo, name, path.Text()});
+        references_.push_back({field.refersTo, name, path.Text(), field.refersToClass});
 }
 
-std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) const {
+const mdl_Repository* mdf_RecordReader::RepositoryOfKind(const std::string& kind) const {
     const std::pair<const char*, const mdl_Repository*> repositories[] = {
         {"material", &model_.materials},
         {"section", &model_.sections},
@@ -665,8 +665,13 @@ std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) 
         {"interaction", &model_.interactions},
     };
     for (const auto& [name, repository] : repositories) {
-        if (kind == name) return mdf_Names(repository->Keys());
+        if (kind == name) return repository;
     }
+    return nullptr;
+}
+
+std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) const {
+    if (const mdl_Repository* repository = RepositoryOfKind(kind)) return mdf_Names(repository->Keys());
     if (kind == "step") return mdf_Names(model_.steps.Keys());
     if (kind == "set") {
         std::vector<std::string> names;
@@ -681,6 +686,20 @@ std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) 
     return {};
 }
 
+void mdf_RecordReader::CheckClass(const Reference& reference) {
+    if (reference.expectedClass == nullptr) return;
+    const mdl_Repository* repository = RepositoryOfKind(reference.kind);
+    const cls_Record* record =
+        repository == nullptr ? nullptr : repository->FindRecord(cow_String(reference.name));
+    if (record == nullptr ||
+        cls_Classes().InheritanceCheck(record->DynTypeId(), reference.expectedClass->Id())) {
+        return;
+    }
+    diagnostics_.Error(reference.pointer, "found " + mdf_Quoted(reference.name) + ", a " +
+                                              Text(cls_Classes().NameOf(record->DynTypeId())) +
+                                              ", expected the name of a " + reference.expectedClass->name);
+}
+
 void mdf_RecordReader::CheckReferences() {
     std::map<std::string, std::pair<std::vector<std::string>, std::set<std::string>>> known;
     for (const Reference& reference : references_) {
@@ -690,7 +709,11 @@ void mdf_RecordReader::CheckReferences() {
             names = NamesOfKind(reference.kind);
             lookup.insert(names.begin(), names.end());
         }
-        if (lookup.count(reference.name) != 0 || IsWrong(reference.name)) continue;
+        if (IsWrong(reference.name)) continue;
+        if (lookup.count(reference.name) != 0) {
+            CheckClass(reference);
+            continue;
+        }
         // Orientations and filters may be defined elsewhere in the deck.
         if (reference.kind == "orientation" || reference.kind == "filter") {
             diagnostics_.Warning(reference.pointer, "found " + mdf_Quoted(reference.name) +

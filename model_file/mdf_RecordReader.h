@@ -43,6 +43,7 @@ private:
         std::string kind;
         std::string name;
         std::string pointer;
+        const cls_ClassInfo* expectedClass; // null: any
     };
 
     bool ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json, const mdf_Path& path,
@@ -65,7 +66,10 @@ private:
     void ReadState(kprC_PropagatingObject& object, const std::string& stepName, const mdf_Value& json,
                    const mdf_Path& path);
     void Refer(const cls_Field& field, const std::string& name, const mdf_Path& path);
+    /// Null where no repository holds the objects of the kind.
+    const mdl_Repository* RepositoryOfKind(const std::string& kind) const;
     std::vector<std::string> NamesOfKind(const std::string& kind) const;
+    void CheckClass(const Reference& reference);
 
     odiK_Model& model_;
     mdf_Diagnostics& diagnostics_;

@@ -192,6 +192,16 @@ public:
         return problems;
     }
 
+protected:
+    /// Puts a copy of the state in the place of the step's; no status changes. An unknown step raises.
+    void ReplaceState(const cow_String& stepName, const S& state) {
+        const int index = steps_.IndexOf(stepName);
+        if (index < 0) this->RaiseNoSuchStep(stepName);
+        auto& replaced = states_[static_cast<std::size_t>(index)];
+        replaced.state = mdl_ObjCow<S>(state);
+        replaced.hasState = true;
+    }
+
 private:
     std::vector<kprC_PropagatingState<S>> states_;
     kprC_StepContainer steps_; // as they were when the states were worked out

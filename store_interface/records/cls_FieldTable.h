@@ -163,6 +163,8 @@ struct cls_Field {
 
     /// For a text field: the kind of object that it names ("amplitude", "material", ...), else null.
     const char* refersTo = nullptr;
+    /// The class that the named object must be of or derive from; null: any of its kind.
+    const cls_ClassInfo* refersToClass = nullptr;
     /// For an int field: what its numbers mean.
     std::span<const cls_IntMeaning> meanings;
     /// For a list: its only permitted length, or 0.
@@ -220,6 +222,20 @@ public:
     }
     cls_Describe& RefersTo(const char* kind) {
         fields_.back().refersTo = kind;
+        return *this;
+    }
+    /// To an object of class T.
+    template <class T>
+    cls_Describe& RefersTo(const char* kind) {
+        fields_.back().refersToClass = &T::Class;
+        return RefersTo(kind);
+    }
+    /// Narrows what a field of the base refers to.
+    template <class T>
+    cls_Describe& InheritedRefersTo(std::string_view name) {
+        for (cls_Field& field : fields_) {
+            if (name == field.name) field.refersToClass = &T::Class;
+        }
         return *this;
     }
     cls_Describe& Meanings(std::span<const cls_IntMeaning> meanings) {

@@ -11,7 +11,7 @@ public:
                                          "state of a control element in one step"};
 };
 
-class kinC_ActuatorSensor final : public cls_RecordOf<kinC_ActuatorSensor, kinC_Interaction> {
+class kinC_ActuatorSensor final : public kinC_InteractionOf<kinC_ActuatorSensor, kinC_ActuatorSensorState> {
 public:
     static constexpr cls_ClassInfo Class{
         "kinC_ActuatorSensor", "a control element at a node: a user element; no deck writes it by itself"};
@@ -22,8 +22,6 @@ public:
     cow_String elementType;
     cow_String nodeSetText;
     cow_List<double> initialValues;
-
-    cls_Record* NewState(unsigned) const override { return new kinC_ActuatorSensorState(); }
 
     static const cls_FieldTable& Fields();
 };

@@ -25,8 +25,25 @@ public:
     bool HasStep(const cow_String& stepName) const;
     /// Status 1, 3 or 4: created, changed or ended in the step.
     bool IsModified(const cow_String& stepName) const;
+    /// Puts a copy of the state in the place of the step's own; statuses stay as they are. A state of another
+    /// class than the step's raises.
+    void Insert(const cow_String& stepName, const kinC_InteractionState& state);
     /// The node sets that it names as surfaces of contact; none for a suppressed one.
-    virtual cow_List<rgnC_Region> ConstGetContactNodeSets() const { return {}; }
+    cow_List<rgnC_Region> ConstGetContactNodeSets() const;
+
+protected:
+    /// The surfaces that its contact keywords name, in declared order.
+    virtual cow_List<rgnC_Region> ContactSurfaces() const { return {}; }
+};
+
+/// Base of the interaction class T, itself derived from Base, with states of class State.
+template <class T, class State, class Base = kinC_Interaction>
+class kinC_InteractionOf : public cls_RecordOf<T, Base> {
+public:
+    const State& ConstGetState(const cow_String& stepName) const {
+        return static_cast<const State&>(kinC_Interaction::ConstGetState(stepName));
+    }
+    cls_Record* NewState(unsigned) const override { return new State(); }
 };
 
 /// Properties that interactions refer to by name.
@@ -39,6 +56,11 @@ public:
 class kinC_ContactControls : public cls_AbstractRecordOf<kinC_ContactControls> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_ContactControls", "numerical options of contact", 0x2A00050};
+
+    /// Whether every field is that of a new record of the class.
+    bool IsDefault() const;
+    /// An independent copy on the heap.
+    kinC_ContactControls* DeepCopy() const { return static_cast<kinC_ContactControls*>(Copy()); }
 };
 
 class kinC_ContactInitialization final : public cls_RecordOf<kinC_ContactInitialization> {
