@@ -3,6 +3,7 @@
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_Orientation.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
 
 #include <map>
 #include <set>
@@ -18,6 +19,7 @@ void oif_TransformBuilder::Build() {
     CollectCsysRegionsList();
     WriteTransforms();
     WriteConnectorOrientations();
+    WriteInertiaReliefOrientations();
 }
 
 void oif_TransformBuilder::CollectCsysRegionsList() {
@@ -31,6 +33,15 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         // A symmetry condition counts also without a system.
         if (condition.datum.IsNullRef() && condition.DynTypeId() != kSymmetryCondition) continue;
         append(condition.datum, condition.region);
+    }
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const kloC_Load& load = it.CurrentValue();
+        if (load.suppressed) continue;
+        const auto appendSystemOf = [&](const auto* typed) {
+            if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, load.region);
+        };
+        appendSystemOf(nex_canDynamicCastPtr<kloC_ConcentratedForce>(&load));
+        appendSystemOf(nex_canDynamicCastPtr<kloC_Moment>(&load));
     }
 }
 
@@ -67,6 +78,14 @@ void oif_TransformBuilder::WriteConnectorOrientations() {
         const cow_String name = odiK_Assembly::ConnectorOrientationName(i);
         WriteOrientation(ends.ConstGetCsys1(), ends.ConstGetAngle1(), name + "-1", ends.ConstGetAxis1());
         WriteOrientation(ends.ConstGetCsys2(), ends.ConstGetAngle2(), name + "-2", ends.ConstGetAxis2());
+    }
+}
+
+void oif_TransformBuilder::WriteInertiaReliefOrientations() {
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const auto* relief = nex_canDynamicCastPtr<kloC_InertiaRelief>(&it.CurrentValue());
+        if (relief == nullptr || relief->suppressed) continue;
+        WriteOrientation(relief->datum, 0.0, {}, ptoC_MaterialOrientation::axisEnm::AXIS_1);
     }
 }
 
