@@ -5,6 +5,7 @@
 #include "model_file/mdf_ModelFile.h"
 #include "tools/DeckFile.h"
 #include "tools/ModelChecks.h"
+#include "tools/ModelHistory.h"
 #include "tools/ModelSummary.h"
 
 #include <algorithm>
@@ -170,7 +171,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     return code;
 }
 
-ExitCode RunInfo(const std::string& model, RunReport& report) {
+ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
     if (odb == nullptr) return code;
@@ -179,6 +180,9 @@ ExitCode RunInfo(const std::string& model, RunReport& report) {
         const std::string key(name.View());
         models[key] = DescribeModel(*entry);
         report.Print(TextOfDescription(key, models[key]));
+        if (!history) continue;
+        models[key]["history"] = DescribeHistory(odb->ddb().model(name));
+        report.Print(TextOfHistory(models[key]["history"]));
     }
     return code;
 }

@@ -19,7 +19,8 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
                    RunReport& report);
 ExitCode RunCheck(const std::string& model, RunReport& report);
-ExitCode RunInfo(const std::string& model, RunReport& report);
+/// `history`: also what every object is in each step.
+ExitCode RunInfo(const std::string& model, bool history, RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.
 ExitCode RunSchema(const std::string& output, RunReport& report);
 

@@ -1,6 +1,8 @@
 #include "tools/ModelChecks.h"
 
+#include "conditions/oif_BoundaryConditionBuilder.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/conditions/kbcC_MotionBCs.h"
 #include "store_interface/records/sections/kseC_BeamSection.h"
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
@@ -224,11 +226,82 @@ void FindSectionsOfMeshes(const odiK_Model& model, Findings& findings) {
     }
 }
 
+const char* KindOf(const rgnC_Region& region) {
+    switch (region.FlagWord()) {
+    case 1: return "a node set";
+    case 2: return "an element set";
+    default: return "a surface";
+    }
+}
+
+/// The names of the model's element sets, as lists of sets refer to them.
+std::set<std::string> ElementSetsOf(const odiK_Model& model) {
+    std::set<std::string> names;
+    const auto add = [&names](const std::string& prefix, const auto& sets) {
+        for (const auto& set : sets) {
+            if (set->type == res_SetTypeEnm::ELEMENTS) names.insert(prefix + Text(set->name));
+        }
+    };
+    add("", model.AssemblySets());
+    for (const auto& [name, instance] : model.Instances()) {
+        const auto mesh = instance->Mesh();
+        if (!mesh.IsNull()) add(Text(name) + ".", mesh->Sets());
+    }
+    return names;
+}
+
+void FindOnRegion(const kbcC_BC& bc, const std::string& place, Findings& findings) {
+    const bool ofConnectors = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc) != nullptr;
+    const int expected = ofConnectors ? 2 : 1;
+    if (!bc.region.HasValue()) {
+        findings.push_back({place, "the condition has no region, so its lines name no set"});
+    } else if (bc.region.FlagWord() != expected) {
+        findings.push_back({place + "/region", "found " + Quoted(bc.region.SetName()) + ", which is " +
+                                                   KindOf(bc.region) + "; the condition acts on " +
+                                                   (ofConnectors ? "connector elements" : "nodes")});
+    }
+}
+
+void FindOnConditions(const odiK_Model& model, Findings& findings) {
+    const oif_BCOpStatus status =
+        oif_BoundaryConditionBuilder::OpStatusOf(model.boundaryConditions, model.loads, model.steps);
+    std::optional<std::set<std::string>> elementSets;
+    for (kprC_PropagatingContainerIT<kbcC_BC> it(model.boundaryConditions); !it.IsDone(); it.Next()) {
+        const kbcC_BC& bc = it.CurrentValue();
+        if (bc.suppressed) continue;
+        const std::string place = Place("boundaryConditions", it.CurrentKey());
+        FindOnRegion(bc, place, findings);
+        if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
+            if (!elementSets) elementSets = ElementSetsOf(model);
+            if (motion->connectors.IsEmpty()) {
+                findings.push_back(
+                    {place + "/connectors",
+                     "the condition names no connectors, so the element set of its name is empty"});
+            }
+            for (int i = 0; i < motion->connectors.Length(); ++i) {
+                if (elementSets->count(Text(motion->connectors[i])) != 0) continue;
+                findings.push_back({place + "/connectors/" + std::to_string(i),
+                                    "found " + Quoted(motion->connectors[i]) + ", which is no element set"});
+            }
+        }
+        bool written = false;
+        for (int i = 0; i < model.steps.Size() && !written; ++i) {
+            const cow_String& step = model.steps.NameAt(i);
+            for (const auto& [loadCase, scale] :
+                 oif_BCOpStatus::Places(model.steps.StepAt(i), it.CurrentKey(), bc.Status(step))) {
+                written = written || status.Writes(bc, step, !loadCase.IsEmpty());
+            }
+        }
+        if (!written) findings.push_back({place, "no step writes the condition"});
+    }
+}
+
 } // namespace
 
 std::vector<ModelFinding> FindingsOf(const odiK_Model& model) {
     Findings findings;
     FindSectionsOfMeshes(model, findings);
     FindIdleMaterials(model, findings);
+    FindOnConditions(model, findings);
     return findings;
 }

@@ -30,6 +30,7 @@ struct CommandLine {
     std::string model;
     std::string schemaOutput;
     bool json = false;
+    bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
     CLI::App* checkCommand = app.add_subcommand("check", "Look for errors in a model, write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
@@ -54,6 +55,10 @@ struct CommandLine {
             ->type_name("DIR");
         AddModel(checkCommand, model);
         AddModel(infoCommand, model);
+        infoCommand->add_flag(
+            "--history", history,
+            "Also what conditions, loads, interactions and output requests are in each step, "
+            "and what the step writes of them");
         schemaCommand->add_option("--output", schemaOutput, "File to write (default: the standard output)")
             ->type_name("FILE");
     }
@@ -69,7 +74,7 @@ struct CommandLine {
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return RunCheck(model, report);
-        if (*infoCommand) return RunInfo(model, report);
+        if (*infoCommand) return RunInfo(model, history, report);
         return RunSchema(schemaOutput, report);
     }
 

@@ -30,6 +30,7 @@ const mdf_RecordChecks& mdf_RecordChecks::All() {
     static const mdf_RecordChecks checks = [] {
         mdf_RecordChecks all;
         mdf_AddAmplitudeChecks(all);
+        mdf_AddBoundaryChecks(all);
         mdf_AddConnectorChecks(all);
         mdf_AddMaterialChecks(all);
         mdf_AddSectionChecks(all);

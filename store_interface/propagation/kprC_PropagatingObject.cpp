@@ -48,22 +48,30 @@ bool mdl_GivenState::IsGiven(const char* field) const {
     return false;
 }
 
+const std::vector<mdl_GivenState>& kprC_PropagatingObject::GivenStates() const {
+    static const std::vector<mdl_GivenState> none;
+    return given_.IsNull() ? none : given_.ConstGet();
+}
+
 const mdl_GivenState* kprC_PropagatingObject::GivenState(const cow_String& stepName) const {
-    const auto place = std::find_if(given_.begin(), given_.end(),
+    const std::vector<mdl_GivenState>& all = GivenStates();
+    const auto place = std::find_if(all.begin(), all.end(),
                                     [&](const mdl_GivenState& given) { return given.stepName == stepName; });
-    return place == given_.end() ? nullptr : &*place;
+    return place == all.end() ? nullptr : &*place;
 }
 
 mdl_GivenState& kprC_PropagatingObject::Give(const cow_String& stepName) {
-    const auto place = std::find_if(given_.begin(), given_.end(),
+    if (given_.IsNull()) given_.Reset(new std::vector<mdl_GivenState>());
+    std::vector<mdl_GivenState>& all = given_.Get();
+    const auto place = std::find_if(all.begin(), all.end(),
                                     [&](const mdl_GivenState& given) { return given.stepName == stepName; });
-    if (place != given_.end()) return *place;
+    if (place != all.end()) return *place;
     mdl_GivenState given;
     given.stepName = stepName;
     given.record = mdl_ObjCow<cls_Record>(NewState(0));
     given.marks.assign(given.record.ConstGet().DynFields().All().size(), mdl_GivenEnm::ABSENT);
-    given_.push_back(std::move(given));
-    return given_.back();
+    all.push_back(std::move(given));
+    return all.back();
 }
 
 bool kprC_PropagatingObject::IsActive(Status status) {
@@ -336,7 +344,7 @@ kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps,
     results.reserve(static_cast<std::size_t>(steps.Size()));
     std::vector<const mdl_GivenState*> givenAt(static_cast<std::size_t>(steps.Size()));
     std::vector<cow_String> unknown;
-    for (const mdl_GivenState& given : given_) {
+    for (const mdl_GivenState& given : GivenStates()) {
         const int index = steps.IndexOf(given.stepName);
         if (index < 0) {
             unknown.push_back(given.stepName);

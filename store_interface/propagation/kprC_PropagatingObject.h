@@ -4,6 +4,7 @@
 #include "store_interface/propagation/mdl_PropAttr.h"
 #include "store_interface/records/steps/kprC_StepContainer.h"
 
+#include <memory>
 #include <optional>
 #include <vector>
 
@@ -65,7 +66,7 @@ public:
     /// A new state of the object's state class, with the defaults of a step of the procedure.
     virtual cls_Record* NewState(unsigned procedureType) const = 0;
 
-    const std::vector<mdl_GivenState>& GivenStates() const { return given_; }
+    const std::vector<mdl_GivenState>& GivenStates() const;
     const mdl_GivenState* GivenState(const cow_String& stepName) const;
     /// The user's state of the step, made at its first use.
     mdl_GivenState& Give(const cow_String& stepName);
@@ -97,7 +98,8 @@ protected:
 
 private:
     class Engine;
-    std::vector<mdl_GivenState> given_;
+    // Shared by copies, since every keyword holds a copy of its object.
+    cow_COW<std::vector<mdl_GivenState>, cow_Direct<std::vector<mdl_GivenState>>> given_;
 };
 
 /// Sets fields of a user's state by member: Edit<S>(given).Set<&S::u1>(0.5).Clear<&S::amplitude>().
@@ -155,13 +157,14 @@ public:
     const kprC_PropagatingState<S>& ConstGetStateQuad(const cow_String& stepName) const {
         const int index = steps_.IndexOf(stepName);
         if (index < 0) this->RaiseNoSuchStep(stepName);
-        return states_[static_cast<std::size_t>(index)];
+        return states_.ConstGet()[static_cast<std::size_t>(index)];
     }
     /// Whether the user gave a state for the step, a deactivation included.
     bool HasStep(const cow_String& stepName) const { return this->GivenState(stepName) != nullptr; }
     /// The name of the first step of status 1; empty if there is none.
     cow_String CreateStepName() const {
-        for (const auto& state : states_) {
+        if (states_.IsNull()) return {};
+        for (const auto& state : states_.ConstGet()) {
             if (state.status == mdl_PropagationStatusEnm::CREATED) return state.stepName;
         }
         return {};
@@ -171,7 +174,8 @@ public:
         std::vector<mdl_PropagationProblem> problems;
         const auto results = this->WorkOut(steps, problems);
         mdl_ObjCow<S> none;
-        std::vector<kprC_PropagatingState<S>> states(results.size());
+        auto shared = std::make_unique<States>(results.size());
+        States& states = *shared;
         for (std::size_t i = 0; i < results.size(); ++i) {
             states[i].stepName = steps.NameAt(static_cast<int>(i));
             states[i].status = results[i].status;
@@ -187,7 +191,7 @@ public:
                 states[i].state = none;
             }
         }
-        states_ = std::move(states);
+        states_.Reset(shared.release());
         steps_ = steps;
         return problems;
     }
@@ -203,8 +207,9 @@ protected:
     }
 
 private:
-    std::vector<kprC_PropagatingState<S>> states_;
-    kprC_StepContainer steps_; // as they were when the states were worked out
+    using States = std::vector<kprC_PropagatingState<S>>;
+    cow_COW<States, cow_Direct<States>> states_; // shared by copies
+    kprC_StepContainer steps_;                   // as they were when the states were worked out
 };
 
 /// Objects that live across steps, by name, in ascending byte order.

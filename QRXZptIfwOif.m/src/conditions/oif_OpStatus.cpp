@@ -1,12 +1,11 @@
 #include "conditions/oif_OpStatus.h"
 
 #include "mesh/oif_SetName.h"
-#include "store_interface/records/conditions/kloC_BoltLoad.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
 #include <string>
 #include <unordered_set>
-#include <vector>
 
 using Status = mdl_PropagationStatusEnm;
 using Method = kloC_BoltLoad::MethodEnm;
@@ -18,6 +17,28 @@ constexpr unsigned kInteractionTypes[] = {0x2A0001F, 0x2A00023, 0x2A00033, 0x2A0
 
 const kloC_BoltLoad* BoltLoad(const kloC_Load& load) {
     return load.DynTypeId() == kloC_BoltLoad::TypeId() ? &static_cast<const kloC_BoltLoad&>(load) : nullptr;
+}
+
+/// The load cases for which `scale` gives a factor, among those that `counts` lets in; the step itself if
+/// there are none of these.
+template <class Counts, class Scale>
+oif_ConditionPlaces PlacesWhere(const kprC_Step& step, const Counts& counts, const Scale& scale) {
+    oif_ConditionPlaces places;
+    bool inCases = false;
+    if (const auto* analysis = nex_canDynamicCastPtr<kprC_AnalysisStep>(&step)) {
+        for (mdl_MapString2ObjCowIT<klcC_LoadCase> it(analysis->loadCases); !it.IsDone(); it.Next()) {
+            const klcC_LoadCase& loadCase = it.CurrentValue();
+            if (!counts(loadCase)) continue;
+            inCases = true;
+            if (const float* factor = scale(loadCase)) places.push_back({it.CurrentKey(), *factor});
+        }
+    }
+    if (!inCases) places.emplace_back();
+    return places;
+}
+
+bool All(const klcC_LoadCase&) {
+    return true;
 }
 
 } // namespace
@@ -96,6 +117,32 @@ bool oif_BCOpStatus::Writes(const kbcC_BC& bc, const cow_String& stepName, bool 
     }
 }
 
+oif_ConditionPlaces oif_BCOpStatus::Places(const kprC_Step& step, const cow_String& name, Status status) {
+    static constexpr float unscaled = 1.0F;
+    return PlacesWhere(step, All, [&](const klcC_LoadCase& loadCase) -> const float* {
+        if (const float* scale = loadCase.bcs.Find(name)) return scale;
+        return loadCase.baseStateBCs && IsOfBaseState(status) ? &unscaled : nullptr;
+    });
+}
+
+bool oif_BCOpStatus::IsOfBaseState(Status status) {
+    return status == Status::PROPAGATED_FROM_BASE_STATE || status == Status::MODIFIED_FROM_BASE_STATE;
+}
+
+bool oif_BCOpStatus::WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool opMod) {
+    if (load.suppressed) return false;
+    const Status status = load.Status(stepName);
+    const auto& method = load.BoltState(stepName).boltMethod;
+    const bool byForce = method.ConstGet() == Method::APPLY_FORCE;
+    switch (status) {
+    case Status::CREATED: return !byForce;
+    case Status::PROPAGATED: return !byForce && !opMod;
+    case Status::MODIFIED: return !byForce || method.IsModified();
+    case Status::DEACTIVATED: return true;
+    default: return false;
+    }
+}
+
 int oif_BCOpStatus::Key(unsigned int typeId) const {
     static constexpr KeyRow rows[] = {
         {0x2880024, 0}, {0x2980005, 0}, {0x2980007, 0}, {0x2980009, 0}, {0x298000C, 0}, {0x298000E, 0},
@@ -142,7 +189,7 @@ void oif_LoadOpStatus::ResolveOverlapRegions(const kprC_PropagatingContainer<klo
 }
 
 bool oif_LoadOpStatus::Writes(const kloC_Load& load, const cow_String& stepName) const {
-    if (load.suppressed) return false;
+    if (load.suppressed || IsInitialStep(stepName)) return false;
     const Status status = load.Status(stepName);
     const bool begunOrChanged = status == Status::CREATED || status == Status::MODIFIED;
     const bool carried = status == Status::PROPAGATED && OpNew(load.DynTypeId(), stepName);
@@ -152,6 +199,12 @@ bool oif_LoadOpStatus::Writes(const kloC_Load& load, const cow_String& stepName)
     // A bolt is a force only while a force tightens it; a change to another method is told once.
     const auto& method = bolt->BoltState(stepName).boltMethod;
     return method.ConstGet() == Method::APPLY_FORCE || (status == Status::MODIFIED && method.IsModified());
+}
+
+oif_ConditionPlaces oif_LoadOpStatus::Places(const kprC_Step& step, const cow_String& name) {
+    return PlacesWhere(
+        step, [](const klcC_LoadCase& loadCase) { return !loadCase.loadsAreStepLoads; },
+        [&](const klcC_LoadCase& loadCase) { return loadCase.loads.Find(name); });
 }
 
 int oif_LoadOpStatus::Key(unsigned int typeId) const {
@@ -190,6 +243,10 @@ bool oif_FieldOpStatus::Writes(const kpfC_Field& field, const cow_String& stepNa
         return field.DynTypeId() == kGeneralField || OpNew(field.DynTypeId(), stepName);
     default: return false;
     }
+}
+
+oif_ConditionPlaces oif_FieldOpStatus::Places(const kprC_Step& step, const cow_String& name) {
+    return PlacesWhere(step, All, [&](const klcC_LoadCase& loadCase) { return loadCase.fields.Find(name); });
 }
 
 int oif_FieldOpStatus::Key(unsigned int typeId) const {

@@ -2,8 +2,18 @@
 #define QRX_OIF_OPSTATUS_H
 
 #include "keyword_layer/qkw_ModelInfo.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
 
 #include <span>
+#include <vector>
+
+/// Where in a step an object stands, if it is written: in a load case with a factor, or, under the empty
+/// name, in the step itself.
+struct oif_ConditionPlace {
+    cow_String loadCase;
+    float scale = 1.0F;
+};
+using oif_ConditionPlaces = std::vector<oif_ConditionPlace>;
 
 /// Which keyword families are written with ", op=NEW" in which steps. A keyword without it adds to what the
 /// steps before said and changes it; one with it wipes out all earlier definitions of its family, so that
@@ -32,6 +42,9 @@ protected:
     static int FindKey(std::span<const KeyRow> rows, unsigned typeId, const char* failure);
 
     void InitializeMembers(const cow_List<cow_String>& steps, int numberOfKeys);
+    bool IsInitialStep(const cow_String& stepName) const {
+        return !stepNames.IsEmpty() && stepNames[0] == stepName;
+    }
     void SetFlag(int key, int stepIndex) { opNewFlags.Get(key).Put(stepIndex, 1); }
     /// Sets the flag of each object's family at the steps behind the initial one for which `test` holds;
     /// `kind` is what messages call them.
@@ -65,6 +78,15 @@ public:
     /// Whether the condition is written in the step: in each load case that takes it, or without load cases
     /// in the step itself.
     bool Writes(const kbcC_BC& bc, const cow_String& stepName, bool inLoadCase) const;
+    /// The load cases that take the condition, those of the base state taken without being named; in a step
+    /// without load cases the step itself.
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name,
+                                      mdl_PropagationStatusEnm status);
+    /// Status 9 or 10.
+    static bool IsOfBaseState(mdl_PropagationStatusEnm status);
+    /// Whether the bolt load stands among the boundary conditions of the step: while its length is given, and
+    /// when that ends. `opMod` is false in a load case and where the family's flag is set.
+    static bool WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool opMod);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kbcC_BC>& bcs,
@@ -78,8 +100,10 @@ public:
     oif_LoadOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps,
                    const qkw_ModelInfo& modelInfo);
-    /// Whether the load is written in the step.
+    /// Whether the load is written in the step; none is in the initial one.
     bool Writes(const kloC_Load& load, const cow_String& stepName) const;
+    /// The load cases that take the load; the step itself if it has none, or none with loads of its own.
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kloC_Load>& loads);
@@ -96,6 +120,8 @@ public:
     void Configure(const kprC_PropagatingContainer<kpfC_Field>& fields, const cow_List<cow_String>& steps);
     /// Whether the field is written in the step.
     bool Writes(const kpfC_Field& field, const cow_String& stepName) const;
+    /// The load cases that take the field; in a step without load cases the step itself.
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kpfC_Field>& fields);

@@ -1,6 +1,9 @@
 #include "store_interface/records/conditions/kbcC_BC.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/conditions/kbcC_MotionBCs.h"
+#include "store_interface/records/conditions/kbcC_ScalarBCs.h"
+#include "store_interface/records/conditions/kbcC_SupportBCs.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 #include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/conditions/kpfC_Fields.h"
@@ -27,6 +30,21 @@ const omu_EnumTable& omu_EnumTableOf(kpfC_Field::DistribTypeEnm) {
 
 bool kbcC_BC::ModifiedNeedsOpNew(const cow_String&) const {
     return false;
+}
+
+bool kbcC_BC::FreesComponent(const cow_String& stepName) const {
+    for (int i = 0; i < 6; ++i) {
+        if (Component(stepName, i).state == mdl_PropAttributeStateEnm::CLEARED) return true;
+    }
+    return false;
+}
+
+bool kbcC_BCState::UseComplex(unsigned int) const {
+    return false;
+}
+
+kbcC_Component kbcC_BCState::Component(int) const {
+    return {};
 }
 
 bool kloC_Load::UsesField(cow_String&) const {
@@ -78,6 +96,9 @@ const cls_FieldTable& kpfC_Field::Fields() {
 void cls_RegisterConditionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kbcC_BCState>();
     registrar.Add<kbcC_BC>();
+    cls_RegisterMotionConditionRecords(registrar);
+    cls_RegisterScalarConditionRecords(registrar);
+    cls_RegisterSupportConditionRecords(registrar);
     registrar.Add<kloC_LoadState>();
     registrar.Add<kloC_Load>();
     cls_RegisterBoltLoadRecords(registrar);

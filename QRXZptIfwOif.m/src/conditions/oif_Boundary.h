@@ -1,0 +1,144 @@
+#ifndef QRX_OIF_BOUNDARY_H
+#define QRX_OIF_BOUNDARY_H
+
+#include "keyword_layer/qkw_Keyword.h"
+#include "store_interface/records/conditions/kbcC_BC.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
+
+#include <optional>
+
+/// A boundary condition in one step: its card, with a data line for each component that is to be said. A
+/// keyword that adds and changes says only what was set in the step; one with op=NEW, or with a new
+/// amplitude, says what is carried over too. A condition that ends in the step is its card alone.
+class oif_ConditionKeyword : public qkw_Keyword {
+public:
+    void Write(utl_Stream& stream) const override;
+
+protected:
+    /// What the two keywords differ in.
+    struct Style {
+        const char* keyword;
+        /// The degree of freedom stands twice, as the first and the last of a range.
+        bool dofRange;
+        /// An amplitude that was taken away counts as a new one.
+        bool clearedAmplitudeIsNew;
+    };
+    oif_ConditionKeyword(const Style& style, const kbcC_BC& bc, const cow_String& stepName, bool opMod,
+                         const cow_String& setName, const cow_String& initialStepName, double scale);
+
+    virtual void WriteForms(utl_Stream& stream) const = 0;
+    /// The parameters behind all others.
+    virtual void WriteLastParameters(utl_Stream&) const {}
+
+    void WriteCard(utl_Stream& stream, kbcC_BC::DistribTypeEnum distributionType, bool fixed, int loadCase,
+                   bool lineBreak) const;
+    void WriteDisplacements(utl_Stream& stream, bool fixed) const;
+    /// Velocities and accelerations, which are told by the type; held ones go without their values.
+    void WriteRates(utl_Stream& stream, const char* type, bool held) const;
+    void WriteLine(utl_Stream& stream, const cow_String& dofs, double value) const;
+    /// The degree of freedom as data lines have it, with its comma.
+    cow_String Dof(int number) const;
+    /// Writes with the number of each load case of a buckling step that the condition enters, in another
+    /// step with 0.
+    template <class Block>
+    void ForEachLoadCase(const Block& block) const;
+
+    /// Whether what came to hold its value in this way is to be said.
+    bool IsSaid(mdl_PropAttributeStateEnm state) const;
+    const kprC_PropagatingState<kbcC_BCState>& Quad() const {
+        return bc_.ConstGet().ConstGetStateQuad(stepName_);
+    }
+    template <class S>
+    const S& State() const {
+        return static_cast<const S&>(Quad().state.ConstGet());
+    }
+    /// 0 for the initial step.
+    unsigned Procedure() const;
+    bool IsBuckling() const;
+    bool UsesComplex() const { return Quad().state.ConstGet().UseComplex(Procedure()); }
+
+    Style style_;
+    bool opNew_;
+    mdl_ObjCow<kbcC_BC> bc_;
+    cow_String stepName_;
+    cow_String setName_;
+    cow_String amplitude_;
+    bool deactivated_ = false;
+    bool modifiedOnly_;
+    cow_String initialStepName_;
+    double scale_;
+
+private:
+    void WriteComponents(utl_Stream& stream, bool held, bool imaginary) const;
+};
+
+/// Every kind of boundary condition but those of connectors:
+///     *Boundary, op=NEW, amplitude=A, load case=1, fixed, user, base name=NAME
+///     SET, 1, 1, 0.5
+/// A class without a form raises.
+class oif_Boundary final : public qkw_KeywordOf<oif_Boundary, oif_ConditionKeyword> {
+public:
+    oif_Boundary(const kbcC_BC& bc, const cow_String& name, const cow_String& stepName, bool opMod,
+                 const cow_String& setName, bool shellToSolid, const cow_String& initialStepName,
+                 double scale);
+
+    /// A boundary that a global model drives in this step: its data lines stand under a line that it shares
+    /// with others, oif_BoundarySubmodelList's.
+    bool IsBCSubmodel() const { return isBCSubmodel_; }
+    /// The keyword line of a submodel boundary.
+    const cow_String& BCSubmodelKwd() const { return submodelKeyword_; }
+    /// The name without a leading "__basename__".
+    static cow_String FixBCNameHack(const cow_String& name);
+
+private:
+    void CheckForSubmodelBC();
+    void WriteForms(utl_Stream& stream) const override;
+    void WriteLastParameters(utl_Stream& stream) const override;
+    void WriteType(utl_Stream& stream) const;
+    void WriteTemperature(utl_Stream& stream) const;
+    void WriteDistributed(utl_Stream& stream, int dof) const;
+    void WriteComplexDistributed(utl_Stream& stream, int dof) const;
+    void WriteSubmodel(utl_Stream& stream) const;
+
+    cow_String name_;
+    bool isBCSubmodel_ = false;
+    cow_String submodelKeyword_;
+    bool shellToSolid_;
+};
+
+/// A prescribed motion of connectors:
+///     *Connector Motion, amplitude=A, type=VELOCITY
+///     SET, 1, 0.5
+/// A class without a form raises.
+class oif_ConnectorMotion final : public qkw_KeywordOf<oif_ConnectorMotion, oif_ConditionKeyword> {
+public:
+    oif_ConnectorMotion(const kbcC_BC& bc, const cow_String& setName, const cow_String& stepName, bool opMod,
+                        const cow_String& initialStepName, double scale);
+
+private:
+    void WriteForms(utl_Stream& stream) const override;
+};
+
+/// A bolt that is tightened by its length, or held:
+///     *Boundary, fixed
+///     SET, 1, 1, 0.02
+/// or, of a bolt that is tightened by a force or let go, the bare keyword with op=NEW. No builder makes it.
+class oif_BoundaryForBoltLoad final : public qkw_KeywordOf<oif_BoundaryForBoltLoad> {
+public:
+    oif_BoundaryForBoltLoad(const kloC_BoltLoad& boltLoad, const cow_String& stepName, bool opMod,
+                            const cow_String& setName, double scale);
+    void Write(utl_Stream& stream) const override;
+
+private:
+    void WriteBCCard(utl_Stream& stream, bool fixed) const;
+    void WriteBCData(utl_Stream& stream, double value) const;
+
+    mdl_ObjCow<kloC_BoltLoad> boltLoad_;
+    cow_String stepName_;
+    cow_String setName_;
+    bool opMod_;
+    bool clear_;
+    double scale_;
+};
+
+#endif
