@@ -395,11 +395,6 @@ bool mdf_RecordReader::ReadList(const cls_ListType& type, void* value, const mdf
             *static_cast<double*>(item) = kNullItem;
             continue;
         }
-        if (type.ItemType().Kind() == cls_FieldKind::Attribute && json.Item(i).IsNull()) {
-            // Lists are cleared as a whole.
-            diagnostics_.Expected(mdf_Path(path, i), json.Item(i), "a value");
-            continue;
-        }
         ReadValue(type.ItemType(), item, json.Item(i), mdf_Path(path, i), field, false);
     }
     return true;

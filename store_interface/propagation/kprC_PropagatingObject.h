@@ -201,7 +201,7 @@ protected:
     void ReplaceState(const cow_String& stepName, const S& state) {
         const int index = steps_.IndexOf(stepName);
         if (index < 0) this->RaiseNoSuchStep(stepName);
-        auto& replaced = states_[static_cast<std::size_t>(index)];
+        auto& replaced = states_.Get()[static_cast<std::size_t>(index)];
         replaced.state = mdl_ObjCow<S>(state);
         replaced.hasState = true;
     }

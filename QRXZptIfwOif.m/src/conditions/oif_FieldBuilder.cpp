@@ -65,9 +65,8 @@ void oif_FieldBuilder::FieldCardDetails(const cow_String& name, const kpfC_Field
         oif_SetName(field.region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
     const bool opMod = !opStatus_.OpNew(typeId, stepName);
     const auto addInitialConditions = [&] {
-        // The holder lets the keyword share the record.
-        add(oif_InitialConditions(*Model().Fields().ConstHolder(name), Model().Steps().NameAt(0), stepName,
-                                  opMod, setName, maxTemperatureSize, maxGeneralFieldSize));
+        add(oif_InitialConditions(field, Model().Steps().NameAt(0), stepName, opMod, setName,
+                                  maxTemperatureSize, maxGeneralFieldSize));
     };
     switch (typeId) {
     case kpfC_Temperature::Class.Id():

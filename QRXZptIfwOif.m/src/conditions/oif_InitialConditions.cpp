@@ -30,15 +30,12 @@ void WriteFileNumbers(utl_Stream& stream, const kpfC_ResultsFile& file) {
 
 } // namespace
 
-oif_InitialConditions::oif_InitialConditions(const mdl_ObjCow<cls_Record>& field, const cow_String&,
+oif_InitialConditions::oif_InitialConditions(const kpfC_Field& field, const cow_String&,
                                              const cow_String& stepName, bool, const cow_String& setName,
                                              int maxTemperatureSize, int maxGeneralFieldSize)
-    : record_(field), setName_(setName), maxTemperatureSize_(maxTemperatureSize),
-      maxGeneralFieldSize_(maxGeneralFieldSize) {
-    const auto& record = nex_canDynamicCastRef<kpfC_Field>(field.ConstGet(), NEX_HERE);
-    state_ = record.ConstGetStateQuad(stepName).state;
-    distributionType_ = record.distributionType;
-}
+    : record_(field), state_(field.ConstGetStateQuad(stepName).state),
+      distributionType_(field.distributionType), setName_(setName), maxTemperatureSize_(maxTemperatureSize),
+      maxGeneralFieldSize_(maxGeneralFieldSize) {}
 
 oif_InitialConditions::oif_InitialConditions(const kinC_ActuatorSensor& actuator, const cow_String& setName,
                                              int count)

@@ -15,8 +15,7 @@
 class oif_InitialConditions final : public qkw_KeywordOf<oif_InitialConditions> {
 public:
     /// What the state of the field in `stepName` says; velocity, stress and hardening stand in the record.
-    /// The holder shares the record.
-    oif_InitialConditions(const mdl_ObjCow<cls_Record>& field, const cow_String& initialStepName,
+    oif_InitialConditions(const kpfC_Field& field, const cow_String& initialStepName,
                           const cow_String& stepName, bool opMod, const cow_String& setName,
                           int maxTemperatureSize, int maxGeneralFieldSize);
     /// `count` initial values, those that the record lacks being 0.
