@@ -36,15 +36,10 @@ void oif_FieldBuilder::CreateFieldCard(const cow_String& name, const kpfC_Field&
                                        const cow_String& stepName, int maxTemperatureSize,
                                        int maxGeneralFieldSize) {
     if (field.suppressed) return;
-    const auto* step = nex_canDynamicCastPtr<kprC_AnalysisStep>(&Model().Steps().ConstGet(stepName));
-    if (step == nullptr || step->loadCases.IsEmpty()) {
-        return FieldCardDetails(name, field, stepName, maxTemperatureSize, maxGeneralFieldSize, {}, 1.0F);
-    }
-    for (mdl_MapString2ObjCowIT<klcC_LoadCase> it(step->loadCases); !it.IsDone(); it.Next()) {
-        if (const float* scale = it.CurrentValue().fields.Find(name)) {
-            FieldCardDetails(name, field, stepName, maxTemperatureSize, maxGeneralFieldSize, it.CurrentKey(),
-                             *scale);
-        }
+    for (const oif_ConditionPlace& place :
+         oif_FieldOpStatus::Places(Model().Steps().ConstGet(stepName), name)) {
+        FieldCardDetails(name, field, stepName, maxTemperatureSize, maxGeneralFieldSize, place.loadCase,
+                         place.scale);
     }
 }
 

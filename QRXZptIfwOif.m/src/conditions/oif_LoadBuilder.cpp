@@ -71,17 +71,9 @@ void oif_LoadBuilder::CreateLoadCard(const cow_String& name, const kloC_Load& lo
     const bool cyclicApplies = cyclicSymmetry_ && step.DynTypeId() == kprC_SteadyStateModalStep::TypeId();
     const int cyclicMode =
         cyclicApplies ? cyclicInteraction_->ConstGetState(stepName).cyclicMode.ConstGet() : 0;
-    bool casesTakeLoads = false;
-    if (const auto* analysis = nex_canDynamicCastPtr<kprC_AnalysisStep>(&step)) {
-        for (mdl_MapString2ObjCowIT<klcC_LoadCase> it(analysis->loadCases); !it.IsDone(); it.Next()) {
-            if (it.CurrentValue().loadsAreStepLoads) continue;
-            casesTakeLoads = true;
-            if (const float* scale = it.CurrentValue().loads.Find(name)) {
-                LoadCardDetails(name, load, stepName, it.CurrentKey(), cyclicApplies, cyclicMode, *scale);
-            }
-        }
+    for (const oif_ConditionPlace& place : oif_LoadOpStatus::Places(step, name)) {
+        LoadCardDetails(name, load, stepName, place.loadCase, cyclicApplies, cyclicMode, place.scale);
     }
-    if (!casesTakeLoads) LoadCardDetails(name, load, stepName, {}, cyclicApplies, cyclicMode, 1.0F);
 }
 
 void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& load,
