@@ -13,6 +13,7 @@ std::string StepsJson(std::string_view kinds) {
         case 'L': name = "kprC_StaticLinearPerturbationStep"; break;
         case 'D': name = "kprC_SteadyStateDirectStep"; break;
         case 'M': name = "kprC_ModalDynamicsStep"; break;
+        case 'S': name = "kprC_SteadyStateModalStep"; break;
         default: ADD_FAILURE() << "no step is called " << kinds[i];
         }
         std::string own;

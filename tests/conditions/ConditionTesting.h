@@ -6,7 +6,7 @@
 #include "support/DeckTest.h"
 
 /// Steps "S0", "S1", ... of a model file by one letter each: I initial, G static, F frequency, B buckling,
-/// L static perturbation, D harmonic direct, M modal dynamics. Text behind a letter in braces is the step's
+/// L static perturbation, D harmonic direct, M modal dynamics, S harmonic modal. Text behind a letter in braces is the step's
 /// own: "IL{\"loadCases\": {}}".
 std::string StepsJson(std::string_view kinds);
 

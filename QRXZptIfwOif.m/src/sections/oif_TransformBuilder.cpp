@@ -3,6 +3,7 @@
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_Orientation.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/constraints/kcoC_Constraints.h"
 
 #include <map>
@@ -20,6 +21,7 @@ void oif_TransformBuilder::Build() {
     WriteTransforms();
     WriteConnectorOrientations();
     WriteCouplingOrientations();
+    WriteInertiaReliefOrientations();
 }
 
 void oif_TransformBuilder::CollectCsysRegionsList() {
@@ -33,6 +35,15 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         // A symmetry condition counts also without a system.
         if (condition.datum.IsNullRef() && condition.DynTypeId() != kSymmetryCondition) continue;
         append(condition.datum, condition.region);
+    }
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const kloC_Load& load = it.CurrentValue();
+        if (load.suppressed) continue;
+        const auto appendSystemOf = [&](const auto* typed) {
+            if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, load.region);
+        };
+        appendSystemOf(nex_canDynamicCastPtr<kloC_ConcentratedForce>(&load));
+        appendSystemOf(nex_canDynamicCastPtr<kloC_Moment>(&load));
     }
     for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
         const auto* equation = nex_canDynamicCastPtr<kcoC_Equation>(&it.CurrentValue());
@@ -87,6 +98,14 @@ void oif_TransformBuilder::WriteCouplingOrientations() {
         const auto* coupling = nex_canDynamicCastPtr<kcoC_Coupling>(&it.CurrentValue());
         if (coupling == nullptr) continue;
         WriteOrientation(coupling->orientation, 0.0, cow_String(), ptoC_MaterialOrientation::axisEnm::AXIS_1);
+    }
+}
+
+void oif_TransformBuilder::WriteInertiaReliefOrientations() {
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const auto* relief = nex_canDynamicCastPtr<kloC_InertiaRelief>(&it.CurrentValue());
+        if (relief == nullptr || relief->suppressed) continue;
+        WriteOrientation(relief->datum, 0.0, {}, ptoC_MaterialOrientation::axisEnm::AXIS_1);
     }
 }
 
