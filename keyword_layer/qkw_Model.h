@@ -3,6 +3,7 @@
 
 #include "store_interface/model/ddb_Model.h"
 #include "store_interface/records/cls_UnreadFamilies.h"
+#include "store_interface/records/output/karC_RemeshingRule.h"
 
 /// The store's base of a model's attributes; here for its enumeration.
 class mdl_Model {

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelReader.h"
 
+#include "model_file/checks/mdf_ConstraintChecks.h"
 #include "model_file/checks/mdf_InteractionChecks.h"
 #include "model_file/checks/mdf_MaterialChecks.h"
 #include "model_file/mdf_Parser.h"
@@ -105,6 +106,7 @@ void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
     });
     records_.CheckReferences();
     mdf_CheckGasketOptions(model_, diagnostics_, path);
+    mdf_CheckEquationSystems(model_, diagnostics_, path);
     mdf_CheckGeneralContact(model_, diagnostics_, path);
     CheckPartAttributes();
     Propagate(path);

@@ -518,6 +518,23 @@ private:
             out_.EndArray();
             break;
         }
+        case cls_FieldKind::Complex: {
+            const auto& number = *static_cast<const omi_complex*>(value);
+            const double parts[2] = {number.real, number.imag};
+            if (number.form == omi_complex::FormEnm::RECTANGULAR) {
+                out_.Row(std::span<const double>(parts));
+                break;
+            }
+            out_.BeginObject(mdf_Layout::OneLine);
+            out_.Key("form");
+            WriteValue(cls_TypeOf<omi_complex::FormEnm>::Instance(), &number.form, model);
+            out_.Key("real");
+            out_.Real(number.real);
+            out_.Key("imag");
+            out_.Real(number.imag);
+            out_.EndObject();
+            break;
+        }
         case cls_FieldKind::Table: {
             const cow_2DArray<double>& cells = static_cast<const cls_TableType&>(type).Get(value);
             out_.BeginArray();

@@ -220,6 +220,7 @@ bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const m
             gsl_ModelSegment({start[0], start[1], start[2]}, {end[0], end[1], end[2]});
         return true;
     }
+    case cls_FieldKind::Complex: return ReadComplex(*static_cast<omi_complex*>(value), json, path);
     case cls_FieldKind::Table: return ReadTable(static_cast<const cls_TableType&>(type), value, json, path);
     case cls_FieldKind::List:
         return ReadList(static_cast<const cls_ListType&>(type), value, json, path, field);
@@ -306,6 +307,38 @@ bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const
         xyz[i] = item.Real();
     }
     return true;
+}
+
+bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, const mdf_Path& path) {
+    const auto readPart = [&](double& part, const mdf_Value& number, const mdf_Path& place) {
+        if (number.IsNumber()) {
+            part = number.Real();
+        } else {
+            diagnostics_.Expected(place, number, "a number");
+        }
+        return number.IsNumber();
+    };
+    value = {};
+    if (json.IsArray() && json.Size() == 2) {
+        const bool isRead = readPart(value.real, json.Item(0), mdf_Path(path, std::size_t{0}));
+        return readPart(value.imag, json.Item(1), mdf_Path(path, std::size_t{1})) && isRead;
+    }
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "two numbers, or an object of \"form\", \"real\" and \"imag\"");
+        return false;
+    }
+    CheckMembers(json, {"form", "real", "imag"}, path);
+    bool isRead = true;
+    if (const mdf_Value* form = json.Find("form")) {
+        const auto& type = static_cast<const cls_EnumType&>(cls_TypeOf<omi_complex::FormEnm>::Instance());
+        isRead = ReadEnum(type, &value.form, *form, mdf_Path(path, "form"));
+    }
+    for (const auto& [name, part] : {std::pair("real", &value.real), std::pair("imag", &value.imag)}) {
+        const mdf_Value* number = json.Find(name);
+        if (number != nullptr)
+            isRead = readPart(*part, *number, mdf_Path(path, std::string_view(name))) && isRead;
+    }
+    return isRead;
 }
 
 bool mdf_RecordReader::ReadTable(const cls_TableType& type, void* value, const mdf_Value& json,

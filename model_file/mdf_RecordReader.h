@@ -52,6 +52,7 @@ private:
                  bool mayBeUnset);
     bool ReadEnum(const cls_EnumType& type, void* value, const mdf_Value& json, const mdf_Path& path);
     bool ReadTable(const cls_TableType& type, void* value, const mdf_Value& json, const mdf_Path& path);
+    bool ReadComplex(omi_complex& value, const mdf_Value& json, const mdf_Path& path);
     bool ReadTriple(double (&xyz)[3], const mdf_Value& json, const mdf_Path& path);
     bool ReadList(const cls_ListType& type, void* value, const mdf_Value& json, const mdf_Path& path,
                   const cls_Field& field);

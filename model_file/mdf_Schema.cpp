@@ -36,6 +36,21 @@ constexpr char kFrame[] = R"({
     },
     "INT": {"type": "integer", "minimum": -2147483648, "maximum": 2147483647},
     "TRIPLE": {"type": "array", "items": {"type": "number"}, "minItems": 3, "maxItems": 3},
+    "COMPLEX": {
+      "description": "A complex number: real and imaginary part, or an object. In the form POLAR real is the magnitude and imag the phase in degrees.",
+      "anyOf": [
+        {"type": "array", "items": {"type": "number"}, "minItems": 2, "maxItems": 2},
+        {
+          "type": "object",
+          "additionalProperties": false,
+          "properties": {
+            "form": {"anyOf": [{"enum": ["RECTANGULAR", "POLAR"]}, {"type": "string"}, {"type": "integer"}], "default": "RECTANGULAR"},
+            "real": {"type": "number", "default": 0},
+            "imag": {"type": "number", "default": 0}
+          }
+        }
+      ]
+    },
     "TABLE": {
       "description": "Rows of numbers, all of one length.",
       "type": "array", "items": {"type": "array", "items": {"type": "number"}}
@@ -380,6 +395,7 @@ private:
         case cls_FieldKind::Triple: return Reference("TRIPLE");
         case cls_FieldKind::Segment:
             return {{"type", "array"}, {"items", Reference("TRIPLE")}, {"minItems", 2}, {"maxItems", 2}};
+        case cls_FieldKind::Complex: return Reference("COMPLEX");
         case cls_FieldKind::Table: return Reference("TABLE");
         case cls_FieldKind::List: {
             Json item = TypeOf(static_cast<const cls_ListType&>(type).ItemType(), nullptr);

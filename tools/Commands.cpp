@@ -7,6 +7,7 @@
 #include "tools/ModelChecks.h"
 #include "tools/ModelHistory.h"
 #include "tools/ModelSummary.h"
+#include "tools/VariableList.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -185,6 +186,18 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
         report.Print(TextOfHistory(models[key]["history"]));
     }
     return code;
+}
+
+ExitCode RunVariables(const std::string& stepType, RunReport& report) {
+    const std::optional<unsigned> type = FindStepType(stepType);
+    if (!stepType.empty() && !type) {
+        report.Error("qrxdeck",
+                     "there is no step type '" + stepType + "'; the step types are " + StepTypeNames());
+        return ExitCode::WRONG_USAGE;
+    }
+    ordered_json& variables = report.Member("variables") = DescribeVariables(type);
+    report.Print(TextOfVariables(variables, type));
+    return ExitCode::DONE;
 }
 
 ExitCode RunSchema(const std::string& output, RunReport& report) {

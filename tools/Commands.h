@@ -21,6 +21,8 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
 ExitCode RunCheck(const std::string& model, RunReport& report);
 /// `history`: also what every object is in each step.
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report);
+/// The catalogue of output variables; `stepType` empty for all procedures.
+ExitCode RunVariables(const std::string& stepType, RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.
 ExitCode RunSchema(const std::string& output, RunReport& report);
 

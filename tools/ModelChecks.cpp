@@ -275,9 +275,8 @@ void FindOnConditions(const odiK_Model& model, Findings& findings) {
         if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
             if (!elementSets) elementSets = ElementSetsOf(model);
             if (motion->connectors.IsEmpty()) {
-                findings.push_back(
-                    {place + "/connectors",
-                     "the condition names no connectors, so the element set of its name is empty"});
+                findings.push_back({place + "/connectors",
+                                    "the condition names no connectors, so no element set carries its name"});
             }
             for (int i = 0; i < motion->connectors.Length(); ++i) {
                 if (elementSets->count(Text(motion->connectors[i])) != 0) continue;

@@ -29,11 +29,14 @@ struct CommandLine {
     WriteRequest write;
     std::string model;
     std::string schemaOutput;
+    std::string stepType;
     bool json = false;
     bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
     CLI::App* checkCommand = app.add_subcommand("check", "Look for errors in a model, write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
+    CLI::App* variablesCommand =
+        app.add_subcommand("variables", "List the variables that output requests can ask for");
     CLI::App* schemaCommand =
         app.add_subcommand("schema", "Print the JSON Schema of model files, for editors and generators");
 
@@ -59,6 +62,11 @@ struct CommandLine {
             "--history", history,
             "Also what conditions, loads, interactions and output requests are in each step, "
             "and what the step writes of them");
+        variablesCommand
+            ->add_option("--step-type", stepType,
+                         "Only those of one procedure, by the class of its step, such as StaticStep")
+            ->type_name("TYPE");
+        AddJson(variablesCommand);
         schemaCommand->add_option("--output", schemaOutput, "File to write (default: the standard output)")
             ->type_name("FILE");
     }
@@ -68,19 +76,23 @@ struct CommandLine {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
         return std::string("there is no command '") + argv[1] +
-               "'; the commands are write, check, info and schema";
+               "'; the commands are write, check, info, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return RunCheck(model, report);
         if (*infoCommand) return RunInfo(model, history, report);
+        if (*variablesCommand) return RunVariables(stepType, report);
         return RunSchema(schemaOutput, report);
     }
 
 private:
     void AddModel(CLI::App* command, std::string& file) {
         command->add_option("MODEL", file, "Model file, JSON")->required()->type_name("");
+        AddJson(command);
+    }
+    void AddJson(CLI::App* command) {
         command->add_flag(
             "--json", json,
             "Everything as one JSON object on the standard output: exitCode, messages, results");

@@ -1,9 +1,12 @@
 #ifndef QRX_STORE_RGNC_REGION_H
 #define QRX_STORE_RGNC_REGION_H
 
+#include "foundation/cow_List.h"
 #include "store_interface/model/ddr_Shortcut.h"
 #include "store_interface/model/rgnC_SetData.h"
 #include "store_interface/records/cls_FieldTable.h"
+
+#include <initializer_list>
 
 /// The set behind a region: its id among the sets of its owner, and its data.
 class rgnC_Set {
@@ -42,6 +45,10 @@ private:
     cow_String instanceName_;
     rgnC_Set set_;
 };
+
+/// Those of the regions that are node sets, in order: what keywords name as surfaces needs a node-based
+/// surface for these.
+cow_List<rgnC_Region> rgnC_NodeSetsAmong(std::initializer_list<rgnC_Region> regions);
 
 template <>
 struct cls_TypeOf<rgnC_Region> : cls_PlainTypeOf<rgnC_Region, cls_FieldKind::Region> {};

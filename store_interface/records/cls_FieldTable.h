@@ -4,6 +4,7 @@
 #include "foundation/cow_2DArray.h"
 #include "foundation/cow_Map.h"
 #include "foundation/gsl_Geometry.h"
+#include "foundation/omi_complex.h"
 #include "foundation/omu_PrimEnum.h"
 #include "store_interface/records/cls_Record.h"
 
@@ -25,6 +26,7 @@ enum class cls_FieldKind {
     Enum,      ///< cls_EnumType
     Triple,    ///< a gsl_Point, gsl_Vector or g3d_Vector: cls_TripleType
     Segment,   ///< gsl_ModelSegment
+    Complex,   ///< omi_complex
     Table,     ///< rows of doubles: cls_TableType
     List,      ///< cls_ListType
     Map,       ///< by name: cls_MapType

@@ -33,6 +33,8 @@ template <>
 struct cls_TypeOf<cow_String> : cls_PlainTypeOf<cow_String, cls_FieldKind::String> {};
 template <>
 struct cls_TypeOf<gsl_ModelSegment> : cls_PlainTypeOf<gsl_ModelSegment, cls_FieldKind::Segment> {};
+template <>
+struct cls_TypeOf<omi_complex> : cls_PlainTypeOf<omi_complex, cls_FieldKind::Complex> {};
 
 template <class E>
 struct cls_TypeOf<E, std::enable_if_t<std::is_enum_v<E>>> {

@@ -26,9 +26,4 @@ public:
     static constexpr cls_ClassInfo Class{"kopC_Task", "an optimisation task"};
 };
 
-class karC_RemeshingRule : public cls_AbstractRecordOf<karC_RemeshingRule> {
-public:
-    static constexpr cls_ClassInfo Class{"karC_RemeshingRule", "a rule for adaptive remeshing between jobs"};
-};
-
 #endif

@@ -23,13 +23,6 @@ cow_List<T> List(std::initializer_list<T> items) {
     return list;
 }
 
-/// What all keywords of a list write, one after the other.
-inline std::string WrittenAll(const qkw_KeywordList& keywords) {
-    std::string text;
-    for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
-    return text;
-}
-
 /// A store with a datum system by name.
 class CsysStore : public TestStore {
 public:

@@ -28,7 +28,26 @@ std::string Attribute(const std::string& member, const std::string& record) {
                  member + R"(": [)" + record + R"(]}}, "datums": [{"name": "LOCAL"}], )" + section);
 }
 
+/// An equation of one term in a system, on this set.
+std::string EquationTerm(const std::string& set) {
+    return Whole(
+        R"("sets": [{"name": "WIRES", "kind": "element", "members": [{"instance": "I", "labels": [4]}]},
+                             {"name": "POINTS", "kind": "node", "members": [{"instance": "I", "labels": [1]}]}])",
+        R"("datums": [{"name": "LOCAL"}],
+           "constraints": {"Q": {"class": "kcoC_Equation", "terms": [{"setName": ")" +
+            set + R"(", "dof": 1, "csys": "LOCAL"}]}})");
+}
+
 const FindingCase referenceCases[] = {
+    {"TermInASystemOnANodeSetOfTheAssembly", EquationTerm("POINTS"), {}},
+    {"TermInASystemOnElements",
+     EquationTerm("WIRES"),
+     {"@/constraints/Q/terms/0/setName: found 'WIRES', expected a node set of the assembly, since the term "
+      "has a csys"}},
+    {"TermInASystemOnASetOfAnInstance",
+     EquationTerm("I.ALL"),
+     {"@/constraints/Q/terms/0/setName: found 'I.ALL', expected a node set of the assembly, since the term "
+      "has a csys"}},
     {"RegionOfNoAssemblySet",
      Region(R"("WIRE")"),
      {"@/assembly/sectionAssignments/0/region: found set 'WIRE', expected the name of a set of the assembly; "

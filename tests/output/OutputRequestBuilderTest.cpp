@@ -6,22 +6,10 @@
 
 namespace {
 
-class OutputState final : public cls_RecordOf<OutputState, korC_OutputState> {
-public:
-    static constexpr cls_ClassInfo Class{"TestOutputState", "asks for nothing in particular"};
-};
-
+/// A request that begins in the step, for the preselected variables.
 template <class Base>
-class RequestOf final : public cls_RecordOf<RequestOf<Base>, Base> {
-public:
-    static constexpr cls_ClassInfo Class{"TestRequest", "an output request"};
-    cls_Record* NewState(unsigned) const override { return new OutputState(); }
-};
-
-/// A request that begins in the step.
-template <class Base>
-RequestOf<Base> RequestFrom(const cow_String& stepName, const kprC_StepContainer& steps) {
-    RequestOf<Base> request;
+Base RequestFrom(const cow_String& stepName, const kprC_StepContainer& steps) {
+    Base request;
     request.Give(stepName);
     request.Propagate(steps);
     return request;
@@ -224,7 +212,7 @@ TEST_F(OutputRequests, FieldRequest_CallsForTheBannerAlsoWithLoadCases) {
     store.model.steps.Append("B", step);
     store.model.fieldOutputRequests.Insert("F", RequestFrom<korC_FieldOutput>("B", store.model.steps));
     EXPECT_EQ(BodyOf("A"), "");
-    EXPECT_EQ(BodyOf("B"), kRequests);
+    EXPECT_EQ(BodyOf("B"), kRequests + "** \n** FIELD OUTPUT: F\n** \n*Output, field, variable=PRESELECT\n");
 }
 
 TEST_F(OutputRequests, HistoryRequest_CallsForNoBannerWithLoadCases) {
@@ -236,6 +224,7 @@ TEST_F(OutputRequests, HistoryRequest_CallsForNoBannerWithLoadCases) {
     request.Give("B");
     request.Propagate(store.model.steps);
     store.model.historyOutputRequests.Insert("H", request);
-    EXPECT_EQ(BodyOf("A"), kRequests);
+    EXPECT_EQ(BodyOf("A"),
+              kRequests + "** \n** HISTORY OUTPUT: H\n** \n*Output, history, variable=PRESELECT\n");
     EXPECT_EQ(BodyOf("B"), "");
 }

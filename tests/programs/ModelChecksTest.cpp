@@ -109,3 +109,60 @@ TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
                      "/assembly/instances/B: 1 element of type 'MASS' can't take the section 'S' "
                      "(kseC_HomogenousSolidSection)"}));
 }
+
+namespace {
+
+/// Findings on a condition "B", or on conditions given whole, on a mesh that needs no section.
+Texts ConditionFindings(const std::string& conditions, const std::string& loadCases = "") {
+    const std::string mesh = R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
+        "elements": [{"type": "CONN3D2", "labels": [1], "connectivity": [[1, 2]]}],
+        "sets": [{"name": "N", "kind": "node", "labels": [1]}, {"name": "E", "kind": "element", "labels": [1]},
+                 {"name": "S", "kind": "surface", "facets": [[1, "END1"]]}]}}},
+        "assembly": {"instances": {"A": {"part": "P"}}})";
+    return Findings(mesh + R"(, "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
+        {"name": "Linear", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {)" +
+                    loadCases + R"(}}], "boundaryConditions": {)" + conditions + "}");
+}
+
+const std::string kPlace = "/boundaryConditions/";
+
+} // namespace
+
+TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
+    EXPECT_EQ(
+        ConditionFindings(R"(
+        "element": {"class": "kbcC_DisplacementBC", "region": "A.E", "states": {"Initial": {"u1": 0}}},
+        "none": {"class": "kbcC_TypeBC", "states": {"Initial": {"typeName": 0}}},
+        "right": {"class": "kbcC_PorePressureBC", "region": "A.N", "states": {"Initial": {"magnitude": 0}}},
+        "suppressed": {"class": "kbcC_TypeBC", "region": "A.E", "suppressed": true},
+        "surface": {"class": "kbcC_SubmodelBC", "region": "A.S", "states": {"Initial": {"dofs": [1]}}})"),
+        (Texts{kPlace + "element/region: found 'E', which is an element set; the condition acts on nodes",
+               kPlace + "none: the condition has no region, so its lines name no set",
+               kPlace + "surface/region: found 'S', which is a surface; the condition acts on nodes"}));
+}
+
+TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
+    EXPECT_EQ(
+        ConditionFindings(R"(
+        "nodes": {"class": "kbcC_ConnVelocityBC", "region": "A.N", "connectors": ["A.E", "A.N"],
+                  "states": {"Initial": {"v1": 0}}},
+        "nothing": {"class": "kbcC_ConnVelocityBC", "region": "A.E", "states": {"Initial": {"v1": 0}}},
+        "right": {"class": "kbcC_ConnDisplacementBC", "region": "A.E", "connectors": ["A.E"],
+                  "states": {"Initial": {"u1": 0}}})"),
+        (Texts{kPlace +
+                   "nodes/region: found 'N', which is a node set; the condition acts on connector elements",
+               kPlace + "nodes/connectors/1: found 'A.N', which is no element set",
+               kPlace + "nothing/connectors: the condition names no connectors, so no element set carries "
+                        "its name"}));
+}
+
+TEST(ModelChecks, ConditionThatNoStepWrites_IsTold) {
+    EXPECT_EQ(ConditionFindings(R"(
+        "left out": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "taken": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "without states": {"class": "kbcC_TypeBC", "region": "A.N"})",
+                                R"("case": {"bcs": {"taken": 1}})"),
+              (Texts{kPlace + "left out: no step writes the condition",
+                     kPlace + "without states: no step writes the condition"}));
+}

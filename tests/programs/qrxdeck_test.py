@@ -273,7 +273,7 @@ class Refusals(ProgramTest):
     def test_UnknownCommand_IsNamed(self):
         self.assert_refused(self.run_program("wirte", "model.json"), 2,
                             "qrxdeck: error: there is no command 'wirte'; "
-                            "the commands are write, check, info and schema\n"
+                            "the commands are write, check, info, variables and schema\n"
                             "Run with --help for more information.\n")
 
     def test_WrongUsage_IsToldInJson(self):
@@ -539,6 +539,82 @@ class OtherCommands(ProgramTest):
             "name": "Hit", "class": "kprC_ExplicitDynamicsStep", "procedure": "explicit dynamics",
             "perturbation": False, "explicit": True, "suppressed": True, "nlgeom": True, "period": 0.001,
             "increments": {"initial": 0.0}, "loadCases": []})
+
+    def test_InfoWithHistory_IsATableOfObjectsBySteps(self):
+        def conditions(model):
+            model["steps"].extend([{"name": "Press", "class": "kprC_StaticStep"},
+                                   {"name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+                                    "loadCases": {"up": {"bcs": {"Tip": 2}}}},
+                                   {"name": "Release", "class": "kprC_StaticStep"}])
+            support = {"class": "kbcC_TypeBC", "region": "ROD-1.TIP"}
+            model["boundaryConditions"] = {
+                "Hold": dict(support, states={"Initial": {"typeName": "PINNED"}, "Release": {"deactivated": True}}),
+                "Off": dict(support, suppressed=True, states={"Initial": {"typeName": "PINNED"}}),
+                "Tip": dict(support, states={"Press": {"typeName": "XSYMM"}})}
+            model["loads"] = {
+                "Bolt": {"class": "kloC_BoltLoad", "region": "ROD-1.TIP",
+                         "states": {"Press": {"magnitude": 5}, "Release": {"boltMethod": "FIX_LENGTH"}}}}
+        self.put("model.json", changed(conditions))
+        run = self.run_program("info", "model.json", "--history")
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        self.assertTrue(run.output.endswith(
+            "  history of boundary conditions\n"
+            "                      Initial    Press       Cases                         Release\n"
+            "    Hold              created *  propagated  propagated from base state !  deactivated !\n"
+            "    Off (suppressed)  created    propagated  propagated from base state    propagated\n"
+            "    Tip               -          created *   propagated from base state !  propagated !\n"
+            "  history of loads\n"
+            "          Initial  Press      Cases                  Release\n"
+            "    Bolt  -        created *  built into base state  modified !\n"
+            "  (* written in the step, ! with op=NEW; of interactions and output requests only the status)\n"),
+            run.output)
+        plain = self.run_program("info", "model.json")
+        self.assertNotIn("history", plain.output)
+        model = json.loads(self.run_program("info", "model.json", "--history", "--json").output)["models"]["Default Model"]
+        self.assertEqual(model["history"]["boundaryConditions"]["Hold"], {
+            "class": "kbcC_TypeBC", "suppressed": False, "steps": [
+                {"step": "Initial", "status": "CREATED", "written": True, "opNew": False},
+                {"step": "Press", "status": "PROPAGATED", "written": False, "opNew": False},
+                {"step": "Cases", "status": "PROPAGATED_FROM_BASE_STATE", "written": True, "opNew": True},
+                {"step": "Release", "status": "DEACTIVATED", "written": True, "opNew": True}]})
+        self.assertEqual(model["history"]["interactions"], {})
+
+    def test_InfoWithHistory_OfAModelWithoutObjects_AddsNothing(self):
+        self.assertEqual(self.run_program("info", "model.json", "--history").output,
+                         self.run_program("info", "model.json").output)
+
+    def test_Check_OfConditionsThatNameWhatIsNotThere_TellsAllOfIt(self):
+        def conditions(model):
+            model["steps"].append({"name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+                                   "loadCases": {"up": {"bcs": {"Tipp": 2}, "loads": {"Bolts": 1}}}})
+            model["boundaryConditions"] = {
+                "Tip": {"class": "kbcC_TypeBC", "region": "ROD-1.TIPP",
+                        "states": {"Casez": {"typeName": "PINNED"}, "Initial": {"typeName": "FREE"}}},
+                "Wire": {"class": "kbcC_ConnVelocityBC", "connectors": ["ROD-1.WIRE"], "datum": "System",
+                         "states": {"Initial": {"v1": 0, "amplitude": "Ramp"}, "Cases": {"u1": 0}}}}
+        self.put("model.json", changed(conditions))
+        run = self.run_program("check", "model.json")
+        self.assertEqual(run.returncode, 1)
+        for place in ["steps/1/loadCases/up/bcs/Tipp", "steps/1/loadCases/up/loads/Bolts", "boundaryConditions/Tip/region",
+                      "boundaryConditions/Tip/states/Casez", "boundaryConditions/Tip/states/Initial/typeName",
+                      "boundaryConditions/Wire/connectors/0", "boundaryConditions/Wire/datum",
+                      "boundaryConditions/Wire/states/Initial/amplitude", "boundaryConditions/Wire/states/Cases/u1"]:
+            self.assertIn("model.json: error: /models/Default Model/" + place + ": found ", run.errors)
+        self.assertEqual(len(run.errors.splitlines()), 9, run.errors)
+
+    def test_Check_OfASubmodelWithANegativeTolerance_Warns(self):
+        def conditions(model):
+            model["boundaryConditions"] = {
+                "Cut": {"class": "kbcC_SubmodelBC", "region": "ROD-1.TIP", "shellThickness": -1.5,
+                        "absoluteExteriorTolerance": -0.5, "exteriorTolerance": -2.5,
+                        "states": {"Initial": {"dofs": [1]}}}}
+        self.put("model.json", changed(conditions))
+        run = self.run_program("check", "model.json")
+        cut = "model.json: warning: /models/Default Model/boundaryConditions/Cut/"
+        self.assertEqual((run.returncode, run.errors.splitlines()), (0, [
+            cut + "shellThickness: found -1.5, expected 0 or more",
+            cut + "absoluteExteriorTolerance: found -0.5, expected 0 or more",
+            cut + "exteriorTolerance: found -2.5, expected 0 or more"]))
 
     def test_Check_ForetellsWhatIsOddAboutSteps(self):
         self.put("model.json", changed(lambda model: model["steps"].extend([

@@ -56,7 +56,6 @@ void Contact::CompleteState(cls_Record& state, mdl_PropagationStatusEnm status,
 
 const cls_FieldTable& RequestState::Fields() {
     static const cls_FieldTable fields = cls_Describe<RequestState>(korC_OutputState::Fields())
-                                             .Field<&RequestState::frequency>("frequency", "every so often")
                                              .Field<&RequestState::variable>("variable", "what");
     return fields;
 }

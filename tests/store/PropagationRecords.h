@@ -107,8 +107,10 @@ class RequestState final : public cls_RecordOf<RequestState, korC_OutputState> {
 public:
     static constexpr cls_ClassInfo Class{"sample_RequestState", "state of a request"};
 
-    mdl_PropAttr<int> frequency;
+    RequestState() : cls_RecordOf(0U, true) {}
     mdl_PropAttr<cow_String> variable;
+
+    korC_OdbChannel::TypeEnm Channel() const override { return korC_OdbChannel::TypeEnm::FIELD; }
 
     static const cls_FieldTable& Fields();
 };

@@ -29,6 +29,13 @@ inline std::string Written(const qkw_Keyword& keyword) {
     return text;
 }
 
+/// What all keywords of a list write, one after the other.
+inline std::string WrittenAll(const qkw_KeywordList& keywords) {
+    std::string text;
+    for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
+    return text;
+}
+
 /// What writing through the stream gives.
 template <class Action>
 std::string Streamed(const Action& action) {

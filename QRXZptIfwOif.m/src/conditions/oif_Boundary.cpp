@@ -17,8 +17,8 @@ constexpr std::string_view kBaseNamePrefix = "__basename__";
 
 } // namespace
 
-oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const kbcC_BC& bc, const cow_String& stepName,
-                                           bool opMod, const cow_String& setName,
+oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const mdl_ObjCow<kbcC_BC>& bc,
+                                           const cow_String& stepName, bool opMod, const cow_String& setName,
                                            const cow_String& initialStepName, double scale)
     : style_(style), opNew_(!opMod), bc_(bc), stepName_(stepName), setName_(setName), modifiedOnly_(opMod),
       initialStepName_(initialStepName), scale_(scale) {
@@ -121,9 +121,9 @@ cow_String oif_ConditionKeyword::Dof(int number) const {
     return style_.dofRange ? one + one : one;
 }
 
-oif_Boundary::oif_Boundary(const kbcC_BC& bc, const cow_String& name, const cow_String& stepName, bool opMod,
-                           const cow_String& setName, bool shellToSolid, const cow_String& initialStepName,
-                           double scale)
+oif_Boundary::oif_Boundary(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& name, const cow_String& stepName,
+                           bool opMod, const cow_String& setName, bool shellToSolid,
+                           const cow_String& initialStepName, double scale)
     : qkw_KeywordOf({"*Boundary", true, true}, bc, stepName, opMod, setName, initialStepName, scale),
       name_(name), shellToSolid_(shellToSolid) {
     CheckForSubmodelBC();
@@ -253,7 +253,7 @@ void oif_Boundary::WriteSubmodel(utl_Stream& stream) const {
     for (int i = 0; i < dofs.Length(); ++i) WriteLine(stream, Dof(dofs[i]), 0.0);
 }
 
-oif_ConnectorMotion::oif_ConnectorMotion(const kbcC_BC& bc, const cow_String& setName,
+oif_ConnectorMotion::oif_ConnectorMotion(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& setName,
                                          const cow_String& stepName, bool opMod,
                                          const cow_String& initialStepName, double scale)
     : qkw_KeywordOf({"*Connector Motion", false, false}, bc, stepName, opMod, setName, initialStepName,

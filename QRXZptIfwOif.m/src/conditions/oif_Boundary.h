@@ -23,8 +23,9 @@ protected:
         /// An amplitude that was taken away counts as a new one.
         bool clearedAmplitudeIsNew;
     };
-    oif_ConditionKeyword(const Style& style, const kbcC_BC& bc, const cow_String& stepName, bool opMod,
-                         const cow_String& setName, const cow_String& initialStepName, double scale);
+    oif_ConditionKeyword(const Style& style, const mdl_ObjCow<kbcC_BC>& bc, const cow_String& stepName,
+                         bool opMod, const cow_String& setName, const cow_String& initialStepName,
+                         double scale);
 
     virtual void WriteForms(utl_Stream& stream) const = 0;
     /// The parameters behind all others.
@@ -78,8 +79,8 @@ private:
 /// A class without a form raises.
 class oif_Boundary final : public qkw_KeywordOf<oif_Boundary, oif_ConditionKeyword> {
 public:
-    oif_Boundary(const kbcC_BC& bc, const cow_String& name, const cow_String& stepName, bool opMod,
-                 const cow_String& setName, bool shellToSolid, const cow_String& initialStepName,
+    oif_Boundary(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& name, const cow_String& stepName,
+                 bool opMod, const cow_String& setName, bool shellToSolid, const cow_String& initialStepName,
                  double scale);
 
     /// A boundary that a global model drives in this step: its data lines stand under a line that it shares
@@ -112,8 +113,8 @@ private:
 /// A class without a form raises.
 class oif_ConnectorMotion final : public qkw_KeywordOf<oif_ConnectorMotion, oif_ConditionKeyword> {
 public:
-    oif_ConnectorMotion(const kbcC_BC& bc, const cow_String& setName, const cow_String& stepName, bool opMod,
-                        const cow_String& initialStepName, double scale);
+    oif_ConnectorMotion(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& setName, const cow_String& stepName,
+                        bool opMod, const cow_String& initialStepName, double scale);
 
 private:
     void WriteForms(utl_Stream& stream) const override;

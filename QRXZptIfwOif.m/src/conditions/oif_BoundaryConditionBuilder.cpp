@@ -105,8 +105,9 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const cow_String& name, const kb
                           oif_Comment(cow_String("Applies To: ") +
                                       oif_BoundarySubmodelList::Joined(connectors->connectors)),
                           loadCaseName);
-        AddStepDefinition(stepName, oif_ConnectorMotion(bc, setName, stepName, opMod, initialStep, factor),
-                          loadCaseName);
+        AddStepDefinition(
+            stepName, oif_ConnectorMotion(Shared(name, bc), setName, stepName, opMod, initialStep, factor),
+            loadCaseName);
         return;
     }
     // The classes with a label are those with a keyword.
@@ -114,8 +115,8 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const cow_String& name, const kb
         QRXBasException::Throw(
             nex_PrimException<atr_String, 1>("Unimplemented keyword for boundary condition"));
     }
-    const oif_Boundary boundary(bc, name, stepName, opMod, setName, Model().ShellToSolid(), initialStep,
-                                factor);
+    const oif_Boundary boundary(Shared(name, bc), name, stepName, opMod, setName, Model().ShellToSolid(),
+                                initialStep, factor);
     if (boundary.IsBCSubmodel()) {
         submodelList_.Append(stepName, shownName, boundary);
         return;
@@ -224,6 +225,12 @@ void oif_BoundaryConditionBuilder::CreateSubmodelKwds() {
             AddStepDefinition(stepNames_[i], keywords[k].ConstGet());
         }
     }
+}
+
+const mdl_ObjCow<kbcC_BC>& oif_BoundaryConditionBuilder::Shared(const cow_String& name, const kbcC_BC& bc) {
+    mdl_ObjCow<kbcC_BC>& shared = shared_.GetOrInsert(name);
+    if (shared.IsNull()) shared = bc;
+    return shared;
 }
 
 void oif_BoundaryConditionBuilder::AddHeader(const cow_String& stepName, const cow_String& loadCaseName) {

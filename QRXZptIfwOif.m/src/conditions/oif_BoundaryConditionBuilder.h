@@ -49,7 +49,11 @@ private:
     /// Null if the step is none of the analysis.
     const kprC_AnalysisStep* AnalysisStep(const cow_String& stepName) const;
 
+    /// The condition for keywords, all of which share it.
+    const mdl_ObjCow<kbcC_BC>& Shared(const cow_String& name, const kbcC_BC& bc);
+
     cow_List<cow_String> stepNames_;
+    cow_Map<cow_String, mdl_ObjCow<kbcC_BC>> shared_;
     oif_BoundarySubmodelList submodelList_;
     oif_BlockHeader blockHeader_;
     oif_BCOpStatus opStatus_;

@@ -1,10 +1,15 @@
 #include "output/oif_OutputRequestBuilder.h"
 
 #include "deck/oif_Comment.h"
+#include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
+#include "output/oif_Output.h"
 #include "steps/oif_StepControls.h"
 #include "steps/oif_StepExtras.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
+#include "store_interface/records/interactions/kinC_Contact.h"
+#include "store_interface/records/steps/kprC_Predicates.h"
 
 #include <memory>
 
@@ -27,17 +32,74 @@ constexpr std::unique_ptr<qkw_Keyword> (*kControlsKeywords[])(const kprC_Control
     KeywordFor<oif_ElectricalControls, kprC_ElectricalControls>,
 };
 
-template <class Output>
-bool AnyHasStep(const kprC_PropagatingContainer<Output>& requests, const cow_String& stepName) {
-    for (mdl_RepositoryIT it(requests); !it.IsDone(); it.Next()) {
-        if (static_cast<const korC_Output&>(it.CurrentRecord()).HasStep(stepName)) return true;
+using Table = korC_OdbRequestTable;
+using Domain = korC_DomainTypeEnm;
+using Print = korC_OdbRequestSpec::PrintEnm;
+
+// Bits of a region's flag word.
+constexpr int kNodeContent = 1;
+constexpr int kElementContent = 2;
+constexpr int kOtherContent = 4;
+constexpr int kSurface = 8;
+
+bool IsElementRegion(const rgnC_Region& region) {
+    const int flags = region.FlagWord();
+    return (flags & kElementContent) != 0 && (flags & (kNodeContent | kOtherContent)) == 0;
+}
+
+bool Holds(const cow_List<cow_String>& names, const cow_String& name) {
+    for (int i = 0; i < names.Length(); ++i) {
+        if (names[i] == name) return true;
     }
     return false;
 }
 
+/// The first name with the suffix, as decks print it; empty for none.
+cow_String FirstWith(const cow_List<cow_String>& names, const char* suffix) {
+    if (names.IsEmpty()) return {};
+    return qkw_QuorixName(names[0] + suffix, false).Printable();
+}
+
+/// Whether the procedure can write so often.
+bool IsAllowed(korC_TypeEnm type, const kprC_AnalysisStep& step, bool isField) {
+    const unsigned stepType = step.DynTypeId();
+    switch (type) {
+    case korC_TypeEnm::FREQUENCY: return kprC_OutputFrequencyIsAllowed(stepType, isField);
+    case korC_TypeEnm::NUMBER_INTERVAL: return kprC_NumberIntervalIsAllowed(step);
+    case korC_TypeEnm::TIME_INTERVAL: return kprC_TimeIntervalIsAllowed(stepType);
+    case korC_TypeEnm::TIME_POINTS: return kprC_TimePointIsAllowed(stepType, isField);
+    case korC_TypeEnm::MODE_LIST: return kprC_ModesIsAllowed(stepType);
+    }
+    return false;
+}
+
+/// Time points have another number in a request.
+korC_OdbRequest::TypeEnm RequestType(korC_TypeEnm type) {
+    return type == korC_TypeEnm::TIME_POINTS ? korC_OdbRequest::TypeEnm::TIME_POINTS
+                                             : static_cast<korC_OdbRequest::TypeEnm>(type);
+}
+
+void TakeFrequency(korC_TypeEnm type, const korC_OutputState& state, korC_OdbRequest& request) {
+    switch (type) {
+    case korC_TypeEnm::FREQUENCY: request.frequency = state.frequency.ConstGet(); break;
+    case korC_TypeEnm::NUMBER_INTERVAL: request.numberInterval = state.numberInterval.ConstGet(); break;
+    case korC_TypeEnm::TIME_INTERVAL: request.timeInterval = state.timeInterval.ConstGet(); break;
+    case korC_TypeEnm::MODE_LIST: request.modeList = state.modeList.ConstGet(); break;
+    case korC_TypeEnm::TIME_POINTS: request.timePoints = state.timePoints.ConstGet(); break;
+    }
+}
+
 } // namespace
 
+oif_OutputRequestBuilder::oif_OutputRequestBuilder(oif_ModelInfo& modelInfo) : oif_ComponentOf(modelInfo) {
+    for (mdl_MapString2ObjCowIT<karC_RemeshingRule> it(Model().RemeshingRules()); !it.IsDone(); it.Next()) {
+        const karC_RemeshingRule& rule = it.CurrentValue();
+        if (!rule.suppressed && !Holds(remeshingSteps_, rule.stepName)) remeshingSteps_.Append(rule.stepName);
+    }
+}
+
 void oif_OutputRequestBuilder::Build() {
+    hasSimBasedStep_ = false;
     mdl_ObjCow<kprC_DiagnosticPrint> print;
     kprC_StepContainerIT it(Model().Steps());
     if (it.IsDone()) return;
@@ -45,6 +107,8 @@ void oif_OutputRequestBuilder::Build() {
         const cow_String& stepName = it.CurrentKey();
         const nex_Context context("step", stepName);
         const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(it.CurrentValue(), NEX_HERE);
+        // Earlier steps don't know of it yet.
+        if (!step.suppressed && step.SimBased()) hasSimBasedStep_ = true;
         AddSolutionControls(step, stepName);
         AddSolverControls(step, stepName);
         const cow_String monitorSet = GetMonitorSetName(step);
@@ -58,6 +122,18 @@ void oif_OutputRequestBuilder::Build() {
         if (!step.restart.IsNull()) AddStepDefinition(stepName, oif_Restart(step.restart));
         AddDiagnosticPrint(step, stepName, print);
         if (!monitorSet.IsEmpty()) AddStepDefinition(stepName, oif_Monitor(step.monitor, monitorSet));
+        const unsigned stepType = step.DynTypeId();
+        const Place place{step, stepName, stepType, kprC_IsExplicit(stepType) ? step.TimePeriod() : 0.0};
+        if (hasField) {
+            cow_List<cow_String> names;
+            const Channel channel = GetField(place, names);
+            CreateOdbRequests(channel, place, names);
+        }
+        if (hasHistory) {
+            cow_List<cow_String> names;
+            const Channel channel = GetHistory(place, names);
+            CreateOdbRequests(channel, place, names);
+        }
     }
 }
 
@@ -108,13 +184,407 @@ cow_String oif_OutputRequestBuilder::GetMonitorSetName(const kprC_AnalysisStep& 
     if (step.monitor.IsNull()) return {};
     const rgnC_Region& region = step.monitor.ConstGet().region;
     if (region.SetName().IsEmpty()) return {};
-    return oif_SetName(region, Info()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    return GetSetName(region);
+}
+
+bool oif_OutputRequestBuilder::RefersToSomething(const korC_Output& output) const {
+    if (!output.boltLoad.IsEmpty()) {
+        if (!Model().Loads().IsMember(output.boltLoad)) return false;
+        const kloC_Load& load = Model().Loads().ConstGet(output.boltLoad);
+        return load.DynTypeId() == kloC_BoltLoad::TypeId() && !load.suppressed;
+    }
+    const cow_String interaction = GetInteractionSetName(output.interactions);
+    return Model().Interactions().IsMember(interaction) &&
+           !Model().Interactions().ConstGet(interaction).suppressed;
 }
 
 bool oif_OutputRequestBuilder::HasFieldRequest(const cow_String& stepName) const {
-    return AnyHasStep(Model().FieldOutputs(), stepName);
+    // Requests that end here or are suppressed count: the step has to stop the output of the one before it.
+    for (kprC_PropagatingContainerIT<korC_FieldOutput> it(Model().FieldOutputs()); !it.IsDone(); it.Next()) {
+        const korC_FieldOutput& output = it.CurrentValue();
+        if (!output.HasStep(stepName)) continue;
+        const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
+        if (isPlain || RefersToSomething(output)) return true;
+    }
+    return Holds(remeshingSteps_, stepName);
 }
 
 bool oif_OutputRequestBuilder::HasHistoryRequest(const cow_String& stepName) const {
-    return AnyHasStep(Model().HistoryOutputs(), stepName);
+    for (kprC_PropagatingContainerIT<korC_HistoryOutput> it(Model().HistoryOutputs()); !it.IsDone();
+         it.Next()) {
+        const korC_HistoryOutput& output = it.CurrentValue();
+        if (!output.HasStep(stepName)) continue;
+        const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
+        // Springs alone are no reason for output.
+        if (isPlain ? output.springs.IsEmpty() : RefersToSomething(output)) return true;
+    }
+    return false;
+}
+
+void oif_OutputRequestBuilder::Merge(const Request& request, const cow_String& name, Channel& channel,
+                                     cow_List<cow_String>& names) {
+    for (int i = 0; i < channel.requests.Length(); ++i) {
+        if (!(channel.requests[i] == request)) continue;
+        names.Get(i) = names[i] + ", " + name;
+        return;
+    }
+    channel.requests.Append(request);
+    names.Append(name);
+}
+
+template <class State>
+void oif_OutputRequestBuilder::Collect(const korC_Output& output, const cow_String& name, const Place& place,
+                                       Request request, Channel& channel, cow_List<cow_String>& names) const {
+    const Domain domain = output.DomainType();
+    if (output.suppressed || domain == Domain::SPRINGS) return;
+    if (!korC_Output::IsActive(output.Status(place.stepName))) return;
+    const nex_Context context("output request", name);
+    request.region = output.region;
+    request.boltLoad = output.boltLoad;
+    request.sectionPoints = output.sectionPoints;
+    request.interactions = output.interactions;
+    request.filter = output.filter;
+    if (output.rebar == korC_RebarEnm::INCLUDE || output.rebar == korC_RebarEnm::ONLY) {
+        request.rebar = output.rebar;
+    }
+
+    State state = nex_canDynamicCastRef<State>(output.ConstGetState(place.stepName), NEX_HERE);
+    request.frequency = state.frequency.ConstGet();
+    request.numberInterval = state.numberInterval.ConstGet();
+    request.timeInterval = state.timeInterval.ConstGet();
+    request.modeList = state.modeList.ConstGet();
+    request.timeMarks = state.timeMarks.ConstGet();
+    request.timePoints = state.timePoints.ConstGet();
+    korC_TypeEnm type = state.frequencyType.ConstGet();
+    if (!IsAllowed(type, place.step, channel.IsField())) {
+        const State usual(place.stepType);
+        type = usual.frequencyType.ConstGet();
+        TakeFrequency(type, usual, request);
+    }
+    request.frequencyType = RequestType(type);
+
+    if (!state.variables.ConstGet().IsEmpty()) {
+        state.ReconstructVariables(place.stepType);
+        state.ConvertVariablesToVariablesSymbol(place.stepType, false);
+    }
+    request.variables = state.variables.ConstGet();
+    if (request.variables.IsEmpty()) {
+        // Names that the procedure doesn't know leave it to the type, the preselection by default.
+        const Table& table = Table::Instance();
+        request.variablesType = state.variablesType.ConstGet();
+        if (request.variablesType == korC_VariablesTypeEnm::PRESELECT) {
+            request.variables = table.Defaults(channel.Type(), place.stepType, HasSimBasedStep(), domain, 0);
+        } else if (request.variablesType == korC_VariablesTypeEnm::ALL) {
+            request.variables = table.All(channel.Type(), place.stepType, domain, 0);
+        }
+        if (request.variables.IsEmpty()) return;
+    }
+    Merge(request, name, channel, names);
+}
+
+oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetField(const Place& place,
+                                                                     cow_List<cow_String>& names) const {
+    Channel channel(true);
+    for (kprC_PropagatingContainerIT<korC_FieldOutput> it(Model().FieldOutputs()); !it.IsDone(); it.Next()) {
+        Request request;
+        request.directions = it.CurrentValue().directions;
+        Collect<korC_FieldOutputState>(it.CurrentValue(), it.CurrentKey(), place, request, channel, names);
+    }
+    if (Holds(remeshingSteps_, place.stepName)) CollectRemeshingRules(place, channel, names);
+    return channel;
+}
+
+oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetHistory(const Place& place,
+                                                                       cow_List<cow_String>& names) const {
+    Channel channel(false);
+    for (kprC_PropagatingContainerIT<korC_HistoryOutput> it(Model().HistoryOutputs()); !it.IsDone();
+         it.Next()) {
+        Request request;
+        request.section = it.CurrentValue().section;
+        request.springs = it.CurrentValue().springs;
+        Collect<korC_HistoryOutputState>(it.CurrentValue(), it.CurrentKey(), place, request, channel, names);
+    }
+    return channel;
+}
+
+void oif_OutputRequestBuilder::CollectRemeshingRules(const Place& place, Channel& channel,
+                                                     cow_List<cow_String>& names) const {
+    for (mdl_MapString2ObjCowIT<karC_RemeshingRule> it(Model().RemeshingRules()); !it.IsDone(); it.Next()) {
+        const karC_RemeshingRule& rule = it.CurrentValue();
+        if (!(rule.stepName == place.stepName) || rule.suppressed || !rule.fieldOutput) continue;
+        Request request;
+        request.region = rule.region;
+        request.variables = rule.GetFullVariableList();
+        request.variables.Append("EVOL");
+        request.frequency = rule.EveryIncrement() ? Table::fieldFrequencyDef() : Table::lastIncrementDef();
+        request.timeMarks = !kprC_IsExplicit(place.stepType);
+        cow_String name = cow_String(" from REMESHING RULE: ") + it.CurrentKey();
+        if (!rule.description.IsEmpty()) name = name + "\n" + rule.description;
+        Merge(request, name, channel, names);
+    }
+}
+
+bool oif_OutputRequestBuilder::IsScreenedOut(const Request& request, const Channel& channel,
+                                             unsigned stepType) {
+    const Table& table = Table::Instance();
+    const auto onlyOf = [&](Print print, Print other) {
+        return table
+            .GetInvalidPrintIdentifiers(request.variables, stepType, print, other, channel.Type(),
+                                        Domain::ALL_DOMAINS)
+            .IsEmpty();
+    };
+    return (!IsWritableNodeRegion(request.region) && onlyOf(Print::NODE, Print::NODE)) ||
+           (!IsWritableElementRegion(request.region) && onlyOf(Print::ELEMENT, Print::ELEMENT_OR_CONTACT));
+}
+
+void oif_OutputRequestBuilder::CreateOdbRequests(const Channel& channel, const Place& place,
+                                                 const cow_List<cow_String>& names) {
+    cow_List<Request> requests;
+    for (int i = 0; i < channel.requests.Length(); ++i) {
+        Request request = channel.requests[i];
+        request.name = names[i];
+        requests.Append(request);
+    }
+    requests.Sort();
+    const cow_List<korC_OdbRequestSpec> defaults =
+        Table::Instance().DefaultRequests(channel.Type(), place.stepType, Domain::ALL_DOMAINS);
+    if (requests.IsEmpty()) {
+        RequestNoOutput(channel, place, defaults.IsEmpty());
+        return;
+    }
+    const cow_String prefix(channel.IsField() ? "\nFIELD OUTPUT: " : "\nHISTORY OUTPUT: ");
+    bool first = true;
+    Request previous;
+    for (int i = 0; i < requests.Length(); ++i) {
+        const Request& request = requests[i];
+        const nex_Context context("output request", request.name);
+        AddStepDefinition(place.stepName, oif_Comment(prefix + request.name + "\n"));
+        const Traits traits = TraitsOf(request);
+        const bool isSymbol = traits.pre || traits.all;
+        const bool wasSymbol = previous.variablesType != korC_VariablesTypeEnm::LISTED;
+        const bool sharesLine = !first && !isSymbol && !wasSymbol && request.EqualFrequency(previous) &&
+                                request.filter == previous.filter;
+        if (!sharesLine) {
+            previous = request; // also when nothing of it is written
+            const bool onKeywords =
+                isSymbol && (!traits.whole || !request.sectionPoints.IsEmpty() || !request.directions);
+            if (onKeywords) {
+                // The sub-keywords tell the choice of variables.
+                AddOutputDefinition(request, channel, place, false, false);
+            } else {
+                if (IsScreenedOut(request, channel, place.stepType)) {
+                    if (first && i + 1 == requests.Length()) RequestNoOutput(channel, place, traits.pre);
+                    continue;
+                }
+                AddOutputDefinition(request, channel, place, traits.pre, traits.all);
+            }
+            first = false;
+        }
+        AddOutputSuboptions(request, channel, place, traits);
+    }
+}
+
+oif_OutputRequestBuilder::Traits oif_OutputRequestBuilder::TraitsOf(const Request& request) const {
+    Traits traits;
+    traits.domain = request.DomainType();
+    traits.pre = request.variablesType == korC_VariablesTypeEnm::PRESELECT;
+    traits.all = request.variablesType == korC_VariablesTypeEnm::ALL;
+    traits.whole = traits.domain == Domain::WHOLE_MODEL;
+    if (traits.domain == Domain::SET) traits.setName = GetSetName(request.region);
+    if (traits.domain == Domain::INTERACTION) traits.setName = GetInteractionSetName(request.interactions);
+    traits.hasSurface = traits.domain == Domain::CONTACT_SURFACE && !GetSurfaceName(request.region).IsEmpty();
+    return traits;
+}
+
+void oif_OutputRequestBuilder::RequestNoOutput(const Channel& channel, const Place& place, bool pre) {
+    Request none;
+    if (channel.IsField() && kprC_ModesIsAllowed(place.stepType)) {
+        none.frequencyType = Request::TypeEnm::MODE_LIST;
+        AddOutputDefinition(none, channel, place, pre, false);
+        AddStepDefinition(place.stepName,
+                          oif_NodeOutput(none, place.stepType, cow_String(), false, false, false));
+        return;
+    }
+    if (channel.IsField() && kprC_IsExplicit(place.stepType)) {
+        none.frequencyType = Request::TypeEnm::NUMBER_INTERVAL;
+    }
+    if (!channel.IsField() && kprC_IsFrequencyBuckle(place.stepType)) return;
+    AddOutputDefinition(none, channel, place, pre, false);
+}
+
+void oif_OutputRequestBuilder::AddOutputDefinition(const Request& request, const Channel& channel,
+                                                   const Place& place, bool pre, bool all) {
+    using Type = Request::TypeEnm;
+    const Type type = request.frequencyType;
+    const unsigned stepType = place.stepType;
+    const auto add = [&](const oif_Output& output) { AddStepDefinition(place.stepName, output); };
+    switch (type) {
+    case Type::FREQUENCY:
+        add(oif_Output(channel, type, request.frequency, pre, all, stepType, request.filter));
+        break;
+    case Type::NUMBER_INTERVAL:
+        add(oif_Output(channel, type, request.numberInterval, request.timeMarks, pre, all, place.time,
+                       stepType, request.filter));
+        break;
+    case Type::TIME_INTERVAL:
+        add(oif_Output(channel, type, request.timeInterval, request.timeMarks, pre, all, stepType,
+                       request.filter));
+        break;
+    case Type::MODE_LIST:
+        add(oif_Output(channel, type, request.modeList, pre, all, stepType, request.filter));
+        break;
+    case Type::TIME_POINTS:
+        add(oif_Output(channel, type, request.timePoints, request.timeMarks, pre, all, stepType,
+                       request.filter));
+        break;
+    }
+}
+
+void oif_OutputRequestBuilder::AddOutputSuboptions(const Request& request, const Channel& channel,
+                                                   const Place& place, const Traits& traits) {
+    AddIntegratedOutput(request, place, traits);
+    if (traits.domain == Domain::INTEGRATED_SECTION) return;
+    const bool isContact = traits.domain == Domain::CONTACT_SURFACE || traits.domain == Domain::INTERACTION;
+    if (!isContact) {
+        AddNodeOutput(request, place, traits);
+        AddElementOutput(request, channel, place, traits, cow_String(), false);
+        AddModalOutput(request, place, traits);
+        AddEnergyOutput(request, place, traits);
+        AddIncrementationOutput(request, place, traits);
+    }
+    AddContactOutput(request, channel, place, traits);
+    if (!isContact) AddRadiationOutput(request, place, traits);
+}
+
+bool oif_OutputRequestBuilder::IsSilent(const Request& request, const Traits& traits) {
+    return request.rebar == korC_RebarEnm::ONLY ||
+           (traits.whole && request.directions && (traits.pre || traits.all));
+}
+
+void oif_OutputRequestBuilder::AddIntegratedOutput(const Request& request, const Place& place,
+                                                   const Traits& traits) {
+    if (request.section.IsEmpty() || IsSilent(request, traits)) return;
+    AddStepDefinition(place.stepName, oif_IntegratedOutput(request, place.stepType, traits.pre, traits.all));
+}
+
+void oif_OutputRequestBuilder::AddNodeOutput(const Request& request, const Place& place,
+                                             const Traits& traits) {
+    if (request.rebar == korC_RebarEnm::ONLY) return;
+    // With section points the *Output line didn't say it all.
+    if (IsSilent(request, traits) && request.sectionPoints.IsEmpty()) return;
+    if (!GetSpringSetName(request.springs).IsEmpty() || !IsWritableNodeRegion(request.region)) return;
+    AddStepDefinition(place.stepName,
+                      oif_NodeOutput(request, place.stepType, traits.setName, traits.pre, traits.all, true));
+}
+
+void oif_OutputRequestBuilder::AddElementOutput(const Request& request, const Channel& channel,
+                                                const Place& place, const Traits& traits,
+                                                const cow_String& secondName, bool force) {
+    const auto add = [&](const cow_String& setName, bool rebar) {
+        AddStepDefinition(place.stepName, oif_ElementOutput(channel, request, place.stepType, setName,
+                                                            traits.pre, traits.all, rebar));
+    };
+    const bool allOfModel = traits.whole && request.sectionPoints.IsEmpty() && (traits.pre || traits.all);
+    if (!(allOfModel && request.directions)) {
+        const bool goes =
+            secondName.IsEmpty() ? IsWritableElementRegion(request.region) || traits.whole : force;
+        const cow_String& setName = secondName.IsEmpty() ? traits.setName : secondName;
+        if (goes && request.rebar != korC_RebarEnm::ONLY) add(setName, false);
+        if (goes && request.rebar != korC_RebarEnm::EXCLUDE) add(setName, true);
+    }
+    // Once more if it has been written already.
+    if (allOfModel && request.rebar != korC_RebarEnm::EXCLUDE) add(traits.setName, true);
+}
+
+void oif_OutputRequestBuilder::AddModalOutput(const Request& request, const Place& place,
+                                              const Traits& traits) {
+    if (IsSilent(request, traits) || kprC_IsExplicit(place.stepType)) return;
+    AddStepDefinition(place.stepName, oif_ModalOutput(request, place.stepType, traits.all));
+}
+
+void oif_OutputRequestBuilder::AddEnergyOutput(const Request& request, const Place& place,
+                                               const Traits& traits) {
+    if (IsSilent(request, traits) || !IsWritableElementRegion(request.region)) return;
+    AddStepDefinition(place.stepName,
+                      oif_EnergyOutput(request, place.stepType, traits.setName, traits.pre, traits.all));
+}
+
+void oif_OutputRequestBuilder::AddIncrementationOutput(const Request& request, const Place& place,
+                                                       const Traits& traits) {
+    if (IsSilent(request, traits) || !kprC_IsExplicit(place.stepType)) return;
+    AddStepDefinition(place.stepName,
+                      oif_IncrementationOutput(request, place.stepType, traits.pre, traits.all));
+}
+
+void oif_OutputRequestBuilder::AddContactOutput(const Request& request, const Channel& channel,
+                                                const Place& place, const Traits& traits) {
+    if (IsSilent(request, traits)) return;
+    cow_String master;
+    cow_String slave;
+    cow_String cpset;
+    const cow_String first = GetInteractionSetName(request.interactions);
+    if (Model().Interactions().IsMember(first)) {
+        const kinC_Interaction& interaction = Model().Interactions().ConstGet(first);
+        const unsigned type = interaction.DynTypeId();
+        if (interaction.suppressed || !interaction.HasStep(place.stepName)) {
+            // A pair that isn't there in the step is not named.
+        } else if (type == kinC_SurfaceToSurfaceContactStd::TypeId()) {
+            const auto& pair = nex_canDynamicCastRef<kinC_SurfaceToSurfaceContact>(interaction, NEX_HERE);
+            master = GetSurfaceName(pair.master);
+            slave = GetSurfaceName(pair.slave);
+        } else if (type == kinC_SelfContactStd::TypeId()) {
+            master = GetSurfaceName(nex_canDynamicCastRef<kinC_SelfContact>(interaction, NEX_HERE).surface);
+        } else if (type == kinC_SurfaceToSurfaceContactXpl::TypeId() ||
+                   type == kinC_SelfContactXpl::TypeId()) {
+            cpset = first;
+        }
+    }
+    if (!traits.hasSurface && traits.domain == Domain::SET) {
+        if (request.region.FlagWord() == 0 || IsElementRegion(request.region)) return;
+        if (traits.pre && kprC_IsExplicit(place.stepType)) return;
+    }
+    AddStepDefinition(place.stepName,
+                      oif_ContactOutput(request, place.stepType, traits.pre, traits.all, master, slave, cpset,
+                                        GetSetName(request.region), !channel.IsField()));
+}
+
+void oif_OutputRequestBuilder::AddRadiationOutput(const Request& request, const Place& place,
+                                                  const Traits& traits) {
+    if (IsSilent(request, traits) || kprC_IsExplicit(place.stepType)) return;
+    if (traits.domain == Domain::BOLT_LOAD || !IsWritableElementRegion(request.region)) return;
+    AddStepDefinition(place.stepName,
+                      oif_RadiationOutput(request, place.stepType, traits.setName, traits.all));
+}
+
+bool oif_OutputRequestBuilder::IsWritableNodeRegion(const rgnC_Region& region) {
+    return (region.FlagWord() & kSurface) == 0 && !IsElementRegion(region);
+}
+
+bool oif_OutputRequestBuilder::IsWritableElementRegion(const rgnC_Region& region) {
+    const int flags = region.FlagWord();
+    return flags == 0 || ((flags & kSurface) == 0 && (flags & kElementContent) != 0);
+}
+
+cow_String oif_OutputRequestBuilder::GetSpringSetName(const cow_List<cow_String>& springs) {
+    return FirstWith(springs, "-spring");
+}
+
+cow_String oif_OutputRequestBuilder::GetDashpotSetName(const cow_List<cow_String>& springs) {
+    return FirstWith(springs, "-dashpot");
+}
+
+cow_String oif_OutputRequestBuilder::GetInteractionSetName(const cow_List<cow_String>& interactions) {
+    return interactions.IsEmpty() ? cow_String() : interactions[0];
+}
+
+const cls_Record* oif_OutputRequestBuilder::GetSpring(const cow_String&) {
+    return nullptr;
+}
+
+cow_String oif_OutputRequestBuilder::GetSetName(const rgnC_Region& region) const {
+    return oif_SetName(region, Info()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+}
+
+cow_String oif_OutputRequestBuilder::GetSurfaceName(const rgnC_Region& region) const {
+    return oif_SetName(region, Info()).UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
 }

@@ -3,6 +3,8 @@
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_Orientation.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
+#include "store_interface/records/constraints/kcoC_Constraints.h"
 
 #include <map>
 #include <set>
@@ -18,6 +20,8 @@ void oif_TransformBuilder::Build() {
     CollectCsysRegionsList();
     WriteTransforms();
     WriteConnectorOrientations();
+    WriteCouplingOrientations();
+    WriteInertiaReliefOrientations();
 }
 
 void oif_TransformBuilder::CollectCsysRegionsList() {
@@ -31,6 +35,25 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         // A symmetry condition counts also without a system.
         if (condition.datum.IsNullRef() && condition.DynTypeId() != kSymmetryCondition) continue;
         append(condition.datum, condition.region);
+    }
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const kloC_Load& load = it.CurrentValue();
+        if (load.suppressed) continue;
+        const auto appendSystemOf = [&](const auto* typed) {
+            if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, load.region);
+        };
+        appendSystemOf(nex_canDynamicCastPtr<kloC_ConcentratedForce>(&load));
+        appendSystemOf(nex_canDynamicCastPtr<kloC_Moment>(&load));
+    }
+    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
+        const auto* equation = nex_canDynamicCastPtr<kcoC_Equation>(&it.CurrentValue());
+        if (equation == nullptr) continue;
+        const nex_Context context("constraint", it.CurrentKey());
+        for (int i = 0; i < equation->terms.Length(); ++i) {
+            const kcoC_EquationTerm& term = equation->terms[i];
+            if (term.csys.Id() <= 0) continue;
+            append(dtmC_DatumRef(term.csys.Id()), Store().rootAssembly().nset(term.setName).Region());
+        }
     }
 }
 
@@ -67,6 +90,22 @@ void oif_TransformBuilder::WriteConnectorOrientations() {
         const cow_String name = odiK_Assembly::ConnectorOrientationName(i);
         WriteOrientation(ends.ConstGetCsys1(), ends.ConstGetAngle1(), name + "-1", ends.ConstGetAxis1());
         WriteOrientation(ends.ConstGetCsys2(), ends.ConstGetAngle2(), name + "-2", ends.ConstGetAxis2());
+    }
+}
+
+void oif_TransformBuilder::WriteCouplingOrientations() {
+    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
+        const auto* coupling = nex_canDynamicCastPtr<kcoC_Coupling>(&it.CurrentValue());
+        if (coupling == nullptr) continue;
+        WriteOrientation(coupling->orientation, 0.0, cow_String(), ptoC_MaterialOrientation::axisEnm::AXIS_1);
+    }
+}
+
+void oif_TransformBuilder::WriteInertiaReliefOrientations() {
+    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
+        const auto* relief = nex_canDynamicCastPtr<kloC_InertiaRelief>(&it.CurrentValue());
+        if (relief == nullptr || relief->suppressed) continue;
+        WriteOrientation(relief->datum, 0.0, {}, ptoC_MaterialOrientation::axisEnm::AXIS_1);
     }
 }
 

@@ -4,7 +4,8 @@
 #include "deck/oif_Component.h"
 
 /// The local systems that the model uses: for each one that degrees of freedom are given in, a node set with
-/// all its regions as members and a transform on it; and an orientation for each system of a connector.
+/// all its regions as members and a transform on it; and an orientation for each system of a connector, a
+/// coupling or an inertia relief load.
 class oif_TransformBuilder final : public oif_ComponentOf<oif_TransformBuilder> {
 public:
     using oif_ComponentOf::oif_ComponentOf;
@@ -14,6 +15,8 @@ private:
     void CollectCsysRegionsList();
     void WriteTransforms();
     void WriteConnectorOrientations();
+    void WriteCouplingOrientations();
+    void WriteInertiaReliefOrientations();
     /// Stores an orientation with its rotation line, unless there is one of this name. The null reference
     /// gives none. The name ends in the suffix if the angle isn't 0.
     void WriteOrientation(const dtmC_DatumRef& datum, double angle, const cow_String& suffix,

@@ -5,7 +5,8 @@
 #include "store_interface/records/conditions/kbcC_ScalarBCs.h"
 #include "store_interface/records/conditions/kbcC_SupportBCs.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
-#include "store_interface/records/conditions/kpfC_Field.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
+#include "store_interface/records/conditions/kpfC_Fields.h"
 
 const omu_EnumTable& omu_EnumTableOf(kbcC_BC::DistribTypeEnum) {
     static constexpr omu_EnumRow rows[] = {
@@ -101,6 +102,8 @@ void cls_RegisterConditionRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kloC_LoadState>();
     registrar.Add<kloC_Load>();
     cls_RegisterBoltLoadRecords(registrar);
+    cls_RegisterLoadRecords(registrar);
     registrar.Add<kpfC_FieldState>();
     registrar.Add<kpfC_Field>();
+    cls_RegisterFieldRecords(registrar);
 }

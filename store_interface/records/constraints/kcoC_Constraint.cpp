@@ -1,6 +1,7 @@
 #include "store_interface/records/constraints/kcoC_Constraint.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/constraints/kcoC_Constraints.h"
 
 const omu_EnumTable& omu_EnumTableOf(calC_SymmetryTypeEnm) {
     static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"}, {1, "CYCLIC", "CYCLIC"}};
@@ -22,4 +23,5 @@ const cls_FieldTable& ddb_ModelSectorDefinition::Fields() {
 void cls_RegisterConstraintRecords(cls_ClassRegistrar& registrar) {
     registrar.Add<kcoC_Constraint>();
     registrar.Add<ddb_ModelSectorDefinition>();
+    cls_RegisterConstraintKindRecords(registrar);
 }

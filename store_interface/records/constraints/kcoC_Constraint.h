@@ -8,7 +8,8 @@ class cls_ClassRegistrar;
 /// A relation between degrees of freedom that holds through the whole analysis; held by name.
 class kcoC_Constraint : public cls_AbstractRecordOf<kcoC_Constraint> {
 public:
-    static constexpr cls_ClassInfo Class{"kcoC_Constraint", "a relation between degrees of freedom"};
+    static constexpr cls_ClassInfo Class{"kcoC_Constraint", "a relation between degrees of freedom",
+                                         0x2B00001};
 
     /// The node sets that the constraint names as surfaces; each gets a node-based surface. Empty for most.
     virtual cow_List<rgnC_Region> ConstGetContactNodeSets() const { return {}; }
