@@ -3,6 +3,7 @@
 #include "deck/oif_KeywordLine.h"
 #include "interactions/oif_InteractionNames.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/constraints/kcoC_Constraints.h"
 #include "store_interface/records/interactions/kinC_CyclicSymmetry.h"
 
 #include <limits>
@@ -46,6 +47,14 @@ oif_ContactPair::oif_ContactPair(const cow_String& name, const rgnC_Region& seco
     master_ = oif_SurfaceName(second, modelInfo);
 }
 
+oif_ContactPair::oif_ContactPair(const cow_String& name, const kcoC_Tie& tie, const cow_String&,
+                                 const qkw_ModelInfo& modelInfo, bool cpset)
+    : name_(name), cpset_(cpset) {
+    slave_ = oif_SurfaceName(tie.slave, modelInfo);
+    master_ = oif_SurfaceName(tie.master, modelInfo);
+    if (tie.positionToleranceMethod == 1) adjust_ = tie.positionTolerance;
+}
+
 void oif_ContactPair::Write(utl_Stream& stream) const {
     if (interaction_.IsNull()) {
         WriteTied(stream);
@@ -71,8 +80,10 @@ void oif_ContactPair::Write(utl_Stream& stream) const {
 }
 
 void oif_ContactPair::WriteTied(utl_Stream& stream) const {
+    stream << "*Contact Pair, tied";
+    if (adjust_) stream << ", adjust=" << *adjust_;
     // The name of the interaction goes out bare.
-    stream << "*Contact Pair, tied, adjust=" << adjust_ << ", interaction=_" << name_;
+    stream << ", interaction=_" << name_;
     WriteCpset(stream);
     stream << endl << slave_ << ", " << master_ << endl;
 }
