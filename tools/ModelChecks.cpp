@@ -7,6 +7,7 @@
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "tools/FindingText.h"
 
 #include <algorithm>
 #include <map>
@@ -17,28 +18,6 @@
 namespace {
 
 using Findings = std::vector<ModelFinding>;
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
-
-std::string Quoted(const cow_String& name) {
-    return "'" + Text(name) + "'";
-}
-
-std::string Place(const char* container, const cow_String& name) {
-    std::string place = std::string("/") + container + "/";
-    for (const char c : name.View()) {
-        if (c == '~') {
-            place += "~0";
-        } else if (c == '/') {
-            place += "~1";
-        } else {
-            place += c;
-        }
-    }
-    return place;
-}
 
 std::string Elements(int count) {
     return std::to_string(count) + (count == 1 ? " element" : " elements");
@@ -223,14 +202,6 @@ void FindSectionsOfMeshes(const odiK_Model& model, Findings& findings) {
                                                               : instance->part->attributes.sectionAssignments,
                    isOwn ? "/assembly" + Place("instances", name) : Place("parts", instance->partName),
                    findings);
-    }
-}
-
-const char* KindOf(const rgnC_Region& region) {
-    switch (region.FlagWord()) {
-    case 1: return "a node set";
-    case 2: return "an element set";
-    default: return "a surface";
     }
 }
 
