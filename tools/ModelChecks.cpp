@@ -7,8 +7,10 @@
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "tools/ConstraintChecks.h"
 #include "tools/FindingText.h"
 #include "tools/InteractionChecks.h"
+#include "tools/RequestChecks.h"
 
 #include <algorithm>
 #include <map>
@@ -275,5 +277,7 @@ std::vector<ModelFinding> FindingsOf(const odiK_Model& model) {
     FindIdleMaterials(model, findings);
     FindOnConditions(model, findings);
     FindInteractionProblems(model, findings);
+    FindConstraintProblems(model, findings);
+    FindRequestProblems(model, findings);
     return findings;
 }
