@@ -597,6 +597,7 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
         diagnostics_.Expected(path, json, "an object");
         return;
     }
+    const int errorsBefore = diagnostics_.NumErrors();
     mdl_GivenState& given = object.Give(cow_String(stepName));
     cls_Record& record = given.record.Get();
     const auto& fields = record.DynFields().All();
@@ -637,6 +638,9 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
         if (ReadValue(*field.type, value, *member, place, field, mayBeUnset))
             given.marks[i] = mdl_GivenEnm::VALUE;
     }
+    if (diagnostics_.NumErrors() != errorsBefore) return;
+    mdf_RecordCheck check(diagnostics_, path);
+    mdf_RecordChecks::All().Run(record, check);
 }
 
 void mdf_RecordReader::Refer(const cls_Field& field, const std::string& name, const mdf_Path& path) {

@@ -4,6 +4,7 @@
 #include "foundation/nex_Exception.h"
 #include "model_file/mdf_ModelFile.h"
 #include "tools/DeckFile.h"
+#include "tools/LoadChecks.h"
 #include "tools/ModelChecks.h"
 #include "tools/ModelHistory.h"
 #include "tools/ModelSummary.h"
@@ -165,7 +166,10 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
     if (odb == nullptr) return code;
     const char* name = odb_Odb::DefaultModelName();
-    for (const ModelFinding& finding : FindingsOf(*odb->FindModel(name))) {
+    std::vector<ModelFinding> findings = FindingsOf(*odb->FindModel(name));
+    for (ModelFinding& finding : LoadFindingsOf(odb->ddb().model(name)))
+        findings.push_back(std::move(finding));
+    for (const ModelFinding& finding : findings) {
         report.Warning(model, std::string("/models/") + name + finding.place + ": " + finding.text);
     }
     report.Print(model + ": no errors\n");

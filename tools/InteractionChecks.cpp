@@ -6,20 +6,13 @@
 #include "store_interface/records/interactions/kinC_ContactExp.h"
 #include "store_interface/records/interactions/kinC_FilmAndRadiation.h"
 #include "store_interface/records/interactions/kinC_WaveInteractions.h"
+#include "tools/FindingText.h"
 
 #include <algorithm>
 
 namespace {
 
 using Status = mdl_PropagationStatusEnm;
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
-
-std::string Quoted(const cow_String& name) {
-    return "'" + Text(name) + "'";
-}
 
 // As rgnC_Region::FlagWord() gives them.
 constexpr int kNodeSet = 1;

@@ -7,7 +7,10 @@
 #include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "tools/ConstraintChecks.h"
+#include "tools/FindingText.h"
 #include "tools/InteractionChecks.h"
+#include "tools/RequestChecks.h"
 
 #include <algorithm>
 #include <map>
@@ -15,39 +18,9 @@
 #include <set>
 #include <string_view>
 
-std::string Place(const char* container, const cow_String& name) {
-    std::string place = std::string("/") + container + "/";
-    for (const char c : name.View()) {
-        if (c == '~') {
-            place += "~0";
-        } else if (c == '/') {
-            place += "~1";
-        } else {
-            place += c;
-        }
-    }
-    return place;
-}
-
-const char* KindOf(const rgnC_Region& region) {
-    switch (region.FlagWord()) {
-    case 1: return "a node set";
-    case 2: return "an element set";
-    default: return "a surface";
-    }
-}
-
 namespace {
 
 using Findings = std::vector<ModelFinding>;
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
-
-std::string Quoted(const cow_String& name) {
-    return "'" + Text(name) + "'";
-}
 
 std::string Elements(int count) {
     return std::to_string(count) + (count == 1 ? " element" : " elements");
@@ -304,5 +277,7 @@ std::vector<ModelFinding> FindingsOf(const odiK_Model& model) {
     FindIdleMaterials(model, findings);
     FindOnConditions(model, findings);
     FindInteractionProblems(model, findings);
+    FindConstraintProblems(model, findings);
+    FindRequestProblems(model, findings);
     return findings;
 }

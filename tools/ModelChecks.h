@@ -12,11 +12,6 @@ struct ModelFinding {
     std::string text;
 };
 
-/// The place of an object of a container, such as "/materials/Steel".
-std::string Place(const char* container, const cow_String& name);
-/// "a node set", "an element set" or "a surface".
-const char* KindOf(const rgnC_Region& region);
-
 /// Looks through a model that is whole: what the deck writer takes as it is, and a solver can't.
 std::vector<ModelFinding> FindingsOf(const odiK_Model& model);
 

@@ -52,9 +52,13 @@ std::string KeywordsOf(Spec::PrintEnm print) {
     return "";
 }
 
+std::string Text(const cow_String& text) {
+    return std::string(text.View());
+}
+
 ordered_json Texts(const cls_xpListString& names) {
     ordered_json list = ordered_json::array();
-    for (int i = 0; i < names.Length(); ++i) list.push_back(std::string(names[i].View()));
+    for (int i = 0; i < names.Length(); ++i) list.push_back(Text(names[i]));
     return list;
 }
 
@@ -122,16 +126,18 @@ ordered_json DescribeVariables(std::optional<unsigned> stepType) {
     for (int i = 0; i < specs.Length(); ++i) {
         const Spec& spec = specs[i];
         if ((spec.procedures & wanted) == 0) continue;
-        variables.push_back({{"name", std::string(spec.name.View())},
-                             {"meaning", std::string(spec.doc.View())},
-                             {"components", Texts(spec.components)},
-                             {"keyword", KeywordsOf(spec.print)},
-                             {"location", omu_PrimEnum<Spec::LocationEnm, 1>(spec.location).GetString()},
-                             {"field", spec.field},
-                             {"history", spec.history},
-                             {"procedures", ProceduresIn(spec.procedures & wanted)},
-                             {"preselectField", ProceduresIn(spec.preselectField & wanted)},
-                             {"preselectHistory", ProceduresIn(spec.preselectHistory & wanted)}});
+        ordered_json variable = {
+            {"name", Text(spec.name)},
+            {"meaning", Text(spec.doc)},
+            {"components", Texts(spec.components)},
+            {"keyword", KeywordsOf(spec.print)},
+            {"location", Text(omu_PrimEnum<Spec::LocationEnm, 1>(spec.location).GetString())},
+            {"field", spec.field},
+            {"history", spec.history},
+            {"procedures", ProceduresIn(spec.procedures & wanted)},
+            {"preselectField", ProceduresIn(spec.preselectField & wanted)},
+            {"preselectHistory", ProceduresIn(spec.preselectHistory & wanted)}};
+        variables.push_back(std::move(variable));
     }
     return variables;
 }

@@ -33,6 +33,7 @@ const mdf_RecordChecks& mdf_RecordChecks::All() {
         mdf_AddBoundaryChecks(all);
         mdf_AddConnectorChecks(all);
         mdf_AddInteractionChecks(all);
+        mdf_AddLoadChecks(all);
         mdf_AddMaterialChecks(all);
         mdf_AddSectionChecks(all);
         mdf_AddStepChecks(all);

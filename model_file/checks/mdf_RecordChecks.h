@@ -67,6 +67,7 @@ void mdf_AddAmplitudeChecks(mdf_RecordChecks& checks);
 void mdf_AddBoundaryChecks(mdf_RecordChecks& checks);
 void mdf_AddConnectorChecks(mdf_RecordChecks& checks);
 void mdf_AddInteractionChecks(mdf_RecordChecks& checks);
+void mdf_AddLoadChecks(mdf_RecordChecks& checks);
 void mdf_AddMaterialChecks(mdf_RecordChecks& checks);
 void mdf_AddSectionChecks(mdf_RecordChecks& checks);
 void mdf_AddStepChecks(mdf_RecordChecks& checks);

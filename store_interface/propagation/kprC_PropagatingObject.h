@@ -68,7 +68,7 @@ public:
 
     const std::vector<mdl_GivenState>& GivenStates() const;
     const mdl_GivenState* GivenState(const cow_String& stepName) const;
-    /// The user's state of the step, made at its first use.
+    /// The user's state of the step, made at its first use; to be filled before the object is copied.
     mdl_GivenState& Give(const cow_String& stepName);
 
     /// Works out all steps; must run again after a change of states or steps. Gives the states that can't

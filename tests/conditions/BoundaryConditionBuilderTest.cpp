@@ -246,6 +246,38 @@ TEST(BoundaryConditionBuilder, Comment_OfAClassWithoutALabelEndsWithABlank) {
               cow_String("Name: x Type: Temperature   Scale factor: 0.1"));
 }
 
+TEST(BoundaryConditionBuilder, EveryStatus_IsWrittenAlwaysInLoadCasesOrNever) {
+    const std::string comment = "** Name: a Type: Displacement/Rotation";
+    const std::string line = "A.N, 1, 1, 2.\n";
+    for (int status = 0; status < 16; ++status) {
+        const std::string states = R"("S1": {"u1": 2, "status": )" + std::to_string(status) + "}";
+        ConditionModel inStep("IG", Conditions(Displacement("a", "A.N", states)));
+        std::string expected;
+        if (status == 1 || status == 3 || status == 10) {
+            expected = kBanner + comment + "\n*Boundary\n" + line;
+        } else if (status == 4 || status == 11) {
+            expected = kBanner + comment + "\n*Boundary, op=NEW\n";
+        }
+        EXPECT_EQ(inStep.StepText("S1"), expected) << status;
+
+        ConditionModel inCase(R"(IL{"loadCases": {"c": {"bcs": {"a": 1}}}})",
+                              Conditions(Displacement("a", "A.N", states)));
+        const std::string scaled = comment + "   Scale factor: 1\n*Boundary, op=NEW\n";
+        expected.clear();
+        if (status == 4 || status == 11) {
+            expected = scaled;
+        } else if (status == 1 || status == 2 || status == 3 || status == 9 || status == 10) {
+            expected = scaled + line;
+        }
+        EXPECT_EQ(inCase.StepText("S1", "c"), expected) << status;
+    }
+}
+
+TEST(BoundaryConditionBuilder, ConditionEndedInTheInitialStep_HasNoOpNewSinceThatStepHasNoFlag) {
+    ConditionModel model("I", Conditions(Displacement("a", "A.N", R"("S0": {"u1": 2, "status": 4})")));
+    EXPECT_EQ(model.StepText("S0"), kBanner + "** Name: a Type: Displacement/Rotation\n*Boundary\n");
+}
+
 TEST(BoundaryConditionBuilder, ClassWithoutAFamily_Fails) {
     TestStore store;
     store.model.steps.Append("Initial", kprC_InitialStep());

@@ -1,5 +1,6 @@
 #include "connectors/ConnectorTesting.h"
 #include "sections/oif_TransformBuilder.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
 
 namespace {
 
@@ -30,6 +31,14 @@ protected:
         condition.datum = datum;
         condition.suppressed = suppressed;
         store.model.boundaryConditions.Insert(name, condition);
+    }
+    template <class Load>
+    void AddLoad(const char* name, const char* set, const dtmC_DatumRef& datum, bool suppressed = false) {
+        Load load;
+        if (set != nullptr) load.region = store.model.Region("I", set);
+        load.datum = datum;
+        load.suppressed = suppressed;
+        store.model.loads.Insert(name, load);
     }
     void Orient(const dtmC_DatumRef& first, double angle1, const dtmC_DatumRef& second, double angle2) {
         ptoC_ConnectorOrientation ends;
@@ -158,6 +167,41 @@ TEST_F(Transforms, Transforms_StandAheadOfOrientations) {
     Add("b1", "A", datum);
     EXPECT_EQ(Text(), "*Nset, nset=_T-D\nI.A, \n*Transform, nset=_T-D\n" + kUnitAxes +
                           "*Orientation, name=D\n" + kUnitAxes + "1, 0.\n");
+}
+
+TEST_F(Transforms, ForcesAndMoments_StandBehindTheConditionsOfTheirSystem) {
+    const dtmC_DatumRef datum = store.Add("D");
+    AddLoad<kloC_Moment>("a", "A", datum);
+    AddLoad<kloC_ConcentratedForce>("b", "A", datum);
+    AddLoad<kloC_ConcentratedForce>("c", nullptr, store.Add("E"));
+    Add("z", "B 1", datum);
+    EXPECT_EQ(Text(), "*Nset, nset=_T-D\nI.\"B 1\", \nI.A, \n*Transform, nset=_T-D\n" + kUnitAxes +
+                          "*Nset, nset=_T-E\n, \n*Transform, nset=_T-E\n" + kUnitAxes);
+}
+
+TEST_F(Transforms, OtherLoadsAndThoseWithoutASystem_HaveNoTransform) {
+    AddLoad<kloC_SurfaceTraction>("a", "A", store.Add("D"));
+    AddLoad<kloC_ConcentratedForce>("b", "A", {});
+    AddLoad<kloC_Moment>("c", "A", store.Add("E"), true);
+    EXPECT_EQ(Text(), "");
+}
+
+TEST_F(Transforms, InertiaRelief_HasAnOrientationBehindThoseOfConnectors) {
+    const dtmC_DatumRef datum = store.Add("D");
+    AddLoad<kloC_InertiaRelief>("a", nullptr, datum);
+    AddLoad<kloC_InertiaRelief>("b", "A", datum);
+    AddLoad<kloC_InertiaRelief>("c", "A", {});
+    AddLoad<kloC_InertiaRelief>("d", "A", store.Add("F"), true);
+    Orient(store.Add("E"), 0, {}, 0);
+    EXPECT_EQ(Text(),
+              "*Orientation, name=E\n" + kUnitAxes + "1, 0.\n*Orientation, name=D\n" + kUnitAxes + "1, 0.\n");
+}
+
+TEST_F(Transforms, InertiaReliefInTheSystemOfAConnector_UsesItsOrientation) {
+    const dtmC_DatumRef datum = store.Add("D");
+    Orient({}, 0, datum, 0);
+    AddLoad<kloC_InertiaRelief>("a", nullptr, datum);
+    EXPECT_EQ(Text(), "*Orientation, name=D\n" + kUnitAxes + "3, 0.\n");
 }
 
 TEST_F(Transforms, ConnectorOrientationOfAnotherClass_Raises) {

@@ -403,4 +403,18 @@ TEST(PropagationState, GivenStates_AreKeptByStepAndField) {
     EXPECT_FALSE(given->IsGiven("no field of this name"));
 }
 
+TEST(PropagationState, CopyOfAnObject_HasAHistoryOfItsOwn) {
+    const kprC_StepContainer steps = StepsOf("IG");
+    Condition original;
+    Give<ConditionState>(original, "S0").Set<&ConditionState::u1>(1.0);
+    original.Propagate(steps);
+    Condition copy(original);
+    Give<ConditionState>(copy, "S1").Deactivate();
+    copy.Propagate(steps);
+    EXPECT_EQ(Statuses(original, steps), (std::vector<int>{1, 2}));
+    EXPECT_EQ(Statuses(copy, steps), (std::vector<int>{1, 4}));
+    EXPECT_EQ(original.GivenStates().size(), 1U);
+    EXPECT_EQ(StateIn<ConditionState>(original, "S1").u1.ConstGet(), 1.0);
+}
+
 } // namespace

@@ -60,19 +60,6 @@ cow_String FirstWith(const cow_List<cow_String>& names, const char* suffix) {
     return qkw_QuorixName(names[0] + suffix, false).Printable();
 }
 
-/// Whether the procedure can write so often.
-bool IsAllowed(korC_TypeEnm type, const kprC_AnalysisStep& step, bool isField) {
-    const unsigned stepType = step.DynTypeId();
-    switch (type) {
-    case korC_TypeEnm::FREQUENCY: return kprC_OutputFrequencyIsAllowed(stepType, isField);
-    case korC_TypeEnm::NUMBER_INTERVAL: return kprC_NumberIntervalIsAllowed(step);
-    case korC_TypeEnm::TIME_INTERVAL: return kprC_TimeIntervalIsAllowed(stepType);
-    case korC_TypeEnm::TIME_POINTS: return kprC_TimePointIsAllowed(stepType, isField);
-    case korC_TypeEnm::MODE_LIST: return kprC_ModesIsAllowed(stepType);
-    }
-    return false;
-}
-
 /// Time points have another number in a request.
 korC_OdbRequest::TypeEnm RequestType(korC_TypeEnm type) {
     return type == korC_TypeEnm::TIME_POINTS ? korC_OdbRequest::TypeEnm::TIME_POINTS
@@ -217,6 +204,18 @@ bool oif_OutputRequestBuilder::HasHistoryRequest(const cow_String& stepName) con
         const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
         // Springs alone are no reason for output.
         if (isPlain ? output.springs.IsEmpty() : RefersToSomething(output)) return true;
+    }
+    return false;
+}
+
+bool oif_OutputRequestBuilder::IsAllowed(korC_TypeEnm type, const kprC_AnalysisStep& step, bool isField) {
+    const unsigned stepType = step.DynTypeId();
+    switch (type) {
+    case korC_TypeEnm::FREQUENCY: return kprC_OutputFrequencyIsAllowed(stepType, isField);
+    case korC_TypeEnm::NUMBER_INTERVAL: return kprC_NumberIntervalIsAllowed(step);
+    case korC_TypeEnm::TIME_INTERVAL: return kprC_TimeIntervalIsAllowed(stepType);
+    case korC_TypeEnm::TIME_POINTS: return kprC_TimePointIsAllowed(stepType, isField);
+    case korC_TypeEnm::MODE_LIST: return kprC_ModesIsAllowed(stepType);
     }
     return false;
 }

@@ -11,6 +11,12 @@ public:
     explicit oif_OutputRequestBuilder(oif_ModelInfo& modelInfo);
     void Build() override;
 
+    /// Whether the step can be written so often.
+    static bool IsAllowed(korC_TypeEnm type, const kprC_AnalysisStep& step, bool isField);
+    /// Whether a region can give results of nodes, of elements; the whole model gives both.
+    static bool IsWritableNodeRegion(const rgnC_Region& region);
+    static bool IsWritableElementRegion(const rgnC_Region& region);
+
 private:
     using Channel = korC_OdbChannel;
     using Request = korC_OdbRequest;
@@ -77,8 +83,6 @@ private:
                           const Traits& traits);
     void AddRadiationOutput(const Request& request, const Place& place, const Traits& traits);
 
-    static bool IsWritableNodeRegion(const rgnC_Region& region);
-    static bool IsWritableElementRegion(const rgnC_Region& region);
     /// Names of the sets that springs and dashpots have in decks, from the first; empty for none.
     static cow_String GetSpringSetName(const cow_List<cow_String>& springs);
     static cow_String GetDashpotSetName(const cow_List<cow_String>& springs);

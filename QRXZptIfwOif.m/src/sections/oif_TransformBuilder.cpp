@@ -3,18 +3,13 @@
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_Orientation.h"
+#include "store_interface/records/conditions/kbcC_SupportBCs.h"
 #include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/constraints/kcoC_Constraints.h"
 
 #include <map>
 #include <set>
 #include <vector>
-
-namespace {
-
-constexpr unsigned kSymmetryCondition = 0x298000E;
-
-} // namespace
 
 void oif_TransformBuilder::Build() {
     CollectCsysRegionsList();
@@ -33,7 +28,7 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         const kbcC_BC& condition = it.CurrentValue();
         if (condition.suppressed) continue;
         // A symmetry condition counts also without a system.
-        if (condition.datum.IsNullRef() && condition.DynTypeId() != kSymmetryCondition) continue;
+        if (condition.datum.IsNullRef() && condition.DynTypeId() != kbcC_SymmetryBC::TypeId()) continue;
         append(condition.datum, condition.region);
     }
     for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
