@@ -90,9 +90,7 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     const oif_Comment comment(text);
     if (!AddsCommentItself(typeId)) add(comment);
 
-    const auto assemblyName = [&](const rgnC_Region& region) {
-        return oif_SetName(region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
-    };
+    const auto assemblyName = [&](const rgnC_Region& region) { return oif_RegionName(region, ModelInfo()); };
     const cow_String setName = assemblyName(load.region);
     const auto addDsload = [&](const cow_String& refNode) {
         cow_String fieldName;

@@ -143,7 +143,7 @@ oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opM
     : qkw_KeywordOf(load, stepName, opMod, cow_String(), scale, ClearedAmplitude::COUNTS) {
     // The lines of bolts and of plane strain loads begin with an empty name.
     if (typeId_ != kloC_BoltLoad::TypeId() && typeId_ != kloC_PEGLoad::TypeId()) {
-        setName_ = oif_SetName(load.region, modelInfo).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+        setName_ = oif_RegionName(load.region, modelInfo);
     }
     if (typeId_ == kloC_ConcentratedForce::TypeId()) {
         follower_ = static_cast<const kloC_ConcentratedForce&>(load).follower;
