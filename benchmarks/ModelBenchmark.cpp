@@ -1,9 +1,15 @@
 // Times and peak memory of whole tasks, each in a process of its own:
 //     bench_model [TASK ...]
-// Tasks: load, rss, instances, surface, materials, sections; all of them without an argument.
+// Tasks: load, rss, instances, surface, materials, sections, conditions, contact; all of them without an
+// argument.
 #include "deck/oif_Writer.h"
 #include "model_file/mdf_ModelFile.h"
+#include "store_interface/records/conditions/kbcC_MotionBCs.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
+#include "store_interface/records/interactions/kinC_Contact.h"
+#include "store_interface/records/interactions/kinC_ContactProperty.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
 
 #include <sys/resource.h>
 #include <sys/wait.h>
@@ -309,13 +315,149 @@ void MeasureSections() {
         hundred.seconds, thousand.seconds, thousand.seconds / hundred.seconds);
 }
 
+cow_String Numbered(const char* prefix, int number) {
+    return cow_String(prefix) + cow_String(number);
+}
+
+/// An instance of a part of `nodes` nodes and an eighth as many elements, and the steps S-0, initial, to
+/// S-`steps`.
+odiK_Model& ModelOfSteps(odb_Odb& odb, int nodes, int steps, const std::function<void(odiK_Mesh&)>& addSets) {
+    odiK_Model& model = odb.AddModel(odb_Odb::DefaultModelName());
+    odiK_Part& part = model.AddPart("P");
+    FillPart(part, nodes, nodes / 8);
+    addSets(*part.mesh);
+    model.AddInstance("I", "P");
+    model.steps.Append("S-0", kprC_InitialStep());
+    for (int s = 1; s <= steps; ++s) model.steps.Append(Numbered("S-", s), kprC_StaticStep());
+    return model;
+}
+
+/// What goes on with the conditions in the steps.
+enum class History {
+    CHANGED,  ///< each step changes one condition in a hundred, the others are carried over
+    REWRITTEN ///< in each step one of them ends, so that all others are said again
+};
+
+/// `conditions` displacement conditions and as many forces, each on a node set of its own.
+std::shared_ptr<odb_Odb> ConditionStore(int conditions, int steps, History history) {
+    auto odb = std::make_shared<odb_Odb>();
+    odiK_Model& model = ModelOfSteps(*odb, conditions, steps, [&](odiK_Mesh& mesh) {
+        for (int c = 0; c < conditions; ++c) mesh.AddNodeSet(Numbered("SET-", c), {c + 1});
+    });
+    for (int c = 0; c < conditions; ++c) {
+        kbcC_DisplacementBC bc;
+        kloC_ConcentratedForce force;
+        bc.region = force.region = model.Region("I", Numbered("SET-", c));
+        const auto set = [&](int step, double value) {
+            mdl_StateEdit<kbcC_DisplacementBCState>(bc.Give(Numbered("S-", step)))
+                .Set<&kbcC_DisplacementBCState::u1>(0.001 * value)
+                .Set<&kbcC_DisplacementBCState::u3>(0.0);
+            mdl_StateEdit<kloC_ConcentratedForceState>(force.Give(Numbered("S-", step)))
+                .Set<&kloC_ConcentratedForceState::component2>(value);
+        };
+        set(1, c + 0.5);
+        for (int step = 2; step <= steps; ++step) {
+            if (history == History::CHANGED && (c + step) % 100 == 0) set(step, c + step);
+            if (history == History::REWRITTEN && c == step) {
+                mdl_StateEdit<kbcC_DisplacementBCState>(bc.Give(Numbered("S-", step))).Deactivate();
+                mdl_StateEdit<kloC_ConcentratedForceState>(force.Give(Numbered("S-", step))).Deactivate();
+            }
+        }
+        model.boundaryConditions.Insert(Numbered("BC-", c), bc);
+        model.loads.Insert(Numbered("LOAD-", c), force);
+    }
+    model.Complete();
+    return odb;
+}
+
+void MeasureConditions() {
+    const auto write = [](int conditions, int steps, History history) {
+        return InChild([&] { return WriteTask(ConditionStore(conditions, steps, history)); });
+    };
+    const Measure few = write(10000, 5, History::CHANGED);
+    const Measure many = write(10000, 100, History::CHANGED);
+    const Measure tenth = write(1000, 100, History::CHANGED);
+    std::printf("10,000 boundary conditions and loads, a hundredth of them changed in each step: 5 steps in "
+                "%.3f s, 100 in %.3f s, ratio %.1f (at most 20); a tenth of them in %.3f s, ratio %.1f (at "
+                "most 12)\n",
+                few.seconds, many.seconds, many.seconds / few.seconds, tenth.seconds,
+                many.seconds / tenth.seconds);
+
+    const Measure store = InChild([&] {
+        const auto odb = ConditionStore(10000, 100, History::REWRITTEN);
+        return [odb] {};
+    });
+    const Measure fewRewritten = write(10000, 5, History::REWRITTEN);
+    const Measure rewritten = write(10000, 100, History::REWRITTEN);
+    std::ifstream deck("bench_model.inp", std::ios::ate | std::ios::binary);
+    std::printf("all of them said again in each step: 5 steps in %.3f s, 100 in %.3f s, ratio %.1f (at most "
+                "24.75, as many more are said); deck of %.0f MB, store %.0f MiB, with writing %.0f MiB\n",
+                fewRewritten.seconds, rewritten.seconds, rewritten.seconds / fewRewritten.seconds,
+                static_cast<double>(deck.tellg()) / 1e6, store.peakMiB, rewritten.peakMiB);
+}
+
+/// `pairs` contact pairs, each on two surfaces of its own. A tenth of them changes its friction in each step.
+std::shared_ptr<odb_Odb> ContactStore(int pairs, int steps) {
+    auto odb = std::make_shared<odb_Odb>();
+    odiK_Model& model = ModelOfSteps(*odb, 16 * pairs, steps, [&](odiK_Mesh& mesh) {
+        for (int p = 0; p < pairs; ++p) {
+            mesh.AddSurface(Numbered("MASTER-", p), {{2 * p + 1, -1, "S1"}});
+            mesh.AddSurface(Numbered("SLAVE-", p), {{2 * p + 2, -1, "S2"}});
+        }
+    });
+    for (int i = 0; i < 2; ++i) {
+        kinC_TangentialBehavior friction;
+        friction.formulation = 1;
+        friction.slipTolerance = 0.005;
+        friction.table = cow_2DArray<double>(1, 1);
+        friction.table.Put(0, 0, 0.1 * (i + 1));
+        kinC_ContactProperty property;
+        property.tangentialBehavior = friction;
+        model.interactionProperties.Insert(Numbered("FRICTION-", i), property);
+    }
+    for (int p = 0; p < pairs; ++p) {
+        kinC_SurfaceToSurfaceContactStd contact;
+        contact.master = model.Region("I", Numbered("MASTER-", p));
+        contact.slave = model.Region("I", Numbered("SLAVE-", p));
+        for (int step = 1; step <= steps; ++step) {
+            if (step > 1 && (p + step) % 10 != 0) continue;
+            mdl_StateEdit<kinC_SurfaceToSurfaceContactStdState>(contact.Give(Numbered("S-", step)))
+                .Set<&kinC_SurfaceToSurfaceContactStdState::InteractionProperty>(
+                    Numbered("FRICTION-", step % 2));
+        }
+        model.interactions.Insert(Numbered("PAIR-", p), contact);
+    }
+    model.Complete();
+    return odb;
+}
+
+void MeasureContact() {
+    const auto write = [](int pairs, int steps) {
+        return InChild([&] { return WriteTask(ContactStore(pairs, steps)); });
+    };
+    const Measure all = write(5000, 20);
+    const Measure fewerPairs = write(500, 20);
+    const Measure fewerSteps = write(5000, 2);
+    const Measure moreSteps = write(5000, 200);
+    std::printf(
+        "5,000 contact pairs, a tenth of them changed in each step: 20 steps in %.3f s, peak %.0f MiB; "
+        "a tenth of the pairs in %.3f s, ratio %.1f (at most 12); 2 steps in %.3f s, ratio %.1f, 200 in "
+        "%.3f s, ratio %.1f (at most 12)\n",
+        all.seconds, all.peakMiB, fewerPairs.seconds, all.seconds / fewerPairs.seconds, fewerSteps.seconds,
+        all.seconds / fewerSteps.seconds, moreSteps.seconds, moreSteps.seconds / all.seconds);
+}
+
 } // namespace
 
 int main(int argc, char** argv) {
-    const std::pair<const char*, void (*)()> tasks[] = {
-        {"load", MeasureLoad},           {"rss", MeasureRss},
-        {"instances", MeasureInstances}, {"surface", MeasureSurface},
-        {"materials", MeasureMaterials}, {"sections", MeasureSections}};
+    const std::pair<const char*, void (*)()> tasks[] = {{"load", MeasureLoad},
+                                                        {"rss", MeasureRss},
+                                                        {"instances", MeasureInstances},
+                                                        {"surface", MeasureSurface},
+                                                        {"materials", MeasureMaterials},
+                                                        {"sections", MeasureSections},
+                                                        {"conditions", MeasureConditions},
+                                                        {"contact", MeasureContact}};
     for (const auto& [name, task] : tasks) {
         bool wanted = argc == 1;
         for (int i = 1; i < argc; ++i) wanted = wanted || std::string(argv[i]) == name;

@@ -51,6 +51,11 @@ protected:
     void AddStepDefinition(const cow_String& stepName, const qkw_Keyword& keyword) {
         AddStepDefinition(stepName, keyword, cow_String());
     }
+    /// For a keyword that stands in many places: the lists share it.
+    void AddStepDefinition(const cow_String& stepName, const qkw_KeywordHandle& keyword,
+                           const cow_String& secondKey = {}) {
+        stepDefinitions_.GetOrInsert(stepName).GetOrInsert(secondKey).Append(keyword);
+    }
     void AddAtomOptionDefinition(const qkw_Keyword& keyword) { atomOptionDefinitions_.Append(keyword); }
     void AddSingleTermDefinition(const qkw_Keyword& keyword) { singleTermDefinitions_.Append(keyword); }
     void AddCombinedTermDefinition(const qkw_Keyword& keyword) { combinedTermDefinitions_.Append(keyword); }

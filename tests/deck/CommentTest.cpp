@@ -57,12 +57,12 @@ TEST(Keyword, PlainClasses_AreNeverEmpty) {
 TEST(BlockHeader, EachSection_HasItsBannerOnce) {
     oif_BlockHeader header("LOADS");
     const char* const banner = "** \n** LOADS\n** \n";
-    EXPECT_EQ(Written(header.ModelHeader()), banner);
-    EXPECT_EQ(Written(header.ModelHeader()), "");
-    EXPECT_EQ(Written(header.AssyHeader()), banner);
-    EXPECT_EQ(Written(header.AssyHeader()), "");
-    EXPECT_EQ(Written(header.StepHeader("A")), banner);
-    EXPECT_EQ(Written(header.StepHeader("B")), banner);
-    EXPECT_EQ(Written(header.StepHeader("A")), "");
-    EXPECT_EQ(Written(header.StepHeader("B")), "");
+    EXPECT_EQ(Written(header.ModelHeader().ConstGet()), banner);
+    EXPECT_EQ(Written(header.ModelHeader().ConstGet()), "");
+    EXPECT_EQ(Written(header.AssyHeader().ConstGet()), banner);
+    EXPECT_EQ(Written(header.AssyHeader().ConstGet()), "");
+    EXPECT_EQ(Written(header.StepHeader("A").ConstGet()), banner);
+    EXPECT_EQ(Written(header.StepHeader("B").ConstGet()), banner);
+    EXPECT_EQ(Written(header.StepHeader("A").ConstGet()), "");
+    EXPECT_EQ(Written(header.StepHeader("B").ConstGet()), "");
 }

@@ -37,10 +37,26 @@ void oif_BoundaryConditionBuilder::Build() {
         CreateEmptyBCs(stepNames_[i], CreateBoltLoadBCs(stepNames_[i]));
     }
     CreateSubmodelKwds();
+    written_ = {};
+    bolts_ = {};
+    shared_.clear();
 }
 
 void oif_BoundaryConditionBuilder::ConfigureOpStatus() {
-    opStatus_ = OpStatusOf(Model().BCs(), Model().Loads(), Model().Steps());
+    const kprC_StepContainer& steps = Model().Steps();
+    opStatus_ = OpStatusOf(Model().BCs(), Model().Loads(), steps);
+    written_ = {"boundary condition", Model().BCs(), steps,
+                [this](const kbcC_BC& bc, const cow_String& stepName) {
+                    if (bc.suppressed) return false;
+                    // Raises for a class without a family, in whatever status.
+                    opStatus_.OpNew(bc.DynTypeId(), stepName);
+                    const kprC_AnalysisStep* step = AnalysisStep(stepName);
+                    return opStatus_.Writes(bc, stepName, step != nullptr && !step->loadCases.IsEmpty());
+                }};
+    bolts_ = {"load", Model().Loads(), steps, [](const kloC_Load& load, const cow_String& stepName) {
+                  return load.DynTypeId() == kloC_BoltLoad::TypeId() && !load.suppressed &&
+                         load.Status(stepName) != Status::BUILT_INTO_BASE_STATE;
+              }};
 }
 
 oif_BCOpStatus oif_BoundaryConditionBuilder::OpStatusOf(const kprC_PropagatingContainer<kbcC_BC>& bcs,
@@ -69,13 +85,10 @@ void oif_BoundaryConditionBuilder::BuildElementSets() {
 void oif_BoundaryConditionBuilder::CreateAllBCs(const cow_String& stepName) {
     if (!Model().Steps().IsMember(stepName)) return;
     const kprC_Step& step = Model().Steps().ConstGet(stepName);
-    for (kprC_PropagatingContainerIT<kbcC_BC> it(Model().BCs()); !it.IsDone(); it.Next()) {
-        const kbcC_BC& bc = it.CurrentValue();
-        const cow_String& name = it.CurrentKey();
-        if (bc.suppressed) continue;
-        const nex_Context context("boundary condition", name);
-        for (const auto& [loadCase, scale] : oif_BCOpStatus::Places(step, name, bc.Status(stepName))) {
-            AllBCDetails(bc, name, stepName, loadCase, scale);
+    for (const auto& [name, bc] : written_.In(Model().Steps().IndexOf(stepName))) {
+        const nex_Context context("boundary condition", *name);
+        for (const auto& [loadCase, scale] : oif_BCOpStatus::Places(step, *name, bc->Status(stepName))) {
+            AllBCDetails(*bc, *name, stepName, loadCase, scale);
         }
     }
 }
@@ -94,10 +107,13 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const cow_String& name, const kb
                                                 const cow_String& stepName, bool opMod,
                                                 const cow_String& loadCaseName, const float& scale) {
     if (bc.suppressed) return;
-    const cow_String shownName = oif_Boundary::FixBCNameHack(name);
-    const oif_Comment comment(Comment(shownName, bc.DynTypeId(), loadCaseName, scale));
-    const cow_String setName = RegionName(bc.region);
-    const cow_String initialStep = Model().InitialStepName();
+    const Shared& shared = SharedOf(name, bc);
+    const qkw_KeywordHandle comment =
+        loadCaseName.IsEmpty() ? shared.comment
+                               : qkw_KeywordHandle(oif_Comment(Comment(oif_Boundary::FixBCNameHack(name),
+                                                                       bc.DynTypeId(), loadCaseName, scale)));
+    const cow_String& setName = shared.setName;
+    const cow_String& initialStep = Model().InitialStepName();
     const double factor = scale;
     if (const kbcC_ConnectorBC* connectors = ConnectorCondition(bc)) {
         AddStepDefinition(stepName, comment, loadCaseName);
@@ -105,9 +121,9 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const cow_String& name, const kb
                           oif_Comment(cow_String("Applies To: ") +
                                       oif_BoundarySubmodelList::Joined(connectors->connectors)),
                           loadCaseName);
-        AddStepDefinition(
-            stepName, oif_ConnectorMotion(Shared(name, bc), setName, stepName, opMod, initialStep, factor),
-            loadCaseName);
+        AddStepDefinition(stepName,
+                          oif_ConnectorMotion(shared.record, setName, stepName, opMod, initialStep, factor),
+                          loadCaseName);
         return;
     }
     // The classes with a label are those with a keyword.
@@ -115,10 +131,10 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const cow_String& name, const kb
         QRXBasException::Throw(
             nex_PrimException<atr_String, 1>("Unimplemented keyword for boundary condition"));
     }
-    const oif_Boundary boundary(Shared(name, bc), name, stepName, opMod, setName, Model().ShellToSolid(),
+    const oif_Boundary boundary(shared.record, name, stepName, opMod, setName, Model().ShellToSolid(),
                                 initialStep, factor);
     if (boundary.IsBCSubmodel()) {
-        submodelList_.Append(stepName, shownName, boundary);
+        submodelList_.Append(stepName, oif_Boundary::FixBCNameHack(name), boundary);
         return;
     }
     AddStepDefinition(stepName, comment, loadCaseName);
@@ -139,21 +155,17 @@ cow_List<cow_String> oif_BoundaryConditionBuilder::CreateBoltLoadBCs(const cow_S
     cow_List<cow_String> taken;
     const kprC_AnalysisStep* step = AnalysisStep(stepName);
     if (step == nullptr) return taken;
-    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
-        if (it.CurrentValue().DynTypeId() != kloC_BoltLoad::TypeId() || it.CurrentValue().suppressed)
-            continue;
-        const auto& load = static_cast<const kloC_BoltLoad&>(it.CurrentValue());
-        const nex_Context context("load", it.CurrentKey());
-        if (load.Status(stepName) == Status::BUILT_INTO_BASE_STATE) continue;
+    for (const auto& [name, object] : bolts_.In(Model().Steps().IndexOf(stepName))) {
+        const auto& load = static_cast<const kloC_BoltLoad&>(*object);
+        const nex_Context context("load", *name);
         if (step->loadCases.IsEmpty()) {
-            BoltLoadBCDetails(load, it.CurrentKey(), stepName, cow_String(), 1.0F);
+            BoltLoadBCDetails(load, *name, stepName, cow_String(), 1.0F);
             taken.Append(cow_String());
             continue;
         }
         for (mdl_MapString2ObjCowIT<klcC_LoadCase> cases(step->loadCases); !cases.IsDone(); cases.Next()) {
-            const float* scale = cases.CurrentValue().loads.Find(it.CurrentKey());
-            if (scale != nullptr &&
-                BoltLoadBCDetails(load, it.CurrentKey(), stepName, cases.CurrentKey(), *scale)) {
+            const float* scale = cases.CurrentValue().loads.Find(*name);
+            if (scale != nullptr && BoltLoadBCDetails(load, *name, stepName, cases.CurrentKey(), *scale)) {
                 taken.Append(cases.CurrentKey());
             }
         }
@@ -227,9 +239,16 @@ void oif_BoundaryConditionBuilder::CreateSubmodelKwds() {
     }
 }
 
-const mdl_ObjCow<kbcC_BC>& oif_BoundaryConditionBuilder::Shared(const cow_String& name, const kbcC_BC& bc) {
-    mdl_ObjCow<kbcC_BC>& shared = shared_.GetOrInsert(name);
-    if (shared.IsNull()) shared = bc;
+const oif_BoundaryConditionBuilder::Shared& oif_BoundaryConditionBuilder::SharedOf(const cow_String& name,
+                                                                                   const kbcC_BC& bc) {
+    const auto [place, isNew] = shared_.try_emplace(&bc);
+    Shared& shared = place->second;
+    if (isNew) {
+        const cow_String shownName = oif_Boundary::FixBCNameHack(name);
+        shared.record = bc;
+        shared.setName = RegionName(bc.region);
+        shared.comment = oif_Comment(Comment(shownName, bc.DynTypeId(), cow_String(), 1.0F));
+    }
     return shared;
 }
 

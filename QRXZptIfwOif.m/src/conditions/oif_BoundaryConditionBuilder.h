@@ -7,6 +7,8 @@
 #include "deck/oif_Component.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 
+#include <unordered_map>
+
 /// Boundary conditions of the steps, the comments of bolt loads, and in the assembly the element sets of
 /// connector conditions and what drives submodels.
 class oif_BoundaryConditionBuilder final : public oif_ComponentOf<oif_BoundaryConditionBuilder> {
@@ -49,11 +51,20 @@ private:
     /// Null if the step is none of the analysis.
     const kprC_AnalysisStep* AnalysisStep(const cow_String& stepName) const;
 
-    /// The condition for keywords, all of which share it.
-    const mdl_ObjCow<kbcC_BC>& Shared(const cow_String& name, const kbcC_BC& bc);
+    /// What is the same in all steps; their keywords share it.
+    struct Shared {
+        mdl_ObjCow<kbcC_BC> record;
+        cow_String setName;
+        qkw_KeywordHandle comment; // outside load cases
+    };
+    const Shared& SharedOf(const cow_String& name, const kbcC_BC& bc);
 
     cow_List<cow_String> stepNames_;
-    cow_Map<cow_String, mdl_ObjCow<kbcC_BC>> shared_;
+    // These while it builds:
+    oif_ObjectsOfSteps<kbcC_BC> written_;
+    oif_ObjectsOfSteps<kloC_Load> bolts_;
+    std::unordered_map<const kbcC_BC*, Shared> shared_;
+
     oif_BoundarySubmodelList submodelList_;
     oif_BlockHeader blockHeader_;
     oif_BCOpStatus opStatus_;

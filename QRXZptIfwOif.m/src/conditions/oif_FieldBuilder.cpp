@@ -16,14 +16,15 @@ void oif_FieldBuilder::BuildFieldsHistory() {
     ConfigureOpStatus();
     const int maxGeneralFieldSize = FindMaxGenFieldSizeInModel();
     const int maxTemperatureSize = FindMaxTempSizeInModel();
-    for (kprC_StepContainerIT step(Model().Steps()); !step.IsDone(); step.Next()) {
-        const cow_String& stepName = step.CurrentKey();
-        const nex_Context stepContext("step", stepName);
-        for (kprC_PropagatingContainerIT<kpfC_Field> it(Model().Fields()); !it.IsDone(); it.Next()) {
-            const nex_Context context("field", it.CurrentKey());
-            if (!opStatus_.Writes(it.CurrentValue(), stepName)) continue;
-            CreateFieldCard(it.CurrentKey(), it.CurrentValue(), stepName, maxTemperatureSize,
-                            maxGeneralFieldSize);
+    const kprC_StepContainer& steps = Model().Steps();
+    const oif_ObjectsOfSteps<kpfC_Field> written(
+        "field", Model().Fields(), steps,
+        [this](const kpfC_Field& field, const cow_String& step) { return opStatus_.Writes(field, step); });
+    for (int i = 0; i < steps.Size(); ++i) {
+        const nex_Context stepContext("step", steps.NameAt(i));
+        for (const auto& [name, field] : written.In(i)) {
+            const nex_Context context("field", *name);
+            CreateFieldCard(*name, *field, steps.NameAt(i), maxTemperatureSize, maxGeneralFieldSize);
         }
     }
 }
@@ -50,7 +51,7 @@ void oif_FieldBuilder::FieldCardDetails(const cow_String& name, const kpfC_Field
     if (field.suppressed) return;
     const unsigned typeId = field.DynTypeId();
     const auto add = [&](const qkw_Keyword& keyword) { AddStepDefinition(stepName, keyword, loadCaseName); };
-    if (loadCaseName.IsEmpty()) add(blockHeader_.StepHeader(stepName));
+    if (loadCaseName.IsEmpty()) AddStepDefinition(stepName, blockHeader_.StepHeader(stepName));
     cow_String text = cow_String("Name: ") + name +
                       "   Type: " + omi_Singleton<kpfC_FieldTypeLabelMap>::Instance().LabelString(typeId, 1);
     if (!loadCaseName.IsEmpty()) text.Append("   Scale factor: ").Append(cow_String(scale));

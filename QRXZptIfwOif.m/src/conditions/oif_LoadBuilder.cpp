@@ -39,16 +39,19 @@ void oif_LoadBuilder::Build() {
 void oif_LoadBuilder::BuildLoadsHistory() {
     ConfigureOpStatus();
     FindCyclicInteraction();
-    const cow_List<cow_String> stepNames = Model().Steps().Keys();
+    const kprC_StepContainer& steps = Model().Steps();
+    const oif_ObjectsOfSteps<kloC_Load> written(
+        "load", Model().Loads(), steps,
+        [this](const kloC_Load& load, const cow_String& step) { return opStatus_.Writes(load, step); });
     // Loads of the initial step are written from the first analysis step on, if at all.
-    for (int i = 1; i < stepNames.Length(); ++i) {
-        const nex_Context stepContext("step", stepNames[i]);
-        for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
-            const nex_Context context("load", it.CurrentKey());
-            if (opStatus_.Writes(it.CurrentValue(), stepNames[i]))
-                CreateLoadCard(it.CurrentKey(), it.CurrentValue(), stepNames[i]);
+    for (int i = 1; i < steps.Size(); ++i) {
+        const nex_Context stepContext("step", steps.NameAt(i));
+        for (const auto& [name, load] : written.In(i)) {
+            const nex_Context context("load", *name);
+            CreateLoadCard(*name, *load, steps.NameAt(i));
         }
     }
+    texts_.clear();
 }
 
 void oif_LoadBuilder::ConfigureOpStatus() {
@@ -83,15 +86,15 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     const unsigned typeId = load.DynTypeId();
     const auto add = [&](const qkw_Keyword& keyword) { AddStepDefinition(stepName, keyword, loadCaseName); };
     const bool opMod = !opStatus_.OpNew(typeId, stepName);
-    if (loadCaseName.IsEmpty()) add(blockHeader_.StepHeader(stepName));
-    cow_String text = cow_String("Name: ") + name +
-                      "   Type: " + omi_Singleton<kloC_LoadTypeLabelMap>::Instance().LabelString(typeId, 1);
-    if (!loadCaseName.IsEmpty()) text.Append("   Scale factor: ").Append(cow_String(scale));
-    const oif_Comment comment(text);
-    if (!AddsCommentItself(typeId)) add(comment);
+    if (loadCaseName.IsEmpty()) AddStepDefinition(stepName, blockHeader_.StepHeader(stepName));
+    const Texts& texts = TextsOf(name, load);
+    const cow_String& setName = texts.setName;
+    const auto addComment = [&] {
+        if (loadCaseName.IsEmpty()) return AddStepDefinition(stepName, texts.comment);
+        add(oif_Comment(texts.label + "   Scale factor: " + cow_String(scale)));
+    };
+    if (!AddsCommentItself(typeId)) addComment();
 
-    const auto assemblyName = [&](const rgnC_Region& region) { return oif_RegionName(region, ModelInfo()); };
-    const cow_String setName = assemblyName(load.region);
     const auto addDsload = [&](const cow_String& refNode) {
         cow_String fieldName;
         // Nothing but the comment tells of a load that a field gives.
@@ -101,7 +104,8 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     };
     switch (typeId) {
     case kloC_Pressure::Class.Id():
-        return addDsload(assemblyName(static_cast<const kloC_Pressure&>(load).distributionRegion));
+        return addDsload(
+            oif_RegionName(static_cast<const kloC_Pressure&>(load).distributionRegion, ModelInfo()));
     case kloC_SurfaceTraction::Class.Id():
     case kloC_ShellEdgeLoad::Class.Id(): return addDsload({});
     case kloC_RotationalBodyForce::Class.Id():
@@ -120,7 +124,7 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     case kloC_ConcentratedPoreFluid::Class.Id():
     case kloC_InwardVolAccel::Class.Id():
     case kloC_ConcentratedForce::Class.Id():
-        add(comment);
+        addComment();
         return add(oif_Cload(load, stepName, opMod, ModelInfo(), name, static_cast<double>(scale)));
     case kloC_ConcentratedHeatFlux::Class.Id():
     case kloC_ConcentratedConcentrationFlux::Class.Id():
@@ -140,9 +144,21 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     case kloC_InertiaRelief::Class.Id():
         // It is a comment only. The end of one of several isn't told; the banner stands all the same.
         if (load.Status(stepName) == Status::DEACTIVATED && !CheckForUniqueIRLoad(name, stepName)) return;
-        return add(comment);
+        return addComment();
     default: QRXBasException::Throw(nex_PrimException<atr_String, 1>("Unimplemented load type conversion"));
     }
+}
+
+const oif_LoadBuilder::Texts& oif_LoadBuilder::TextsOf(const cow_String& name, const kloC_Load& load) {
+    const auto [place, isNew] = texts_.try_emplace(&load);
+    Texts& texts = place->second;
+    if (isNew) {
+        texts.setName = oif_RegionName(load.region, ModelInfo());
+        texts.label = cow_String("Name: ") + name + "   Type: " +
+                      omi_Singleton<kloC_LoadTypeLabelMap>::Instance().LabelString(load.DynTypeId(), 1);
+        texts.comment = oif_Comment(texts.label);
+    }
+    return texts;
 }
 
 bool oif_LoadBuilder::CheckForUniqueIRLoad(const cow_String& name, const cow_String& stepName) const {

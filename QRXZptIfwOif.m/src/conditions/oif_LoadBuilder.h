@@ -5,6 +5,8 @@
 #include "deck/oif_BlockHeader.h"
 #include "deck/oif_Component.h"
 
+#include <unordered_map>
+
 class kinC_CyclicSymmetry;
 
 /// Loads of the steps: in each step those that begin, change or end there, and under op=NEW those that go
@@ -26,7 +28,16 @@ private:
     /// Whether no other inertia relief load begins, changes or ends in the step.
     bool CheckForUniqueIRLoad(const cow_String& name, const cow_String& stepName) const;
 
+    /// What is the same in all steps; their keywords share it.
+    struct Texts {
+        cow_String setName;
+        cow_String label;
+        qkw_KeywordHandle comment;
+    };
+    const Texts& TextsOf(const cow_String& name, const kloC_Load& load);
+
     oif_LoadOpStatus opStatus_;
+    std::unordered_map<const kloC_Load*, Texts> texts_; // while it builds
     oif_BlockHeader blockHeader_;
     bool cyclicSymmetry_ = false;
     const kinC_CyclicSymmetry* cyclicInteraction_ = nullptr; // of the model

@@ -15,6 +15,38 @@ struct oif_ConditionPlace {
 };
 using oif_ConditionPlaces = std::vector<oif_ConditionPlace>;
 
+/// The objects for which a test holds, step by step in the order of their names. One walk over the objects
+/// asks for all steps, so that a step costs nothing for what it only carries on.
+template <class T>
+class oif_ObjectsOfSteps {
+public:
+    struct Entry {
+        const cow_String* name;
+        const T* object;
+    };
+
+    oif_ObjectsOfSteps() = default;
+    /// `kind` is what messages call the objects; `test(object, stepName)`.
+    template <class Test>
+    oif_ObjectsOfSteps(const char* kind, const kprC_PropagatingContainer<T>& objects,
+                       const kprC_StepContainer& steps, const Test& test)
+        : entries_(static_cast<std::size_t>(steps.Size())) {
+        for (kprC_PropagatingContainerIT<T> it(objects); !it.IsDone(); it.Next()) {
+            const Entry entry{&it.CurrentKey(), &it.CurrentValue()};
+            for (int i = 0; i < steps.Size(); ++i) {
+                const nex_Context stepContext("step", steps.NameAt(i));
+                const nex_Context context(kind, *entry.name);
+                if (test(*entry.object, steps.NameAt(i)))
+                    entries_[static_cast<std::size_t>(i)].push_back(entry);
+            }
+        }
+    }
+    const std::vector<Entry>& In(int step) const { return entries_.at(static_cast<std::size_t>(step)); }
+
+private:
+    std::vector<std::vector<Entry>> entries_;
+};
+
 /// Which keyword families are written with ", op=NEW" in which steps. A keyword without it adds to what the
 /// steps before said and changes it; one with it wipes out all earlier definitions of its family, so that
 /// everything that goes on has to be said again. A builder configures its status once, before it makes any

@@ -12,12 +12,12 @@ public:
     explicit oif_BlockHeader(const cow_String& text)
         : banner_(oif_Comment(cow_String("\n") + text + "\n")), empty_(oif_RawKeyword("")) {}
 
-    const qkw_Keyword& ModelHeader() { return Once(modelHeaderGiven_); }
-    const qkw_Keyword& AssyHeader() { return Once(assyHeaderGiven_); }
-    const qkw_Keyword& StepHeader(const cow_String& stepName);
+    const qkw_KeywordHandle& ModelHeader() { return Once(modelHeaderGiven_); }
+    const qkw_KeywordHandle& AssyHeader() { return Once(assyHeaderGiven_); }
+    const qkw_KeywordHandle& StepHeader(const cow_String& stepName);
 
 private:
-    const qkw_Keyword& Once(bool& given);
+    const qkw_KeywordHandle& Once(bool& given);
 
     qkw_KeywordHandle banner_;
     qkw_KeywordHandle empty_;

@@ -40,7 +40,7 @@ void oif_InteractionBuilder::CreateInteractionProperties() {
         const kinC_InteractionProperty& property = it.CurrentValue();
         const nex_Context context("interaction property", name);
         const auto add = [&](const qkw_Keyword& keyword) {
-            AddModelDefinition(propertyBlockHeader.ModelHeader());
+            AddModelDefinition(propertyBlockHeader.ModelHeader().ConstGet());
             AddModelDefinition(keyword);
         };
         // Properties of incident waves and of control elements are not written.
@@ -62,7 +62,7 @@ void oif_InteractionBuilder::CreateContactProperty(const cow_String& name,
     };
     kinC_GeometricProperties geometry;
     if (!contact.geometricProperties.IsNull()) geometry = contact.geometricProperties.ConstGet();
-    AddModelDefinition(propertyBlockHeader.ModelHeader());
+    AddModelDefinition(propertyBlockHeader.ModelHeader().ConstGet());
     AddModelDefinition(
         oif_SurfaceInteraction(name, ModelInfo(), geometry.contactArea, geometry.padThickness));
     add(contact.tangentialBehavior, oif_Friction(held, ModelInfo(), false));

@@ -2,6 +2,7 @@
 
 #include "foundation/nex_Exception.h"
 
+#include <algorithm>
 #include <string>
 
 const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm) {
@@ -34,8 +35,11 @@ cow_List<cow_String> kprC_StepContainer::Keys() const {
 }
 
 int kprC_StepContainer::IndexOf(const cow_String& name) const {
+    for (int guess = data_->lastFound; guess < std::min(data_->lastFound + 2, Size()); ++guess) {
+        if (data_->steps[static_cast<std::size_t>(guess)].name == name) return data_->lastFound = guess;
+    }
     const auto place = data_->index.find(name.View());
-    return place == data_->index.end() ? -1 : place->second;
+    return place == data_->index.end() ? -1 : data_->lastFound = place->second;
 }
 
 const kprC_Step& kprC_StepContainer::ConstGet(const cow_String& name) const {

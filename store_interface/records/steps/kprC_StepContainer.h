@@ -45,6 +45,8 @@ private:
         std::vector<Entry> steps;
         // The views lie in the names' shared storage, which copies of the container keep alive too.
         std::unordered_map<std::string_view, int> index;
+        // Where a step was last found: the next question is mostly for the same or the one behind it.
+        mutable int lastFound = 0;
     };
     Data& Writable();
 
