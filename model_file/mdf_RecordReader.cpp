@@ -23,15 +23,14 @@ std::vector<std::string> FieldNames(const cls_FieldTable& table) {
     return names;
 }
 
-// The word of a meaning is what stands before "(", "," or ":".
-std::string MeaningWord(const cls_IntMeaning& meaning) {
+} // namespace
+
+std::string mdf_MeaningWord(const cls_IntMeaning& meaning) {
     std::string word(meaning.word);
     word.erase(std::min(word.find_first_of("(,:"), word.size()));
     while (!word.empty() && word.back() == ' ') word.pop_back();
     return word;
 }
-
-} // namespace
 
 std::vector<std::string> mdf_Names(const cow_List<cow_String>& names) {
     std::vector<std::string> copies;
@@ -256,7 +255,7 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const mdf_Path
     }
     std::vector<std::string> words;
     for (const cls_IntMeaning& meaning : field.meanings) {
-        words.push_back(MeaningWord(meaning));
+        words.push_back(mdf_MeaningWord(meaning));
         if (json.IsString() && omu_EqualInAnyCapitals(json.String(), words.back())) {
             value = meaning.value;
             return true;

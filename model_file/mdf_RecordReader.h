@@ -78,6 +78,8 @@ private:
 };
 
 /// Copies of cow_String as std::string and of lists of names, for messages.
+/// The word of a meaning: what stands before "(", "," or ":".
+std::string mdf_MeaningWord(const cls_IntMeaning& meaning);
 std::vector<std::string> mdf_Names(const cow_List<cow_String>& names);
 
 #endif

@@ -1,7 +1,10 @@
 #include "model_file/mdf_ModelFile.h"
+#include "model_file/mdf_RecordReader.h"
 
 #include <nlohmann/json.hpp>
 
+#include <cctype>
+#include <cstring>
 #include <ostream>
 
 namespace {
@@ -356,6 +359,22 @@ private:
         return schema;
     }
 
+    /// A pattern for the word in any capitals.
+    static std::string PatternOf(const std::string& word) {
+        std::string pattern;
+        for (const char c : word) {
+            const auto letter = static_cast<unsigned char>(c);
+            if (std::isalpha(letter) != 0) {
+                pattern += {'[', static_cast<char>(std::toupper(letter)),
+                            static_cast<char>(std::tolower(letter)), ']'};
+            } else {
+                if (std::strchr(".^$*+?()[]{}|\\/", c) != nullptr) pattern += '\\';
+                pattern += c;
+            }
+        }
+        return pattern;
+    }
+
     static Json DefaultOf(const cls_FieldType& type, const void* value) {
         switch (type.Kind()) {
         case cls_FieldKind::Bool: return *static_cast<const bool*>(value);
@@ -377,8 +396,16 @@ private:
         case cls_FieldKind::Int: {
             if (field == nullptr || field->meanings.empty()) return Reference("INT");
             Json words = Json::array();
-            for (const cls_IntMeaning& meaning : field->meanings) words.push_back(meaning.word);
-            return {{"anyOf", {Reference("INT"), {{"enum", words}}}}};
+            std::string inAnyCapitals;
+            for (const cls_IntMeaning& meaning : field->meanings) {
+                const std::string word = mdf_MeaningWord(meaning);
+                words.push_back(word);
+                inAnyCapitals += (inAnyCapitals.empty() ? "" : "|") + PatternOf(word);
+            }
+            return {{"anyOf",
+                     {Reference("INT"),
+                      {{"enum", words}},
+                      {{"type", "string"}, {"pattern", "^(" + inAnyCapitals + ")$"}}}}};
         }
         case cls_FieldKind::Double:
         case cls_FieldKind::Float: return {{"type", "number"}};
