@@ -146,10 +146,16 @@ private:
         if (isExplicitPair && model_.steps.Size() < 2) {
             Add("", "without an analysis step the contact is not written");
         }
+        int changes = 0;
+        bool beginsWithNone = false;
         for (int i = 0; i < model_.steps.Size(); ++i) {
             const cow_String& step = model_.steps.NameAt(i);
             const Status status = pair.GetPropStatus(step);
             const auto& property = pair.ConstGetState(step).InteractionProperty;
+            if (pair.HasStep(step) && !kinC_Interaction::IsBuiltIn(status) && property.IsModified() &&
+                ++changes == 1) {
+                beginsWithNone = property.ConstGet().IsEmpty();
+            }
             if (!property.ConstGet().IsEmpty()) continue;
             if (status == Status::CREATED) {
                 Add("", "step " + Quoted(step) + " begins the contact without a property");
@@ -158,6 +164,9 @@ private:
                                        : "writing fails: step " + Quoted(step) +
                                              " takes the property away, and no friction can take its place");
             }
+        }
+        if (!isExplicitJob && changes > 1 && beginsWithNone) {
+            Add("", "writing fails: the property changes, but begins as none, of which there can be no copy");
         }
     }
 

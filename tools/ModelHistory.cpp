@@ -3,6 +3,7 @@
 #include "conditions/oif_BoundaryConditionBuilder.h"
 #include "deck/oif_ModelInfo.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
@@ -12,10 +13,6 @@
 using nlohmann::ordered_json;
 
 namespace {
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
 
 struct Mark {
     bool written;

@@ -3,6 +3,7 @@
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 #include "store_interface/records/steps/kprC_Step.h"
+#include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
@@ -50,10 +51,6 @@ std::string KeywordsOf(Spec::PrintEnm print) {
     case Spec::PrintEnm::NONE: break;
     }
     return "";
-}
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
 }
 
 ordered_json Texts(const cls_xpListString& names) {

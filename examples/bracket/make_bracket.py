@@ -59,19 +59,53 @@ NODE_SETS = {"CLAMPED-FACE": on_wall_back, **{name: on_bolt_hole(name) for name 
 SURFACES = {"LOADED-FACE": on_base_top, "BORE": on_bore}
 
 # The bracket is loaded, then watched in small motions about that state: bent both ways, its modes, the
-# response to a shaking machine and to a sudden stop.
+# response to a shaking machine and to a sudden stop. Forces are in N, times in s, so masses are in t.
 DAMPING = {"directDamping": {"rows": [{"firstMode": 1, "lastMode": 12, "value": 0.02}]}}
 STEPS = [
     {"name": "Initial", "class": "kprC_InitialStep"},
     {"name": "Tighten", "class": "kprC_StaticStep", "description": "Large displacements, in increments of a tenth",
      "nlgeom": "ON", "initialInc": 0.1, "maxInc": 0.2, "restart": {"class": "kprC_StandardRestart", "frequency": 5},
      "monitor": {"class": "kprC_StandardMonitor", "region": "TIP", "dof": 3}},
-    {"name": "Bend", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {"Down": {}, "Sideways": {}}},
+    {"name": "Bend", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {
+        "Down": {"loads": {"Push": 1.0}}, "Sideways": {"loads": {"Pull": 1.0, "Push": 0.1}}}},
     {"name": "Modes", "class": "kprC_FrequencyStep", "numEigen": 12},
     {"name": "Shake", "class": "kprC_SteadyStateModalStep",
      "frequencies": [{"lower": 10, "upper": 2000, "points": 40}], **DAMPING},
     {"name": "Stop", "class": "kprC_ModalDynamicsStep", "timePeriod": 0.05, "timeIncrement": 1e-4, **DAMPING},
 ]
+PHYSICS = {
+    "materials": {"Aluminium": {
+        "elastic": {"table": [[70000, 0.33]]}, "density": {"table": [[2.7e-09]]}}},
+    "sections": {"Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Aluminium"}},
+    "amplitudes": {
+        "Rise": {"class": "kamC_Tabular", "table": [[0, 0], [1, 1]]},
+        "Knock": {"class": "kamC_Tabular", "table": [[0, 1], [0.005, 1], [0.006, 0]]}},
+    "boundaryConditions": {
+        "Bolted": {"class": "kbcC_DisplacementBC", "region": "BOLTS",
+                   "states": {"Initial": {"u1": 0, "u2": 0, "u3": 0}}},
+        "Wall": {"class": "kbcC_DisplacementBC", "region": "BRACKET-1.CLAMPED-FACE",
+                 "states": {"Initial": {"u2": 0}}}},
+    "loads": {
+        "Weight on the pad": {"class": "kloC_Pressure", "region": "PAD",
+                              "states": {"Tighten": {"magnitude": 0.5, "amplitude": "Rise"}}},
+        "Push": {"class": "kloC_ConcentratedForce", "region": "TIP", "states": {"Bend": {"component3": -100}}},
+        "Pull": {"class": "kloC_ConcentratedForce", "region": "TIP", "states": {"Bend": {"component1": 100}}},
+        "Shaker": {"class": "kloC_ConcentratedForce", "region": "TIP", "complex": True,
+                   "complexComponent3": [20, 5], "states": {"Shake": {"component3": 20}}},
+        "Jolt": {"class": "kloC_ConcentratedForce", "region": "TIP",
+                 "states": {"Stop": {"component2": 250, "amplitude": "Knock"}}}},
+    "fieldOutputRequests": {
+        "Stresses": {"class": "korC_FieldOutput",
+                     "states": {"Tighten": {"variables": ["S", "U", "RF"], "frequencyType": "TIME_INTERVAL",
+                                            "timeInterval": 0.25}}},
+        "Shapes": {"class": "korC_FieldOutput",
+                   "states": {"Bend": {}, "Modes": {"frequencyType": "MODE_LIST"},
+                              "Shake": {"frequencyType": "FREQUENCY", "frequency": 1}}}},
+    "historyOutputRequests": {
+        "Tip": {"class": "korC_HistoryOutput", "region": "TIP",
+                "states": {"Tighten": {"variables": ["U3"]}, "Shake": {"variables": ["U1", "U2", "U3"]}}},
+        "Energies": {"class": "korC_HistoryOutput", "states": {"Tighten": {}}}},
+}
 
 
 def exact_measures():
@@ -212,14 +246,15 @@ def model_of(nodes, elements):
         "description": "An L-shaped mounting bracket: two bolt holes in the wall, a bore in the base; lengths in mm. "
                        "Made by make_bracket.py.",
         "topLevelSolverInput": ["*Heading", "Mounting bracket, quadratic tetrahedra, lengths in mm"],
-        "parts": {"BRACKET": {"mesh": mesh}},
+        "parts": {"BRACKET": {"mesh": mesh,
+                              "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"}]}},
         "assembly": {
             "instances": {"BRACKET-1": {"part": "BRACKET", "translation": [250, 40, 0],
                                         "rotation": [0, 0, round(math.pi / 2, DIGITS)]}},
             "sets": [{"name": "BOLTS", "kind": "node", "members": member(labels=bolts)},
                      {"name": "TIP", "kind": "node", "members": member(labels=[tip])},
                      {"name": "PAD", "kind": "surface", "members": member(facets=surfaces["LOADED-FACE"])}]},
-        "steps": STEPS}}}
+        "steps": STEPS, **PHYSICS}}}
 
 
 def triangle(points):
@@ -294,6 +329,8 @@ def check(document):
                 f"{name}: area {exact_areas[name]:.2f} expected, {area:.2f} found")
 
     require(model["steps"] == STEPS, "the steps are others than those of this script")
+    for name, content in PHYSICS.items():
+        require(model[name] == content, f"the {name} are others than those of this script")
     for entry in model["assembly"]["sets"]:
         for part in entry["members"]:
             require(part["instance"] in model["assembly"]["instances"], f"{entry['name']}: unknown instance")

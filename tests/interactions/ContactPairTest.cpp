@@ -1,5 +1,6 @@
 #include "interactions/InteractionTesting.h"
 #include "interactions/oif_ContactPair.h"
+#include "store_interface/records/constraints/kcoC_Constraints.h"
 
 namespace {
 
@@ -167,6 +168,20 @@ TEST(ContactPair, OfAMeshIndependentTie_NamesItsInteractionBare_Wanted) {
     EXPECT_EQ(
         Written(oif_ContactPair("Tie 1", model.Region("MASTER"), model.Region("SLAVE"), 0.5, model.Info())),
         "*Contact Pair, tied, adjust=0.5, interaction=_Tie 1\nI.SLAVE, I.MASTER\n");
+}
+
+TEST(ContactPair, OfATie_HasItsToleranceAndMayHaveACpset) {
+    InteractionModel model(StaticSteps(1));
+    kcoC_Tie tie;
+    tie.master = model.Region("MASTER");
+    tie.slave = model.Region("NODES");
+    tie.positionTolerance = 0.25;
+    EXPECT_EQ(Written(oif_ContactPair("Tie 1", tie, "Initial", model.Info(), false)),
+              "*Contact Pair, tied, interaction=_Tie 1\nI_NODES_CNS_, I.MASTER\n");
+    tie.positionToleranceMethod = 1;
+    EXPECT_EQ(
+        Written(oif_ContactPair("Tie 1", tie, "Initial", model.Info(), true)),
+        "*Contact Pair, tied, adjust=0.25, interaction=_Tie 1, cpset=\"Tie 1\"\nI_NODES_CNS_, I.MASTER\n");
 }
 
 TEST(ContactPair, ElasticFoundation_WritesNothing) {

@@ -134,6 +134,12 @@ TEST(StandardContact, PropertyTakenAwayInALaterStep_Raises) {
     EXPECT_EQ(Raised([&] { model.ModelText(); }), "kinC_InteractionProperty: no entry named ''");
 }
 
+TEST(StandardContact, PropertyThatBeginsAsNoneAndChanges_Raises) {
+    InteractionModel model =
+        Standard(R"("Initial": {"InteractionProperty": null}, "Step-1": {"InteractionProperty": "P"})");
+    EXPECT_EQ(Raised([&] { model.ModelText(); }), "kinC_InteractionProperty: no entry named ''");
+}
+
 TEST(StandardContact, Clearance_StandsInTheModelBehindTheProperties) {
     InteractionModel model = Standard(R"("Step-2": {"InteractionProperty": "P"})",
                                       R"("clearanceType": 1, "pitch": 1, "clearanceRegion": "I.NODES", )");

@@ -136,4 +136,16 @@ TEST(InteractionChecks, ContactWithoutAProperty_IsNamedWithItsStep) {
         Findings(Pair("SurfaceToSurfaceContactXpl", kBegun + R"(, "Step-1": {"InteractionProperty": null})"),
                  {"ExplicitDynamics"}),
         Texts{kPlace + ": step 'Step-1' takes the property away"});
+    EXPECT_EQ(
+        Findings(Pair("SurfaceToSurfaceContactXpl",
+                      R"("Initial": {"InteractionProperty": null}, "Step-1": {"InteractionProperty": "P"})"),
+                 {"ExplicitDynamics"}),
+        Texts{kPlace + ": step 'Initial' begins the contact without a property"});
+    EXPECT_EQ(
+        Findings(Pair("SurfaceToSurfaceContactStd",
+                      R"("Initial": {"InteractionProperty": null}, "Step-1": {"InteractionProperty": "P"})"),
+                 {"Static"}),
+        (Texts{kPlace + ": step 'Initial' begins the contact without a property",
+               kPlace + ": writing fails: the property changes, but begins as none, of which there can be no "
+                        "copy"}));
 }

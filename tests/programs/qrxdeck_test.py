@@ -7,6 +7,7 @@ usage: qrxdeck_test.py PROGRAM [unittest options]
 import json
 import os
 import pathlib
+import re
 import resource
 import shutil
 import signal
@@ -666,6 +667,77 @@ class OtherCommands(ProgramTest):
         for word in ["write", "check", "info", "schema", "--version", "Exit codes:"]:
             self.assertIn(word, run.output)
         self.assertIn("--output-dir DIR", self.run_program("write", "--help").output)
+
+
+class Variables(ProgramTest):
+    def rows(self, *arguments):
+        """The columns of each line, the header first."""
+        run = self.run_program("variables", *arguments)
+        self.assertEqual((run.returncode, run.errors), (0, ""))
+        return [re.split("  +", line) for line in run.output.splitlines()]
+
+    def test_OfAllProcedures_IsATableWithAColumnForThem(self):
+        header, *rows = self.rows()
+        self.assertEqual(header, ["name", "channels", "keyword", "place", "procedures", "meaning (components)"])
+        by_name = {row[0]: row for row in rows}
+        self.assertEqual(len(by_name), len(rows))
+        self.assertEqual(by_name["U"], ["U", "field, history", "*Node Output", "node", "20",
+                                        "displacements and rotations (U1 U2 U3 UR1 UR2 UR3 WARP)"])
+        self.assertEqual(by_name["EVOL"][4], "all")
+        self.assertEqual(by_name["DT"][1:5], ["history", "*Incrementation Output", "whole set",
+                                              "ExplicitDynamics TempDisplacementDynamics"])
+        self.assertEqual(by_name["HFL"][2], "*Element Output, *Contact Output")
+
+    def test_OfOneProcedure_ShowsWhatIsPreselected(self):
+        header, *rows, legend = self.rows("--step-type", "Buckle")
+        self.assertEqual(header, ["name", "channels", "keyword", "place", "meaning (components)"])
+        self.assertEqual(legend, ["* preselected"])
+        channels = {row[0]: row[1] for row in rows}
+        self.assertEqual(channels["U"], "field*, history")
+        self.assertEqual(channels["RF"], "field, history")
+        self.assertNotIn("ALLKE", channels)
+        channels = {row[0]: row[1] for row in self.rows("--step-type", "Static")[1:-1]}
+        self.assertEqual(channels["ALLKE"], "history*")
+
+    def test_StepTypes_AreKnownByShortAndByWholeNamesInAnyCapitals(self):
+        expected = self.run_program("variables", "--step-type", "StaticRiks").output
+        for name in ["staticriks", "STATICRIKSSTEP", "StaticRiksStep", "kprC_StaticRiksStep", "KPRC_staticriksstep"]:
+            with self.subTest(name=name):
+                run = self.run_program("variables", "--step-type", name)
+                self.assertEqual((run.returncode, run.output), (0, expected))
+
+    def test_StepTypeThatIsNotThere_IsCodeTwoAndNamesThoseThatAre(self):
+        for name in ["Nosuch", "Step", "kprC_StaticRiks", "kprC_InitialStep", "kprC_AnalysisStep", " Static"]:
+            with self.subTest(name=name):
+                run = self.run_program("variables", "--step-type", name)
+                self.assert_refused(run, 2)
+                self.assertRegex(run.errors, "^qrxdeck: error: there is no step type '%s'; the step types are "
+                                             "Static, StaticRiks, .*, SteadyStateSubspace\n$" % name)
+        run = self.run_program("variables", "--json", "--step-type", "Nosuch")
+        self.assertEqual((run.returncode, run.errors), (2, ""))
+        result = json.loads(run.output)
+        self.assertEqual(result["exitCode"], 2)
+        self.assertNotIn("variables", result)
+
+    def test_InJson_EveryVariableHasItsProcedures(self):
+        result = json.loads(self.run_program("variables", "--json").output)
+        self.assertEqual((result["exitCode"], result["messages"]), (0, []))
+        by_name = {variable["name"]: variable for variable in result["variables"]}
+        self.assertEqual(len(by_name), len(result["variables"]))
+        self.assertEqual(by_name["DT"], {
+            "name": "DT", "meaning": by_name["DT"]["meaning"], "components": [],
+            "keyword": "*Incrementation Output", "location": "WHOLE SET", "field": False, "history": True,
+            "procedures": ["ExplicitDynamics", "TempDisplacementDynamics"], "preselectField": [],
+            "preselectHistory": ["ExplicitDynamics", "TempDisplacementDynamics"]})
+        self.assertEqual(by_name["S"]["components"], ["S11", "S22", "S33", "S12", "S13", "S23"])
+
+    def test_InJsonOfOneProcedure_TheListsNameThatOneAlone(self):
+        run = self.run_program("variables", "--json", "--step-type", "static")
+        by_name = {variable["name"]: variable for variable in json.loads(run.output)["variables"]}
+        self.assertEqual(by_name["U"]["procedures"], ["Static"])
+        self.assertEqual(by_name["U"]["preselectField"], ["Static"])
+        self.assertEqual(by_name["U"]["preselectHistory"], [])
+        self.assertNotIn("NT", by_name)
 
 
 if __name__ == "__main__":

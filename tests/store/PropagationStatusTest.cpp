@@ -300,9 +300,13 @@ TEST(PropagationStatus, UnknownStep_Raises) {
     EXPECT_EQ(Raised([&] { force.Status("S0"); }), "kprC_PropagatingState: no entry named 'S0'");
     force.Propagate(StepsOf("IG"));
     EXPECT_EQ(Raised([&] { force.ConstGetStateQuad("S9"); }), "kprC_PropagatingState: no entry named 'S9'");
+}
+
+TEST(PropagationStatus, UnknownStepOfAnInteraction_HasStatusZero) {
     Contact contact;
     contact.Propagate(StepsOf("IG"));
-    EXPECT_EQ(Raised([&] { contact.HasStep("S9"); }), "kprC_PropagatingState: no entry named 'S9'");
+    EXPECT_FALSE(contact.HasStep("S9"));
+    EXPECT_EQ(contact.GetPropStatus("S9"), mdl_PropagationStatusEnm::NOT_YET_ACTIVE);
 }
 
 TEST(PropagationStatus, ChangedSteps_CountAfterPropagatingAgain) {

@@ -259,7 +259,7 @@ void oif_BoundaryConditionBuilder::AddHeader(const cow_String& stepName, const c
 }
 
 cow_String oif_BoundaryConditionBuilder::RegionName(const rgnC_Region& region) const {
-    return oif_SetName(region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    return oif_RegionName(region, ModelInfo());
 }
 
 const kprC_AnalysisStep* oif_BoundaryConditionBuilder::AnalysisStep(const cow_String& stepName) const {

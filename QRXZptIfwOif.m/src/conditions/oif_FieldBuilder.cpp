@@ -57,8 +57,7 @@ void oif_FieldBuilder::FieldCardDetails(const cow_String& name, const kpfC_Field
     if (!loadCaseName.IsEmpty()) text.Append("   Scale factor: ").Append(cow_String(scale));
     add(oif_Comment(text));
 
-    const cow_String setName =
-        oif_SetName(field.region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    const cow_String setName = oif_RegionName(field.region, ModelInfo());
     const bool opMod = !opStatus_.OpNew(typeId, stepName);
     const auto addInitialConditions = [&] {
         add(oif_InitialConditions(field, Model().Steps().NameAt(0), stepName, opMod, setName,

@@ -25,7 +25,7 @@ oif_FluxLoad::oif_FluxLoad(const kloC_Load& load, const cow_String& stepName, bo
     if (!values.empty()) magnitude_ = values.front().real;
 }
 
-void oif_FluxLoad::Write(utl_Stream& stream, const oif_FluxText& text) const {
+void oif_FluxLoad::WriteAs(const oif_FluxText& text, utl_Stream& stream) const {
     stream << text.keyword;
     if (!opMod_) stream << ", op=NEW";
     if (deactivated_) return stream.LineBreak();
@@ -66,7 +66,7 @@ void oif_ElectricalLoad::WriteCard(utl_Stream& stream, const oif_ElectricalText&
     stream.LineBreak();
 }
 
-void oif_ElectricalLoad::Write(utl_Stream& stream, const oif_ElectricalText& text) const {
+void oif_ElectricalLoad::WriteAs(const oif_ElectricalText& text, utl_Stream& stream) const {
     if (deactivated_) return WriteCard(stream, text, 0);
     const auto line = [&](double value) { stream << setName_ << text.label << value << endl; };
     WriteCard(stream, text, 1);

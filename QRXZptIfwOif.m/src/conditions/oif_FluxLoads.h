@@ -16,7 +16,7 @@ struct oif_FluxText {
 class oif_FluxLoad : public qkw_Keyword {
 protected:
     oif_FluxLoad(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName);
-    void Write(utl_Stream& stream, const oif_FluxText& text) const;
+    void WriteAs(const oif_FluxText& text, utl_Stream& stream) const;
 
 private:
     bool opMod_;
@@ -36,7 +36,7 @@ class oif_FluxLoadOf final : public qkw_KeywordOf<oif_FluxLoadOf<Text>, oif_Flux
 public:
     oif_FluxLoadOf(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName)
         : qkw_KeywordOf<oif_FluxLoadOf<Text>, oif_FluxLoad>(load, stepName, opMod, setName) {}
-    void Write(utl_Stream& stream) const override { oif_FluxLoad::Write(stream, Text); }
+    void Write(utl_Stream& stream) const override { oif_FluxLoad::WriteAs(Text, stream); }
 };
 
 inline constexpr oif_FluxText oif_CfluxText{"*Cflux", nullptr, nullptr};
@@ -62,7 +62,7 @@ class oif_ElectricalLoad : public qkw_Keyword {
 protected:
     oif_ElectricalLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
                        const cow_String& setName);
-    void Write(utl_Stream& stream, const oif_ElectricalText& text) const;
+    void WriteAs(const oif_ElectricalText& text, utl_Stream& stream) const;
 
 private:
     void WriteCard(utl_Stream& stream, const oif_ElectricalText& text, int loadCase) const;
@@ -89,7 +89,7 @@ public:
     oif_ElectricalLoadOf(const kloC_Load& load, const cow_String& stepName, bool opMod,
                          const cow_String& setName)
         : qkw_KeywordOf<oif_ElectricalLoadOf<Text>, oif_ElectricalLoad>(load, stepName, opMod, setName) {}
-    void Write(utl_Stream& stream) const override { oif_ElectricalLoad::Write(stream, Text); }
+    void Write(utl_Stream& stream) const override { oif_ElectricalLoad::WriteAs(Text, stream); }
 };
 
 inline constexpr oif_ElectricalText oif_CechargeText{"*Cecharge", ", ,"};

@@ -104,7 +104,8 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     };
     switch (typeId) {
     case kloC_Pressure::Class.Id():
-        return addDsload(AssemblyName(static_cast<const kloC_Pressure&>(load).distributionRegion));
+        return addDsload(
+            oif_RegionName(static_cast<const kloC_Pressure&>(load).distributionRegion, ModelInfo()));
     case kloC_SurfaceTraction::Class.Id():
     case kloC_ShellEdgeLoad::Class.Id(): return addDsload({});
     case kloC_RotationalBodyForce::Class.Id():
@@ -152,16 +153,12 @@ const oif_LoadBuilder::Texts& oif_LoadBuilder::TextsOf(const cow_String& name, c
     const auto [place, isNew] = texts_.try_emplace(&load);
     Texts& texts = place->second;
     if (isNew) {
-        texts.setName = AssemblyName(load.region);
+        texts.setName = oif_RegionName(load.region, ModelInfo());
         texts.label = cow_String("Name: ") + name + "   Type: " +
                       omi_Singleton<kloC_LoadTypeLabelMap>::Instance().LabelString(load.DynTypeId(), 1);
         texts.comment = oif_Comment(texts.label);
     }
     return texts;
-}
-
-cow_String oif_LoadBuilder::AssemblyName(const rgnC_Region& region) const {
-    return oif_SetName(region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
 }
 
 bool oif_LoadBuilder::CheckForUniqueIRLoad(const cow_String& name, const cow_String& stepName) const {

@@ -35,7 +35,6 @@ private:
         qkw_KeywordHandle comment;
     };
     const Texts& TextsOf(const cow_String& name, const kloC_Load& load);
-    cow_String AssemblyName(const rgnC_Region& region) const;
 
     oif_LoadOpStatus opStatus_;
     std::unordered_map<const kloC_Load*, Texts> texts_; // while it builds

@@ -140,9 +140,7 @@ void oif_MechanicalLoad::WriteMagnitude(bool passes, const Block& block) const {
 
 oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
                      const qkw_ModelInfo& modelInfo, const cow_String&, double scale)
-    : oif_Cload(load, stepName, opMod,
-                oif_SetName(load.region, modelInfo).UniqueSetName(oif_SetName::regionContext::ASSEMBLY),
-                scale) {}
+    : oif_Cload(load, stepName, opMod, oif_RegionName(load.region, modelInfo), scale) {}
 
 oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
                      const cow_String& regionName, double scale)

@@ -177,8 +177,7 @@ void oif_LoadOpStatus::ResolveOverlapRegions(const kprC_PropagatingContainer<klo
         const nex_Context context("load", it.CurrentKey());
         const auto key = static_cast<std::size_t>(Key(load.DynTypeId()));
         // Regions without a value share the empty name.
-        const cow_String name =
-            oif_SetName(load.region, modelInfo).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+        const cow_String name = oif_RegionName(load.region, modelInfo);
         if (!names[key].emplace(name.View()).second) overlaps[key] = true;
     }
     for (std::size_t key = 0; key < overlaps.size(); ++key) {

@@ -22,7 +22,7 @@ void oif_ConstraintBuilder::Build() {
 }
 
 cow_String oif_ConstraintBuilder::RegionName(const rgnC_Region& region) const {
-    return oif_SetName(region, ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    return oif_RegionName(region, ModelInfo());
 }
 
 void oif_ConstraintBuilder::AddConstraint(const cow_String& name, const kcoC_Constraint& constraint,
@@ -47,8 +47,7 @@ void oif_ConstraintBuilder::AddConstraint(const cow_String& name, const kcoC_Con
         }
     } else if (type == kcoC_RigidBody::TypeId()) {
         const auto& body = nex_canDynamicCastRef<kcoC_RigidBody>(constraint, NEX_HERE);
-        const cow_String surface =
-            oif_SetName(body.surface, ModelInfo()).UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
+        const cow_String surface = oif_SurfaceName(body.surface, ModelInfo());
         AddAssemblyDefinition(oif_RigidBody(RegionName(body.refNode), RegionName(body.elements),
                                             RegionName(body.pinNodes), RegionName(body.tieNodes), surface,
                                             body.refPointAtCenterOfMass, body.isothermal));

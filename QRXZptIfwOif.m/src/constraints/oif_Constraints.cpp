@@ -5,14 +5,6 @@
 
 namespace {
 
-cow_String SurfaceName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo) {
-    return oif_SetName(region, modelInfo).UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
-}
-
-cow_String SetName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo) {
-    return oif_SetName(region, modelInfo).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
-}
-
 /// Parameters behind which, unlike elsewhere, the line may break: the next one's comma opens a new line.
 class BrokenBehind {
 public:
@@ -55,8 +47,8 @@ void WritePoint(utl_Stream& stream, const g3d_Vector& point) {
 } // namespace
 
 oif_Tie::oif_Tie(const cow_String& name, const kcoC_Tie& tie, const qkw_ModelInfo& modelInfo, bool cyclic)
-    : name_(name), master_(SurfaceName(tie.master, modelInfo)), slave_(SurfaceName(tie.slave, modelInfo)),
-      record_(tie), cyclic_(cyclic) {}
+    : name_(name), master_(oif_SurfaceName(tie.master, modelInfo)),
+      slave_(oif_SurfaceName(tie.slave, modelInfo)), record_(tie), cyclic_(cyclic) {}
 
 void oif_Tie::Write(utl_Stream& stream) const {
     stream << "*Tie, name=" << qkw_QuorixName(name_, false);
@@ -81,8 +73,8 @@ void oif_Tie::Write(utl_Stream& stream) const {
 
 oif_Coupling::oif_Coupling(const cow_String& name, const kcoC_Coupling& coupling,
                            const qkw_ModelInfo& modelInfo)
-    : name_(name), refNode_(SetName(coupling.refNode, modelInfo)),
-      surface_(SurfaceName(coupling.surface, modelInfo)), influenceRadius_(coupling.influenceRadius) {
+    : name_(name), refNode_(oif_RegionName(coupling.refNode, modelInfo)),
+      surface_(oif_SurfaceName(coupling.surface, modelInfo)), influenceRadius_(coupling.influenceRadius) {
     if (coupling.orientation.IsNullRef()) return;
     orientation_ = modelInfo.GetOrientationName(coupling.orientation, 0.0, cow_String());
 }
@@ -127,9 +119,9 @@ void oif_RigidBody::Write(utl_Stream& stream) const {
 
 oif_EmbeddedRegion::oif_EmbeddedRegion(const cow_String& name, const kcoC_EmbeddedRegion& region,
                                        const qkw_ModelInfo& modelInfo)
-    : oif_EmbeddedRegion(name, SetName(region.host, modelInfo), SetName(region.embedded, modelInfo),
-                         region.fractionalTolerance, region.absoluteTolerance, region.weightFactorTolerance,
-                         modelInfo) {}
+    : oif_EmbeddedRegion(name, oif_RegionName(region.host, modelInfo),
+                         oif_RegionName(region.embedded, modelInfo), region.fractionalTolerance,
+                         region.absoluteTolerance, region.weightFactorTolerance, modelInfo) {}
 
 void oif_EmbeddedRegion::Write(utl_Stream& stream) const {
     stream << "*Embedded Element, host elset=" << host_;
@@ -163,8 +155,8 @@ void oif_Equation::Write(utl_Stream& stream) const {
 oif_ShellSolidCoupling::oif_ShellSolidCoupling(const cow_String& name,
                                                const kcoC_ShellSolidCoupling& coupling,
                                                const qkw_ModelInfo& modelInfo)
-    : name_(name), shellEdge_(SurfaceName(coupling.shellEdge, modelInfo)),
-      solidFace_(SurfaceName(coupling.solidFace, modelInfo)), record_(coupling) {}
+    : name_(name), shellEdge_(oif_SurfaceName(coupling.shellEdge, modelInfo)),
+      solidFace_(oif_SurfaceName(coupling.solidFace, modelInfo)), record_(coupling) {}
 
 void oif_ShellSolidCoupling::Write(utl_Stream& stream) const {
     stream << "*Shell to Solid Coupling, constraint name=" << qkw_QuorixName(name_, false);

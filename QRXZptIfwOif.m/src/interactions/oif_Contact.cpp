@@ -1,6 +1,7 @@
 #include "interactions/oif_Contact.h"
 
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
@@ -68,7 +69,7 @@ oif_ContactPropertyAssignments::oif_ContactPropertyAssignments(const kinC_Intera
 // The first word alone begins with a capital in these three.
 void oif_ContactPropertyAssignments::Write(utl_Stream& stream) const {
     WriteLines(stream, "*Contact property assignment", lines_, [&](const auto& line) {
-        stream << line.first << " , " << line.second << " , " << oif_Name(line.value);
+        stream << line.first << " , " << line.second << " , " << qkw_QuorixName(line.value, false);
     });
 }
 

@@ -1,7 +1,8 @@
 #include "interactions/oif_ContactControls.h"
 
 #include "deck/oif_KeywordLine.h"
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 
 namespace {
 
@@ -37,7 +38,7 @@ void oif_ContactControls::Write(utl_Stream& stream) const {
 void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContactControls& controls) const {
     using Controls = kinC_ExpContactControls;
     oif_KeywordLine line(stream, "*Contact Controls, cpset=");
-    line.Text(oif_Name(name_).Printable());
+    line.Text(qkw_QuorixName(name_, false).Printable());
     if (reset_) {
         line.Text(", reset").End();
         return;

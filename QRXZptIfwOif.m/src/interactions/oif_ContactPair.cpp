@@ -1,8 +1,10 @@
 #include "interactions/oif_ContactPair.h"
 
 #include "deck/oif_KeywordLine.h"
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/constraints/kcoC_Constraints.h"
 #include "store_interface/records/interactions/kinC_CyclicSymmetry.h"
 
 #include <limits>
@@ -17,7 +19,7 @@ const char* MechanicalConstraintWord(int constraint) {
 /// ", interaction=" and ", mechanical constraint=".
 template <class Contact>
 void WriteExplicitPair(utl_Stream& stream, const Contact& contact, const kinC_ContactPairState& state) {
-    stream << ", interaction=" << oif_Name(state.InteractionProperty.ConstGet())
+    stream << ", interaction=" << qkw_QuorixName(state.InteractionProperty.ConstGet(), false)
            << ", mechanical constraint=" << MechanicalConstraintWord(contact.mechanicalConstraint);
 }
 
@@ -46,6 +48,14 @@ oif_ContactPair::oif_ContactPair(const cow_String& name, const rgnC_Region& seco
     master_ = oif_SurfaceName(second, modelInfo);
 }
 
+oif_ContactPair::oif_ContactPair(const cow_String& name, const kcoC_Tie& tie, const cow_String&,
+                                 const qkw_ModelInfo& modelInfo, bool cpset)
+    : name_(name), cpset_(cpset) {
+    slave_ = oif_SurfaceName(tie.slave, modelInfo);
+    master_ = oif_SurfaceName(tie.master, modelInfo);
+    if (tie.positionToleranceMethod == 1) adjust_ = tie.positionTolerance;
+}
+
 void oif_ContactPair::Write(utl_Stream& stream) const {
     if (interaction_.IsNull()) {
         WriteTied(stream);
@@ -71,8 +81,10 @@ void oif_ContactPair::Write(utl_Stream& stream) const {
 }
 
 void oif_ContactPair::WriteTied(utl_Stream& stream) const {
+    stream << "*Contact Pair, tied";
+    if (adjust_) stream << ", adjust=" << *adjust_;
     // The name of the interaction goes out bare.
-    stream << "*Contact Pair, tied, adjust=" << adjust_ << ", interaction=_" << name_;
+    stream << ", interaction=_" << name_;
     WriteCpset(stream);
     stream << endl << slave_ << ", " << master_ << endl;
 }
@@ -83,7 +95,7 @@ void oif_ContactPair::WriteStandard(utl_Stream& stream,
     const bool smallSliding = contact.sliding == 0;
     const bool surfaceToSurface = contact.formulation == 1;
     oif_KeywordLine line(stream, "*Contact Pair, interaction=");
-    line.Text(oif_Name(contact.ConstGetState(step_).InteractionProperty.ConstGet()))
+    line.Text(qkw_QuorixName(contact.ConstGetState(step_).InteractionProperty.ConstGet(), false))
         .WordIf(smallSliding, "small sliding")
         .ValueIf(!smallSliding && contact.limitSlideDistance, "slide distance=", contact.slideDistance)
         .WordIf(surfaceToSurface, "type=SURFACE TO SURFACE")
@@ -99,7 +111,7 @@ void oif_ContactPair::WriteStandard(utl_Stream& stream,
     case kinC_StdAdjustEnm::TOLERANCE: line.Value("adjust=", contact.adjustTolerance); break;
     case kinC_StdAdjustEnm::SET: line.Value("adjust=", adjustSetName_); break;
     }
-    line.WordIf(contact.tied, "tied").ValueIf(cpset_, "cpset=", oif_Name(name_)).End();
+    line.WordIf(contact.tied, "tied").ValueIf(cpset_, "cpset=", qkw_QuorixName(name_, false)).End();
     stream << slave_ << ", " << master_ << endl;
 }
 
@@ -120,7 +132,7 @@ void oif_ContactPair::WriteExplicit(utl_Stream& stream,
 
 void oif_ContactPair::WriteStandardSelf(utl_Stream& stream, const kinC_SelfContactStd& contact) const {
     stream << "*Contact Pair, interaction="
-           << oif_Name(contact.ConstGetState(step_).InteractionProperty.ConstGet());
+           << qkw_QuorixName(contact.ConstGetState(step_).InteractionProperty.ConstGet(), false);
     WriteCpset(stream);
     // Lines break behind a parameter here, not behind the comma ahead of it.
     if (contact.smooth != kinC_SelfContactStd::smoothDef()) {
@@ -152,7 +164,7 @@ void oif_ContactPair::WriteExplicitSelf(utl_Stream& stream, const kinC_SelfConta
 }
 
 void oif_ContactPair::WriteCpset(utl_Stream& stream) const {
-    if (cpset_) stream << ", cpset=" << oif_Name(name_);
+    if (cpset_) stream << ", cpset=" << qkw_QuorixName(name_, false);
 }
 
 oif_ModelChange::oif_ModelChange(const cow_String&, const mdl_ObjCow<kinC_Interaction>& interaction,
@@ -191,7 +203,7 @@ void oif_ContactInterference::Write(utl_Stream& stream) const {
     const cow_String& amplitude = state->amplitude.ConstGet();
     stream << "*Contact Interference";
     if (type == kinC_InterferenceTypeEnm::UNIFORM_FIT && !amplitude.IsEmpty()) {
-        stream << ", amplitude=" << oif_Name(amplitude);
+        stream << ", amplitude=" << qkw_QuorixName(amplitude, false);
     }
     if (shrink) stream << ", shrink";
     stream << endl << slave_ << ", " << master_;
@@ -214,7 +226,7 @@ void oif_Clearance::Write(utl_Stream& stream) const {
     if (contact.DynTypeId() == kinC_SurfaceToSurfaceContactStd::TypeId()) {
         stream << ", master=" << master_ << ", slave=" << slave_;
     } else if (contact.DynTypeId() == kinC_SurfaceToSurfaceContactXpl::TypeId()) {
-        stream << ", cpset=" << oif_Name(cpset_);
+        stream << ", cpset=" << qkw_QuorixName(cpset_, false);
     }
     if (contact.ClearanceType() == kinC_ClearanceTypeEnm::SINGLE_VALUE) {
         stream << ", value=" << contact.initialClearance << endl;

@@ -5,6 +5,10 @@
 #include "keyword_layer/qkw_ModelInfo.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
 
+#include <optional>
+
+class kcoC_Tie;
+
 /// What the keywords about one contact hold: its record, the step that they look at, and the names of its
 /// surfaces; a contact of a surface with itself has the one name twice.
 class oif_ContactKeyword : public qkw_Keyword {
@@ -34,6 +38,9 @@ class oif_ContactPair final : public qkw_KeywordOf<oif_ContactPair, oif_ContactK
 public:
     oif_ContactPair(const cow_String& name, const mdl_ObjCow<kinC_Interaction>& interaction,
                     const cow_String& step, const qkw_ModelInfo& modelInfo, bool cpset);
+    /// Of a tie, with ", adjust=" if its position tolerance is a distance; `step` makes no difference.
+    oif_ContactPair(const cow_String& name, const kcoC_Tie& tie, const cow_String& step,
+                    const qkw_ModelInfo& modelInfo, bool cpset);
     /// Of a mesh-independent tie:
     ///     *Contact Pair, tied, adjust=0.1, interaction=_Tie-1
     ///     Inst.FIRST, Inst.SECOND
@@ -51,8 +58,8 @@ private:
 
     cow_String name_;
     bool cpset_ = false;
-    double adjust_ = 0.0;      // of a tied pair
-    cow_String adjustSetName_; // of a standard pair
+    std::optional<double> adjust_; // of a tied pair
+    cow_String adjustSetName_;     // of a standard pair
 };
 
 /// A pair that enters or leaves the analysis:

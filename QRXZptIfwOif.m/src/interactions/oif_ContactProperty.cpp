@@ -1,8 +1,9 @@
 #include "interactions/oif_ContactProperty.h"
 
 #include "deck/oif_DataLines.h"
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
+#include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 namespace {
@@ -41,7 +42,7 @@ void WriteNumbers(utl_Stream& stream, const Table& table, std::initializer_list<
 } // namespace
 
 void oif_SurfaceInteraction::Write(utl_Stream& stream) const {
-    stream << "*Surface Interaction, name=" << oif_Name(name_);
+    stream << "*Surface Interaction, name=" << qkw_QuorixName(name_, false);
     if (product_ == kprC_AnalysisProductEnm::EXPLICIT && padThickness_ != cls_UnsetDouble) {
         stream << ", pad thickness=" << padThickness_;
     }
@@ -122,7 +123,7 @@ void oif_Friction::WriteData(utl_Stream& stream, const kinC_TangentialBehavior& 
 }
 
 void oif_ChangeFriction::Write(utl_Stream& stream) const {
-    stream << "*Change Friction, interaction=" << oif_Name(propertyName_) << endl;
+    stream << "*Change Friction, interaction=" << qkw_QuorixName(propertyName_, false) << endl;
 }
 
 void oif_SurfaceBehavior::Write(utl_Stream& stream) const {

@@ -1,7 +1,8 @@
 #include "interactions/oif_FilmAndRadiation.h"
 
 #include "deck/oif_DataLines.h"
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 
 namespace {
 
@@ -47,7 +48,7 @@ void oif_Sfilm::WriteData(utl_Stream& stream) const {
         break;
     case PROPERTY:
         stream << "F, " << state.sinkTemperature.ConstGet() << ", "
-               << oif_Name(state.filmProperty.ConstGet());
+               << qkw_QuorixName(state.filmProperty.ConstGet(), false);
         break;
     case USER:
         stream << "FNU, " << state.sinkTemperature.ConstGet() << ", " << state.filmCoeff.ConstGet();
@@ -72,7 +73,7 @@ void oif_Cfilm::WriteData(utl_Stream& stream) const {
     stream << SetName() << ", " << state.nodalArea.ConstGet() << ", " << state.sinkTemperature.ConstGet()
            << ", ";
     if (film.definition == PROPERTY) {
-        stream << oif_Name(state.filmProperty.ConstGet());
+        stream << qkw_QuorixName(state.filmProperty.ConstGet(), false);
     } else {
         stream << state.filmCoeff.ConstGet();
     }
@@ -105,7 +106,7 @@ oif_FilmProperty::oif_FilmProperty(const cow_String& name, const kinC_Interactio
     : name_(name), property_(nex_canDynamicCastRef<kinC_FilmConditionProp>(property, NEX_HERE)) {}
 
 void oif_FilmProperty::Write(utl_Stream& stream) const {
-    stream << "*Film Property, name=" << oif_Name(name_);
+    stream << "*Film Property, name=" << qkw_QuorixName(name_, false);
     stream.OptionalLineBreak();
     if (property_.dependencies != 0) stream << ", dependencies=" << property_.dependencies;
     stream << endl;
@@ -130,7 +131,7 @@ oif_CavityDefinition::oif_CavityDefinition(const cow_String& name, const kinC_In
 }
 
 void oif_CavityDefinition::Write(utl_Stream& stream) const {
-    stream << "*Cavity Definition, name=" << oif_Name(name_);
+    stream << "*Cavity Definition, name=" << qkw_QuorixName(name_, false);
     if (ambientTemp_ != kinC_CavityRadiation::ambientTempDef()) stream << ", ambient temp=" << ambientTemp_;
     stream << endl;
     WriteSurfaces(stream, surfaces_);
@@ -142,7 +143,7 @@ oif_RadiationViewfactor::oif_RadiationViewfactor(const cow_String& name, const k
       blockingSurfaces_(SurfaceNames(state_.blockingSurfaces.ConstGet(), modelInfo)) {}
 
 void oif_RadiationViewfactor::Write(utl_Stream& stream) const {
-    stream << "*Radiation Viewfactor, cavity=" << oif_Name(name_);
+    stream << "*Radiation Viewfactor, cavity=" << qkw_QuorixName(name_, false);
     if (off_) {
         stream << ", off" << endl;
         return;

@@ -5,8 +5,9 @@
 #include "interactions/oif_ContactPair.h"
 #include "interactions/oif_ContactProperty.h"
 #include "interactions/oif_FilmAndRadiation.h"
-#include "interactions/oif_InteractionNames.h"
 #include "interactions/oif_WaveInteractions.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <set>

@@ -1,6 +1,7 @@
 #include "interactions/oif_StepInteraction.h"
 
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 #include "store_interface/records/steps/kprC_Predicates.h"
 
 void oif_StepInteraction::Write(utl_Stream& stream) const {
@@ -17,7 +18,7 @@ void oif_StepInteraction::Write(utl_Stream& stream) const {
 void oif_StepInteraction::WriteNamed(utl_Stream& stream, const char* parameter, const cow_String& name) {
     if (name.IsEmpty()) return;
     stream.OptionalLineBreak();
-    stream << parameter << oif_Name(name);
+    stream << parameter << qkw_QuorixName(name, false);
 }
 
 void oif_StepInteraction::WriteRegionType(utl_Stream& stream, int regionType) const {

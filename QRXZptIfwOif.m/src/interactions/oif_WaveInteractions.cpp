@@ -1,7 +1,8 @@
 #include "interactions/oif_WaveInteractions.h"
 
-#include "interactions/oif_InteractionNames.h"
+#include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
+#include "mesh/oif_SetName.h"
 
 namespace {
 
@@ -23,7 +24,7 @@ void oif_AcousticImpedance::WriteParameters(utl_Stream& stream) const {
         const bool isKnown = type >= 0 && type < static_cast<int>(std::size(kBoundaryTypes));
         stream << ", nonreflecting=" << (isKnown ? kBoundaryTypes[type] : "");
     } else {
-        stream << ", property=" << oif_Name(impedance.ConstGetState(Step()).property.ConstGet());
+        stream << ", property=" << qkw_QuorixName(impedance.ConstGetState(Step()).property.ConstGet(), false);
     }
     stream.OptionalLineBreak();
 }
@@ -52,7 +53,7 @@ oif_AcousticImpedanceProp::oif_AcousticImpedanceProp(const cow_String& name,
     : name_(name), property_(nex_canDynamicCastRef<kinC_AcousticImpedanceProp>(property, NEX_HERE)) {}
 
 void oif_AcousticImpedanceProp::Write(utl_Stream& stream) const {
-    stream << "*Impedance Property, name=" << oif_Name(name_);
+    stream << "*Impedance Property, name=" << qkw_QuorixName(name_, false);
     stream.OptionalLineBreak();
     if (!property_.admittance) stream << ", data=IMPEDANCE";
     stream << endl << oif_MaterialTable(property_.table, 0, property_.dependencies != 0);
@@ -68,12 +69,12 @@ void oif_IncidentWave::Write(utl_Stream& stream) const {
     if (wave_.GetPropStatus(step_) != mdl_PropagationStatusEnm::CREATED) return;
     stream << "*Incident wave interaction";
     switch (wave_.waveType) {
-    case 0: stream << ", pressure amplitude=" << oif_Name(wave_.amplitude); break;
-    case 1: stream << ", acceleration amplitude=" << oif_Name(wave_.amplitude); break;
+    case 0: stream << ", pressure amplitude=" << qkw_QuorixName(wave_.amplitude, false); break;
+    case 1: stream << ", acceleration amplitude=" << qkw_QuorixName(wave_.amplitude, false); break;
     default: stream << ", UNDEX"; break;
     }
     stream.OptionalLineBreak();
-    stream << ", property=" << oif_Name(wave_.property) << endl
+    stream << ", property=" << qkw_QuorixName(wave_.property, false) << endl
            << surfaceName_ << ", " << sourceName_ << ", " << standoffName_ << ", " << wave_.magnitude << endl;
 }
 
@@ -83,7 +84,7 @@ oif_IncidentWaveProperty::oif_IncidentWaveProperty(const cow_String& name,
       depth_(property_.initialDepth) {}
 
 void oif_IncidentWaveProperty::Write(utl_Stream& stream) const {
-    stream << "*Incident Wave Interaction Property, name=" << oif_Name(name_);
+    stream << "*Incident Wave Interaction Property, name=" << qkw_QuorixName(name_, false);
     stream.OptionalLineBreak();
     if (property_.shape == 1) stream << ", type=SPHERE";
     stream << endl << property_.speed << ", " << property_.density;

@@ -117,3 +117,11 @@ cow_String oif_SetName::Unquote(cow_String text) {
 void oif_SetName::SplitName(const cow_String& name, cow_String& prefix, cow_String& last) {
     qkw_QuorixName::SplitName(name, prefix, last);
 }
+
+cow_String oif_RegionName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo) {
+    return oif_SetName(region, modelInfo).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+}
+
+cow_String oif_SurfaceName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo) {
+    return oif_SetName(region, modelInfo).UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
+}

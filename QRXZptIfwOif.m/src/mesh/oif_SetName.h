@@ -40,4 +40,8 @@ private:
     bool isNodeSet_ = false;
 };
 
+/// What the assembly calls a set, and a surface or a node set that serves as one; empty without a value.
+cow_String oif_RegionName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo);
+cow_String oif_SurfaceName(const rgnC_Region& region, const qkw_ModelInfo& modelInfo);
+
 #endif

@@ -171,7 +171,7 @@ cow_String oif_OutputRequestBuilder::GetMonitorSetName(const kprC_AnalysisStep& 
     if (step.monitor.IsNull()) return {};
     const rgnC_Region& region = step.monitor.ConstGet().region;
     if (region.SetName().IsEmpty()) return {};
-    return GetSetName(region);
+    return oif_RegionName(region, Info());
 }
 
 bool oif_OutputRequestBuilder::RefersToSomething(const korC_Output& output) const {
@@ -389,7 +389,7 @@ oif_OutputRequestBuilder::Traits oif_OutputRequestBuilder::TraitsOf(const Reques
     traits.pre = request.variablesType == korC_VariablesTypeEnm::PRESELECT;
     traits.all = request.variablesType == korC_VariablesTypeEnm::ALL;
     traits.whole = traits.domain == Domain::WHOLE_MODEL;
-    if (traits.domain == Domain::SET) traits.setName = GetSetName(request.region);
+    if (traits.domain == Domain::SET) traits.setName = oif_RegionName(request.region, Info());
     if (traits.domain == Domain::INTERACTION) traits.setName = GetInteractionSetName(request.interactions);
     traits.hasSurface = traits.domain == Domain::CONTACT_SURFACE && !GetSurfaceName(request.region).IsEmpty();
     return traits;
@@ -544,7 +544,7 @@ void oif_OutputRequestBuilder::AddContactOutput(const Request& request, const Ch
     }
     AddStepDefinition(place.stepName,
                       oif_ContactOutput(request, place.stepType, traits.pre, traits.all, master, slave, cpset,
-                                        GetSetName(request.region), !channel.IsField()));
+                                        oif_RegionName(request.region, Info()), !channel.IsField()));
 }
 
 void oif_OutputRequestBuilder::AddRadiationOutput(const Request& request, const Place& place,
@@ -580,10 +580,6 @@ const cls_Record* oif_OutputRequestBuilder::GetSpring(const cow_String&) {
     return nullptr;
 }
 
-cow_String oif_OutputRequestBuilder::GetSetName(const rgnC_Region& region) const {
-    return oif_SetName(region, Info()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
-}
-
 cow_String oif_OutputRequestBuilder::GetSurfaceName(const rgnC_Region& region) const {
-    return oif_SetName(region, Info()).UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
+    return oif_SurfaceName(region, Info());
 }

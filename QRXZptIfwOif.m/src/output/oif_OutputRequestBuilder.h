@@ -89,7 +89,6 @@ private:
     static cow_String GetInteractionSetName(const cow_List<cow_String>& interactions);
     /// The model view has no springs, so none is ever found.
     static const cls_Record* GetSpring(const cow_String& name);
-    cow_String GetSetName(const rgnC_Region& region) const;
     cow_String GetSurfaceName(const rgnC_Region& region) const;
 
     cow_List<cow_String> remeshingSteps_;

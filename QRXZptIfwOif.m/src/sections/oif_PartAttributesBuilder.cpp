@@ -71,8 +71,7 @@ int oif_PartAttributesBuilder::Stamp(const ddb_PartInstance& instance, const rgn
 
 void oif_PartAttributesBuilder::SetSectionsInArray(const ddb_PartInstance& instance) {
     assignmentSize_.clear();
-    const ptoC_PartAttributeList& assignments =
-        instance.Shortcut().ConstGet().ConstGetSectionAssignment();
+    const ptoC_PartAttributeList& assignments = instance.Shortcut().ConstGet().ConstGetSectionAssignment();
     for (int i = 0; i < assignments.Size(); ++i) {
         const auto& assignment =
             nex_canDynamicCastRef<ptoC_SectionAssignment>(assignments.ConstGet(i), NEX_HERE);
@@ -131,8 +130,7 @@ void oif_PartAttributesBuilder::ProcessPropertyArray(const ddb_PartInstance& ins
 void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& instance,
                                                         const bme_MapPropertyArray& groups) {
     writtenOrientations_ = {};
-    const ptoC_PartAttributeList& assignments =
-        instance.Shortcut().ConstGet().ConstGetSectionAssignment();
+    const ptoC_PartAttributeList& assignments = instance.Shortcut().ConstGet().ConstGetSectionAssignment();
     for (int key = 0; key < groups.Count(); ++key) {
         // Elements without a section have no keyword, but their group uses up a number.
         if (groups.SectionIndex(key) == -1) continue;
@@ -145,11 +143,10 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
         group.offset = assignment.Offset();
         oif_SetName setName(assignment.RegionRef(), ModelInfo());
         group.setName = oif_SetName::QuoteIfNeeded(
-            isPartial
-                ? setName.UniqueSetName(assignment.RegionRef().SetName() + PartSetString() +
-                                            cow_String(key + 1),
-                                        oif_SetName::regionContext::INSTANCE)
-                : setName.UniqueSetName(oif_SetName::regionContext::INSTANCE));
+            isPartial ? setName.UniqueSetName(assignment.RegionRef().SetName() + PartSetString() +
+                                                  cow_String(key + 1),
+                                              oif_SetName::regionContext::INSTANCE)
+                      : setName.UniqueSetName(oif_SetName::regionContext::INSTANCE));
 
         cow_String text = cow_String(RegionString()) + "(" + assignment.SectionName() + ":" +
                           NameInComment(assignment.RegionRef()) + ")";
@@ -232,8 +229,8 @@ void oif_PartAttributesBuilder::CreateSection(const ddb_PartInstance& instance, 
 
 void oif_PartAttributesBuilder::CreateSolidSection(const ddb_PartInstance& instance,
                                                    const kseC_Section& section, const Group& group) {
-    AddInstanceDefinition(instance.name(), oif_SolidSection(group.setName, section, group.orientationName,
-                                                            group.controlsName));
+    AddInstanceDefinition(
+        instance.name(), oif_SolidSection(group.setName, section, group.orientationName, group.controlsName));
     AddHourglassStiffness(instance, group);
 }
 
@@ -294,8 +291,8 @@ void oif_PartAttributesBuilder::CreatePointSection(const ddb_PartInstance& insta
 void oif_PartAttributesBuilder::CreateBeamSection(const ddb_PartInstance& instance, const cow_String& name,
                                                   const kseC_Section& section, const Group& group) {
     const auto& beam = nex_canDynamicCastRef<kseC_BeamSection>(section, NEX_HERE);
-    AddInstanceDefinition(instance.name(), oif_Comment(cow_String("Section: ") + name +
-                                                       "  Profile: " + beam.profileName));
+    AddInstanceDefinition(instance.name(),
+                          oif_Comment(cow_String("Section: ") + name + "  Profile: " + beam.profileName));
     const kbpC_BeamProfile& profile = Model().BeamProfiles().ConstGet(beam.profileName);
     gsl_Vector vector(0.0, 0.0, -1.0);
     if (group.beamOriIndex != -1) {
@@ -318,8 +315,8 @@ void oif_PartAttributesBuilder::CreateElementControls() {
     bool hasComment = false;
     // The defaults, "EC-0", would come first; they are never written.
     for (int key = 0; key < nextElemCtrlKey_; ++key) {
-        const oif_SectionControls controls(elemCtrlMap_.ConstGet(key), cow_String("EC-") + cow_String(key + 1),
-                                           IsStandard());
+        const oif_SectionControls controls(elemCtrlMap_.ConstGet(key),
+                                           cow_String("EC-") + cow_String(key + 1), IsStandard());
         if (controls.IsEmpty()) continue;
         if (!hasComment) AddModelDefinition(oif_Comment("\nELEMENT CONTROLS\n"));
         hasComment = true;

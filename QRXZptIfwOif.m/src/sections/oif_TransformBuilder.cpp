@@ -61,8 +61,7 @@ void oif_TransformBuilder::WriteTransforms() {
     std::vector<System> systems; // in the order of their first region
     std::map<int, std::size_t> placeOf;
     for (int i = 0; i < regions_.Length(); ++i) {
-        const cow_String member =
-            oif_SetName(regions_[i], ModelInfo()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+        const cow_String member = oif_RegionName(regions_[i], ModelInfo());
         const auto [place, isNew] = placeOf.emplace(datums_[i].Id(), systems.size());
         if (isNew) systems.push_back({datums_[i], {}, {}});
         System& system = systems[place->second];

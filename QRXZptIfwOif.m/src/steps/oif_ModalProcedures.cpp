@@ -117,8 +117,7 @@ void oif_Frequency::WriteAmsParameters(utl_Stream& stream) const {
     if (step_.acousticCoupling != AcousticCoupling::ON) stream << CouplingText(step_.acousticCoupling);
     if (!step_.dampingProjection) stream << ", damping projection=off";
     if (step_.nsetRegion.SetName().IsEmpty()) return;
-    stream << ", nset="
-           << oif_SetName(step_.nsetRegion, *modelInfo_).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    stream << ", nset=" << oif_RegionName(step_.nsetRegion, *modelInfo_);
 }
 
 void oif_Frequency::WriteData(utl_Stream& stream) const {

@@ -145,5 +145,5 @@ void oif_StepBuilder::AddLoadCases(const cow_String& stepName, const kprC_Analys
 }
 
 cow_String oif_StepBuilder::AssemblySetName(const rgnC_Region& region) const {
-    return oif_SetName(region, Info()).UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
+    return oif_RegionName(region, Info());
 }

@@ -60,12 +60,14 @@ class kbcC_SubmodelBCState final : public cls_RecordOf<kbcC_SubmodelBCState, kbc
 public:
     static constexpr cls_ClassInfo Class{"kbcC_SubmodelBCState", "what drives a submodel in one step"};
 
+    static constexpr bool timeScaleDef() { return false; }
+
     mdl_PropAttr<bool> centerZone;
     mdl_PropAttr<cow_List<int>> dofs;
     mdl_PropAttr<double> shellThicknessValue;
     cow_String stepName;
     int increment = 0;
-    bool timeScale = false;
+    bool timeScale = timeScaleDef();
 
     static const cls_FieldTable& Fields();
 };

@@ -28,7 +28,7 @@ public:
 };
 
 /// Three components.
-class kloC_VectorState : public cls_AbstractRecordOf<kloC_VectorState, kloC_LoadState> {
+class kloC_VectorState : public cls_RecordOf<kloC_VectorState, kloC_LoadState> {
 public:
     static constexpr cls_ClassInfo Class{"kloC_VectorState", "components of a load in one step"};
 

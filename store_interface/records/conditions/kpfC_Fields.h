@@ -144,12 +144,19 @@ public:
         "kpfC_Stress", "initial stress of an element set: uniform, from a results file, or geostatic",
         0x2EC001A};
 
-    double sigma11 = cls_UnsetDouble;
-    double sigma22 = cls_UnsetDouble;
-    double sigma33 = cls_UnsetDouble;
-    double sigma12 = cls_UnsetDouble;
-    double sigma13 = cls_UnsetDouble;
-    double sigma23 = cls_UnsetDouble;
+    static constexpr double sigma11Def() { return cls_UnsetDouble; }
+    static constexpr double sigma12Def() { return cls_UnsetDouble; }
+    static constexpr double sigma13Def() { return cls_UnsetDouble; }
+    static constexpr double sigma22Def() { return cls_UnsetDouble; }
+    static constexpr double sigma23Def() { return cls_UnsetDouble; }
+    static constexpr double sigma33Def() { return cls_UnsetDouble; }
+
+    double sigma11 = sigma11Def();
+    double sigma22 = sigma22Def();
+    double sigma33 = sigma33Def();
+    double sigma12 = sigma12Def();
+    double sigma13 = sigma13Def();
+    double sigma23 = sigma23Def();
     double stressMagnitude1 = 0.0;
     double vCoordinate1 = 0.0;
     double stressMagnitude2 = 0.0;
