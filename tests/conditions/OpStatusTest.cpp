@@ -83,6 +83,40 @@ oif_BCOpStatus ConditionStatus(const ConditionModel& model) {
 
 } // namespace
 
+TEST(ObjectsOfSteps, EachStep_HasThoseThatPassTheTestInTheOrderOfTheirNames) {
+    const auto one = Given<AnyLoad<kPressure>>(".s.");
+    const auto other = Given<AnyLoad<kPressure>>(".ss");
+    const kprC_StepContainer steps = sample::StepsOf("IGG");
+    const auto loads = Container<kloC_Load>({{"B", &one}, {"A", &other}, {"C", &other}}, steps);
+    const oif_ObjectsOfSteps<kloC_Load> given(
+        "load", loads, steps,
+        [](const kloC_Load& load, const cow_String& step) { return load.HasStep(step); });
+    const auto names = [&](int step) {
+        std::string text;
+        for (const auto& [name, load] : given.In(step)) {
+            EXPECT_EQ(load, &loads.ConstGet(*name));
+            text += name->View();
+        }
+        return text;
+    };
+    EXPECT_EQ(names(0), "");
+    EXPECT_EQ(names(1), "ABC");
+    EXPECT_EQ(names(2), "AC");
+}
+
+TEST(ObjectsOfSteps, Test_RunsInTheContextOfStepAndObject) {
+    const auto load = Given<AnyLoad<kPressure>>(".s");
+    const kprC_StepContainer steps = sample::StepsOf("IG");
+    const auto loads = Container<kloC_Load>({{"L", &load}}, steps);
+    atr_String context;
+    const auto test = [&](const kloC_Load&, const cow_String& step) -> bool {
+        if (step == "S1") context = nex_Context::Text();
+        return false;
+    };
+    oif_ObjectsOfSteps<kloC_Load>("load", loads, steps, test);
+    EXPECT_EQ(context.View(), "step 'S1', load 'L'");
+}
+
 TEST(OpStatus, LoadThatEnds_SetsItsFamilysFlagInThatStepOnly) {
     const auto ends = Given<AnyLoad<kPressure>>(".s.d.");
     const auto stays = Given<AnyLoad<kBodyForce>>(".s...");

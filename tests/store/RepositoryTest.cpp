@@ -164,6 +164,14 @@ TEST(StepContainer, Steps_RunInTheOrderOfTheAnalysis) {
     EXPECT_EQ(&it.CurrentValue(), &steps.ConstGet("M"));
 }
 
+TEST(StepContainer, Place_IsFoundInWhateverOrderItIsAskedFor) {
+    const kprC_StepContainer steps = StepsOf("IGGGG");
+    for (const int place : {0, 1, 2, 2, 4, 4, 3, 0, 4, 1, 3}) {
+        EXPECT_EQ(steps.IndexOf(StepName(place)), place);
+        EXPECT_EQ(steps.IndexOf("no step"), -1);
+    }
+}
+
 TEST(StepContainer, Copies_ShareTheStepsUntilOneIsWrittenTo) {
     kprC_StepContainer steps;
     steps.Append("A", kprC_InitialStep());

@@ -45,13 +45,15 @@ void oif_BoundaryConditionBuilder::Build() {
 void oif_BoundaryConditionBuilder::ConfigureOpStatus() {
     const kprC_StepContainer& steps = Model().Steps();
     opStatus_ = OpStatusOf(Model().BCs(), Model().Loads(), steps);
+    const auto inLoadCases = [this](const cow_String& stepName) {
+        const kprC_AnalysisStep* step = AnalysisStep(stepName);
+        return step != nullptr && !step->loadCases.IsEmpty();
+    };
     written_ = {"boundary condition", Model().BCs(), steps,
-                [this](const kbcC_BC& bc, const cow_String& stepName) {
-                    if (bc.suppressed) return false;
-                    // Raises for a class without a family, in whatever status.
-                    opStatus_.OpNew(bc.DynTypeId(), stepName);
-                    const kprC_AnalysisStep* step = AnalysisStep(stepName);
-                    return opStatus_.Writes(bc, stepName, step != nullptr && !step->loadCases.IsEmpty());
+                [&](const kbcC_BC& bc, const cow_String& stepName) {
+                    // In the first step all are let in: a class without a family raises in any status.
+                    if (stepName == steps.NameAt(0)) return !bc.suppressed;
+                    return opStatus_.Writes(bc, stepName, inLoadCases(stepName));
                 }};
     bolts_ = {"load", Model().Loads(), steps, [](const kloC_Load& load, const cow_String& stepName) {
                   return load.DynTypeId() == kloC_BoltLoad::TypeId() && !load.suppressed &&

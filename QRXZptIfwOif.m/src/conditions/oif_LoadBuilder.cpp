@@ -125,7 +125,7 @@ void oif_LoadBuilder::LoadCardDetails(const cow_String& name, const kloC_Load& l
     case kloC_InwardVolAccel::Class.Id():
     case kloC_ConcentratedForce::Class.Id():
         addComment();
-        return add(oif_Cload(load, stepName, opMod, ModelInfo(), name, static_cast<double>(scale)));
+        return add(oif_Cload(load, stepName, opMod, setName, static_cast<double>(scale)));
     case kloC_ConcentratedHeatFlux::Class.Id():
     case kloC_ConcentratedConcentrationFlux::Class.Id():
         return add(oif_Cflux(load, stepName, opMod, setName));

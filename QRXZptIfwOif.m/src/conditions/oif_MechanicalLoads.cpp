@@ -140,11 +140,13 @@ void oif_MechanicalLoad::WriteMagnitude(bool passes, const Block& block) const {
 
 oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
                      const qkw_ModelInfo& modelInfo, const cow_String&, double scale)
+    : oif_Cload(load, stepName, opMod, oif_RegionName(load.region, modelInfo), scale) {}
+
+oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
+                     const cow_String& regionName, double scale)
     : qkw_KeywordOf(load, stepName, opMod, cow_String(), scale, ClearedAmplitude::COUNTS) {
     // The lines of bolts and of plane strain loads begin with an empty name.
-    if (typeId_ != kloC_BoltLoad::TypeId() && typeId_ != kloC_PEGLoad::TypeId()) {
-        setName_ = oif_RegionName(load.region, modelInfo);
-    }
+    if (typeId_ != kloC_BoltLoad::TypeId() && typeId_ != kloC_PEGLoad::TypeId()) setName_ = regionName;
     if (typeId_ == kloC_ConcentratedForce::TypeId()) {
         follower_ = static_cast<const kloC_ConcentratedForce&>(load).follower;
     } else if (typeId_ == kloC_Moment::TypeId()) {

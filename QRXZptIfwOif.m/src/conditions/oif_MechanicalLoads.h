@@ -58,6 +58,9 @@ class oif_Cload final : public qkw_KeywordOf<oif_Cload, oif_MechanicalLoad> {
 public:
     oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod, const qkw_ModelInfo& modelInfo,
               const cow_String& name, double scale);
+    /// With the name of the load's region, for many keywords of one load to share.
+    oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& regionName,
+              double scale);
     void Write(utl_Stream& stream) const override;
 
 private:

@@ -45,9 +45,8 @@ bool All(const klcC_LoadCase&) {
 
 bool oif_OpStatus::OpNew(unsigned int typeId, const cow_String& stepName) const {
     const cow_List<int>& flags = opNewFlags.ConstGet(Key(typeId));
-    const int* index = stepIndices_.Find(stepName);
     // A step that is not there fails as place -1 of the list does.
-    return flags.ConstGet(index == nullptr ? -1 : *index) != 0;
+    return flags.ConstGet(stepIndex_.Find(stepName)) != 0;
 }
 
 void oif_OpStatus::ForceOpNew(int stepIndex) {
@@ -65,7 +64,7 @@ int oif_OpStatus::FindKey(std::span<const KeyRow> rows, unsigned typeId, const c
 void oif_OpStatus::InitializeMembers(const cow_List<cow_String>& steps, int numberOfKeys) {
     cow_List<int> flags;
     for (int i = 0; i < steps.Length(); ++i) {
-        stepIndices_.Insert(steps[i], stepNames.Length());
+        stepIndex_.Append(steps[i]);
         stepNames.Append(steps[i]);
         flags.Append(0);
     }

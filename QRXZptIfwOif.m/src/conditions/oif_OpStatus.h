@@ -98,7 +98,7 @@ private:
     /// The family of a class of objects.
     virtual int Key(unsigned int typeId) const = 0;
 
-    cow_Map<cow_String, int> stepIndices_;
+    kprC_StepIndex stepIndex_;
 };
 
 /// "*Boundary" and "*Connector Motion".

@@ -12,6 +12,21 @@ const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm) {
     return table;
 }
 
+void kprC_StepIndex::Append(const cow_String& name) {
+    names_.push_back(name);
+    places_.emplace(names_.back().View(), static_cast<int>(names_.size()) - 1);
+}
+
+int kprC_StepIndex::Find(const cow_String& name) const {
+    for (std::size_t guess = last_; guess < std::min(last_ + 2, names_.size()); ++guess) {
+        if (names_[guess] == name) return static_cast<int>(last_ = guess);
+    }
+    const auto place = places_.find(name.View());
+    if (place == places_.end()) return -1;
+    last_ = static_cast<std::size_t>(place->second);
+    return place->second;
+}
+
 void kprC_StepContainer::Append(const cow_String& name, const kprC_Step& step) {
     if (IsMember(name)) {
         const std::string text =
@@ -20,7 +35,7 @@ void kprC_StepContainer::Append(const cow_String& name, const kprC_Step& step) {
     }
     Data& data = Writable();
     data.steps.push_back({name, mdl_ObjCow<kprC_Step>(step)});
-    data.index.emplace(data.steps.back().name.View(), Size() - 1);
+    data.index.Append(name);
 }
 
 kprC_StepContainer::Data& kprC_StepContainer::Writable() {
@@ -32,14 +47,6 @@ cow_List<cow_String> kprC_StepContainer::Keys() const {
     cow_List<cow_String> keys;
     for (const Entry& entry : data_->steps) keys.Append(entry.name);
     return keys;
-}
-
-int kprC_StepContainer::IndexOf(const cow_String& name) const {
-    for (int guess = data_->lastFound; guess < std::min(data_->lastFound + 2, Size()); ++guess) {
-        if (data_->steps[static_cast<std::size_t>(guess)].name == name) return data_->lastFound = guess;
-    }
-    const auto place = data_->index.find(name.View());
-    return place == data_->index.end() ? -1 : data_->lastFound = place->second;
 }
 
 const kprC_Step& kprC_StepContainer::ConstGet(const cow_String& name) const {

@@ -11,6 +11,21 @@
 enum class kprC_AnalysisProductEnm : int { IMPLICIT = 0, EXPLICIT = 1, OTHER = 2 };
 const omu_EnumTable& omu_EnumTableOf(kprC_AnalysisProductEnm);
 
+/// The places of steps by their names. Questions mostly come step by step, so the place of the last answer
+/// and the one behind it are tried first.
+class kprC_StepIndex {
+public:
+    void Append(const cow_String& name);
+    /// The place from 0, or -1.
+    int Find(const cow_String& name) const;
+
+private:
+    std::vector<cow_String> names_;
+    // The views lie in the names' shared storage, which copies of the index keep alive too.
+    std::unordered_map<std::string_view, int> places_;
+    mutable std::size_t last_ = 0;
+};
+
 /// The steps in the order of the analysis, the initial step first; not in name order. Copies share the steps
 /// until one of them is written to.
 class kprC_StepContainer {
@@ -25,7 +40,7 @@ public:
     kprC_Step& Get(const cow_String& name);
     int Size() const { return static_cast<int>(data_->steps.size()); }
     /// The place of the step from 0, or -1.
-    int IndexOf(const cow_String& name) const;
+    int IndexOf(const cow_String& name) const { return data_->index.Find(name); }
     /// A place outside the steps raises.
     const cow_String& NameAt(int index) const { return EntryAt(index).name; }
     const kprC_Step& StepAt(int index) const { return EntryAt(index).record.ConstGet(); }
@@ -43,10 +58,7 @@ private:
 
     struct Data {
         std::vector<Entry> steps;
-        // The views lie in the names' shared storage, which copies of the container keep alive too.
-        std::unordered_map<std::string_view, int> index;
-        // Where a step was last found: the next question is mostly for the same or the one behind it.
-        mutable int lastFound = 0;
+        kprC_StepIndex index;
     };
     Data& Writable();
 
