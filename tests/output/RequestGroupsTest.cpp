@@ -205,6 +205,16 @@ TEST_F(RequestGroups, ScreenedRequestAmongOthers_LeavesItsCommentOnly) {
     EXPECT_EQ(BodyOf(), FieldComment("a") + FieldComment("b") + "*Output, field\n*Node Output\nRF, \n");
 }
 
+TEST_F(RequestGroups, ScreenedRequestBehindOthers_LeavesItsCommentOnly) {
+    Steps().Append("A", kprC_StaticStep());
+    Add("a", FieldOf({"RF"}));
+    korC_FieldOutput nodesOnElements = FieldOf({"U"});
+    nodesOnElements.region = Region("E");
+    mdl_StateEdit<Field>(nodesOnElements.Give("A")).Set<&Field::frequency>(2);
+    Add("b", nodesOnElements);
+    EXPECT_EQ(BodyOf(), FieldComment("a") + "*Output, field\n*Node Output\nRF, \n" + FieldComment("b"));
+}
+
 TEST_F(RequestGroups, NamesThatTheProcedureDoesNotKnow_LeaveThePreselection) {
     Steps().Append("A", kprC_StaticStep());
     Add("F", FieldOf({"NT"}));
@@ -317,6 +327,16 @@ TEST_F(RequestGroups, RebarOnly_LeavesOnlyElementOutput) {
     field.rebar = korC_RebarEnm::ONLY;
     Add("F", field);
     EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n*Element Output, rebar, directions=YES\nS, \n");
+}
+
+TEST_F(RequestGroups, RebarOnlyAtSectionPoints_LeavesOnlyElementOutputToo) {
+    Steps().Append("A", kprC_StaticStep());
+    korC_FieldOutput field = FieldOf({"S", "U"});
+    field.rebar = korC_RebarEnm::ONLY;
+    field.sectionPoints = {1, 5};
+    Add("F", field);
+    EXPECT_EQ(BodyOf(),
+              FieldComment("F") + "*Output, field\n*Element Output, rebar, directions=YES\n1, 5\nS, \n");
 }
 
 TEST_F(RequestGroups, PreselectionWithRebar_WritesItsKeywordBesideTheLine) {
