@@ -239,8 +239,8 @@ TEST(ContactOutput, NamesWhereItIsAndWhoTouches) {
               "*Contact Output, cpset=\"my pair\", variable=ALL\n");
     EXPECT_EQ(Written(oif_ContactOutput(request, kExplicitStep, false, true, "", "", "p", "N", true)),
               "*Contact Output, nset=N, cpset=p, variable=ALL\n");
-    EXPECT_EQ(Written(oif_ContactOutput(RequestOf({"S"}), kStaticStep, false, false, "M", "S", "", "", false)),
-              "");
+    EXPECT_EQ(
+        Written(oif_ContactOutput(RequestOf({"S"}), kStaticStep, false, false, "M", "S", "", "", false)), "");
 }
 
 TEST(ContactOutput, ASurface_GoesByItsOwnNameWithoutQuotes) {
@@ -251,8 +251,9 @@ TEST(ContactOutput, ASurface_GoesByItsOwnNameWithoutQuotes) {
     store.model.AddInstance("I", "P");
     korC_OdbRequest request = RequestOf({"CSTRESS"});
     request.region = store.model.Region("I", "my skin");
-    EXPECT_EQ(Written(oif_ContactOutput(request, kStaticStep, false, false, "", "", "", "I.\"my skin\"", false)),
-              "*Contact Output, surface=my skin\nCSTRESS, \n");
+    EXPECT_EQ(
+        Written(oif_ContactOutput(request, kStaticStep, false, false, "", "", "", "I.\"my skin\"", false)),
+        "*Contact Output, surface=my skin\nCSTRESS, \n");
     EXPECT_EQ(Written(oif_ContactOutput(request, kExplicitStep, false, false, "", "", "", "I.X", false)),
               "*Contact Output\nCSTRESS, \n");
     EXPECT_EQ(Written(oif_ContactOutput(request, kExplicitStep, false, false, "", "", "", "I.X", true)),
@@ -263,6 +264,34 @@ TEST(ContactOutput, ComponentsOfOneVariable_BecomeThatVariableOnce) {
     EXPECT_EQ(Written(oif_ContactOutput(RequestOf({"CPRESS", "CSHEAR1", "COPEN"}), kStaticStep, false, false,
                                         "", "", "", "", true)),
               "*Contact Output\nCSTRESS, CDISP\n");
+}
+
+TEST(NodeOutput, LongSetName_PutsTheVariableParameterOnALineOfItsOwnWanted) {
+    const std::string set = std::string(80, 'i') + "." + std::string(80, 's');
+    EXPECT_EQ(Written(oif_NodeOutput(RequestOf({}), kStaticStep, set.c_str(), true, false, true)),
+              "*Node Output, nset=" + set + "\n, variable=PRESELECT\n");
+    EXPECT_EQ(Node({"U"}, set.c_str()), "*Node Output, nset=" + set + "\nU, \n");
+}
+
+TEST(ElementOutput, LongSetName_KeepsRebarAndDirectionsOnTheLine) {
+    const std::string set = std::string(80, 'i') + "." + std::string(80, 's');
+    EXPECT_EQ(Element(RequestOf({}), true, set.c_str(), kField, true),
+              "*Element Output, elset=" + set + ", rebar, directions=YES\n, variable=PRESELECT\n");
+}
+
+TEST(ContactOutput, LongNames_BreakTheLineBehindTheComma) {
+    const std::string name = std::string(80, 'i') + "." + std::string(80, 's');
+    EXPECT_EQ(Written(oif_ContactOutput(RequestOf({"CSTRESS"}), kStaticStep, false, false, name.c_str(), "S",
+                                        "pair", "N", false)),
+              "*Contact Output, nset=N, master=" + name + ", \nslave=S, cpset=pair\nCSTRESS, \n");
+}
+
+TEST(IntegratedOutput, SectionName_BreaksNoLine) {
+    korC_OdbRequest request = RequestOf({"SOF"});
+    const std::string name(140, 'c');
+    request.section = name.c_str();
+    EXPECT_EQ(Written(oif_IntegratedOutput(request, kStaticStep, false, false)),
+              "*Integrated Output, section=" + name + "\nSOF, \n");
 }
 
 TEST(OtherOutput, EachKindListsItsOwn) {

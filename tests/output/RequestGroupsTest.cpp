@@ -1,5 +1,6 @@
 #include "output/oif_OutputRequestBuilder.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
 #include "store_interface/records/output/korC_Output.h"
 #include "store_interface/records/steps/kprC_DynamicSteps.h"
@@ -124,8 +125,9 @@ TEST_F(RequestGroups, RequestsThatDifferInTheirRegion_ShareAnOutputLine) {
     nodes.region = Region("N");
     Add("F-2", nodes);
     Add("F-1", FieldOf({"U", "S"}));
-    EXPECT_EQ(BodyOf(), FieldComment("F-1") + "*Output, field\n*Node Output\nU, \n"
-                                              "*Element Output, directions=YES\nS, \n" +
+    EXPECT_EQ(BodyOf(), FieldComment("F-1") +
+                            "*Output, field\n*Node Output\nU, \n"
+                            "*Element Output, directions=YES\nS, \n" +
                             FieldComment("F-2") + "*Node Output, nset=I.N\nU, \n");
 }
 
@@ -139,9 +141,8 @@ TEST_F(RequestGroups, OtherFrequencyOrFilter_OpensANewGroup) {
     Add("b filtered", filtered);
     Add("c plain", FieldOf({"RF"}));
     EXPECT_EQ(BodyOf(), FieldComment("c plain") + "*Output, field\n*Node Output\nRF, \n" +
-                            FieldComment("b filtered") +
-                            "*Output, field, filter=FLT\n*Node Output\nU, \n" + FieldComment("a rare") +
-                            "*Output, field, frequency=5\n*Node Output\nU, \n");
+                            FieldComment("b filtered") + "*Output, field, filter=FLT\n*Node Output\nU, \n" +
+                            FieldComment("a rare") + "*Output, field, frequency=5\n*Node Output\nU, \n");
 }
 
 TEST_F(RequestGroups, EqualRequests_AreOneUnderBothNames) {
@@ -202,6 +203,16 @@ TEST_F(RequestGroups, ScreenedRequestAmongOthers_LeavesItsCommentOnly) {
     Add("a", nodesOnElements);
     Add("b", FieldOf({"RF"}));
     EXPECT_EQ(BodyOf(), FieldComment("a") + FieldComment("b") + "*Output, field\n*Node Output\nRF, \n");
+}
+
+TEST_F(RequestGroups, ScreenedRequestBehindOthers_LeavesItsCommentOnly) {
+    Steps().Append("A", kprC_StaticStep());
+    Add("a", FieldOf({"RF"}));
+    korC_FieldOutput nodesOnElements = FieldOf({"U"});
+    nodesOnElements.region = Region("E");
+    mdl_StateEdit<Field>(nodesOnElements.Give("A")).Set<&Field::frequency>(2);
+    Add("b", nodesOnElements);
+    EXPECT_EQ(BodyOf(), FieldComment("a") + "*Output, field\n*Node Output\nRF, \n" + FieldComment("b"));
 }
 
 TEST_F(RequestGroups, NamesThatTheProcedureDoesNotKnow_LeaveThePreselection) {
@@ -318,6 +329,16 @@ TEST_F(RequestGroups, RebarOnly_LeavesOnlyElementOutput) {
     EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n*Element Output, rebar, directions=YES\nS, \n");
 }
 
+TEST_F(RequestGroups, RebarOnlyAtSectionPoints_LeavesOnlyElementOutputToo) {
+    Steps().Append("A", kprC_StaticStep());
+    korC_FieldOutput field = FieldOf({"S", "U"});
+    field.rebar = korC_RebarEnm::ONLY;
+    field.sectionPoints = {1, 5};
+    Add("F", field);
+    EXPECT_EQ(BodyOf(),
+              FieldComment("F") + "*Output, field\n*Element Output, rebar, directions=YES\n1, 5\nS, \n");
+}
+
 TEST_F(RequestGroups, PreselectionWithRebar_WritesItsKeywordBesideTheLine) {
     Steps().Append("A", kprC_StaticStep());
     korC_FieldOutput field = FieldOf({});
@@ -350,8 +371,7 @@ TEST_F(RequestGroups, IntegratedSection_HasItsKeywordAlone) {
     korC_HistoryOutput request = HistoryOf({"SOF", "U"});
     request.section = "cut";
     Add("H", request);
-    EXPECT_EQ(BodyOf(),
-              HistoryComment("H") + "*Output, history\n*Integrated Output, section=cut\nSOF, \n");
+    EXPECT_EQ(BodyOf(), HistoryComment("H") + "*Output, history\n*Integrated Output, section=cut\nSOF, \n");
 }
 
 TEST_F(RequestGroups, BoltLoad_HasToBeThere) {
@@ -423,4 +443,110 @@ TEST_F(RequestGroups, PreselectionOfNodesInAnExplicitStep_HasNoContactOutput) {
     Add("F", request);
     EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n*Node Output, nset=I.N, variable=PRESELECT\n"
                                             "*Incrementation Output, variable=PRESELECT\n");
+}
+
+TEST_F(RequestGroups, AllVariablesOfNodesInAnExplicitStep_HaveContactOutputWithoutThem) {
+    Steps().Append("A", kprC_ExplicitDynamicsStep());
+    korC_FieldOutput request = FieldOf({"ALL"});
+    request.region = Region("N");
+    Add("F", request);
+    EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n*Node Output, nset=I.N, variable=ALL\n"
+                                            "*Incrementation Output, variable=ALL\n"
+                                            "*Contact Output, variable=ALL\n");
+}
+
+TEST_F(RequestGroups, AllVariablesWithoutDirections_HaveEveryKeywordOfAnImplicitStep) {
+    Steps().Append("A", kprC_StaticStep());
+    korC_FieldOutput request = FieldOf({"ALL"});
+    request.directions = false;
+    Add("F", request);
+    EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n"
+                                            "*Node Output, variable=ALL\n"
+                                            "*Element Output, directions=NO, variable=ALL\n"
+                                            "*Modal Output, variable=ALL\n"
+                                            "*Energy Output, variable=ALL\n"
+                                            "*Contact Output, variable=ALL\n"
+                                            "*Radiation Output, variable=ALL\n");
+}
+
+TEST_F(RequestGroups, AllVariablesOfABolt_HaveNoRadiationOutputAndNameNoNodesWanted) {
+    Steps().Append("A", kprC_StaticStep());
+    kloC_BoltLoad bolt;
+    bolt.Propagate(Steps());
+    store.model.loads.Insert("bolt", bolt);
+    korC_FieldOutput request = FieldOf({"ALL"});
+    request.boltLoad = "bolt";
+    Add("F", request);
+    EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field\n"
+                                            "*Node Output, variable=ALL\n"
+                                            "*Element Output, directions=YES, variable=ALL\n"
+                                            "*Modal Output, variable=ALL\n"
+                                            "*Energy Output, variable=ALL\n"
+                                            "*Contact Output, variable=ALL\n");
+}
+
+TEST_F(RequestGroups, PreselectionOfABoltsHistory_IsEmptyAndGivesNoOutput) {
+    Steps().Append("A", kprC_StaticStep());
+    kloC_BoltLoad bolt;
+    bolt.Propagate(Steps());
+    store.model.loads.Insert("bolt", bolt);
+    korC_HistoryOutput request = HistoryOf({});
+    request.boltLoad = "bolt";
+    Add("H", request);
+    EXPECT_EQ(BodyOf(), "*Output, history, frequency=0\n");
+}
+
+TEST_F(RequestGroups, BoltLoadThatIsSuppressed_IsAskedForWhereAnotherRequestCallsForOutputWanted) {
+    Steps().Append("A", kprC_StaticStep());
+    kloC_BoltLoad bolt;
+    bolt.suppressed = true;
+    bolt.Propagate(Steps());
+    store.model.loads.Insert("bolt", bolt);
+    korC_HistoryOutput request = HistoryOf({"U1"});
+    request.boltLoad = "bolt";
+    Add("H", request);
+    Add("other", HistoryOf({"ALLKE"}));
+    EXPECT_EQ(BodyOf(), HistoryComment("H") + "*Output, history\n*Node Output\nU1, \n" +
+                            HistoryComment("other") + "*Energy Output\nALLKE, \n");
+}
+
+TEST_F(RequestGroups, LoadThatIsNoBolt_IsNoReasonForOutput) {
+    Steps().Append("A", kprC_StaticStep());
+    kloC_Pressure pressure;
+    pressure.Propagate(Steps());
+    store.model.loads.Insert("bolt", pressure);
+    korC_HistoryOutput request = HistoryOf({"U1"});
+    request.boltLoad = "bolt";
+    Add("H", request);
+    EXPECT_EQ(BodyOf(), "");
+}
+
+TEST_F(RequestGroups, SymbolsOfAnIntegratedSection_StandOnItsKeyword) {
+    Steps().Append("A", kprC_StaticStep());
+    korC_HistoryOutput preselect = HistoryOf({"PRESELECT"});
+    preselect.section = "cut";
+    Add("a", preselect);
+    korC_HistoryOutput all = HistoryOf({"ALL"});
+    all.section = "cut";
+    Add("b", all);
+    EXPECT_EQ(BodyOf(), HistoryComment("a") +
+                            "*Output, history\n*Integrated Output, section=cut, variable=PRESELECT\n" +
+                            HistoryComment("b") +
+                            "*Output, history\n*Integrated Output, section=cut, variable=ALL\n");
+}
+
+TEST_F(RequestGroups, NamesThatTheProcedureDoesNotKnow_LeaveAllVariablesWhereTheTypeSaysSo) {
+    Steps().Append("A", kprC_StaticStep());
+    korC_FieldOutput request = FieldOf({"NT"});
+    mdl_StateEdit<Field>(request.Give("A")).Set<&Field::variablesType>(Variables::ALL);
+    Add("F", request);
+    EXPECT_EQ(BodyOf(), FieldComment("F") + "*Output, field, variable=ALL\n");
+}
+
+TEST_F(RequestGroups, AnnealingWithoutPreselection_AsksForThePreselectionOfNoOutputWanted) {
+    Steps().Append("A", kprC_AnnealStep());
+    Add("F", FieldOf({"U"}));
+    Add("H", HistoryOf({"ALLKE"}));
+    EXPECT_EQ(BodyOf(), "*Output, field, variable=PRESELECT, number interval=0\n"
+                        "*Output, history, frequency=0\n");
 }

@@ -5,11 +5,10 @@
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 
 /// Opens a group of output requests that are equally frequent:
-///     *Output, field|history[, variable=PRESELECT|ALL][, filter=FILTER][, frequency=N | , number interval=N
-///     |
-///         , time interval=T | , mode list | , time points=NAME][, time marks=YES|NO]
-/// A frequency and a number of intervals that the procedure has anyway aren't written. A frequency of 0 says
-/// that there is no output. Modes follow in data lines.
+///     *Output, field|history[, variable=PRESELECT|ALL][, filter=FILTER]FREQUENCY[, time marks=YES|NO]
+/// FREQUENCY is ", frequency=N", ", number interval=N", ", time interval=T", ", mode list" (the modes follow
+/// in data lines) or ", time points=NAME". One that the procedure has anyway isn't written. A frequency of 0
+/// says that there is no output.
 class oif_Output final : public qkw_KeywordOf<oif_Output> {
 public:
     using TypeEnm = korC_OdbRequest::TypeEnm;
