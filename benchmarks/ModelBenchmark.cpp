@@ -225,7 +225,8 @@ void MeasureMaterials() {
     double rate[2] = {};
     const std::pair<int, int> sizes[] = {{2000, 200}, {200, 2000}};
     for (int i = 0; i < 2; ++i) {
-        const auto [materials, rows] = sizes[i];
+        const int materials = sizes[i].first;
+        const int rows = sizes[i].second;
         const Measure write = InChild([&] {
             std::mt19937 random(9);
             auto odb = std::make_shared<odb_Odb>();
