@@ -55,6 +55,16 @@ Measure InChild(const std::function<std::function<void()>()>& prepare) {
     return measure;
 }
 
+/// The quickest of three runs, where short times are compared.
+Measure BestInChild(const std::function<std::function<void()>()>& prepare) {
+    Measure best = InChild(prepare);
+    for (int run = 1; run < 3; ++run) {
+        const Measure next = InChild(prepare);
+        if (next.seconds < best.seconds) best = next;
+    }
+    return best;
+}
+
 std::vector<float> Coordinates(int nodes) {
     std::mt19937 random(1);
     std::uniform_real_distribution<float> side(-500.0F, 500.0F);
@@ -373,7 +383,7 @@ std::shared_ptr<odb_Odb> ConditionStore(int conditions, int steps, History histo
 
 void MeasureConditions() {
     const auto write = [](int conditions, int steps, History history) {
-        return InChild([&] { return WriteTask(ConditionStore(conditions, steps, history)); });
+        return BestInChild([&] { return WriteTask(ConditionStore(conditions, steps, history)); });
     };
     const Measure few = write(10000, 5, History::CHANGED);
     const Measure many = write(10000, 100, History::CHANGED);
@@ -434,7 +444,7 @@ std::shared_ptr<odb_Odb> ContactStore(int pairs, int steps) {
 
 void MeasureContact() {
     const auto write = [](int pairs, int steps) {
-        return InChild([&] { return WriteTask(ContactStore(pairs, steps)); });
+        return BestInChild([&] { return WriteTask(ContactStore(pairs, steps)); });
     };
     const Measure all = write(5000, 20);
     const Measure fewerPairs = write(500, 20);
