@@ -7,8 +7,5 @@
 // The lists that records hold.
 using cls_xpListInt = cow_List<int>;
 using cls_xpListString = cow_List<cow_String>;
-using cls_xp1DArrayListFloat = cow_List<float>;
-template <class T>
-using cls_xoList = cow_List<T>;
 
 #endif

@@ -1,7 +1,6 @@
 #ifndef QRX_STORE_KINC_CONTACT_H
 #define QRX_STORE_KINC_CONTACT_H
 
-#include "store_interface/records/cls_Lists.h"
 #include "store_interface/records/interactions/kinC_Interaction.h"
 
 /// Kind of the initial clearance of a contact pair: whether *Clearance is written, and in what form.
@@ -103,7 +102,7 @@ public:
     mdl_PropAttr<kinC_InterferenceTypeEnm> interferenceType;
     mdl_PropAttr<double> interferenceValue;
     mdl_PropAttr<kinC_InterferenceDirectionTypeEnm> directionType;
-    mdl_PropAttr<cls_xp1DArrayListFloat> direction{{0.0F, 0.0F, 0.0F}, mdl_PropAttributeStateEnm::NEVER_SET};
+    mdl_PropAttr<cow_List<float>> direction{{0.0F, 0.0F, 0.0F}, mdl_PropAttributeStateEnm::NEVER_SET};
     mdl_PropAttr<cow_String> amplitude;
 
     static const cls_FieldTable& Fields();

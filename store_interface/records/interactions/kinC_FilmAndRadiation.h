@@ -1,7 +1,6 @@
 #ifndef QRX_STORE_KINC_FILMANDRADIATION_H
 #define QRX_STORE_KINC_FILMANDRADIATION_H
 
-#include "store_interface/records/cls_Lists.h"
 #include "store_interface/records/interactions/kinC_Interaction.h"
 
 /// Which surfaces of a cavity block the view.
@@ -112,7 +111,7 @@ public:
         "state of a cavity radiation in one step: how its view factors are computed", 0x2A00029};
 
     mdl_PropAttr<kinC_CavityRadiationBlockingEnm> blocking;
-    mdl_PropAttr<cls_xoList<rgnC_Region>> blockingSurfaces;
+    mdl_PropAttr<cow_List<rgnC_Region>> blockingSurfaces;
     mdl_PropAttr<double> range{3.4028234663852886e+38, mdl_PropAttributeStateEnm::NEVER_SET};
     mdl_PropAttr<bool> reflection{true, mdl_PropAttributeStateEnm::NEVER_SET};
     mdl_PropAttr<double> vtol{0.05, mdl_PropAttributeStateEnm::NEVER_SET};
