@@ -34,7 +34,7 @@ oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const mdl_ObjCow<
 
 void oif_ConditionKeyword::Write(utl_Stream& stream) const {
     if (deactivated_) {
-        WriteCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0, true);
+        WriteBoundaryCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0, true);
     } else {
         WriteForms(stream);
     }
@@ -52,8 +52,8 @@ bool oif_ConditionKeyword::IsBuckling() const {
     return Procedure() == kBuckling;
 }
 
-void oif_ConditionKeyword::WriteCard(utl_Stream& stream, Distribution distributionType, bool fixed,
-                                     int loadCase, bool lineBreak) const {
+void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, Distribution distributionType, bool fixed,
+                                             int loadCase, bool lineBreak) const {
     oif_KeywordLine line(stream, style_.keyword);
     if (opNew_) line.Text(", op=NEW");
     if (!amplitude_.IsEmpty()) line.Text(", amplitude=").Text(qkw_QuorixName(amplitude_, false));
@@ -80,20 +80,21 @@ void oif_ConditionKeyword::WriteDisplacements(utl_Stream& stream, bool fixed) co
     const Distribution distribution = bc_.ConstGet().distributionType;
     if (UsesComplex()) {
         for (const int loadCase : {1, 2}) {
-            WriteCard(stream, distribution, fixed, loadCase, true);
+            WriteBoundaryCard(stream, distribution, fixed, loadCase, true);
             WriteComponents(stream, fixed, loadCase == 2);
         }
         return;
     }
     ForEachLoadCase([&](int loadCase) {
-        WriteCard(stream, distribution, fixed, loadCase, true);
+        WriteBoundaryCard(stream, distribution, fixed, loadCase, true);
         WriteComponents(stream, fixed, false);
     });
 }
 
 void oif_ConditionKeyword::WriteRates(utl_Stream& stream, const char* type, bool held) const {
     // Of a complex value only the real part is ever written.
-    WriteCard(stream, bc_.ConstGet().distributionType, false, UsesComplex() || IsBuckling() ? 1 : 0, false);
+    WriteBoundaryCard(stream, bc_.ConstGet().distributionType, false, UsesComplex() || IsBuckling() ? 1 : 0,
+                      false);
     stream << ", ";
     stream.OptionalLineBreak();
     stream << type;
@@ -193,7 +194,7 @@ void oif_Boundary::WriteType(utl_Stream& stream) const {
     const cow_String support =
         cow_String(", ") + omu_PrimEnum<kbcC_TypeBC::TypeNameEnm, 1>(typeName.ConstGet()).GetString();
     ForEachLoadCase([&](int loadCase) {
-        WriteCard(stream, bc_.ConstGet().distributionType, false, loadCase, true);
+        WriteBoundaryCard(stream, bc_.ConstGet().distributionType, false, loadCase, true);
         WriteLine(stream, support, 0.0);
     });
 }
@@ -203,7 +204,7 @@ void oif_Boundary::WriteTemperature(utl_Stream& stream) const {
     const auto& dofs = State<kbcC_TemperatureBCState>().dofs;
     const double value = bc.Magnitude(stepName_) * scale_;
     const bool valueIsSaid = IsSaid(bc.MagnitudeState(stepName_));
-    WriteCard(stream, bc.distributionType, false, 0, true);
+    WriteBoundaryCard(stream, bc.distributionType, false, 0, true);
     if (!bc.dofsGiven) {
         if (valueIsSaid) WriteLine(stream, Dof(11), value);
     } else if (valueIsSaid || IsSaid(dofs.State())) {
@@ -215,7 +216,7 @@ void oif_Boundary::WriteTemperature(utl_Stream& stream) const {
 // Unlike a displacement's, the value stands beside "fixed" too.
 void oif_Boundary::WriteDistributed(utl_Stream& stream, int dof) const {
     const auto& bc = static_cast<const kbcC_DistributedBC&>(bc_.ConstGet());
-    WriteCard(stream, bc.distributionType, bc.fixed, 0, true);
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 0, true);
     if (IsSaid(bc.MagnitudeState(stepName_))) {
         WriteLine(stream, Dof(dof), bc.Magnitude(stepName_) * scale_);
     }
@@ -228,9 +229,9 @@ void oif_Boundary::WriteComplexDistributed(utl_Stream& stream, int dof) const {
     }
     // Both parts are always written, changed or not.
     const auto& bc = static_cast<const kbcC_DistributedBC&>(bc_.ConstGet());
-    WriteCard(stream, bc.distributionType, bc.fixed, 1, true);
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 1, true);
     WriteLine(stream, Dof(dof), bc.Magnitude(stepName_) * scale_);
-    WriteCard(stream, bc.distributionType, bc.fixed, 2, true);
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 2, true);
     WriteLine(stream, Dof(dof), bc.ImaginaryMagnitude(stepName_) * scale_);
 }
 

@@ -31,8 +31,8 @@ protected:
     /// The parameters behind all others.
     virtual void WriteLastParameters(utl_Stream&) const {}
 
-    void WriteCard(utl_Stream& stream, kbcC_BC::DistribTypeEnum distributionType, bool fixed, int loadCase,
-                   bool lineBreak) const;
+    void WriteBoundaryCard(utl_Stream& stream, kbcC_BC::DistribTypeEnum distributionType, bool fixed,
+                           int loadCase, bool lineBreak) const;
     void WriteDisplacements(utl_Stream& stream, bool fixed) const;
     /// Velocities and accelerations, which are told by the type; held ones go without their values.
     void WriteRates(utl_Stream& stream, const char* type, bool held) const;

@@ -237,10 +237,13 @@ bool oif_FieldOpStatus::Writes(const kpfC_Field& field, const cow_String& stepNa
     case Status::DEACTIVATED:
     case Status::FIELD_RESET: return true;
     case Status::PROPAGATED:
-    case Status::FIELD_PROPAGATED:
-        return field.DynTypeId() == kGeneralField || OpNew(field.DynTypeId(), stepName);
+    case Status::FIELD_PROPAGATED: return WriteInEveryPropStep(field) || OpNew(field.DynTypeId(), stepName);
     default: return false;
     }
+}
+
+bool oif_FieldOpStatus::WriteInEveryPropStep(const kpfC_Field& field) {
+    return !field.suppressed && field.DynTypeId() == kGeneralField;
 }
 
 oif_ConditionPlaces oif_FieldOpStatus::Places(const kprC_Step& step, const cow_String& name) {

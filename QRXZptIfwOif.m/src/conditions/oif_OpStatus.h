@@ -156,11 +156,13 @@ public:
     static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name);
 
 private:
+    /// General fields are written again in each step that carries them.
+    static bool WriteInEveryPropStep(const kpfC_Field& field);
     void PopulateMembers(const kprC_PropagatingContainer<kpfC_Field>& fields);
     int Key(unsigned int typeId) const override;
 };
 
-/// The interactions that are ended and begun by op=NEW: concentrated film and its like.
+/// The interactions that op=NEW ends: films, radiation and general contact.
 class oif_InteractionOpStatus final : public oif_OpStatus {
 public:
     oif_InteractionOpStatus() = default;
