@@ -1,5 +1,5 @@
 // Mesh blocks as the keywords write them, beside fprintf, {fmt} and a raw write of the same bytes.
-#include "deck/oif_ModelInfo.h"
+#include "base/oif_ModelInfo.h"
 #include "foundation/utl_Stream.h"
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"

@@ -1,7 +1,7 @@
 #ifndef QRX_TOOLS_FINDINGTEXT_H
 #define QRX_TOOLS_FINDINGTEXT_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 #include <string>
 

@@ -1,5 +1,5 @@
 #include "connectors/ConnectorTesting.h"
-#include "sections/oif_ConnectorOptions.h"
+#include "connectors/oif_ConnectorOptions.h"
 
 namespace {
 

@@ -1,6 +1,6 @@
 #include "connectors/ConnectorTesting.h"
-#include "mesh/oif_InstanceBuilder.h"
-#include "sections/oif_ConnectorSection.h"
+#include "assembly/oif_InstanceBuilder.h"
+#include "connectors/oif_ConnectorSection.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
 
 namespace {

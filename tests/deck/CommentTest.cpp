@@ -1,5 +1,5 @@
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Comment.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Comment.h"
 #include "support/DeckTest.h"
 
 TEST(Comment, EmptyText_WritesNothing) {

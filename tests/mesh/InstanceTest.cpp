@@ -1,5 +1,5 @@
-#include "mesh/oif_InstanceBuilder.h"
-#include "mesh/oif_PartBuilder.h"
+#include "assembly/oif_InstanceBuilder.h"
+#include "assembly/oif_PartBuilder.h"
 #include "support/DeckTest.h"
 
 #include <numbers>

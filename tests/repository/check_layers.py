@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Fails on an include that breaks the order of the layers.
+"""Fails on an include that breaks the order of the layers, or of the rooms (folders) within a layer.
 
 usage: check_layers.py REPOSITORY
 """
@@ -19,6 +19,29 @@ ALLOWED = {
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "model_file": ["foundation", "store_interface"],
     "tools": CORE + ["model_file"],
+}
+# The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
+# one line don't know each other.
+ROOMS = {
+    "store_interface": [
+        ["records"],
+        ["regions"],
+        ["records/amplitudes", "records/materials", "records/part_attributes", "records/sections",
+         "records/steps"],
+        ["propagation"],
+        ["records/conditions", "records/interactions", "records/constraints", "records/output"],
+        ["model"],
+        ["catalogue"],
+    ],
+    DECK_WRITER: [
+        ["base"],
+        ["mesh", "amplitudes", "materials"],
+        ["sections"],
+        ["connectors"],
+        ["assembly", "steps", "conditions", "constraints"],
+        ["interactions", "output"],
+        ["deck"],
+    ],
 }
 LIBRARIES = {
     "model_file": ["nlohmann/"],
@@ -51,7 +74,29 @@ def layer_of_header(root, path):
     return DECK_WRITER if "/" in path and (root / DECK_WRITER / path).is_file() else None
 
 
-def finding(root, layer, quoted, angled):
+def room_of(layer, path):
+    """The level and the name of the room of a file, given by its path below the layer; None for no room."""
+    folder = str(pathlib.PurePosixPath(path).parent)
+    for level, rooms in enumerate(ROOMS[layer]):
+        if folder in rooms:
+            return level, folder
+    return None
+
+
+def room_finding(layer, file, quoted):
+    """What is wrong with an include between rooms of one layer, or None. Paths are below the layer."""
+    if layer not in ROOMS:
+        return None
+    own = room_of(layer, file)
+    if own is None:
+        return f"{layer} has no room for {file}"
+    other = room_of(layer, quoted)
+    if other is None or other[1] == own[1] or other[0] < own[0]:
+        return None
+    return f'{own[1]} may not include {other[1]} ("{quoted}")'
+
+
+def finding(root, layer, file, quoted, angled):
     """What is wrong with an include of a file of the layer, or None."""
     if quoted is not None:
         target = layer_of_header(root, quoted)
@@ -59,7 +104,7 @@ def finding(root, layer, quoted, angled):
             return f'"{quoted}" names no header by its path'
         if target != layer and target not in ALLOWED[layer]:
             return f'{layer} may not include {target} ("{quoted}")'
-        return None
+        return room_finding(layer, file, quoted.removeprefix(layer + "/")) if target == layer else None
     if angled is None:
         return "the name of an included file must be written out"
     if angled in STANDARD or angled in SYSTEM and layer in SYSTEM_LAYERS:
@@ -80,7 +125,8 @@ def findings(root):
             count += 1
             for number, line in enumerate(file.read_text(encoding="utf-8").splitlines(), 1):
                 match = INCLUDE.match(line)
-                text = finding(root, layer, match[1], match[2]) if match else None
+                below = file.relative_to(root / layer).as_posix()
+                text = finding(root, layer, below, match[1], match[2]) if match else None
                 if text:
                     found.append(f"{file.relative_to(root)}:{number}: {text}")
     return found, count

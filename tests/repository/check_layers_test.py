@@ -32,9 +32,9 @@ class LayerCheckTest(unittest.TestCase):
 
     def test_tree_in_order_has_no_findings(self):
         self.write("foundation/x.cpp", '#include "foundation/a.h"\n#include <vector>\n#include <unistd.h>\n')
-        self.write("store_interface/x.cpp", '#include "foundation/a.h"\n#include "store_interface/model/s.h"\n')
+        self.write("store_interface/model/x.cpp", '#include "foundation/a.h"\n#include "store_interface/model/s.h"\n')
         self.write("keyword_layer/x.cpp", '#include "store_interface/model/s.h"\n#include "keyword_layer/k.h"\n')
-        self.write(DECK + "/mesh/x.cpp", '#include "mesh/m.h"\n#include "deck/d.h"\n#include "keyword_layer/k.h"\n')
+        self.write(DECK + "/deck/x.cpp", '#include "mesh/m.h"\n#include "deck/d.h"\n#include "keyword_layer/k.h"\n')
         self.write("model_file/x.cpp", '#include <nlohmann/json.hpp>\n#include "store_interface/model/s.h"\n')
         self.write("tools/x.cpp", '#include <CLI/CLI.hpp>\n#include "deck/d.h"\n#include "model_file/f.h"\n')
         self.assertEqual(check_layers.findings(self.root), ([], 13))
@@ -51,14 +51,31 @@ class LayerCheckTest(unittest.TestCase):
                           'model_file/x.cpp:2: model_file may not include keyword_layer ("keyword_layer/k.h")'])
         self.assertEqual(len(self.found(DECK + "/deck/x.cpp", '#include "model_file/f.h"')), 3)
 
+    def test_include_of_a_higher_room_is_found(self):
+        self.write("store_interface/records/r.h", "")
+        self.assertEqual(
+            self.found("store_interface/records/x.cpp", '#include "store_interface/model/s.h"'),
+            ['store_interface/records/x.cpp:1: records may not include model ("model/s.h")'])
+        self.assertEqual(self.found("store_interface/model/x.cpp", '#include "store_interface/records/r.h"'), [
+            'store_interface/records/x.cpp:1: records may not include model ("model/s.h")'])
+
+    def test_include_of_a_room_beside_is_found(self):
+        self.write(DECK + "/materials/y.h", "")
+        self.assertEqual(self.found(DECK + "/mesh/x.cpp", '#include "materials/y.h"'),
+                         [f'{DECK}/mesh/x.cpp:1: mesh may not include materials ("materials/y.h")'])
+
+    def test_file_outside_the_rooms_is_found(self):
+        self.assertEqual(self.found(DECK + "/attic/x.cpp", '#include "mesh/m.h"'),
+                         [f"{DECK}/attic/x.cpp:1: {DECK} has no room for attic/x.cpp"])
+
     def test_third_party_header_in_the_core_is_found(self):
         self.assertEqual(self.found(DECK + "/deck/x.cpp", "#include <nlohmann/json.hpp>", "#include <fmt/core.h>"),
                          [f"{DECK}/deck/x.cpp:1: {DECK} may not include <nlohmann/json.hpp>",
                           f"{DECK}/deck/x.cpp:2: {DECK} may not include <fmt/core.h>"])
 
     def test_system_header_outside_the_device_is_found(self):
-        self.assertEqual(self.found("store_interface/x.cpp", "#include <unistd.h>"),
-                         ["store_interface/x.cpp:1: store_interface may not include <unistd.h>"])
+        self.assertEqual(self.found("store_interface/model/x.cpp", "#include <unistd.h>"),
+                         ["store_interface/model/x.cpp:1: store_interface may not include <unistd.h>"])
 
     def test_header_not_named_by_its_path_is_found(self):
         self.assertEqual(

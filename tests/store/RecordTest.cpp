@@ -1,4 +1,4 @@
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/mdl_PropAttr.h"
 #include "store_interface/records/mdl_Repository.h"
 

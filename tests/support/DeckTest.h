@@ -1,7 +1,7 @@
 #ifndef QRX_TESTS_SUPPORT_DECKTEST_H
 #define QRX_TESTS_SUPPORT_DECKTEST_H
 
-#include "deck/oif_ModelInfo.h"
+#include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/model/odb_Odb.h"
 

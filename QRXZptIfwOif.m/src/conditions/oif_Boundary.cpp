@@ -1,7 +1,7 @@
 #include "conditions/oif_Boundary.h"
 
-#include "deck/oif_KeywordLine.h"
-#include "deck/oif_Utils.h"
+#include "base/oif_KeywordLine.h"
+#include "base/oif_Utils.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kbcC_MotionBCs.h"
 #include "store_interface/records/conditions/kbcC_ScalarBCs.h"

@@ -1,6 +1,6 @@
 #include "conditions/oif_BoundaryConditionBuilder.h"
 
-#include "deck/oif_Utils.h"
+#include "base/oif_Utils.h"
 #include "foundation/omi_Singleton.h"
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"

@@ -3,8 +3,8 @@
 
 #include "conditions/oif_OpStatus.h"
 #include "conditions/oif_Submodel.h"
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Component.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Component.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 
 #include <unordered_map>

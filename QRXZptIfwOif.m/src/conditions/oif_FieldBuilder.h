@@ -2,8 +2,8 @@
 #define QRX_OIF_FIELDBUILDER_H
 
 #include "conditions/oif_OpStatus.h"
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Component.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Component.h"
 
 /// Initial conditions and predefined fields of the steps. A field variable is written in every step that it
 /// lives in.

@@ -2,8 +2,8 @@
 #define QRX_OIF_LOADBUILDER_H
 
 #include "conditions/oif_OpStatus.h"
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Component.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Component.h"
 
 #include <unordered_map>
 

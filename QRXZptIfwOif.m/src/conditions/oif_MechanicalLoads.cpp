@@ -1,6 +1,6 @@
 #include "conditions/oif_MechanicalLoads.h"
 
-#include "deck/oif_Utils.h"
+#include "base/oif_Utils.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"

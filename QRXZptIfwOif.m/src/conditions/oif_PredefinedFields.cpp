@@ -1,6 +1,6 @@
 #include "conditions/oif_PredefinedFields.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "foundation/omu_PrimEnum.h"
 #include "keyword_layer/qkw_QuorixName.h"
 

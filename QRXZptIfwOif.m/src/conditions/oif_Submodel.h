@@ -2,7 +2,7 @@
 #define QRX_OIF_SUBMODEL_H
 
 #include "conditions/oif_Boundary.h"
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "foundation/cow_Map.h"
 #include "store_interface/records/conditions/kbcC_SupportBCs.h"
 

@@ -1,8 +1,8 @@
 #ifndef QRX_OIF_CONSTRAINTBUILDER_H
 #define QRX_OIF_CONSTRAINTBUILDER_H
 
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Component.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Component.h"
 
 /// Constraints of the assembly, and the sector of a cyclic model.
 class oif_ConstraintBuilder final : public oif_ComponentOf<oif_ConstraintBuilder> {

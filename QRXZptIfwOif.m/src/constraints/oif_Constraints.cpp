@@ -1,6 +1,6 @@
 #include "constraints/oif_Constraints.h"
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "mesh/oif_SetName.h"
 
 namespace {

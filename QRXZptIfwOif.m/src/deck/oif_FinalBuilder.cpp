@@ -1,6 +1,6 @@
 #include "deck/oif_FinalBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 
 #include <set>
 

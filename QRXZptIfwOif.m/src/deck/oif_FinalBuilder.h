@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_FINALBUILDER_H
 #define QRX_OIF_FINALBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The texts that the store keeps for each block, and the keywords that close the blocks. The last component
 /// of all, so that these stand behind what the others say.

@@ -1,6 +1,6 @@
 #include "deck/oif_JobKeywordsBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 
 void oif_JobKeywordsBuilder::Build() {
     const cow_String text = Store().topLevelSolverInput();

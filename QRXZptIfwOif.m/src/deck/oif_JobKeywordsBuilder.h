@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_JOBKEYWORDSBUILDER_H
 #define QRX_OIF_JOBKEYWORDSBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The opening text of the deck, which stands before everything else.
 class oif_JobKeywordsBuilder final : public oif_ComponentOf<oif_JobKeywordsBuilder> {

@@ -1,6 +1,6 @@
 #include "interactions/oif_ContactPair.h"
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"

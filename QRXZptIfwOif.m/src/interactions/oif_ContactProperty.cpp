@@ -1,6 +1,6 @@
 #include "interactions/oif_ContactProperty.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
 #include "mesh/oif_SetName.h"

@@ -1,6 +1,6 @@
 #include "interactions/oif_FilmAndRadiation.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 

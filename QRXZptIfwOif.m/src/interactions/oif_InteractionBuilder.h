@@ -2,8 +2,8 @@
 #define QRX_OIF_INTERACTIONBUILDER_H
 
 #include "conditions/oif_OpStatus.h"
-#include "deck/oif_BlockHeader.h"
-#include "deck/oif_Component.h"
+#include "base/oif_BlockHeader.h"
+#include "base/oif_Component.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
 #include "store_interface/records/interactions/kinC_ContactControls.h"
 

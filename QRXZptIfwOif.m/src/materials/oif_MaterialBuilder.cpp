@@ -1,6 +1,6 @@
 #include "materials/oif_MaterialBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "materials/oif_Material.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_OPTIONLINE_H
 #define QRX_OIF_OPTIONLINE_H
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 
 /// The keyword line of a material option.
 class oif_OptionLine final : public oif_KeywordLine {

@@ -1,6 +1,6 @@
 #include "mesh/oif_Element.h"
 
-#include "deck/oif_ModelInfo.h"
+#include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_QuorixName.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #include "mesh/oif_Region.h"
 
-#include "deck/oif_Model.h"
+#include "base/oif_Model.h"
 
 oif_Region::oif_Region(const qkw_Model& model, const rgnC_Region& region) {
     if (!region.Shortcut().HasValue()) return;

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_REGIONBUILDER_H
 #define QRX_OIF_REGIONBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// Named regions: the sets and surfaces of every instance in its block, those of the assembly in the
 /// assembly, and a node-based surface for each node set that contact uses as one.

@@ -1,6 +1,6 @@
 #include "mesh/oif_SetName.h"
 
-#include "deck/oif_Model.h"
+#include "base/oif_Model.h"
 #include "foundation/omu_QuorixName.h"
 #include "keyword_layer/qkw_QuorixName.h"
 

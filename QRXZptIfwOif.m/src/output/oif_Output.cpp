@@ -1,6 +1,6 @@
 #include "output/oif_Output.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/steps/kprC_Predicates.h"
 

@@ -1,6 +1,6 @@
 #include "output/oif_OutputRequestBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "output/oif_Output.h"

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_OUTPUTREQUESTBUILDER_H
 #define QRX_OIF_OUTPUTREQUESTBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 
 /// What closes the steps: controls, restart, prints, and the output requests, of which the model holds named

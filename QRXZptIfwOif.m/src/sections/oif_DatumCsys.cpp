@@ -1,6 +1,6 @@
 #include "sections/oif_DatumCsys.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "foundation/nex_Exception.h"
 
 oif_DatumCsys::oif_DatumCsys(const ddb_Model& model, const dtmC_DatumRef& reference, gsl_Matrix placement) {

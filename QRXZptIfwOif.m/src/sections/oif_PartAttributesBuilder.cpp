@@ -1,6 +1,6 @@
 #include "sections/oif_PartAttributesBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_PARTATTRIBUTESBUILDER_H
 #define QRX_OIF_PARTATTRIBUTESBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 #include "store_interface/records/sections/kseC_Section.h"
 
 #include <map>

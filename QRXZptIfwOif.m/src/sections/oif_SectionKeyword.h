@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_SECTIONKEYWORD_H
 #define QRX_OIF_SECTIONKEYWORD_H
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/records/sections/kseC_Section.h"
 

@@ -1,6 +1,6 @@
 #include "sections/oif_SolidSections.h"
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"

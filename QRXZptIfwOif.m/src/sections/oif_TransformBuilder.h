@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_TRANSFORMBUILDER_H
 #define QRX_OIF_TRANSFORMBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The local systems that the model uses: for each one that degrees of freedom are given in, a node set with
 /// all its regions as members and a transform on it; and an orientation for each system of a connector, a

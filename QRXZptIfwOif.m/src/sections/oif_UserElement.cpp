@@ -1,6 +1,6 @@
 #include "sections/oif_UserElement.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <limits>

@@ -1,6 +1,6 @@
 #include "steps/oif_StepBuilder.h"
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "mesh/oif_SetName.h"
 #include "steps/oif_DynamicProcedures.h"
 #include "steps/oif_ModalProcedures.h"

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_STEPBUILDER_H
 #define QRX_OIF_STEPBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The head of every step but the initial one: banner, *Step, the procedure, what belongs to the procedure,
 /// and the headers of its load cases. Raises for a procedure that it doesn't know.

@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KBCC_BC_H
 #define QRX_STORE_KBCC_BC_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
 
 /// One prescribed value in one step, such as a displacement along an axis.

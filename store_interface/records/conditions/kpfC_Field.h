@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KPFC_FIELD_H
 #define QRX_STORE_KPFC_FIELD_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
 
 /// State of a predefined field in one step.

@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KCOC_CONSTRAINT_H
 #define QRX_STORE_KCOC_CONSTRAINT_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 class cls_ClassRegistrar;
 

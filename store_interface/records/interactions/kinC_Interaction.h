@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KINC_INTERACTION_H
 #define QRX_STORE_KINC_INTERACTION_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
 
 /// State of an interaction in one step; has no data of its own and serves the classes that need none.

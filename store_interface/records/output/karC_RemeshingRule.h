@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KARC_REMESHINGRULE_H
 #define QRX_STORE_KARC_REMESHINGRULE_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/cls_Lists.h"
 
 /// A rule for adaptive remeshing between jobs: which error indicators a step works out, and where. A deck

@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KORC_ODBREQUEST_H
 #define QRX_STORE_KORC_ODBREQUEST_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/cls_Lists.h"
 #include "store_interface/records/output/korC_OutputEnums.h"
 

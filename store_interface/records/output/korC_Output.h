@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KORC_OUTPUT_H
 #define QRX_STORE_KORC_OUTPUT_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
 #include "store_interface/records/output/korC_OdbRequest.h"
 

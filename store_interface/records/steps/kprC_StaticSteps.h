@@ -1,7 +1,7 @@
 #ifndef QRX_STORE_KPRC_STATICSTEPS_H
 #define QRX_STORE_KPRC_STATICSTEPS_H
 
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/steps/kprC_Step.h"
 
 class cls_ClassRegistrar;

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_AMPLITUDEBUILDER_H
 #define QRX_OIF_AMPLITUDEBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 #include "store_interface/records/amplitudes/kamC_Amplitude.h"
 
 /// Amplitudes of the model: curves, power spectral densities and response spectra.

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_MODELINFO_H
 #define QRX_OIF_MODELINFO_H
 
-#include "deck/oif_Model.h"
+#include "base/oif_Model.h"
 #include "foundation/cow_Map.h"
 #include "foundation/omi_IntTable.h"
 #include "keyword_layer/qkw_ModelInfo.h"

@@ -1,4 +1,4 @@
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 
 void oif_Comment::Write(utl_Stream& stream) const {
     const int length = text_.Length();

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_PARTBUILDER_H
 #define QRX_OIF_PARTBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The opening line of a part:
 ///     *Part, name=NAME

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_BLOCKHEADER_H
 #define QRX_OIF_BLOCKHEADER_H
 
-#include "deck/oif_Comment.h"
+#include "base/oif_Comment.h"
 #include "foundation/cow_Map.h"
 
 /// A banner of three comment lines that stands once in the model section, once in the assembly and once in

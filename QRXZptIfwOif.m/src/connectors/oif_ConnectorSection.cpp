@@ -1,6 +1,6 @@
-#include "sections/oif_ConnectorSection.h"
+#include "connectors/oif_ConnectorSection.h"
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 
 #include <string>

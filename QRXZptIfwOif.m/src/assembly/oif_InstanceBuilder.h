@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_INSTANCEBUILDER_H
 #define QRX_OIF_INSTANCEBUILDER_H
 
-#include "deck/oif_Component.h"
+#include "base/oif_Component.h"
 
 /// The opening of an instance, with its placement:
 ///     *Instance, name=NAME, part=PART

@@ -1,6 +1,6 @@
-#include "materials/oif_AmplitudeBuilder.h"
+#include "amplitudes/oif_AmplitudeBuilder.h"
 
-#include "materials/oif_Amplitude.h"
+#include "amplitudes/oif_Amplitude.h"
 #include "store_interface/records/mdl_Repository.h"
 
 #include <set>

@@ -1,7 +1,7 @@
 #ifndef QRX_OIF_COMPONENT_H
 #define QRX_OIF_COMPONENT_H
 
-#include "deck/oif_ModelInfo.h"
+#include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_BuilderComponent.h"
 
 /// Base of the component class T: copying, and access to the store behind the model view.

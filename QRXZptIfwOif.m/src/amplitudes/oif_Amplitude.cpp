@@ -1,6 +1,6 @@
-#include "materials/oif_Amplitude.h"
+#include "amplitudes/oif_Amplitude.h"
 
-#include "deck/oif_DataLines.h"
+#include "base/oif_DataLines.h"
 #include "foundation/nex_Exception.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"

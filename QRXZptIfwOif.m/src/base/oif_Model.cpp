@@ -1,4 +1,4 @@
-#include "deck/oif_Model.h"
+#include "base/oif_Model.h"
 
 namespace {
 

@@ -1,4 +1,4 @@
-#include "store_interface/records/conditions/klcC_LoadCase.h"
+#include "store_interface/records/steps/klcC_LoadCase.h"
 
 const cls_FieldTable& klcC_LoadCase::Fields() {
     static const cls_FieldTable fields =

@@ -1,4 +1,4 @@
-#include "store_interface/model/rgnC_SetData.h"
+#include "store_interface/regions/rgnC_SetData.h"
 
 rgnC_SubsetData rgnC_SetData::SubSet(int index) const {
     if (index < 0 || index >= NumSubSets()) cow_RaiseOutOfRange(index, NumSubSets());

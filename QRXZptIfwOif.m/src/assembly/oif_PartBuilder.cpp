@@ -1,4 +1,4 @@
-#include "mesh/oif_PartBuilder.h"
+#include "assembly/oif_PartBuilder.h"
 
 #include "keyword_layer/qkw_QuorixName.h"
 

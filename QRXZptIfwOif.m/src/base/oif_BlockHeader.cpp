@@ -1,4 +1,4 @@
-#include "deck/oif_BlockHeader.h"
+#include "base/oif_BlockHeader.h"
 
 const qkw_KeywordHandle& oif_BlockHeader::StepHeader(const cow_String& stepName) {
     bool given = stepHeadersGiven_.IsMember(stepName);

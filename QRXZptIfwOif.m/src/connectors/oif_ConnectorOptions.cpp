@@ -1,6 +1,6 @@
-#include "sections/oif_ConnectorOptions.h"
+#include "connectors/oif_ConnectorOptions.h"
 
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
 

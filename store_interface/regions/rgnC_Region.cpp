@@ -1,4 +1,4 @@
-#include "store_interface/model/rgnC_Region.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 int rgnC_Region::FlagWord() const {
     if (!HasValue() || set_.Data().IsNull()) return 0;

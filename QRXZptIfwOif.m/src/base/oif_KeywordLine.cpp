@@ -1,4 +1,4 @@
-#include "deck/oif_KeywordLine.h"
+#include "base/oif_KeywordLine.h"
 
 oif_KeywordLine::oif_KeywordLine(utl_Stream& stream, const char* keyword) : stream_(stream) {
     stream_ << keyword;

@@ -1,4 +1,4 @@
-#include "deck/oif_Utils.h"
+#include "base/oif_Utils.h"
 
 #include "keyword_layer/qkw_QuorixName.h"
 

@@ -1,4 +1,4 @@
-#include "deck/oif_ModelInfo.h"
+#include "base/oif_ModelInfo.h"
 
 #include "keyword_layer/qkw_QuorixName.h"
 
