@@ -2,6 +2,7 @@
 #define QRX_FOUNDATION_COW_LIST_H
 
 #include "foundation/cow_CountedHld.h"
+#include "foundation/cow_Range.h"
 
 #include <algorithm>
 #include <bit>
@@ -112,6 +113,12 @@ public:
         return Writable(index);
     }
     const T& Last() const { return ConstGet(count_ - 1); }
+
+    static const T& ItemAt(const cow_List& list, int index) { return list.UncheckedConstGet(index); }
+    using ConstIterator = cow_IndexIterator<cow_List, &ItemAt>;
+    /// The items in order, for loops that leave the list as it is.
+    ConstIterator begin() const { return {*this, 0}; }
+    ConstIterator end() const { return {*this, count_}; }
 
     void Put(int index, T item) { Get(index) = std::move(item); }
 

@@ -2,6 +2,7 @@
 #define QRX_FOUNDATION_COW_MAP_H
 
 #include "foundation/cow_COW.h"
+#include "foundation/cow_Range.h"
 #include "foundation/cow_String.h"
 
 #include <memory>
@@ -132,6 +133,11 @@ public:
         const Node* node = FindNode(key);
         return node == nullptr ? nullptr : &node->value;
     }
+    class ConstIterator;
+    /// The entries in the order of the walk, for loops that leave the map as it is.
+    ConstIterator begin() const { return ConstIterator(root_); }
+    ConstIterator end() const { return {}; }
+
     /// True if the key was there. All other keys stay reachable; the walk order of those below the removed
     /// node may change.
     bool Remove(const K& key) {
@@ -246,6 +252,40 @@ private:
     mutable bool shared_ = false;
     mutable int walks_ = 0;
     mutable std::unique_ptr<Index> index_;
+};
+
+template <class K, class V>
+class cow_Map<K, V>::ConstIterator {
+public:
+    using iterator_category = std::input_iterator_tag;
+    using difference_type = std::ptrdiff_t;
+    using reference = cow_Entry<K, const V&>;
+    using value_type = reference;
+    using pointer = void;
+
+    ConstIterator() = default;
+    explicit ConstIterator(const Handle& root) { Push(root); }
+    reference operator*() const { return {open_.back()->key, open_.back()->value}; }
+    ConstIterator& operator++() {
+        const Node* node = open_.back();
+        open_.pop_back();
+        Push(node->right);
+        Push(node->left);
+        return *this;
+    }
+    ConstIterator operator++(int) {
+        ConstIterator before(*this);
+        ++*this;
+        return before;
+    }
+    friend bool operator==(const ConstIterator& a, const ConstIterator& b) { return a.open_ == b.open_; }
+
+private:
+    void Push(const Handle& subtree) {
+        if (!subtree.IsNull()) open_.push_back(subtree.Referent());
+    }
+
+    std::vector<const Node*> open_; // the entry that it stands at comes last, those to be visited before it
 };
 
 /// A snapshot of a map's walk in pre-order. The map must not be changed while it is in use.

@@ -1,7 +1,7 @@
 #include "tools/LoadChecks.h"
 
-#include "conditions/oif_OpStatus.h"
 #include "base/oif_ModelInfo.h"
+#include "conditions/oif_OpStatus.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 #include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/conditions/kpfC_Fields.h"

@@ -1,7 +1,7 @@
 #include "tools/ModelHistory.h"
 
-#include "conditions/oif_BoundaryConditionBuilder.h"
 #include "base/oif_ModelInfo.h"
+#include "conditions/oif_BoundaryConditionBuilder.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "tools/FindingText.h"
 #include "tools/TextTable.h"

@@ -27,6 +27,14 @@ public:
     void next() { ++place_; }
     bool isDone() const { return place_ == entries_->end(); }
     const cow_String& currentKey() const { return place_->first; }
+    // The same for range-based loops: names and views.
+    cow_Entry<cow_String, View> operator*() const { return {currentKey(), currentValue()}; }
+    ddb_ContainerIT& operator++() {
+        next();
+        return *this;
+    }
+    friend bool operator==(const ddb_ContainerIT& it, std::default_sentinel_t) { return it.isDone(); }
+
     View currentValue() const {
         if constexpr (std::is_constructible_v<View, const cow_CountedHld<Entry>&>) {
             return View(place_->second);
@@ -48,6 +56,8 @@ public:
     ddb_Part get(const cow_String& name) const;
     int size() const { return static_cast<int>(model_->Parts().size()); }
     ddb_ContainerIT<odiK_Part, ddb_Part> createIterator() const { return {model_->Parts(), model_}; }
+    ddb_ContainerIT<odiK_Part, ddb_Part> begin() const { return createIterator(); }
+    static std::default_sentinel_t end() { return {}; }
 
 private:
     cow_CountedHld<odiK_Model> model_;
@@ -143,6 +153,8 @@ public:
     ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> createIterator() const {
         return {model_->Instances(), model_};
     }
+    ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> begin() const { return createIterator(); }
+    static std::default_sentinel_t end() { return {}; }
     /// The part instance whose mesh has the index; none for any other index.
     std::optional<ddb_PartInstance> FindByMeshIndex(int meshIndex) const;
 

@@ -124,6 +124,11 @@ public:
     ddb_Set get(int index) const;
     ddb_SetListIT createIterator() const;
 
+    static ddb_Set ItemAt(const ddb_SetList& sets, int index) { return sets.get(index); }
+    using ConstIterator = cow_IndexIterator<ddb_SetList, &ItemAt>;
+    ConstIterator begin() const { return {*this, 0}; }
+    ConstIterator end() const { return {*this, size()}; }
+
 private:
     const std::vector<cow_CountedHld<odiK_Set>>* Sets() const;
 

@@ -4,8 +4,8 @@
 #include "store_interface/model/ddb_ElementShape.h"
 #include "store_interface/model/odiK_LabelIndex.h"
 #include "store_interface/model/odiK_Problems.h"
-#include "store_interface/regions/rgnC_SetData.h"
 #include "store_interface/records/part_attributes/bme_ElemCtrlParams.h"
+#include "store_interface/regions/rgnC_SetData.h"
 
 #include <span>
 #include <unordered_map>

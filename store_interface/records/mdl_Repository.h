@@ -1,9 +1,13 @@
 #ifndef QRX_STORE_MDL_REPOSITORY_H
 #define QRX_STORE_MDL_REPOSITORY_H
 
+#include "foundation/cow_Range.h"
 #include "store_interface/records/cls_FieldTable.h"
 
 #include <map>
+
+template <class T>
+class mdl_RepositoryPlace;
 
 /// Named records in ascending byte order of their names; copies share everything until one is written.
 /// An absent name raises "<container>: no entry named '...'".
@@ -32,6 +36,9 @@ public:
     void InsertRecord(const cow_String& name, const cls_Record& record);
     bool Remove(const cow_String& name);
     void Clear() { records_ = {}; }
+    /// The records in key order, for loops that leave the repository as it is.
+    mdl_RepositoryPlace<cls_Record> begin() const;
+    mdl_RepositoryPlace<cls_Record> end() const;
     /// The holder under the name, or null.
     const mdl_ObjCow<cls_Record>* ConstHolder(const cow_String& name) const;
     /// The holder under the name for writing; an empty one at its first use.
@@ -42,6 +49,13 @@ protected:
 
     using Records = std::map<cow_String, mdl_ObjCow<cls_Record>>;
     friend class mdl_RepositoryIT;
+
+    Records::const_iterator Begin() const {
+        return records_.IsNull() ? Records::const_iterator() : records_.ConstGet().begin();
+    }
+    Records::const_iterator End() const {
+        return records_.IsNull() ? Records::const_iterator() : records_.ConstGet().end();
+    }
 
     const char* name_;
     unsigned itemTypeId_;
@@ -65,6 +79,40 @@ private:
     mdl_Repository::Records::const_iterator place_;
 };
 
+/// Stands at an entry of a repository whose records are of class T or derive from it.
+template <class T>
+class mdl_RepositoryPlace {
+public:
+    using Place = std::map<cow_String, mdl_ObjCow<cls_Record>>::const_iterator;
+    using iterator_category = std::input_iterator_tag;
+    using difference_type = std::ptrdiff_t;
+    using reference = cow_Entry<cow_String, const T&>;
+    using value_type = reference;
+    using pointer = void;
+
+    mdl_RepositoryPlace() = default;
+    explicit mdl_RepositoryPlace(Place place) : place_(place) {}
+    reference operator*() const { return {place_->first, static_cast<const T&>(place_->second.ConstGet())}; }
+    mdl_RepositoryPlace& operator++() {
+        ++place_;
+        return *this;
+    }
+    mdl_RepositoryPlace operator++(int) { return mdl_RepositoryPlace(place_++); }
+    friend bool operator==(const mdl_RepositoryPlace& a, const mdl_RepositoryPlace& b) {
+        return a.place_ == b.place_;
+    }
+
+private:
+    Place place_;
+};
+
+inline mdl_RepositoryPlace<cls_Record> mdl_Repository::begin() const {
+    return mdl_RepositoryPlace<cls_Record>(Begin());
+}
+inline mdl_RepositoryPlace<cls_Record> mdl_Repository::end() const {
+    return mdl_RepositoryPlace<cls_Record>(End());
+}
+
 /// A repository of records of class T and the classes derived from it.
 template <class T>
 class mdl_MapString2ObjCow : public mdl_Repository {
@@ -74,6 +122,10 @@ public:
     /// The record for writing.
     T& Get(const cow_String& name) { return static_cast<T&>(WritableRecord(name)); }
     void Insert(const cow_String& name, const T& record) { InsertRecord(name, record); }
+
+    /// The entries in key order, for loops that leave the repository as it is.
+    mdl_RepositoryPlace<T> begin() const { return mdl_RepositoryPlace<T>(Begin()); }
+    mdl_RepositoryPlace<T> end() const { return mdl_RepositoryPlace<T>(End()); }
 };
 
 template <class T>

@@ -2,9 +2,9 @@
 #define QRX_STORE_RGNC_REGION_H
 
 #include "foundation/cow_List.h"
+#include "store_interface/records/cls_FieldTable.h"
 #include "store_interface/regions/ddr_Shortcut.h"
 #include "store_interface/regions/rgnC_SetData.h"
-#include "store_interface/records/cls_FieldTable.h"
 
 #include <initializer_list>
 

@@ -1,5 +1,5 @@
-#include "connectors/ConnectorTesting.h"
 #include "assembly/oif_InstanceBuilder.h"
+#include "connectors/ConnectorTesting.h"
 #include "connectors/oif_ConnectorSection.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
 

@@ -1,6 +1,6 @@
+#include "base/oif_Comment.h"
 #include "deck/QRXZptInputFileWriter.h"
 #include "deck/oif_Builder.h"
-#include "base/oif_Comment.h"
 #include "deck/oif_Writer.h"
 #include "store_interface/records/steps/kprC_ModalSteps.h"
 #include "store_interface/records/steps/kprC_StaticSteps.h"

@@ -1,7 +1,7 @@
 #include "decks/DeckFromCopies.h"
 
-#include "deck/oif_Builder.h"
 #include "base/oif_Comment.h"
+#include "deck/oif_Builder.h"
 #include "store_interface/model/odb_Odb.h"
 
 #include <memory>

@@ -582,6 +582,16 @@ INSTANTIATE_TEST_SUITE_P(
         FailingOperation{"Fill", false, [](auto& list) { list.Fill(20, Tracked(7)); }}),
     [](const auto& test) { return std::string(test.param.name); });
 
+TEST(cow_List, RangeLoop_RunsOverAllBlocks) {
+    cow_List<int> list;
+    for (int i = 0; i < 100; ++i) list.Append(i);
+    list.Prepend(-1);
+    int expected = -1;
+    for (const int item : list) EXPECT_EQ(item, expected++);
+    EXPECT_EQ(expected, 100);
+    EXPECT_EQ(std::count(list.begin(), list.end(), 7), 1);
+}
+
 TEST(cow_List, AppendFailsAtNewBlockThenCutAndPrepended_LeaksNothing) {
     Tracked::Reset();
     cow_List<Tracked> list;

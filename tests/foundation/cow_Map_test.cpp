@@ -276,6 +276,18 @@ TEST(cow_Map, LongChainOfKeys_IsDroppedOnASmallStack) {
     EXPECT_EQ(count, 3999);
 }
 
+TEST(cow_Map, RangeLoop_WalksAsTheIteratorDoes) {
+    for (const Keys& keys : {Keys{}, Keys{"a"}, Keys{"s2", "s1", "", "abc", "b", "ab", "z9", "aa"}}) {
+        const Map map = MapOf(keys);
+        Keys walked;
+        for (const auto& [key, place] : map) {
+            walked.emplace_back(key.View());
+            EXPECT_EQ(keys[static_cast<std::size_t>(place)], walked.back());
+        }
+        EXPECT_EQ(walked, Walk(map));
+    }
+}
+
 TEST(cow_ConstMapIterator, EmptyMap_IsDoneAtOnce) {
     const Map map;
     const cow_ConstMapIterator<cow_String, int> iter(map);

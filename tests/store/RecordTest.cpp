@@ -1,6 +1,6 @@
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/mdl_PropAttr.h"
 #include "store_interface/records/mdl_Repository.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 #include "store/StoreTesting.h"
 

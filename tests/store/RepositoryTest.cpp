@@ -44,6 +44,22 @@ TEST(NamedRecords, EmptyMap_HasNothingToWalk) {
     EXPECT_EQ(map.ItemTypeId(), klcC_LoadCase::TypeId());
 }
 
+TEST(NamedRecords, RangeLoop_RunsInAscendingOrder) {
+    Map map;
+    for (const auto& [name, loadCase] : map) ADD_FAILURE() << name.CStr() << Factor(loadCase);
+    map.Insert("B", CaseWith(2.0F));
+    map.Insert("A", CaseWith(1.0F));
+    std::string walked;
+    for (const auto& [name, loadCase] : map) walked += name.CStr() + std::to_string(Factor(loadCase)) + " ";
+    EXPECT_EQ(walked, "A1.000000 B2.000000 ");
+    walked.clear();
+    for (const auto& [name, record] : static_cast<const mdl_Repository&>(map)) {
+        walked += name.CStr();
+        EXPECT_EQ(record.DynTypeId(), klcC_LoadCase::TypeId());
+    }
+    EXPECT_EQ(walked, "AB");
+}
+
 TEST(NamedRecords, AbsentName_RaisesWithTheContainersName) {
     Map map;
     map.Insert("A", CaseWith(1.0F));

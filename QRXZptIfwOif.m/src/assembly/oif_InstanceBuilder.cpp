@@ -1,12 +1,12 @@
 #include "assembly/oif_InstanceBuilder.h"
 
 #include "base/oif_DataLines.h"
+#include "connectors/oif_ConnectorOptions.h"
+#include "connectors/oif_ConnectorSection.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 #include "mesh/oif_SetName.h"
-#include "connectors/oif_ConnectorOptions.h"
-#include "connectors/oif_ConnectorSection.h"
 
 #include <set>
 

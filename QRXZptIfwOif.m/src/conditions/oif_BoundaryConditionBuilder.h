@@ -1,10 +1,10 @@
 #ifndef QRX_OIF_BOUNDARYCONDITIONBUILDER_H
 #define QRX_OIF_BOUNDARYCONDITIONBUILDER_H
 
-#include "conditions/oif_OpStatus.h"
-#include "conditions/oif_Submodel.h"
 #include "base/oif_BlockHeader.h"
 #include "base/oif_Component.h"
+#include "conditions/oif_OpStatus.h"
+#include "conditions/oif_Submodel.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 
 #include <unordered_map>

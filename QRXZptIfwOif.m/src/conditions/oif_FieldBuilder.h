@@ -1,9 +1,9 @@
 #ifndef QRX_OIF_FIELDBUILDER_H
 #define QRX_OIF_FIELDBUILDER_H
 
-#include "conditions/oif_OpStatus.h"
 #include "base/oif_BlockHeader.h"
 #include "base/oif_Component.h"
+#include "conditions/oif_OpStatus.h"
 
 /// Initial conditions and predefined fields of the steps. A field variable is written in every step that it
 /// lives in.

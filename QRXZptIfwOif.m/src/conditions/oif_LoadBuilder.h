@@ -1,9 +1,9 @@
 #ifndef QRX_OIF_LOADBUILDER_H
 #define QRX_OIF_LOADBUILDER_H
 
-#include "conditions/oif_OpStatus.h"
 #include "base/oif_BlockHeader.h"
 #include "base/oif_Component.h"
+#include "conditions/oif_OpStatus.h"
 
 #include <unordered_map>
 

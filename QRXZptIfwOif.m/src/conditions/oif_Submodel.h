@@ -1,8 +1,8 @@
 #ifndef QRX_OIF_SUBMODEL_H
 #define QRX_OIF_SUBMODEL_H
 
-#include "conditions/oif_Boundary.h"
 #include "base/oif_Comment.h"
+#include "conditions/oif_Boundary.h"
 #include "foundation/cow_Map.h"
 #include "store_interface/records/conditions/kbcC_SupportBCs.h"
 

@@ -1,6 +1,9 @@
 #ifndef QRX_OIF_BUILDER_H
 #define QRX_OIF_BUILDER_H
 
+#include "amplitudes/oif_AmplitudeBuilder.h"
+#include "assembly/oif_InstanceBuilder.h"
+#include "assembly/oif_PartBuilder.h"
 #include "conditions/oif_BoundaryConditionBuilder.h"
 #include "conditions/oif_FieldBuilder.h"
 #include "conditions/oif_LoadBuilder.h"
@@ -8,10 +11,7 @@
 #include "deck/oif_FinalBuilder.h"
 #include "deck/oif_JobKeywordsBuilder.h"
 #include "interactions/oif_InteractionBuilder.h"
-#include "amplitudes/oif_AmplitudeBuilder.h"
 #include "materials/oif_MaterialBuilder.h"
-#include "assembly/oif_InstanceBuilder.h"
-#include "assembly/oif_PartBuilder.h"
 #include "mesh/oif_RegionBuilder.h"
 #include "output/oif_OutputRequestBuilder.h"
 #include "sections/oif_PartAttributesBuilder.h"

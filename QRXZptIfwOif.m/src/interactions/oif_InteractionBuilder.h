@@ -1,9 +1,9 @@
 #ifndef QRX_OIF_INTERACTIONBUILDER_H
 #define QRX_OIF_INTERACTIONBUILDER_H
 
-#include "conditions/oif_OpStatus.h"
 #include "base/oif_BlockHeader.h"
 #include "base/oif_Component.h"
+#include "conditions/oif_OpStatus.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
 #include "store_interface/records/interactions/kinC_ContactControls.h"
 

@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KBCC_BC_H
 #define QRX_STORE_KBCC_BC_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// One prescribed value in one step, such as a displacement along an axis.
 struct kbcC_Component {

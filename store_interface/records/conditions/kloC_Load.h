@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KLOC_LOAD_H
 #define QRX_STORE_KLOC_LOAD_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// State of a load in one step.
 class kloC_LoadState : public cls_RecordOf<kloC_LoadState> {

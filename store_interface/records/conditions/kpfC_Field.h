@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KPFC_FIELD_H
 #define QRX_STORE_KPFC_FIELD_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// State of a predefined field in one step.
 class kpfC_FieldState : public cls_RecordOf<kpfC_FieldState> {

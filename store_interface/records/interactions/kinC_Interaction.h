@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KINC_INTERACTION_H
 #define QRX_STORE_KINC_INTERACTION_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// State of an interaction in one step; has no data of its own and serves the classes that need none.
 class kinC_InteractionState : public cls_RecordOf<kinC_InteractionState> {

@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KARC_REMESHINGRULE_H
 #define QRX_STORE_KARC_REMESHINGRULE_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/cls_Lists.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// A rule for adaptive remeshing between jobs: which error indicators a step works out, and where. A deck
 /// asks for them as field output. Held by name; a store holds none, a model view of a program's own may.

@@ -1,9 +1,9 @@
 #ifndef QRX_STORE_KORC_ODBREQUEST_H
 #define QRX_STORE_KORC_ODBREQUEST_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/cls_Lists.h"
 #include "store_interface/records/output/korC_OutputEnums.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// What one step asks of one place of the model, merged from the requests that ask for the same. Made while a
 /// deck is built; a store never holds it.

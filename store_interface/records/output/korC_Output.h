@@ -1,9 +1,9 @@
 #ifndef QRX_STORE_KORC_OUTPUT_H
 #define QRX_STORE_KORC_OUTPUT_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/propagation/kprC_PropagatingObject.h"
 #include "store_interface/records/output/korC_OdbRequest.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 /// What an output request asks for in one step: variables, and how often.
 class korC_OutputState : public cls_AbstractRecordOf<korC_OutputState> {

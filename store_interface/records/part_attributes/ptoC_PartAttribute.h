@@ -99,6 +99,13 @@ public:
         items_.Append(mdl_ObjCow<ptoC_PartAttribute>(attribute));
     }
 
+    static const ptoC_PartAttribute& ItemAt(const ptoC_PartAttributeList& list, int index) {
+        return list.items_.UncheckedConstGet(index).ConstGet();
+    }
+    using ConstIterator = cow_IndexIterator<ptoC_PartAttributeList, &ItemAt>;
+    ConstIterator begin() const { return {*this, 0}; }
+    ConstIterator end() const { return {*this, Size()}; }
+
 private:
     cow_List<mdl_ObjCow<ptoC_PartAttribute>> items_;
 };

@@ -1,9 +1,9 @@
 #ifndef QRX_STORE_KPRC_MODALSTEPS_H
 #define QRX_STORE_KPRC_MODALSTEPS_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/steps/kprC_ModalDamping.h"
 #include "store_interface/records/steps/kprC_Step.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 class cls_ClassRegistrar;
 

@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KPRC_STATICSTEPS_H
 #define QRX_STORE_KPRC_STATICSTEPS_H
 
-#include "store_interface/regions/rgnC_Region.h"
 #include "store_interface/records/steps/kprC_Step.h"
+#include "store_interface/regions/rgnC_Region.h"
 
 class cls_ClassRegistrar;
 

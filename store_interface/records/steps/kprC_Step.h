@@ -1,8 +1,8 @@
 #ifndef QRX_STORE_KPRC_STEP_H
 #define QRX_STORE_KPRC_STEP_H
 
-#include "store_interface/records/steps/klcC_LoadCase.h"
 #include "store_interface/records/mdl_Repository.h"
+#include "store_interface/records/steps/klcC_LoadCase.h"
 #include "store_interface/records/steps/kprC_Controls.h"
 #include "store_interface/records/steps/kprC_Predicates.h"
 #include "store_interface/records/steps/kprC_StepRequests.h"

@@ -45,6 +45,14 @@ public:
     const cow_String& NameAt(int index) const { return EntryAt(index).name; }
     const kprC_Step& StepAt(int index) const { return EntryAt(index).record.ConstGet(); }
 
+    static cow_Entry<cow_String, const kprC_Step&> ItemAt(const kprC_StepContainer& steps, int index) {
+        return {steps.NameAt(index), steps.StepAt(index)};
+    }
+    using ConstIterator = cow_IndexIterator<kprC_StepContainer, &ItemAt>;
+    /// Names and steps in order, for loops that leave the steps as they are.
+    ConstIterator begin() const { return {*this, 0}; }
+    ConstIterator end() const { return {*this, Size()}; }
+
 private:
     struct Entry {
         cow_String name;
