@@ -5,6 +5,12 @@ get_property(qrx_layers GLOBAL PROPERTY QRX_LAYERS)
 list(TRANSFORM qrx_layers REPLACE "(.+)" "$<TARGET_OBJECTS:\\1>" OUTPUT_VARIABLE qrx_objects)
 add_library(QRXZptInputFileWriter ${qrx_objects})
 add_library(QRX::QRXZptInputFileWriter ALIAS QRXZptInputFileWriter)
+if(QRX_SANITIZED_TESTS)
+    list(TRANSFORM qrx_layers REPLACE "(.+)" "$<TARGET_OBJECTS:\\1_sanitized>" OUTPUT_VARIABLE qrx_sanitized_objects)
+    add_library(QRXZptInputFileWriter_sanitized STATIC ${qrx_sanitized_objects})
+    target_include_directories(QRXZptInputFileWriter_sanitized PUBLIC
+        ${PROJECT_SOURCE_DIR} ${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src)
+endif()
 set(QRX_INCLUDE_SUBDIR QRXZptInputFileWriter-${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
 target_include_directories(QRXZptInputFileWriter PUBLIC
     $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>

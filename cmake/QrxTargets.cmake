@@ -8,13 +8,62 @@ target_compile_options(qrx_flags INTERFACE
     $<$<AND:$<CXX_COMPILER_ID:GNU>,$<VERSION_LESS:$<CXX_COMPILER_VERSION>,13>>:-Wno-restrict>
     $<$<BOOL:${QRX_WARNINGS_AS_ERRORS}>:-Werror>)
 
-# qrx_layer(NAME): the sources of this folder as one layer of the core; a folder without sources adds none.
+# g++ 12 warns of the standard library's own code when it comes precompiled.
+add_library(qrx_precompiled INTERFACE)
+target_compile_options(qrx_precompiled INTERFACE
+    $<$<AND:$<CXX_COMPILER_ID:GNU>,$<VERSION_LESS:$<CXX_COMPILER_VERSION>,13>>:-Wno-array-bounds
+        -Wno-stringop-overflow -Wno-stringop-overread>)
+
+# What the second build of each library is made with, that the tests are linked to as well.
+add_library(qrx_sanitizers INTERFACE)
+set(QRX_SANITIZER_FLAGS -fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
+target_compile_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS} -O1 -g1)
+target_link_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS})
+
+# qrx_sanitized(LIST NAMES...): the targets of the second build where there are such, else the names as they are.
+function(qrx_sanitized list)
+    set(found)
+    foreach(name ${ARGN})
+        if(TARGET ${name}_sanitized)
+            list(APPEND found ${name}_sanitized)
+        else()
+            list(APPEND found ${name})
+        endif()
+    endforeach()
+    set(${list} ${found} PARENT_SCOPE)
+endfunction()
+
+# qrx_library(NAME TYPE SOURCES... [PUBLIC LIBS...] [PRIVATE LIBS...] [PRECOMPILE HEADERS...]): a library of the
+# project and, under QRX_SANITIZED_TESTS, its double NAME_sanitized.
+function(qrx_library name type)
+    cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE;PRECOMPILE" ${ARGN})
+    set(variants ${name})
+    if(QRX_SANITIZED_TESTS)
+        list(APPEND variants ${name}_sanitized)
+    endif()
+    foreach(variant ${variants})
+        set(public ${ARG_PUBLIC})
+        set(private ${ARG_PRIVATE})
+        if(NOT variant STREQUAL name)
+            qrx_sanitized(public ${ARG_PUBLIC})
+            qrx_sanitized(private ${ARG_PRIVATE})
+            list(APPEND private $<BUILD_INTERFACE:qrx_sanitizers>)
+        endif()
+        add_library(${variant} ${type} ${ARG_SOURCES})
+        target_include_directories(${variant} PUBLIC
+            $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>
+            $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src>)
+        target_link_libraries(${variant} PUBLIC ${public} PRIVATE $<BUILD_INTERFACE:qrx_flags> ${private})
+        if(QRX_PRECOMPILED_HEADERS AND ARG_PRECOMPILE)
+            target_precompile_headers(${variant} PRIVATE ${ARG_PRECOMPILE})
+            target_link_libraries(${variant} PRIVATE $<BUILD_INTERFACE:qrx_precompiled>)
+        endif()
+    endforeach()
+endfunction()
+
+# qrx_layer(NAME [PRECOMPILE HEADERS...]): the sources of this folder as one layer of the core.
 function(qrx_layer name)
     file(GLOB_RECURSE sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
-    add_library(${name} OBJECT ${sources})
-    target_include_directories(${name} PUBLIC
-        $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>
-        $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src>)
-    target_link_libraries(${name} PRIVATE $<BUILD_INTERFACE:qrx_flags>)
+    qrx_library(${name} OBJECT SOURCES ${sources} ${ARGN})
     set_property(GLOBAL APPEND PROPERTY QRX_LAYERS ${name})
 endfunction()

@@ -11,5 +11,7 @@ target=$2
 shift 2
 
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
+# A compiler cache takes precompiled headers only when it may rely on their defines and times.
+export CCACHE_SLOPPINESS=${CCACHE_SLOPPINESS-pch_defines,time_macros}
 cmake --preset "$preset" -DCMAKE_CXX_COMPILER_LAUNCHER="$(command -v ccache || true)" "$@"
 cmake --build --preset "$preset" --target "$target" --parallel "$(nproc)"

@@ -1,0 +1,31 @@
+#ifndef QRX_STORE_FND_TEXT_H
+#define QRX_STORE_FND_TEXT_H
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+// Texts that findings are made of.
+
+/// In single quotes; control characters as \xNN, so that no text of a file acts on the terminal that shows it.
+std::string fnd_Quoted(std::string_view text);
+std::string fnd_Visible(std::string_view text);
+/// The shortest text that reads back as the number, with a point or an exponent.
+std::string fnd_Shown(double value);
+/// "1 row", "2 rows".
+std::string fnd_Counted(long long count, const char* singular);
+/// "one of a, b, c".
+std::string fnd_OneOf(const std::vector<std::string>& words);
+/// The known name that is nearest to `name`, as "did you mean 'x'?", or nothing when none is near.
+std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>& known);
+/// The text with A to Z as a to z.
+std::string fnd_LowerCase(std::string_view text);
+
+/// Why the text can't stand in a deck as a name: what was found, and what is expected instead.
+struct fnd_NameProblem {
+    std::string found; ///< empty: the name is good
+    std::string expected;
+};
+fnd_NameProblem fnd_ProblemOfName(std::string_view name);
+
+#endif
