@@ -1,7 +1,7 @@
 #include "model_file/mdf_Diagnostics.h"
 
 #include "model_file/mdf_Parser.h"
-#include "model_file/mdf_Writer.h"
+#include "model_file/mdf_Utf8.h"
 
 #include <algorithm>
 #include <charconv>
@@ -28,28 +28,15 @@ bool IsControl(char c) {
 
 // Control characters as \xNN, so that no text of a file acts on the terminal that shows it.
 std::string Visible(std::string_view text) {
-    constexpr const char* digits = "0123456789ABCDEF";
     std::string visible;
     for (const char c : text) {
         if (!IsControl(c)) {
             visible += c;
             continue;
         }
-        const auto byte = static_cast<unsigned char>(c);
-        visible.append("\\x").append({digits[byte >> 4], digits[byte & 15]});
+        visible.append("\\x").append(mdf_HexOf(static_cast<unsigned char>(c)));
     }
     return visible;
-}
-
-// The beginning of the text, cut between characters.
-std::string_view Beginning(std::string_view text, std::size_t longest) {
-    std::size_t end = 0;
-    while (end < text.size()) {
-        const std::size_t length = std::max<std::size_t>(1, mdf_Utf8Length(text.substr(end)));
-        if (end + length > longest) break;
-        end += length;
-    }
-    return text.substr(0, end);
 }
 
 // Number of characters put in, left out, changed or swapped with the next, capitals not counted.
@@ -119,7 +106,8 @@ std::string mdf_Shown(const mdf_Value& value) {
     if (value.IsNumber()) return mdf_Shown(value.Real());
     if (value.IsString()) {
         const std::string& text = value.String();
-        return text.size() <= longest ? mdf_Quoted(text) : mdf_Quoted(Beginning(text, longest)) + "...";
+        return text.size() <= longest ? mdf_Quoted(text)
+                                      : mdf_Quoted(mdf_Utf8Beginning(text, longest)) + "...";
     }
     if (value.IsObject()) return "an object";
     return "an array of " + std::to_string(value.Size()) + (value.Size() == 1 ? " item" : " items");

@@ -21,7 +21,7 @@ cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Pa
         diagnostics_.Expected(path, json, "an object");
         return mesh;
     }
-    records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
     ReadNodesAndElements(*mesh, json, path, false);
     if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, mdf_Path(path, "sets"));
     return mesh;
@@ -51,7 +51,7 @@ void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path) {
         diagnostics_.Error(mdf_Path(path, "sets"),
                            "found sets, expected them in the member \"sets\" of the assembly");
     }
-    records_.CheckMembers(json, {"nodes", "elements", "sets"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
     ReadNodesAndElements(mesh, json, path, true);
     if (mesh.Nodes().NumNodes() > 0) {
         diagnostics_.Warning(mdf_Path(path, "nodes"), "the assembly's own " +
@@ -65,7 +65,7 @@ void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path&
         diagnostics_.Expected(path, json, "an object");
         return;
     }
-    records_.CheckMembers(json, {"labels", "coordinates"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"labels", "coordinates"}, path);
     mdf_Value* coordinates = json.Find("coordinates");
     mdf_Value* labelsJson = json.Find("labels");
     if (labelsJson == nullptr || coordinates == nullptr) {
@@ -134,7 +134,7 @@ bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const
         diagnostics_.Expected(path, json, "an array of labels, or {\"from\": ..., \"to\": ..., \"by\": ...}");
         return false;
     }
-    records_.CheckMembers(json, {"from", "to", "by"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"from", "to", "by"}, path);
     int range[3] = {0, 0, 1};
     const char* const names[3] = {"from", "to", "by"};
     for (int i = 0; i < 3; ++i) {
@@ -188,7 +188,7 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const md
         diagnostics_.Expected(path, json, "an object");
         return;
     }
-    records_.CheckMembers(json, {"type", "labels", "connectivity", "controls"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"type", "labels", "connectivity", "controls"}, path);
     const mdf_Value* type = json.Find("type");
     mdf_Value* labelsJson = json.Find("labels");
     mdf_Value* connectivity = json.Find("connectivity");
@@ -317,7 +317,7 @@ int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const
     const std::string digits = json.String().substr(dot + 1);
     const odiK_Instance* instance = model_.FindInstance(cow_String(name));
     if (instance == nullptr) {
-        records_.ReportNoInstance(name, path);
+        records_.Places().ReportNoInstance(name, path);
         return -1;
     }
     if (!instance->isPartInstance) {
@@ -338,45 +338,17 @@ int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const
     return mesh.AddForeignNode(instance->name, static_cast<int>(label));
 }
 
-bool mdf_MeshReader::ReadSetHead(SetHead& head, const mdf_Value& json, const mdf_Path& path,
+bool mdf_MeshReader::ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const mdf_Path& path,
                                  mdf_CapitalsCheck& capitals) {
-    const mdf_Value* name = json.Find("name");
-    const mdf_Value* kind = json.Find("kind");
-    const mdf_Value* internal = json.Find("internal");
-    const mdf_Path namePath(path, "name");
-    if (name == nullptr || !name->IsString()) {
-        diagnostics_.Error(namePath, "found " +
-                                         (name == nullptr ? std::string("nothing") : mdf_Shown(*name)) +
-                                         ", expected the name of the set");
-        return false;
-    }
-    const std::string problem = mdf_NameProblem(name->String());
-    if (!problem.empty()) {
-        diagnostics_.Error(namePath, "found " + problem);
-        return false;
-    }
-    head.name = cow_String(name->String());
-    capitals.Enter(name->String(), namePath, "set", diagnostics_);
-    const char* const kinds[] = {"node", "element", "surface"};
-    int type = -1;
-    for (int i = 0; i < 3; ++i) {
-        if (kind != nullptr && kind->IsString() && kind->String() == kinds[i]) type = i;
-    }
-    if (type < 0) {
-        diagnostics_.Error(mdf_Path(path, "kind"),
-                           "found " + (kind == nullptr ? std::string("nothing") : mdf_Shown(*kind)) +
-                               ", expected one of node, element, surface");
-        records_.NoteWrong(name->String());
-        return false;
-    }
-    head.type = static_cast<res_SetTypeEnm>(type);
-    if (internal != nullptr && !internal->IsBool()) {
-        diagnostics_.Expected(mdf_Path(path, "internal"), *internal, "true or false");
-        records_.NoteWrong(name->String());
-        return false;
-    }
-    head.internal = internal != nullptr && internal->Bool();
-    return true;
+    const int errorsBefore = diagnostics_.NumErrors();
+    for (const cls_Field& field : odiK_SetHead::Fields().All())
+        records_.ReadField(head, field, json.Find(field.name), mdf_Path(path, std::string_view(field.name)));
+    if (head.name.IsEmpty()) return false;
+    const std::string name(head.name.View());
+    capitals.Enter(name, mdf_Path(path, "name"), "set", diagnostics_);
+    const bool good = diagnostics_.NumErrors() == errorsBefore;
+    if (!good) records_.References().NoteWrong(name);
+    return good;
 }
 
 bool mdf_MeshReader::ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
@@ -447,7 +419,7 @@ void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Rea
     for (std::size_t i = 0; i < json.Size(); ++i) {
         mdf_Value& set = json.Items()[i];
         const mdf_Path place(path, i);
-        SetHead head;
+        odiK_SetHead head;
         if (!set.IsObject()) {
             diagnostics_.Expected(place, set, "an object");
         } else if (ReadSetHead(head, set, place, capitals)) {
@@ -457,9 +429,10 @@ void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Rea
 }
 
 void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
-    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const SetHead& head) {
+    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const odiK_SetHead& head) {
         const bool facets = head.type == res_SetTypeEnm::FACETS;
-        records_.CheckMembers(set, {"name", "kind", "internal", facets ? "facets" : "labels"}, place);
+        mdf_CheckMembers(diagnostics_, set,
+                         mdf_MembersOf(odiK_SetHead::Fields(), {facets ? "facets" : "labels"}), place);
         mdf_StoreProblems problems(diagnostics_, place);
         if (IsIncomplete(&mesh)) {
             mesh.AddSet({head.name, head.type, head.internal, {}, {}}, problems);
@@ -468,7 +441,7 @@ void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& 
         const int most = head.type == res_SetTypeEnm::NODES ? mesh.Nodes().NumNodes() : mesh.NumElements();
         Members members;
         if (!ReadMembers(members, head.type, set, place, static_cast<std::size_t>(most))) {
-            records_.NoteWrong(head.name.View());
+            records_.References().NoteWrong(head.name.View());
             return;
         }
         if (members.empty) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
@@ -477,8 +450,8 @@ void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& 
 }
 
 void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
-    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const SetHead& head) {
-        records_.CheckMembers(set, {"name", "kind", "internal", "members"}, place);
+    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const odiK_SetHead& head) {
+        mdf_CheckMembers(diagnostics_, set, mdf_MembersOf(odiK_SetHead::Fields(), {"members"}), place);
         mdf_Value* entries = set.Find("members");
         const mdf_Path entriesPath(place, "members");
         if (entries == nullptr || !entries->IsArray() ||
@@ -486,7 +459,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
             diagnostics_.Error(
                 entriesPath, "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)) +
                                  ", expected an array of members");
-            records_.NoteWrong(head.name.View());
+            records_.References().NoteWrong(head.name.View());
             return;
         }
         if (entries->Empty()) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
@@ -502,7 +475,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
                 continue;
             }
             const bool facets = head.type == res_SetTypeEnm::FACETS;
-            records_.CheckMembers(entry, {"instance", facets ? "facets" : "labels"}, entryPath);
+            mdf_CheckMembers(diagnostics_, entry, {"instance", facets ? "facets" : "labels"}, entryPath);
             const mdf_Value* instance = entry.Find("instance");
             if (instance != nullptr && (!instance->IsString() || instance->String().empty())) {
                 diagnostics_.Expected(mdf_Path(entryPath, "instance"), *instance, "the name of an instance");
@@ -513,7 +486,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
                 instance == nullptr ? cow_String() : cow_String(instance->String());
             const odiK_Instance* owner = model_.FindInstance(instanceName);
             if (instance != nullptr && owner == nullptr) {
-                records_.ReportNoInstance(instance->String(), mdf_Path(entryPath, "instance"));
+                records_.Places().ReportNoInstance(instance->String(), mdf_Path(entryPath, "instance"));
                 good = false;
                 continue;
             }
@@ -534,7 +507,7 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
             inputs.push_back({instanceName, members[m].labels, members[m].facets});
         }
         if (!good) {
-            records_.NoteWrong(head.name.View());
+            records_.References().NoteWrong(head.name.View());
             return;
         }
         mdf_StoreProblems problems(diagnostics_, place);

@@ -18,11 +18,6 @@ public:
     void ReadAssemblySets(mdf_Value& json, const mdf_Path& path);
 
 private:
-    struct SetHead {
-        cow_String name;
-        res_SetTypeEnm type = res_SetTypeEnm::NODES;
-        bool internal = false;
-    };
     struct Members {
         std::vector<int> labels;
         std::vector<odiK_FacetInput> facets;
@@ -43,7 +38,8 @@ private:
     template <class Reader>
     void ForEachSet(mdf_Value& json, const mdf_Path& path, const Reader& read);
     void ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
-    bool ReadSetHead(SetHead& head, const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals);
+    bool ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const mdf_Path& path,
+                     mdf_CapitalsCheck& capitals);
     bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
                      std::size_t mostLabels);
     bool ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json, const mdf_Path& path);

@@ -9,6 +9,9 @@
 #include <string_view>
 #include <vector>
 
+/// What model files say that they are.
+inline constexpr char mdf_kFormat[] = "qrx-model/1";
+
 /// Something to say about a model file. Syntax errors have a line and a column, both from 1; all else has a
 /// JSON pointer (RFC 6901), "" for the whole file, and line 0.
 struct mdf_Message {

@@ -1,12 +1,12 @@
 #include "model_file/mdf_Parser.h"
 
+#include "model_file/mdf_Token.h"
+#include "model_file/mdf_Utf8.h"
 #include "model_file/mdf_ValueData.h"
-#include "model_file/mdf_Writer.h"
 
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
-#include <array>
 #include <cerrno>
 #include <cstdint>
 #include <cstdio>
@@ -56,96 +56,8 @@ private:
 };
 
 constexpr const char* foundNul = "found a NUL byte, expected text";
-constexpr std::size_t longestQuote = 40;
+constexpr std::size_t kLongestTail = 40;
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
-
-std::string Hex(unsigned char byte) {
-    constexpr const char* digits = "0123456789ABCDEF";
-    return {digits[byte >> 4], digits[byte & 15]};
-}
-
-/// The text in single quotes, with bytes that can't be shown as \xNN.
-std::string Quoted(std::string_view text) {
-    const std::size_t whole = text.size();
-    std::string quoted = "'";
-    while (!text.empty()) {
-        if (whole - text.size() >= longestQuote) return quoted + "...'";
-        const std::size_t length = mdf_Utf8Length(text);
-        const auto byte = static_cast<unsigned char>(text.front());
-        if (length == 0 || byte < 0x20 || byte == 0x7F)
-            quoted += "\\x" + Hex(byte);
-        else
-            quoted += text.substr(0, length);
-        text.remove_prefix(std::max<std::size_t>(length, 1));
-    }
-    return quoted + "'";
-}
-
-bool IsBlank(char c) {
-    return c == ' ' || c == '\t' || c == '\n' || c == '\r';
-}
-
-std::size_t SkipBlanksAndComments(std::string_view text, std::size_t at) {
-    while (at < text.size()) {
-        if (IsBlank(text[at])) {
-            ++at;
-            continue;
-        }
-        const std::string_view rest = text.substr(at);
-        std::size_t end = std::string_view::npos;
-        if (rest.starts_with("//")) {
-            end = std::min(text.find_first_of("\r\n", at), text.size());
-        } else if (rest.starts_with("/*")) {
-            end = text.find("*/", at + 2);
-            if (end != std::string_view::npos) end += 2;
-        }
-        if (end == std::string_view::npos) return at;
-        at = end;
-    }
-    return at;
-}
-
-/// The token as a person sees it: a bracket, a string up to `end`, else a run of other characters.
-std::string_view TokenAt(std::string_view text, std::size_t at, std::size_t end) {
-    if (text[at] == '"') return text.substr(at, std::max<std::size_t>(end - at, 1));
-    const std::size_t stop = text.find_first_of(" \t\r\n,:[]{}\"", at);
-    return text.substr(at, std::max<std::size_t>(std::min(stop, text.size()) - at, 1));
-}
-
-/// What stands before `end`, no longer than a quote.
-std::string_view Tail(std::string_view text, std::size_t begin, std::size_t end) {
-    if (end - begin > longestQuote) begin = end - longestQuote;
-    while (begin + 1 < end && (static_cast<unsigned char>(text[begin]) & 0xC0) == 0x80) ++begin;
-    return text.substr(begin, end - begin);
-}
-
-/// What was expected, in our words, from the end of the library's message; empty when it doesn't say.
-std::string_view Expected(std::string_view message) {
-    struct Words {
-        std::string_view library;
-        std::string_view ours;
-    };
-    static constexpr std::array<Words, 6> table{
-        {{"; expected '[', '{', or a literal", "a value"},
-         {"; expected string literal", "a member name in double quotes"},
-         {"; expected ':'", "':'"},
-         {"; expected ']'", "',' or ']'"},
-         {"; expected '}'", "',' or '}'"},
-         {"; expected end of input", "the end of the file"}}};
-    for (const Words& words : table) {
-        if (message.ends_with(words.library)) return words.ours;
-    }
-    return {};
-}
-
-/// The reason in the lexer's words; empty when the tokens are good and stand in the wrong order.
-std::string_view LexerReason(std::string_view message) {
-    const std::size_t end = message.find("; last read: '");
-    if (end == std::string_view::npos) return {};
-    constexpr std::string_view dash = " - ";
-    const std::size_t begin = message.find(dash);
-    return message.substr(begin + dash.size(), end - begin - dash.size());
-}
 
 bool WrittenAsInteger(std::string_view number) {
     return number.find_first_not_of("-0123456789") == std::string_view::npos;
@@ -186,6 +98,8 @@ public:
     std::size_t Offset() const { return static_cast<std::size_t>(cursor_.at - cursor_.begin); }
 
 private:
+    enum class Event { Start, BeginObject, Key, BeginArray, Number, Value };
+
     bool Int(int value);
     bool Real(double value, bool isLarge);
     bool Other(mdf_Value value);
@@ -195,7 +109,9 @@ private:
     bool AddFacetName(const std::string& text);
     void DemoteRow();
     bool MayNest();
-    std::size_t TokenBegin() const;
+    void Note(Event event);
+    std::size_t EndOfNumber() const;
+    std::size_t FindToken(const char*& expected) const;
     mdf_Value& Top() { return frames_.back(); }
 
     std::string_view Text() const {
@@ -211,21 +127,16 @@ private:
     /// The innermost open array is a row, and its items go straight into the Matrix or FacetArray on top.
     bool rowOpen_ = false;
     std::size_t rowBegin_ = 0;
-    /// Where the lexer was after the last event, and whether that was a number: the lexer reads one character
-    /// beyond a number.
-    std::size_t lastEvent_ = 0;
-    bool lastWasNumber_ = false;
+    /// The last event, and where the lexer was after it.
+    Event lastEvent_ = Event::Start;
+    std::size_t lastOffset_ = 0;
 };
 
 /// The numbers of the row or array that is open, with room for one more; null when it holds other things.
 mdf_Numbers* mdf_Builder::OpenNumbers() {
     if (frames_.empty()) return nullptr;
     mdf_Value& top = Top();
-    mdf_Numbers* numbers = nullptr;
-    if (rowOpen_)
-        numbers = &top.rows_->numbers;
-    else if (top.kind_ == mdf_Kind::IntArray || top.kind_ == mdf_Kind::RealArray)
-        numbers = top.numbers_;
+    mdf_Numbers* numbers = rowOpen_ ? &top.As<mdf_Rows>()->numbers : top.As<mdf_Numbers>();
     if (numbers != nullptr) MakeRoom(*numbers);
     return numbers;
 }
@@ -249,10 +160,10 @@ void mdf_Builder::MakeRoom(mdf_Numbers& numbers) const {
 }
 
 bool mdf_Builder::Int(int value) {
-    lastEvent_ = Offset();
-    lastWasNumber_ = true;
-    if (rowOpen_ && Top().kind_ == mdf_Kind::FacetArray) {
-        std::vector<int>& pairs = Top().facets_->pairs;
+    Note(Event::Number);
+    mdf_Facets* facets = rowOpen_ ? Top().As<mdf_Facets>() : nullptr;
+    if (facets != nullptr) {
+        std::vector<int>& pairs = facets->pairs;
         if (pairs.size() - rowBegin_ < 2) {
             pairs.push_back(value);
             return true;
@@ -267,24 +178,19 @@ bool mdf_Builder::Int(int value) {
 }
 
 bool mdf_Builder::Real(double value, bool isLarge) {
-    lastEvent_ = Offset();
-    lastWasNumber_ = true;
-    if (rowOpen_ && Top().kind_ == mdf_Kind::FacetArray) DemoteRow();
+    Note(Event::Number);
+    if (rowOpen_ && Top().As<mdf_Facets>() != nullptr) DemoteRow();
     if (mdf_Numbers* numbers = OpenNumbers()) {
         numbers->AddReal(value, isLarge);
-        if (!rowOpen_) Top().kind_ = mdf_Kind::RealArray;
     } else {
-        mdf_Value real(value);
-        real.largeInteger_ = isLarge;
-        Place(std::move(real));
+        Place(isLarge ? mdf_Value(mdf_Value::Data(mdf_Value::Large{value})) : mdf_Value(value));
     }
     return true;
 }
 
 bool mdf_Builder::string(std::string& text) {
     if (rowOpen_ && AddFacetName(text)) {
-        lastEvent_ = Offset();
-        lastWasNumber_ = false;
+        Note(Event::Value);
         return true;
     }
     // The lexer's buffer is copied, not taken: it has the capacity of the longest text so far.
@@ -293,20 +199,17 @@ bool mdf_Builder::string(std::string& text) {
 
 bool mdf_Builder::AddFacetName(const std::string& text) {
     mdf_Value& top = Top();
-    if (top.kind_ == mdf_Kind::Matrix) {
-        mdf_Rows& rows = *top.rows_;
+    if (mdf_Rows* rows = top.As<mdf_Rows>()) {
         const bool pairsSoFar =
-            rows.numbers.allInts && rows.ends.empty() && (rows.count == 0 || rows.length == 2);
-        if (!pairsSoFar || rows.numbers.Size() - rowBegin_ != 1) return false;
-        auto facets = std::make_unique<mdf_Facets>();
-        facets->pairs = std::move(rows.numbers.ints);
-        top.Release();
-        top.facets_ = facets.release();
-        top.kind_ = mdf_Kind::FacetArray;
-    } else if (top.facets_->pairs.size() - rowBegin_ != 1) {
+            rows->numbers.allInts && rows->ends.empty() && (rows->count == 0 || rows->length == 2);
+        if (!pairsSoFar || rows->numbers.Size() - rowBegin_ != 1) return false;
+        mdf_Facets facets;
+        facets.pairs = std::move(rows->numbers.ints);
+        top = mdf_Value::Of(std::move(facets));
+    } else if (top.As<mdf_Facets>()->pairs.size() - rowBegin_ != 1) {
         return false;
     }
-    top.facets_->AddName(text);
+    top.As<mdf_Facets>()->AddName(text);
     return true;
 }
 
@@ -314,12 +217,12 @@ bool mdf_Builder::AddFacetName(const std::string& text) {
 void mdf_Builder::DemoteRow() {
     mdf_Value& top = Top();
     mdf_Value row;
-    if (top.kind_ == mdf_Kind::Matrix) {
-        mdf_Numbers& numbers = top.rows_->numbers;
+    if (mdf_Rows* rows = top.As<mdf_Rows>()) {
+        mdf_Numbers& numbers = rows->numbers;
         row = numbers.Slice(rowBegin_, numbers.Size());
         numbers.Truncate(rowBegin_);
     } else {
-        mdf_Facets& facets = *top.facets_;
+        mdf_Facets& facets = *top.As<mdf_Facets>();
         const std::size_t filled = facets.pairs.size() - rowBegin_;
         if (filled == 2) {
             row = top.Item(facets.Count() - 1);
@@ -336,8 +239,7 @@ void mdf_Builder::DemoteRow() {
 }
 
 bool mdf_Builder::Other(mdf_Value value) {
-    lastEvent_ = Offset();
-    lastWasNumber_ = false;
+    Note(Event::Value);
     if (rowOpen_) DemoteRow();
     Place(std::move(value));
     return true;
@@ -349,17 +251,15 @@ void mdf_Builder::Place(mdf_Value value) {
         return;
     }
     mdf_Value& top = Top();
-    if (top.kind_ == mdf_Kind::Object) {
-        top.object_->members.back().value = std::move(value);
+    if (mdf_ObjectData* object = top.As<mdf_ObjectData>()) {
+        object->members.back().value = std::move(value);
         return;
     }
     top.Generalise();
-    top.array_->push_back(std::move(value));
+    top.Items().push_back(std::move(value));
 }
 
 bool mdf_Builder::MayNest() {
-    lastEvent_ = Offset();
-    lastWasNumber_ = false;
     const std::size_t depth = frames_.size() + (rowOpen_ ? 1 : 0);
     if (depth < static_cast<std::size_t>(mdf_maxDepth)) return true;
     SyntaxError(Offset() - 1,
@@ -368,31 +268,28 @@ bool mdf_Builder::MayNest() {
 }
 
 bool mdf_Builder::start_object(std::size_t) {
+    Note(Event::BeginObject);
     if (!MayNest()) return false;
     if (rowOpen_) DemoteRow();
-    mdf_Value object;
-    object.object_ = new mdf_ObjectData;
-    object.kind_ = mdf_Kind::Object;
-    frames_.push_back(std::move(object));
+    frames_.push_back(mdf_Value::Of(mdf_ObjectData()));
     return true;
 }
 
 bool mdf_Builder::key(std::string& name) {
-    lastEvent_ = Offset();
-    lastWasNumber_ = false;
-    Top().object_->members.push_back({name, mdf_Value()});
+    Note(Event::Key);
+    Top().As<mdf_ObjectData>()->members.push_back({name, mdf_Value()});
     return true;
 }
 
 bool mdf_Builder::end_object() {
-    std::vector<std::string> repeated = Top().object_->Index();
+    std::vector<std::string> repeated = Top().As<mdf_ObjectData>()->Index();
     mdf_Value object = std::move(Top());
     frames_.pop_back();
     if (!repeated.empty()) {
         std::string pointer;
         for (const mdf_Value& frame : frames_) {
-            if (frame.kind_ == mdf_Kind::Object)
-                mdf_AppendPointer(pointer, frame.object_->members.back().name);
+            if (frame.IsObject())
+                mdf_AppendPointer(pointer, frame.Members().back().name);
             else
                 mdf_AppendPointer(pointer, frame.Size());
         }
@@ -401,45 +298,42 @@ bool mdf_Builder::end_object() {
             mdf_Error& error = errors_.emplace_back();
             error.pointer = pointer;
             mdf_AppendPointer(error.pointer, name);
-            error.text = "the member " + Quoted(name) + " stands more than once; expected names that differ";
+            error.text =
+                "the member " + mdf_QuotedToken(name) + " stands more than once; expected names that differ";
         }
     }
     return Other(std::move(object));
 }
 
 bool mdf_Builder::start_array(std::size_t) {
+    Note(Event::BeginArray);
     if (!MayNest()) return false;
     if (rowOpen_) DemoteRow();
     if (!frames_.empty()) {
         mdf_Value& top = Top();
-        if (top.kind_ == mdf_Kind::IntArray && top.numbers_->Size() == 0) {
-            auto rows = std::make_unique<mdf_Rows>();
-            top.Release();
-            top.rows_ = rows.release();
-            top.kind_ = mdf_Kind::Matrix;
-        }
-        rowOpen_ = top.kind_ == mdf_Kind::Matrix || top.kind_ == mdf_Kind::FacetArray;
+        const mdf_Numbers* numbers = top.As<mdf_Numbers>();
+        if (numbers != nullptr && numbers->Size() == 0) top = mdf_Value::Of(mdf_Rows());
+        const mdf_Rows* rows = top.As<mdf_Rows>();
+        const mdf_Facets* facets = top.As<mdf_Facets>();
+        rowOpen_ = rows != nullptr || facets != nullptr;
         if (rowOpen_) {
-            rowBegin_ = top.kind_ == mdf_Kind::Matrix ? top.rows_->numbers.Size() : top.facets_->pairs.size();
+            rowBegin_ = rows != nullptr ? rows->numbers.Size() : facets->pairs.size();
             return true;
         }
     }
-    mdf_Value array;
-    array.numbers_ = new mdf_Numbers;
-    array.kind_ = mdf_Kind::IntArray;
-    frames_.push_back(std::move(array));
+    frames_.push_back(mdf_Value::Of(mdf_Numbers()));
     return true;
 }
 
 bool mdf_Builder::end_array() {
-    lastEvent_ = Offset();
-    lastWasNumber_ = false;
-    if (rowOpen_ && Top().kind_ == mdf_Kind::Matrix) {
-        Top().rows_->CloseRow();
+    Note(Event::Value);
+    mdf_Rows* rows = rowOpen_ ? Top().As<mdf_Rows>() : nullptr;
+    if (rows != nullptr) {
+        rows->CloseRow();
         rowOpen_ = false;
         return true;
     }
-    if (rowOpen_ && Top().facets_->pairs.size() - rowBegin_ == 2) {
+    if (rowOpen_ && Top().As<mdf_Facets>()->pairs.size() - rowBegin_ == 2) {
         rowOpen_ = false;
         return true;
     }
@@ -460,47 +354,85 @@ void mdf_Builder::SyntaxError(std::size_t offset, std::string text) {
     error.text = std::move(text);
 }
 
-/// Where the token that was read last begins: after the last event, a separator, and what the lexer skips.
-std::size_t mdf_Builder::TokenBegin() const {
+void mdf_Builder::Note(Event event) {
+    lastEvent_ = event;
+    lastOffset_ = Offset();
+}
+
+/// Where the text goes on behind the number that was the last event. The lexer reads one character beyond a
+/// number, if there is one.
+std::size_t mdf_Builder::EndOfNumber() const {
     const std::string_view text = Text();
-    std::size_t at = lastWasNumber_ ? lastEvent_ - 1 : lastEvent_;
+    const auto isDigit = [&](std::size_t at) { return text[at] >= '0' && text[at] <= '9'; };
+    const std::size_t last = lastOffset_ - 1;
+    if (lastOffset_ < text.size() || !isDigit(last)) return last;
+    // A digit at the end of the text belongs to the number, unless that is a zero.
+    if (last == 0 || text[last - 1] != '0') return lastOffset_;
+    std::size_t begin = last - 1;
+    while (begin > 0 &&
+           (isDigit(begin - 1) || std::string_view("+-.eE").find(text[begin - 1]) != std::string_view::npos))
+        --begin;
+    const std::string_view number = text.substr(begin, last - begin);
+    return number == "0" || number == "-0" ? last : lastOffset_;
+}
+
+/// The token that the lexer or the parser stumbled at, and what could have stood there.
+std::size_t mdf_Builder::FindToken(const char*& expected) const {
+    const std::string_view text = Text();
+    std::size_t at = lastEvent_ == Event::Number ? EndOfNumber() : lastOffset_;
     if (at == 0 && text.starts_with(byteOrderMark)) at = byteOrderMark.size();
-    at = SkipBlanksAndComments(text, at);
-    while (at + 1 < Offset() && (text[at] == ',' || text[at] == ':'))
-        at = SkipBlanksAndComments(text, at + 1);
+    at = mdf_SkipBlanksAndComments(text, at);
+    const auto passed = [&](char sign) {
+        if (at >= text.size() || text[at] != sign) return false;
+        at = mdf_SkipBlanksAndComments(text, at + 1);
+        return true;
+    };
+    constexpr const char* aValue = "a value";
+    constexpr const char* aName = "a member name in double quotes";
+    switch (lastEvent_) {
+    case Event::Start:
+    case Event::BeginArray: expected = aValue; break;
+    case Event::BeginObject: expected = aName; break;
+    case Event::Key: expected = passed(':') ? aValue : "':'"; break;
+    case Event::Number:
+    case Event::Value:
+        if (frames_.empty()) {
+            expected = "the end of the file";
+        } else if (!rowOpen_ && frames_.back().IsObject()) {
+            expected = passed(',') ? aName : "',' or '}'";
+        } else {
+            expected = passed(',') ? aValue : "',' or ']'";
+        }
+        break;
+    }
     return at;
 }
 
 bool mdf_Builder::parse_error(std::size_t, const std::string&, const nlohmann::detail::exception& failure) {
     const std::string_view text = Text();
-    const std::string_view message = failure.what();
-    const std::string_view reason = LexerReason(message);
-    const bool inString = reason.starts_with("invalid string");
-    if (!inString && Offset() > 0 && text[Offset() - 1] == '\0') {
+    const char* expected = "";
+    const std::size_t begin = FindToken(expected);
+    const mdf_TokenProblem problem = mdf_ProblemOf(text, begin, Offset());
+    if (!problem.insideString && Offset() > 0 && text[Offset() - 1] == '\0') {
         SyntaxError(Offset() - 1, foundNul);
         return false;
     }
-    const bool ended = reason.empty() && message.find("unexpected end of input") != std::string_view::npos;
-    const std::size_t begin = ended ? text.size() : std::min(TokenBegin(), text.size());
-    const std::string token =
-        begin == text.size() ? std::string("the end of the file") : Quoted(TokenAt(text, begin, Offset()));
-
+    const std::string token = begin >= text.size() ? std::string("the end of the file")
+                                                   : mdf_QuotedToken(mdf_TokenAt(text, begin, Offset()));
     constexpr int numberOverflow = 406;
     if (failure.id == numberOverflow) {
         SyntaxError(begin, "the number " + token + " is beyond the range of double precision");
         return false;
     }
-    std::string words = reason.empty() ? std::string() : std::string(reason) + "; ";
-    std::size_t position = begin;
-    if (inString && reason.find("missing closing quote") == std::string_view::npos) {
-        position = Offset() - 1;
-        words += "found " + Quoted(Tail(text, begin, Offset()));
-    } else {
-        words += "found " + token;
+    std::string words = problem.reason.empty() ? std::string() : problem.reason + "; ";
+    if (problem.insideString) {
+        const std::string_view tail = mdf_Utf8End(text.substr(begin, Offset() - begin), kLongestTail);
+        SyntaxError(Offset() - 1, words + "found " + mdf_QuotedToken(tail));
+        return false;
     }
-    const std::string_view expected = Expected(message);
-    if (!expected.empty()) words.append(", expected ").append(expected);
-    SyntaxError(position, std::move(words));
+    words += "found " + token;
+    if (problem.isOfAnyKind) words.append(", expected ").append(expected);
+    SyntaxError(begin, std::move(words));
     return false;
 }
 

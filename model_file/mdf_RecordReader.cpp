@@ -11,44 +11,16 @@ namespace {
 // Stands for a null in a list until all fields are read; no number of a model file is one.
 constexpr double kNullItem = std::numeric_limits<double>::quiet_NaN();
 
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
+constexpr const char* kSinglePrecision = "a number of single precision";
 
-std::vector<std::string> FieldNames(const cls_FieldTable& table) {
-    std::vector<std::string> names;
-    for (const cls_Field& field : table.All()) {
-        if (!field.notModelData) names.emplace_back(field.name);
-    }
-    return names;
+std::vector<std::string> WordsOf(const cls_Field& enumField) {
+    std::vector<std::string> words;
+    for (const omu_EnumRow& row : static_cast<const cls_EnumType&>(*enumField.type).Table().rows)
+        words.emplace_back(row.name);
+    return words;
 }
 
 } // namespace
-
-std::string mdf_MeaningWord(const cls_IntMeaning& meaning) {
-    std::string word(meaning.word);
-    word.erase(std::min(word.find_first_of("(,:"), word.size()));
-    while (!word.empty() && word.back() == ' ') word.pop_back();
-    return word;
-}
-
-std::vector<std::string> mdf_Names(const cow_List<cow_String>& names) {
-    std::vector<std::string> copies;
-    copies.reserve(static_cast<std::size_t>(names.Length()));
-    for (int i = 0; i < names.Length(); ++i) copies.push_back(Text(names[i]));
-    return copies;
-}
-
-void mdf_RecordReader::CheckMembers(const mdf_Value& object, const std::vector<std::string>& known,
-                                    const mdf_Path& path) {
-    for (const mdf_Member& member : object.Members()) {
-        if (std::find(known.begin(), known.end(), member.name) != known.end()) continue;
-        diagnostics_.Error(mdf_Path(path, member.name),
-                           "found an unknown member " + mdf_Quoted(member.name) +
-                               (known.empty() ? ", expected none" : ", expected " + mdf_OneOf(known)) +
-                               mdf_DidYouMean(member.name, known));
-    }
-}
 
 void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, const mdf_Path& path,
                                   const std::vector<std::string>& others) {
@@ -57,42 +29,42 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
         return;
     }
     const int errorsBefore = diagnostics_.NumErrors();
-    const cls_FieldTable& table = record.DynFields();
     std::vector<const cls_Field*> refusedTables;
-    std::vector<std::string> known = FieldNames(table);
-    for (const std::string& other : others) {
-        if (std::find(known.begin(), known.end(), other) == known.end()) known.push_back(other);
-    }
-    CheckMembers(object, known, path);
-    for (const cls_Field& field : table.All()) {
+    mdf_CheckMembers(diagnostics_, object, mdf_MembersOf(record.DynFields(), others), path);
+    for (const cls_Field& field : record.DynFields().All()) {
         if (field.notModelData || std::find(others.begin(), others.end(), field.name) != others.end())
             continue;
-        const mdf_Value* json = object.Find(field.name);
-        const mdf_Path place(path, field.name);
-        if (json != nullptr) {
-            const bool mayBeUnset = cls_IsUnset(*field.type, field.In(record));
-            if (!ReadValue(*field.type, field.In(record), *json, place, field, mayBeUnset)) {
-                if (field.type->Kind() == cls_FieldKind::Table) refusedTables.push_back(&field);
-                continue;
-            }
-        } else if (field.defaultItems != nullptr) {
-            // The defaults may be others than those of a new record.
-            static_cast<const cls_ListType&>(*field.type).Clear(field.In(record));
-        }
-        if (!field.required) continue;
-        const bool isText = field.type->Kind() == cls_FieldKind::String;
-        const bool missing =
-            json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
-        if (missing) diagnostics_.Error(place, std::string("found nothing, expected ") + field.doc);
+        const bool taken = ReadField(record, field, object.Find(field.name), mdf_Path(path, field.name));
+        if (!taken && field.type->Kind() == cls_FieldKind::Table) refusedTables.push_back(&field);
     }
     for (const cls_Field* field : refusedTables) {
         const std::string hint = mdf_RecordChecks::All().TableHint(record, field->name);
         if (!hint.empty()) diagnostics_.Error(mdf_Path(path, field->name), hint);
     }
-    for (const cls_Field& field : table.All()) CompleteList(field, record, path);
+    for (const cls_Field& field : record.DynFields().All()) CompleteList(field, record, path);
     if (diagnostics_.NumErrors() != errorsBefore) return;
     mdf_RecordCheck check(diagnostics_, path);
     mdf_RecordChecks::All().Run(record, check);
+}
+
+bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, const mdf_Value* json,
+                                 const mdf_Path& path) {
+    if (json != nullptr) {
+        const bool mayBeUnset = cls_IsUnset(*field.type, field.In(record));
+        if (!ReadValue(*field.type, field.In(record), *json, path, field, mayBeUnset)) return false;
+    } else if (field.defaultItems != nullptr) {
+        // The defaults may be others than those of a new record.
+        static_cast<const cls_ListType&>(*field.type).Clear(field.In(record));
+    }
+    if (!field.required) return true;
+    const bool isText = field.type->Kind() == cls_FieldKind::String;
+    const bool missing =
+        json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
+    if (missing) {
+        diagnostics_.Error(path, "found nothing, expected " +
+                                     (field.wordsOnly ? mdf_OneOf(WordsOf(field)) : std::string(field.doc)));
+    }
+    return true;
 }
 
 std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const mdf_Value& object,
@@ -162,63 +134,27 @@ bool mdf_RecordReader::ReadText(cow_String& text, const mdf_Value& value, const 
 bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json,
                                  const mdf_Path& path, const cls_Field& field, bool mayBeUnset) {
     switch (type.Kind()) {
-    case cls_FieldKind::Bool:
-        if (!json.IsBool()) {
-            diagnostics_.Expected(path, json, "true or false");
-            return false;
-        }
-        *static_cast<bool*>(value) = json.Bool();
-        return true;
+    case cls_FieldKind::Bool: return ReadBool(*static_cast<bool*>(value), json, path);
     case cls_FieldKind::Int: return ReadInt(*static_cast<int*>(value), json, path, field, mayBeUnset);
-    case cls_FieldKind::Double:
-        if (json.IsNull() && mayBeUnset) {
-            *static_cast<double*>(value) = cls_UnsetDouble;
-            return true;
-        }
-        if (!json.IsNumber()) {
-            diagnostics_.Expected(path, json, mayBeUnset ? "a number or null" : "a number");
-            return false;
-        }
-        *static_cast<double*>(value) = json.Real();
-        return true;
+    case cls_FieldKind::Double: return ReadDouble(*static_cast<double*>(value), json, path, mayBeUnset);
     case cls_FieldKind::Float:
         if (!json.IsNumber() || std::isinf(static_cast<float>(json.Real()))) {
-            diagnostics_.Expected(path, json, "a number of single precision");
+            diagnostics_.Expected(path, json, kSinglePrecision);
             return false;
         }
         *static_cast<float*>(value) = static_cast<float>(json.Real());
         return true;
-    case cls_FieldKind::String:
-        if (field.verbatim) return ReadText(*static_cast<cow_String*>(value), json, path);
-        if (!json.IsString()) {
-            diagnostics_.Expected(path, json, "a string");
-            return false;
-        }
-        *static_cast<cow_String*>(value) = cow_String(json.String());
-        Refer(field, json.String(), path);
-        return true;
-    case cls_FieldKind::Enum: return ReadEnum(static_cast<const cls_EnumType&>(type), value, json, path);
+    case cls_FieldKind::String: return ReadString(*static_cast<cow_String*>(value), json, path, field);
+    case cls_FieldKind::Enum:
+        return ReadEnum(static_cast<const cls_EnumType&>(type), value, json, path, field.wordsOnly);
     case cls_FieldKind::Triple: {
+        const auto& triple = static_cast<const cls_TripleType&>(type);
         double xyz[3];
-        if (!ReadTriple(xyz, json, path)) return false;
-        static_cast<const cls_TripleType&>(type).Set(value, xyz);
+        if (!ReadTriple(xyz, json, path, field.singlePrecision || triple.IsSingle())) return false;
+        triple.Set(value, xyz);
         return true;
     }
-    case cls_FieldKind::Segment: {
-        double start[3];
-        double end[3];
-        if (!json.IsArray() || json.Size() != 2) {
-            diagnostics_.Expected(path, json, "two points");
-            return false;
-        }
-        if (!ReadTriple(start, json.Item(0), mdf_Path(path, std::size_t{0})) ||
-            !ReadTriple(end, json.Item(1), mdf_Path(path, std::size_t{1}))) {
-            return false;
-        }
-        *static_cast<gsl_ModelSegment*>(value) =
-            gsl_ModelSegment({start[0], start[1], start[2]}, {end[0], end[1], end[2]});
-        return true;
-    }
+    case cls_FieldKind::Segment: return ReadSegment(*static_cast<gsl_ModelSegment*>(value), json, path);
     case cls_FieldKind::Complex: return ReadComplex(*static_cast<omi_complex*>(value), json, path);
     case cls_FieldKind::Table: return ReadTable(static_cast<const cls_TableType&>(type), value, json, path);
     case cls_FieldKind::List:
@@ -228,12 +164,73 @@ bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const m
     case cls_FieldKind::Optional:
     case cls_FieldKind::Variant:
         return ReadHolder(static_cast<const cls_HolderType&>(type), value, json, path);
-    case cls_FieldKind::Region: *static_cast<rgnC_Region*>(value) = ReadRegion(json, path); return true;
-    case cls_FieldKind::Datum: return ReadDatum(*static_cast<dtmC_DatumRef*>(value), json, path);
+    case cls_FieldKind::Region:
+        *static_cast<rgnC_Region*>(value) = places_.ReadRegion(json, path);
+        return true;
+    case cls_FieldKind::Datum: return places_.ReadDatum(*static_cast<dtmC_DatumRef*>(value), json, path);
     case cls_FieldKind::Attribute:
         return ReadAttribute(static_cast<const cls_AttributeType&>(type), value, json, path, field) !=
                mdl_GivenEnm::ABSENT;
+    case cls_FieldKind::Tree: break;
     }
+    return false;
+}
+
+bool mdf_RecordReader::ReadBool(bool& value, const mdf_Value& json, const mdf_Path& path) {
+    if (json.IsBool()) {
+        value = json.Bool();
+    } else {
+        diagnostics_.Expected(path, json, "true or false");
+    }
+    return json.IsBool();
+}
+
+bool mdf_RecordReader::ReadDouble(double& value, const mdf_Value& json, const mdf_Path& path,
+                                  bool mayBeUnset) {
+    if (json.IsNumber()) {
+        value = json.Real();
+        return true;
+    }
+    if (json.IsNull() && mayBeUnset) {
+        value = cls_UnsetDouble;
+        return true;
+    }
+    diagnostics_.Expected(path, json, mayBeUnset ? "a number or null" : "a number");
+    return false;
+}
+
+bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, const mdf_Path& path,
+                                  const cls_Field& field) {
+    if (field.verbatim) return ReadText(value, json, path);
+    if (!field.words.empty()) return ReadWord(value, json, path, field);
+    if (!json.IsString()) {
+        const std::string kind = field.nameOf == nullptr ? "" : field.nameOf;
+        diagnostics_.Expected(path, json,
+                              field.nameOf == nullptr ? "a string"
+                              : kind.empty()          ? "a name"
+                                                      : "the name of a " + kind);
+        return false;
+    }
+    const std::string problem = field.nameOf == nullptr ? std::string() : mdf_NameProblem(json.String());
+    if (!problem.empty()) {
+        diagnostics_.Error(path, "found " + problem);
+        return false;
+    }
+    value = cow_String(json.String());
+    references_.Note(field, json.String(), path);
+    return true;
+}
+
+bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const mdf_Path& path,
+                                const cls_Field& field) {
+    for (const char* word : field.words) {
+        if (!json.IsString() || !omu_EqualInAnyCapitals(json.String(), word)) continue;
+        value = word;
+        return true;
+    }
+    const std::vector<std::string> words(field.words.begin(), field.words.end());
+    diagnostics_.Expected(path, json,
+                          mdf_OneOf(words) + (json.IsString() ? mdf_DidYouMean(json.String(), words) : ""));
     return false;
 }
 
@@ -271,10 +268,10 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const mdf_Path
 }
 
 bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf_Value& json,
-                                const mdf_Path& path) {
+                                const mdf_Path& path, bool wordsOnly) {
     const omu_EnumTable& table = type.Table();
     const omu_EnumRow* row = nullptr;
-    if (json.IsInt()) row = table.Row(json.Int());
+    if (json.IsInt() && !wordsOnly) row = table.Row(json.Int());
     if (json.IsString()) row = table.RowOfWord(json.String());
     if (row != nullptr) {
         type.Set(value, row->value);
@@ -287,24 +284,42 @@ bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf
         shown.push_back(std::string(listed.name) + " (" + std::to_string(listed.value) + ")");
     }
     diagnostics_.Expected(path, json,
-                          mdf_OneOf(shown) +
+                          mdf_OneOf(wordsOnly ? words : shown) +
                               (json.IsString() ? mdf_DidYouMean(json.String(), words) : std::string()));
     return false;
 }
 
-bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const mdf_Path& path) {
+bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const mdf_Path& path,
+                                  bool singlePrecision) {
     if (!json.IsArray() || json.Size() != 3) {
         diagnostics_.Expected(path, json, "three numbers");
         return false;
     }
     for (std::size_t i = 0; i < 3; ++i) {
         const mdf_Value item = json.Item(i);
-        if (!item.IsNumber()) {
-            diagnostics_.Expected(mdf_Path(path, i), item, "a number");
+        const bool tooLarge =
+            singlePrecision && item.IsNumber() && std::isinf(static_cast<float>(item.Real()));
+        if (!item.IsNumber() || tooLarge) {
+            diagnostics_.Expected(mdf_Path(path, i), item, tooLarge ? kSinglePrecision : "a number");
             return false;
         }
         xyz[i] = item.Real();
     }
+    return true;
+}
+
+bool mdf_RecordReader::ReadSegment(gsl_ModelSegment& segment, const mdf_Value& json, const mdf_Path& path) {
+    if (!json.IsArray() || json.Size() != 2) {
+        diagnostics_.Expected(path, json, "two points");
+        return false;
+    }
+    double start[3];
+    double end[3];
+    if (!ReadTriple(start, json.Item(0), mdf_Path(path, std::size_t{0}), false) ||
+        !ReadTriple(end, json.Item(1), mdf_Path(path, std::size_t{1}), false)) {
+        return false;
+    }
+    segment = gsl_ModelSegment({start[0], start[1], start[2]}, {end[0], end[1], end[2]});
     return true;
 }
 
@@ -326,11 +341,11 @@ bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, co
         diagnostics_.Expected(path, json, "two numbers, or an object of \"form\", \"real\" and \"imag\"");
         return false;
     }
-    CheckMembers(json, {"form", "real", "imag"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"form", "real", "imag"}, path);
     bool isRead = true;
     if (const mdf_Value* form = json.Find("form")) {
         const auto& type = static_cast<const cls_EnumType&>(cls_TypeOf<omi_complex::FormEnm>::Instance());
-        isRead = ReadEnum(type, &value.form, *form, mdf_Path(path, "form"));
+        isRead = ReadEnum(type, &value.form, *form, mdf_Path(path, "form"), false);
     }
     for (const auto& [name, part] : {std::pair("real", &value.real), std::pair("imag", &value.imag)}) {
         const mdf_Value* number = json.Find(name);
@@ -438,7 +453,7 @@ bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_V
             }
             capitals.Enter(member.name, place, "name", diagnostics_);
         } else {
-            Refer(field, member.name, place);
+            references_.Note(field, member.name, place);
         }
         ReadValue(type.ItemType(), type.Insert(value, cow_String(member.name)), member.value, place, field,
                   false);
@@ -462,86 +477,6 @@ bool mdf_RecordReader::ReadHolder(const cls_HolderType& type, void* value, const
     return true;
 }
 
-bool mdf_RecordReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const mdf_Path& path) {
-    if (json.IsNull()) {
-        datum = {};
-        return true;
-    }
-    std::vector<std::string> names;
-    for (const odiK_Datum& known : model_.Datums()) names.push_back(Text(known.name));
-    if (json.IsString()) datum = model_.FindDatum(cow_String(json.String()));
-    if (json.IsString() && (!datum.IsNullRef() || IsWrong(json.String()))) return true;
-    diagnostics_.Expected(path, json,
-                          "the name of a datum, or null" +
-                              (json.IsString() ? mdf_DidYouMean(json.String(), names) : std::string()));
-    return false;
-}
-
-void mdf_RecordReader::ReportNoInstance(const std::string& name, const mdf_Path& path) {
-    if (IsWrong(name)) return;
-    std::vector<std::string> names;
-    for (const auto& [known, entry] : model_.Instances()) names.push_back(Text(known));
-    diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
-                                 mdf_DidYouMean(name, names));
-}
-
-rgnC_Region mdf_RecordReader::ReadRegion(const mdf_Value& value, const mdf_Path& path) {
-    if (value.IsNull()) return {};
-    std::string instance;
-    std::string set;
-    if (value.IsString()) {
-        const std::string& text = value.String();
-        const std::size_t dot = text.find('.');
-        if (dot != std::string::npos && text.find('.', dot + 1) != std::string::npos) {
-            diagnostics_.Expected(path, value, "{\"instance\": ..., \"set\": ...} for names with dots");
-            return {};
-        }
-        set = dot == std::string::npos ? text : text.substr(dot + 1);
-        if (dot != std::string::npos) instance = text.substr(0, dot);
-        if (dot == 0) {
-            diagnostics_.Expected(path, value, "{\"instance\": ..., \"set\": ...} for names with dots");
-            return {};
-        }
-    } else if (value.IsObject()) {
-        CheckMembers(value, {"instance", "set"}, path);
-        for (const char* member : {"instance", "set"}) {
-            const mdf_Value* name = value.Find(member);
-            if (name == nullptr) continue;
-            if (!name->IsString()) {
-                diagnostics_.Expected(mdf_Path(path, std::string_view(member)), *name, "a name");
-                return {};
-            }
-            (std::string_view(member) == "set" ? set : instance) = name->String();
-        }
-        if (value.Find("set") == nullptr) {
-            diagnostics_.Error(mdf_Path(path, "set"), "found nothing, expected the name of a set");
-            return {};
-        }
-    } else {
-        diagnostics_.Expected(path, value, "\"SET\", \"INSTANCE.SET\", an object of both names, or null");
-        return {};
-    }
-    rgnC_Region region = model_.FindRegion(cow_String(instance), cow_String(set));
-    if (region.HasValue()) return region;
-
-    const odiK_Instance* owner = model_.FindInstance(cow_String(instance));
-    std::vector<std::string> names;
-    if (!instance.empty() && owner == nullptr) {
-        ReportNoInstance(instance, path);
-        return {};
-    }
-    if (IsWrong(set)) return {};
-    static const std::vector<cow_CountedHld<odiK_Set>> none;
-    const auto mesh = owner == nullptr ? cow_CountedHld<odiK_Mesh>() : owner->Mesh();
-    for (const auto& known : owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets()) {
-        names.push_back(Text(known->name));
-    }
-    diagnostics_.Error(path, "found set " + mdf_Quoted(set) + ", expected the name of a set of " +
-                                 (owner == nullptr ? "the assembly" : "instance " + mdf_Quoted(instance)) +
-                                 mdf_DidYouMean(set, names));
-    return {};
-}
-
 mdl_GivenEnm mdf_RecordReader::ReadAttribute(const cls_AttributeType& type, void* attribute,
                                              const mdf_Value& json, const mdf_Path& path,
                                              const cls_Field& field) {
@@ -556,11 +491,11 @@ mdl_GivenEnm mdf_RecordReader::ReadAttribute(const cls_AttributeType& type, void
                    ? mdl_GivenEnm::VALUE
                    : mdl_GivenEnm::ABSENT;
     }
-    CheckMembers(json, {"value", "state"}, path);
+    mdf_CheckMembers(diagnostics_, json, {"value", "state"}, path);
     mdl_PropAttributeStateEnm state = mdl_PropAttributeStateEnm::NEVER_SET;
     const auto& stateType =
         static_cast<const cls_EnumType&>(cls_TypeOf<mdl_PropAttributeStateEnm>::Instance());
-    if (!ReadEnum(stateType, &state, *json.Find("state"), mdf_Path(path, "state")))
+    if (!ReadEnum(stateType, &state, *json.Find("state"), mdf_Path(path, "state"), false))
         return mdl_GivenEnm::ABSENT;
     type.SetState(attribute, static_cast<int>(state));
     const mdf_Value* value = json.Find("value");
@@ -580,7 +515,7 @@ void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Valu
     const std::vector<std::string> steps = mdf_Names(model_.steps.Keys());
     for (const mdf_Member& member : states.Members()) {
         const mdf_Path place(path, member.name);
-        if (IsWrong(member.name)) continue;
+        if (references_.IsWrong(member.name)) continue;
         if (!model_.steps.IsMember(cow_String(member.name))) {
             diagnostics_.Error(place, "found " + mdf_Quoted(member.name) + ", expected the name of a step" +
                                           mdf_DidYouMean(member.name, steps));
@@ -600,20 +535,13 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
     mdl_GivenState& given = object.Give(cow_String(stepName));
     cls_Record& record = given.record.Get();
     const auto& fields = record.DynFields().All();
-    std::vector<std::string> known = FieldNames(record.DynFields());
-    known.insert(known.end(), {"deactivated", "status"});
-    CheckMembers(json, known, path);
-    if (const mdf_Value* deactivated = json.Find("deactivated")) {
-        if (deactivated->IsBool()) {
-            given.deactivated = deactivated->Bool();
-        } else {
-            diagnostics_.Expected(mdf_Path(path, "deactivated"), *deactivated, "true or false");
-        }
-    }
+    mdf_CheckMembers(diagnostics_, json, mdf_MembersOf(record.DynFields(), {"deactivated", "status"}), path);
+    if (const mdf_Value* deactivated = json.Find("deactivated"))
+        ReadBool(given.deactivated, *deactivated, mdf_Path(path, "deactivated"));
     if (const mdf_Value* status = json.Find("status")) {
         mdl_PropagationStatusEnm value = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
         const auto& type = static_cast<const cls_EnumType&>(cls_TypeOf<mdl_PropagationStatusEnm>::Instance());
-        if (ReadEnum(type, &value, *status, mdf_Path(path, "status"))) given.status = value;
+        if (ReadEnum(type, &value, *status, mdf_Path(path, "status"), false)) given.status = value;
     }
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const cls_Field& field = fields[i];
@@ -640,90 +568,4 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
     if (diagnostics_.NumErrors() != errorsBefore) return;
     mdf_RecordCheck check(diagnostics_, path);
     mdf_RecordChecks::All().Run(record, check);
-}
-
-void mdf_RecordReader::Refer(const cls_Field& field, const std::string& name, const mdf_Path& path) {
-    if (field.refersTo != nullptr && !name.empty())
-        references_.push_back({field.refersTo, name, path.Text(), field.refersToClass});
-}
-
-const mdl_Repository* mdf_RecordReader::RepositoryOfKind(const std::string& kind) const {
-    const std::pair<const char*, const mdl_Repository*> repositories[] = {
-        {"material", &model_.materials},
-        {"section", &model_.sections},
-        {"profile", &model_.beamProfiles},
-        {"amplitude", &model_.amplitudes},
-        {"constraint", &model_.constraints},
-        {"contactControls", &model_.contactControls},
-        {"interactionProperty", &model_.interactionProperties},
-        {"timePoints", &model_.timePoints},
-        {"boundaryCondition", &model_.boundaryConditions},
-        {"load", &model_.loads},
-        {"field", &model_.fields},
-        {"interaction", &model_.interactions},
-    };
-    for (const auto& [name, repository] : repositories) {
-        if (kind == name) return repository;
-    }
-    return nullptr;
-}
-
-std::vector<std::string> mdf_RecordReader::NamesOfKind(const std::string& kind) const {
-    if (const mdl_Repository* repository = RepositoryOfKind(kind)) return mdf_Names(repository->Keys());
-    if (kind == "step") return mdf_Names(model_.steps.Keys());
-    if (kind == "set") {
-        std::vector<std::string> names;
-        for (const auto& set : model_.AssemblySets()) names.push_back(Text(set->name));
-        for (const auto& [instanceName, instance] : model_.Instances()) {
-            const auto mesh = instance->Mesh();
-            if (mesh.IsNull()) continue;
-            for (const auto& set : mesh->Sets()) names.push_back(Text(instanceName) + "." + Text(set->name));
-        }
-        return names;
-    }
-    return {};
-}
-
-void mdf_RecordReader::CheckClass(const Reference& reference) {
-    if (reference.expectedClass == nullptr) return;
-    const mdl_Repository* repository = RepositoryOfKind(reference.kind);
-    const cls_Record* record =
-        repository == nullptr ? nullptr : repository->FindRecord(cow_String(reference.name));
-    if (record == nullptr ||
-        cls_Classes().InheritanceCheck(record->DynTypeId(), reference.expectedClass->Id())) {
-        return;
-    }
-    diagnostics_.Error(reference.pointer, "found " + mdf_Quoted(reference.name) + ", a " +
-                                              Text(cls_Classes().NameOf(record->DynTypeId())) +
-                                              ", expected the name of a " + reference.expectedClass->name);
-}
-
-void mdf_RecordReader::CheckReferences() {
-    std::map<std::string, std::pair<std::vector<std::string>, std::set<std::string>>> known;
-    for (const Reference& reference : references_) {
-        const auto [place, isNew] = known.try_emplace(reference.kind);
-        auto& [names, lookup] = place->second;
-        if (isNew) {
-            names = NamesOfKind(reference.kind);
-            lookup.insert(names.begin(), names.end());
-        }
-        if (IsWrong(reference.name)) continue;
-        if (lookup.count(reference.name) != 0) {
-            CheckClass(reference);
-            continue;
-        }
-        // Orientations and filters may be defined elsewhere in the deck.
-        if (reference.kind == "orientation" || reference.kind == "filter") {
-            diagnostics_.Warning(reference.pointer, "found " + mdf_Quoted(reference.name) +
-                                                        ", which the model doesn't "
-                                                        "define");
-            continue;
-        }
-        const bool startsWithVowel =
-            std::string_view("aeiou").find(reference.kind.front()) != std::string_view::npos;
-        diagnostics_.Error(reference.pointer, "found " + mdf_Quoted(reference.name) +
-                                                  ", expected the name of " +
-                                                  (startsWithVowel ? "an " : "a ") + reference.kind +
-                                                  mdf_DidYouMean(reference.name, names));
-    }
 }

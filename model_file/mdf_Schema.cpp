@@ -1,5 +1,7 @@
+#include "model_file/mdf_Members.h"
 #include "model_file/mdf_ModelFile.h"
-#include "model_file/mdf_RecordReader.h"
+#include "store_interface/model/odiK_Repositories.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <nlohmann/json.hpp>
 
@@ -20,7 +22,7 @@ constexpr char kFrame[] = R"({
   "additionalProperties": false,
   "required": ["format", "models"],
   "properties": {
-    "format": {"const": "qrx-model/1"},
+    "format": {"description": "what this file is", "const": "qrx-model/1"},
     "models": {
       "description": "Models by name; decks are written from \"Default Model\".",
       "type": "object",
@@ -47,9 +49,9 @@ constexpr char kFrame[] = R"({
           "type": "object",
           "additionalProperties": false,
           "properties": {
-            "form": {"anyOf": [{"enum": ["RECTANGULAR", "POLAR"]}, {"type": "string"}, {"type": "integer"}], "default": "RECTANGULAR"},
-            "real": {"type": "number", "default": 0},
-            "imag": {"type": "number", "default": 0}
+            "form": {"description": "how the two numbers are to be read", "anyOf": [{"enum": ["RECTANGULAR", "POLAR"]}, {"type": "string"}, {"type": "integer"}], "default": "RECTANGULAR"},
+            "real": {"description": "real part, or magnitude", "type": "number", "default": 0},
+            "imag": {"description": "imaginary part, or phase", "type": "number", "default": 0}
           }
         }
       ]
@@ -67,9 +69,9 @@ constexpr char kFrame[] = R"({
           "additionalProperties": false,
           "required": ["from", "to"],
           "properties": {
-            "from": {"type": "integer", "minimum": 1},
-            "to": {"type": "integer", "minimum": 1},
-            "by": {"type": "integer", "minimum": 1, "default": 1}
+            "from": {"description": "first label", "type": "integer", "minimum": 1},
+            "to": {"description": "no label is above it", "type": "integer", "minimum": 1},
+            "by": {"description": "from one label to the next", "type": "integer", "minimum": 1, "default": 1}
           }
         }
       ]
@@ -90,24 +92,12 @@ constexpr char kFrame[] = R"({
           "type": "object",
           "additionalProperties": false,
           "required": ["set"],
-          "properties": {"instance": {"$ref": "#/$defs/NAME"}, "set": {"$ref": "#/$defs/NAME"}}
+          "properties": {
+            "instance": {"description": "the instance that has the set", "$ref": "#/$defs/NAME"},
+            "set": {"description": "the set", "$ref": "#/$defs/NAME"}
+          }
         }
       ]
-    },
-    "DATUM": {
-      "description": "A coordinate system, point, axis or plane. A csys takes origin and axes, a point its origin, an axis origin and xAxis (its direction), a plane origin and zAxis (its normal).",
-      "type": "object",
-      "additionalProperties": false,
-      "required": ["name"],
-      "properties": {
-        "name": {"$ref": "#/$defs/NAME"},
-        "type": {"enum": ["csys", "point", "axis", "plane"], "default": "csys"},
-        "system": {"enum": ["rectangular", "cylindrical", "spherical"], "default": "rectangular"},
-        "origin": {"$ref": "#/$defs/TRIPLE"},
-        "xAxis": {"$ref": "#/$defs/TRIPLE"},
-        "yAxis": {"$ref": "#/$defs/TRIPLE"},
-        "zAxis": {"$ref": "#/$defs/TRIPLE"}
-      }
     },
     "NODES": {
       "description": "User labels, and for each three coordinates (single precision).",
@@ -115,8 +105,8 @@ constexpr char kFrame[] = R"({
       "additionalProperties": false,
       "required": ["labels", "coordinates"],
       "properties": {
-        "labels": {"$ref": "#/$defs/LABELS"},
-        "coordinates": {"type": "array", "items": {"$ref": "#/$defs/TRIPLE"}}
+        "labels": {"description": "labels that differ", "$ref": "#/$defs/LABELS"},
+        "coordinates": {"description": "x, y and z of each node: lengths", "type": "array", "items": {"$ref": "#/$defs/TRIPLE"}}
       }
     },
     "ELEMENTS": {
@@ -125,121 +115,34 @@ constexpr char kFrame[] = R"({
       "additionalProperties": false,
       "required": ["type", "labels", "connectivity"],
       "properties": {
-        "type": {"$ref": "#/$defs/NAME"},
-        "labels": {"$ref": "#/$defs/LABELS"},
+        "type": {"description": "the element type, as the deck says it", "$ref": "#/$defs/NAME"},
+        "labels": {"description": "labels that differ in the whole mesh", "$ref": "#/$defs/LABELS"},
         "connectivity": {
+          "description": "the nodes of each element",
           "type": "array",
           "items": {"type": "array", "items": {"type": ["integer", "string"]}, "minItems": 1}
         },
-        "controls": {"$ref": "#/$defs/bme_ElemCtrlParams"}
-      }
-    },
-    "SET": {
-      "description": "A named set of a mesh.",
-      "type": "object",
-      "additionalProperties": false,
-      "required": ["name", "kind"],
-      "properties": {
-        "name": {"$ref": "#/$defs/NAME"},
-        "kind": {"enum": ["node", "element", "surface"]},
-        "internal": {"type": "boolean", "default": false},
-        "labels": {"$ref": "#/$defs/LABELS"},
-        "facets": {"$ref": "#/$defs/FACETS"}
-      }
-    },
-    "ASSEMBLY_SET": {
-      "description": "A named set of the assembly; a member without an instance lies in the assembly's own mesh.",
-      "type": "object",
-      "additionalProperties": false,
-      "required": ["name", "kind", "members"],
-      "properties": {
-        "name": {"$ref": "#/$defs/NAME"},
-        "kind": {"enum": ["node", "element", "surface"]},
-        "internal": {"type": "boolean", "default": false},
-        "members": {
-          "type": "array",
-          "items": {
-            "type": "object",
-            "additionalProperties": false,
-            "properties": {
-              "instance": {"$ref": "#/$defs/NAME"},
-              "labels": {"$ref": "#/$defs/LABELS"},
-              "facets": {"$ref": "#/$defs/FACETS"}
-            }
-          }
-        }
+        "controls": {"description": "element controls", "$ref": "#/$defs/bme_ElemCtrlParams"}
       }
     },
     "MESH": {
+      "description": "Nodes, elements and sets. Elements find their nodes by label, sets their members.",
       "type": "object",
       "additionalProperties": false,
       "properties": {
-        "nodes": {"$ref": "#/$defs/NODES"},
-        "elements": {"type": "array", "items": {"$ref": "#/$defs/ELEMENTS"}},
-        "sets": {"type": "array", "items": {"$ref": "#/$defs/SET"}}
+        "nodes": {"description": "the nodes in the order of the deck", "$ref": "#/$defs/NODES"},
+        "elements": {"description": "the elements type by type, in the order of the deck", "type": "array", "items": {"$ref": "#/$defs/ELEMENTS"}},
+        "sets": {"description": "node sets, element sets and surfaces", "type": "array", "items": {"$ref": "#/$defs/SET"}}
       }
     },
-    "PART": {
+    "MEMBERS": {
+      "description": "Members of a set of the assembly in one instance; without an instance, in the assembly's own mesh.",
       "type": "object",
       "additionalProperties": false,
       "properties": {
-        "solverInput": {"$ref": "#/$defs/TEXT"},
-        "mesh": {"$ref": "#/$defs/MESH"},
-        "sectionAssignments": {"type": "array", "items": {"$ref": "#/$defs/ptoC_SectionAssignment"}},
-        "materialOrientations": {"type": "array", "items": {"$ref": "#/$defs/ptoC_MaterialOrientation"}},
-        "beamOrientations": {"type": "array", "items": {"$ref": "#/$defs/ptoC_BeamOrientation"}}
-      }
-    },
-    "INSTANCE": {
-      "description": "An instance of a part. What it gives of its own takes the place of the part's.",
-      "type": "object",
-      "additionalProperties": false,
-      "properties": {
-        "part": {"$ref": "#/$defs/NAME"},
-        "partInstance": {"description": "false for an entry that is no part instance", "type": "boolean", "default": true},
-        "translation": {"description": "length, single precision", "$ref": "#/$defs/TRIPLE"},
-        "rotation": {"description": "rotation vector through the origin: its direction is the axis, its length the angle in radians; applied before the translation", "$ref": "#/$defs/TRIPLE"},
-        "solverInput": {"$ref": "#/$defs/TEXT"},
-        "mesh": {"$ref": "#/$defs/MESH"},
-        "sectionAssignments": {"type": "array", "items": {"$ref": "#/$defs/ptoC_SectionAssignment"}},
-        "materialOrientations": {"type": "array", "items": {"$ref": "#/$defs/ptoC_MaterialOrientation"}},
-        "beamOrientations": {"type": "array", "items": {"$ref": "#/$defs/ptoC_BeamOrientation"}}
-      }
-    },
-    "ASSEMBLY": {
-      "type": "object",
-      "additionalProperties": false,
-      "properties": {
-        "name": {"$ref": "#/$defs/NAME", "default": "Assembly"},
-        "solverInput": {"$ref": "#/$defs/TEXT"},
-        "instances": {"type": "object", "additionalProperties": {"$ref": "#/$defs/INSTANCE"}},
-        "mesh": {"$ref": "#/$defs/MESH"},
-        "sets": {"type": "array", "items": {"$ref": "#/$defs/ASSEMBLY_SET"}},
-        "sectionAssignments": {"type": "array", "items": {"$ref": "#/$defs/ptoC_SectionAssignment"}},
-        "connectorOrientations": {"type": "array", "items": {"$ref": "#/$defs/ptoC_ConnectorOrientation"}}
-      }
-    },
-    "MODEL": {
-      "type": "object",
-      "additionalProperties": false,
-      "properties": {
-        "description": {"description": "for people; never in the deck", "type": "string"},
-        "topLevelSolverInput": {"description": "opening text of the deck", "$ref": "#/$defs/TEXT"},
-        "solverInput": {"description": "text that closes the model section", "$ref": "#/$defs/TEXT"},
-        "absoluteZero": {"description": "absolute zero on the temperature scale in use", "type": "number", "default": 0},
-        "stefanBoltzmann": {"type": "number", "default": 0},
-        "waveFormulation": {"enum": ["NOT_SET", "SCATTERED", "TOTAL"], "default": "NOT_SET"},
-        "restartJob": {"type": "string"},
-        "restartStep": {"type": "string"},
-        "restartIncrement": {"$ref": "#/$defs/INT"},
-        "endRestartStep": {"type": "boolean"},
-        "globalJob": {"type": "string"},
-        "shellToSolid": {"type": "boolean"},
-        "analysisProduct": {"description": "without it EXPLICIT when an analysis step is explicit, else STANDARD", "anyOf": [{"enum": ["STANDARD", "IMPLICIT", "EXPLICIT"]}, {"type": "integer"}]},
-        "datums": {"type": "array", "items": {"$ref": "#/$defs/DATUM"}},
-        "parts": {"type": "object", "additionalProperties": {"$ref": "#/$defs/PART"}},
-        "assembly": {"$ref": "#/$defs/ASSEMBLY"},
-        "cyclicSymmetry": {"$ref": "#/$defs/ddb_ModelSectorDefinition"}
+        "instance": {"description": "the instance that they lie in", "$ref": "#/$defs/NAME"},
+        "labels": {"description": "nodes or elements", "$ref": "#/$defs/LABELS"},
+        "facets": {"description": "faces of elements", "$ref": "#/$defs/FACETS"}
       }
     }
   }
@@ -259,33 +162,17 @@ public:
     Json Make() {
         Json schema = Json::parse(kFrame);
         Json& definitions = schema["$defs"];
-        Json& model = definitions["MODEL"]["properties"];
-        const std::pair<const char*, unsigned> containers[] = {
-            {"materials", kmaC_Material::TypeId()},
-            {"sections", kseC_Section::TypeId()},
-            {"beamProfiles", kbpC_BeamProfile::TypeId()},
-            {"amplitudes", kamC_Amplitude::TypeId()},
-            {"constraints", kcoC_Constraint::TypeId()},
-            {"contactControls", kinC_ContactControls::TypeId()},
-            {"contactInitializations", kinC_ContactInitialization::TypeId()},
-            {"interactionProperties", kinC_InteractionProperty::TypeId()},
-            {"timePoints", kprC_TimePoint::TypeId()},
-            {"adaptiveMeshControls", kadC_AdptMeshCtrl::TypeId()},
-            {"boundaryConditions", kbcC_BC::TypeId()},
-            {"loads", kloC_Load::TypeId()},
-            {"fields", kpfC_Field::TypeId()},
-            {"interactions", kinC_Interaction::TypeId()},
-            {"fieldOutputRequests", korC_FieldOutput::TypeId()},
-            {"historyOutputRequests", korC_HistoryOutput::TypeId()},
-            {"adaptiveMeshConstraints", kprC_AdptMeshCons::TypeId()},
-        };
-        for (const auto& [member, base] : containers) {
-            model[member] = {{"type", "object"}, {"additionalProperties", VariantOf(base)}};
+        definitions["DATUM"] = FrameOf<odiK_Datum>();
+        definitions["SET"] = FrameOf<odiK_SetHead>();
+        definitions["ASSEMBLY_SET"] = FrameOf<odiK_SetHead>();
+        definitions["PART"] = FrameOf<odiK_Part>();
+        definitions["INSTANCE"] = FrameOf<odiK_Instance>();
+        definitions["ASSEMBLY"] = FrameOf<odiK_Assembly>();
+        definitions["MODEL"] = FrameOf<odiK_ModelData>();
+        AddMembersOfSets(definitions);
+        for (const odiK_Repository& repository : odiK_Repositories()) {
+            definitions["MODEL"]["properties"][repository.member] = RepositoryOf(repository);
         }
-        Json step = VariantOf(kprC_Step::TypeId());
-        model["steps"] = {{"description", "the first is the kprC_InitialStep, no other is one"},
-                          {"type", "array"},
-                          {"items", step}};
         for (const cls_ClassEntry& entry : cls_Classes().All()) {
             if (entry.create != nullptr) definitions[entry.info.name] = RecordOf(entry);
         }
@@ -293,6 +180,50 @@ public:
     }
 
 private:
+    static Json ArrayOf(const Json& item) { return {{"type", "array"}, {"items", item}}; }
+    static Json MapOf(const Json& item) { return {{"type", "object"}, {"additionalProperties", item}}; }
+
+    static void AddMembersOfSets(Json& definitions) {
+        const Json& members = definitions["MEMBERS"]["properties"];
+        for (const char* member : {"labels", "facets"})
+            definitions["SET"]["properties"][member] = members[member];
+        Json& set = definitions["ASSEMBLY_SET"];
+        set["properties"]["members"] = ArrayOf(Reference("MEMBERS"));
+        set["properties"]["members"]["description"] = "its members, instance by instance";
+        set["required"].push_back("members");
+    }
+
+    static Json RepositoryOf(const odiK_Repository& repository) {
+        const Json item = VariantOf(repository.ItemTypeId());
+        Json schema = repository.IsInOrder() ? ArrayOf(item) : MapOf(item);
+        schema["description"] = repository.IsInOrder() ? "the first is the kprC_InitialStep, no other is one"
+                                                       : std::string(repository.plural) + " by name";
+        if (!repository.ReachesDeck())
+            schema["description"] =
+                schema["description"].get<std::string>() + "; in no deck: " + repository.whyNotInDeck;
+        return schema;
+    }
+
+    /// An object of the frame, whose class is known by its place.
+    template <class T>
+    static Json FrameOf() {
+        const T byDefault;
+        return ObjectOf(T::Class.doc, T::Fields(), byDefault, Json::object(), Json::array());
+    }
+
+    static Json ObjectOf(const char* doc, const cls_FieldTable& fields, const cls_Record& byDefault,
+                         Json properties, Json required) {
+        for (const cls_Field& field : fields.All()) {
+            if (field.notModelData) continue;
+            properties[field.name] = FieldOf(field, byDefault);
+            if (field.required) required.push_back(field.name);
+        }
+        Json object = {{"description", doc}, {"type", "object"}, {"additionalProperties", false}};
+        if (!required.empty()) object["required"] = required;
+        object["properties"] = properties;
+        return object;
+    }
+
     static Json VariantOf(unsigned base) {
         Json choices = Json::array();
         for (const cls_ClassEntry* entry : cls_Classes().ConcreteClasses(base)) {
@@ -305,27 +236,20 @@ private:
 
     static Json RecordOf(const cls_ClassEntry& entry) {
         const std::unique_ptr<cls_Record> byDefault(entry.create());
-        Json record = {{"description", entry.info.doc}, {"type", "object"}, {"additionalProperties", false}};
         Json properties = Json::object();
         Json required = Json::array();
         // "class" may be left out where only one class is possible.
-        properties["class"] = {{"const", entry.info.name}};
+        properties["class"] = {{"description", "the class of the record"}, {"const", entry.info.name}};
         if (cls_Classes().InheritanceCheck(entry.info.Id(), kprC_Step::TypeId())) {
             properties["name"] = Reference("NAME");
+            properties["name"]["description"] = "the name of the step";
             required = {"name", "class"};
         }
-        for (const cls_Field& field : entry.fields().All()) {
-            if (field.notModelData) continue;
-            properties[field.name] = FieldOf(field, *byDefault);
-            if (field.required) required.push_back(field.name);
-        }
+        Json record = ObjectOf(entry.info.doc, entry.fields(), *byDefault, properties, required);
         if (const auto* object = nex_canDynamicCastPtr<kprC_PropagatingObject>(byDefault.get())) {
-            properties["states"] = {{"description", "states by the name of their step"},
-                                    {"type", "object"},
-                                    {"additionalProperties", StateOf(*object)}};
+            record["properties"]["states"] = MapOf(StateOf(*object));
+            record["properties"]["states"]["description"] = "states by the name of their step";
         }
-        if (!required.empty()) record["required"] = required;
-        record["properties"] = properties;
         return record;
     }
 
@@ -350,7 +274,7 @@ private:
             schema["default"] = nullptr;
         } else {
             const Json value = DefaultOf(*field.type, field.In(byDefault));
-            if (!value.is_null()) schema["default"] = value;
+            if (!value.is_null() && !field.required) schema["default"] = value;
         }
         if (field.refersTo != nullptr) {
             schema["description"] = std::string(field.doc) + " (name of a " + field.refersTo + ")";
@@ -386,6 +310,10 @@ private:
             const omu_EnumRow* row = enumeration.Table().Row(enumeration.Get(value));
             return row == nullptr ? Json() : Json(row->name);
         }
+        case cls_FieldKind::String: {
+            const auto& text = *static_cast<const cow_String*>(value);
+            return text.IsEmpty() ? Json() : Json(text.View());
+        }
         default: return {};
         }
     }
@@ -409,13 +337,13 @@ private:
         }
         case cls_FieldKind::Double:
         case cls_FieldKind::Float: return {{"type", "number"}};
-        case cls_FieldKind::String:
-            return field != nullptr && field->verbatim ? Reference("TEXT") : Json{{"type", "string"}};
+        case cls_FieldKind::String: return StringOf(field);
         case cls_FieldKind::Enum: {
             Json values = Json::array();
             for (const omu_EnumRow& row : static_cast<const cls_EnumType&>(type).Table().rows) {
                 values.push_back(row.name);
             }
+            if (field != nullptr && field->wordsOnly) return {{"enum", values}};
             // Any capitals, the texts and the numbers are taken too.
             return {{"anyOf", {{{"enum", values}}, {{"type", "string"}}, {{"type", "integer"}}}}};
         }
@@ -453,6 +381,30 @@ private:
                        {"required", {"state"}},
                        {"properties", {{"value", value}, {"state", state}}}}}}};
         }
+        case cls_FieldKind::Tree: return TreeOf(type, *field);
+        }
+        return {};
+    }
+
+    static Json StringOf(const cls_Field* field) {
+        if (field != nullptr && field->verbatim) return Reference("TEXT");
+        if (field != nullptr && field->nameOf != nullptr) return Reference("NAME");
+        if (field != nullptr && !field->words.empty()) return {{"enum", field->words}};
+        return {{"type", "string"}};
+    }
+
+    static Json TreeOf(const cls_FieldType& type, const cls_Field& field) {
+        switch (static_cast<const cls_TreeType&>(type).Part()) {
+        case cls_TreeEnm::Datums: return ArrayOf(Reference("DATUM"));
+        case cls_TreeEnm::Parts: return MapOf(Reference("PART"));
+        case cls_TreeEnm::Assembly: return Reference("ASSEMBLY");
+        case cls_TreeEnm::Instances: return MapOf(Reference("INSTANCE"));
+        case cls_TreeEnm::Mesh:
+        case cls_TreeEnm::AssemblyMesh: return Reference("MESH");
+        case cls_TreeEnm::AssemblySets: return ArrayOf(Reference("ASSEMBLY_SET"));
+        case cls_TreeEnm::Attributes:
+        case cls_TreeEnm::OwnAttributes:
+        case cls_TreeEnm::AssemblyAttributes: return ArrayOf(Reference(field.refersToClass->name));
         }
         return {};
     }

@@ -2,8 +2,6 @@
 
 #include "model_file/mdf_ValueData.h"
 
-#include <algorithm>
-#include <numeric>
 #include <stdexcept>
 #include <utility>
 
@@ -24,207 +22,30 @@ const char* mdf_KindText(mdf_Kind kind) {
     return "a value";
 }
 
-mdf_Numbers::mdf_Numbers(const mdf_Numbers& other)
-    : allInts(other.allInts), ints(other.ints), reals(other.reals), firstReal(other.firstReal),
-      marks(other.marks ? std::make_unique<Marks>(*other.marks) : nullptr) {}
+// Documents have as many values as a file has texts and single numbers.
+static_assert(sizeof(mdf_Value) == 2 * sizeof(void*));
 
-void mdf_Numbers::Reserve(std::size_t size) {
-    if (allInts)
-        ints.reserve(size);
-    else
-        reals.reserve(size);
-}
+mdf_Value::mdf_Value() noexcept = default;
+mdf_Value::mdf_Value(bool value) noexcept : data_(value) {}
+mdf_Value::mdf_Value(int value) noexcept : data_(value) {}
+mdf_Value::mdf_Value(double value) noexcept : data_(value) {}
+mdf_Value::mdf_Value(std::string_view text) : data_(std::make_unique<std::string>(text)) {}
+mdf_Value::mdf_Value(std::string&& text) : data_(std::make_unique<std::string>(std::move(text))) {}
+mdf_Value::mdf_Value(Data&& data) noexcept : data_(std::move(data)) {}
+mdf_Value::~mdf_Value() = default;
 
-namespace {
-
-void Mark(std::vector<bool>& bits, std::size_t index) {
-    if (bits.size() <= index) bits.resize(index + 1);
-    bits[index] = true;
-}
-
-bool IsMarked(const std::vector<bool>& bits, std::size_t index) {
-    return index < bits.size() && bits[index];
-}
-
-} // namespace
-
-void mdf_Numbers::AddInt(int value) {
-    if (allInts) {
-        ints.push_back(value);
-        return;
-    }
-    if (!marks) marks = std::make_unique<Marks>();
-    Mark(marks->isInt, reals.size());
-    reals.push_back(value);
-}
-
-void mdf_Numbers::AddReal(double value, bool isLarge) {
-    if (allInts) {
-        allInts = false;
-        firstReal = ints.size();
-        reals.reserve(std::max(ints.capacity(), firstReal + 1));
-        reals.assign(ints.begin(), ints.end());
-        ints = {};
-    }
-    if (isLarge) {
-        if (!marks) marks = std::make_unique<Marks>();
-        Mark(marks->isLarge, reals.size());
-    }
-    reals.push_back(value);
-}
-
-mdf_Value mdf_Numbers::At(std::size_t index) const {
-    if (allInts) return mdf_Value(ints[index]);
-    const double value = reals[index];
-    if (index < firstReal || (marks && IsMarked(marks->isInt, index)))
-        return mdf_Value(static_cast<int>(value));
-    mdf_Value item(value);
-    item.largeInteger_ = marks && IsMarked(marks->isLarge, index);
-    return item;
-}
-
-mdf_Value mdf_Numbers::Slice(std::size_t begin, std::size_t end) const {
-    auto numbers = std::make_unique<mdf_Numbers>();
-    if (allInts) {
-        numbers->ints.assign(ints.begin() + static_cast<std::ptrdiff_t>(begin),
-                             ints.begin() + static_cast<std::ptrdiff_t>(end));
-    } else {
-        for (std::size_t i = begin; i < end; ++i) {
-            const mdf_Value item = At(i);
-            if (item.IsInt())
-                numbers->AddInt(item.Int());
-            else
-                numbers->AddReal(item.Real(), item.IsLargeInteger());
+mdf_Value::mdf_Value(const mdf_Value& other) {
+    const auto copy = [this]<class T>(const T& held) {
+        if constexpr (std::is_copy_constructible_v<T>) {
+            data_ = held;
+        } else {
+            data_ = std::make_unique<typename T::element_type>(*held);
         }
-    }
-    mdf_Value slice;
-    slice.kind_ = numbers->allInts ? mdf_Kind::IntArray : mdf_Kind::RealArray;
-    slice.numbers_ = numbers.release();
-    return slice;
-}
-
-void mdf_Numbers::Truncate(std::size_t size) {
-    if (allInts) {
-        ints.resize(size);
-        return;
-    }
-    if (size > firstReal) {
-        reals.resize(size);
-        if (!marks) return;
-        marks->isInt.resize(std::min(size, marks->isInt.size()));
-        marks->isLarge.resize(std::min(size, marks->isLarge.size()));
-        return;
-    }
-    ints.clear();
-    for (std::size_t i = 0; i < size; ++i) ints.push_back(static_cast<int>(reals[i]));
-    allInts = true;
-    reals = {};
-    firstReal = 0;
-    marks.reset();
-}
-
-void mdf_Rows::CloseRow() {
-    const std::size_t begin = count == 0 ? 0 : End(count - 1);
-    const std::size_t end = numbers.Size();
-    if (count == 0) {
-        length = end;
-    } else if (!ends.empty()) {
-        ends.push_back(end);
-    } else if (end - begin != length) {
-        ends.reserve(count + 1);
-        for (std::size_t row = 0; row < count; ++row) ends.push_back((row + 1) * length);
-        ends.push_back(end);
-    }
-    ++count;
-}
-
-void mdf_Facets::AddName(std::string_view name) {
-    Mark(isNamed, Count());
-    auto found = indices.find(name);
-    if (found == indices.end()) {
-        found = indices.emplace(name, static_cast<int>(names.size())).first;
-        names.emplace_back(name);
-    }
-    pairs.push_back(found->second);
-}
-
-namespace {
-constexpr std::size_t fewMembers = 8;
-}
-
-std::vector<std::string> mdf_ObjectData::Index() {
-    const auto before = [this](std::uint32_t a, std::uint32_t b) {
-        const int sign = members[a].name.compare(members[b].name);
-        return sign != 0 ? sign < 0 : a < b;
     };
-    const auto sort = [&] {
-        order.resize(members.size());
-        std::iota(order.begin(), order.end(), 0u);
-        std::sort(order.begin(), order.end(), before);
-    };
-    sort();
-    std::vector<std::uint32_t> repeated;
-    for (std::size_t i = 1; i < order.size(); ++i) {
-        if (members[order[i]].name == members[order[i - 1]].name) repeated.push_back(order[i]);
-    }
-    std::vector<std::string> names;
-    if (!repeated.empty()) {
-        std::sort(repeated.begin(), repeated.end());
-        std::vector<mdf_Member> kept;
-        auto next = repeated.begin();
-        for (std::uint32_t i = 0; i < members.size(); ++i) {
-            if (next != repeated.end() && *next == i) {
-                names.push_back(std::move(members[i].name));
-                ++next;
-            } else {
-                kept.push_back(std::move(members[i]));
-            }
-        }
-        members = std::move(kept);
-        sort();
-    }
-    if (members.size() <= fewMembers) order = {};
-    return names;
+    std::visit(copy, other.data_);
 }
 
-const mdf_Member* mdf_ObjectData::Find(std::string_view name) const {
-    if (order.empty()) {
-        const auto found = std::find_if(members.begin(), members.end(),
-                                        [&](const mdf_Member& member) { return member.name == name; });
-        return found == members.end() ? nullptr : &*found;
-    }
-    const auto found =
-        std::lower_bound(order.begin(), order.end(), name,
-                         [this](std::uint32_t i, std::string_view n) { return members[i].name < n; });
-    return found != order.end() && members[*found].name == name ? &members[*found] : nullptr;
-}
-
-mdf_Value::mdf_Value(std::string_view text) : kind_(mdf_Kind::String), string_(new std::string(text)) {}
-
-mdf_Value::mdf_Value(std::string&& text)
-    : kind_(mdf_Kind::String), string_(new std::string(std::move(text))) {}
-
-mdf_Value::mdf_Value(const mdf_Value& other) : mdf_Value() {
-    switch (other.kind_) {
-    case mdf_Kind::Null: break;
-    case mdf_Kind::Bool: bool_ = other.bool_; break;
-    case mdf_Kind::Int: int_ = other.int_; break;
-    case mdf_Kind::Real: real_ = other.real_; break;
-    case mdf_Kind::String: string_ = new std::string(*other.string_); break;
-    case mdf_Kind::Array: array_ = new std::vector<mdf_Value>(*other.array_); break;
-    case mdf_Kind::Object: object_ = new mdf_ObjectData(*other.object_); break;
-    case mdf_Kind::IntArray:
-    case mdf_Kind::RealArray: numbers_ = new mdf_Numbers(*other.numbers_); break;
-    case mdf_Kind::Matrix: rows_ = new mdf_Rows(*other.rows_); break;
-    case mdf_Kind::FacetArray: facets_ = new mdf_Facets(*other.facets_); break;
-    }
-    kind_ = other.kind_;
-    largeInteger_ = other.largeInteger_;
-}
-
-mdf_Value::mdf_Value(mdf_Value&& other) noexcept : mdf_Value() {
-    *this = std::move(other);
-}
+mdf_Value::mdf_Value(mdf_Value&& other) noexcept : data_(std::exchange(other.data_, Data())) {}
 
 mdf_Value& mdf_Value::operator=(const mdf_Value& other) {
     if (this != &other) *this = mdf_Value(other);
@@ -232,173 +53,117 @@ mdf_Value& mdf_Value::operator=(const mdf_Value& other) {
 }
 
 mdf_Value& mdf_Value::operator=(mdf_Value&& other) noexcept {
-    if (this == &other) return *this;
     // The other may be an item of this one, so it is emptied before this one is released.
-    mdf_Value old;
-    const auto carry = [](mdf_Value& to, mdf_Value& from) {
-        to.kind_ = std::exchange(from.kind_, mdf_Kind::Null);
-        to.largeInteger_ = std::exchange(from.largeInteger_, false);
-        switch (to.kind_) {
-        case mdf_Kind::Null: break;
-        case mdf_Kind::Bool: to.bool_ = from.bool_; break;
-        case mdf_Kind::Int: to.int_ = from.int_; break;
-        case mdf_Kind::Real: to.real_ = from.real_; break;
-        case mdf_Kind::String: to.string_ = from.string_; break;
-        case mdf_Kind::Array: to.array_ = from.array_; break;
-        case mdf_Kind::Object: to.object_ = from.object_; break;
-        case mdf_Kind::IntArray:
-        case mdf_Kind::RealArray: to.numbers_ = from.numbers_; break;
-        case mdf_Kind::Matrix: to.rows_ = from.rows_; break;
-        case mdf_Kind::FacetArray: to.facets_ = from.facets_; break;
-        }
-    };
-    carry(old, *this);
-    carry(*this, other);
+    Data taken = std::exchange(other.data_, Data());
+    std::swap(data_, taken);
     return *this;
 }
 
-mdf_Value::~mdf_Value() {
-    Release();
-}
-
-void mdf_Value::Release() noexcept {
-    switch (std::exchange(kind_, mdf_Kind::Null)) {
-    case mdf_Kind::Null:
-    case mdf_Kind::Bool:
-    case mdf_Kind::Int:
-    case mdf_Kind::Real: break;
-    case mdf_Kind::String: delete string_; break;
-    case mdf_Kind::Array: delete array_; break;
-    case mdf_Kind::Object: delete object_; break;
-    case mdf_Kind::IntArray:
-    case mdf_Kind::RealArray: delete numbers_; break;
-    case mdf_Kind::Matrix: delete rows_; break;
-    case mdf_Kind::FacetArray: delete facets_; break;
-    }
-    largeInteger_ = false;
+mdf_Kind mdf_Value::Kind() const {
+    if (const mdf_Numbers* numbers = As<mdf_Numbers>())
+        return numbers->allInts ? mdf_Kind::IntArray : mdf_Kind::RealArray;
+    static constexpr mdf_Kind kinds[] = {mdf_Kind::Null,   mdf_Kind::Bool,      mdf_Kind::Int,
+                                         mdf_Kind::Real,   mdf_Kind::Real,      mdf_Kind::String,
+                                         mdf_Kind::Array,  mdf_Kind::Object,    mdf_Kind::IntArray,
+                                         mdf_Kind::Matrix, mdf_Kind::FacetArray};
+    static_assert(std::size(kinds) == std::variant_size_v<Data>);
+    return kinds[data_.index()];
 }
 
 void mdf_Value::RaiseMismatch(const char* wanted) const {
     throw std::logic_error(std::string("a value was asked for ") + wanted + " but is " + KindText());
 }
 
-void mdf_Value::Expect(mdf_Kind kind) const {
-    if (kind_ != kind) RaiseMismatch(mdf_KindText(kind));
-}
-
 const mdf_Numbers& mdf_Value::Numbers() const {
-    if (kind_ == mdf_Kind::Matrix) return rows_->numbers;
-    if (kind_ != mdf_Kind::IntArray && kind_ != mdf_Kind::RealArray) RaiseMismatch("an array of numbers");
-    return *numbers_;
-}
-
-const mdf_Rows& mdf_Value::Rows() const {
-    Expect(mdf_Kind::Matrix);
-    return *rows_;
+    if (const mdf_Rows* rows = As<mdf_Rows>()) return rows->numbers;
+    return Get<mdf_Numbers>("an array of numbers");
 }
 
 const mdf_Rows& mdf_Value::Rows(std::size_t row) const {
-    if (row >= Rows().count) throw std::logic_error("a row beyond the end was asked for");
-    return *rows_;
+    const auto& rows = Get<mdf_Rows>(mdf_KindText(mdf_Kind::Matrix));
+    if (row >= rows.count) throw std::logic_error("a row beyond the end was asked for");
+    return rows;
 }
 
 const mdf_Facets& mdf_Value::FacetRow(std::size_t row) const {
-    Expect(mdf_Kind::FacetArray);
-    if (row >= facets_->Count()) throw std::logic_error("a facet beyond the end was asked for");
-    return *facets_;
+    const auto& facets = Get<mdf_Facets>(mdf_KindText(mdf_Kind::FacetArray));
+    if (row >= facets.Count()) throw std::logic_error("a facet beyond the end was asked for");
+    return facets;
 }
 
 bool mdf_Value::Bool() const {
-    Expect(mdf_Kind::Bool);
-    return bool_;
+    if (!IsBool()) RaiseMismatch(mdf_KindText(mdf_Kind::Bool));
+    return *std::get_if<bool>(&data_);
 }
 
 int mdf_Value::Int() const {
-    Expect(mdf_Kind::Int);
-    return int_;
+    if (!IsInt()) RaiseMismatch(mdf_KindText(mdf_Kind::Int));
+    return *std::get_if<int>(&data_);
 }
 
 double mdf_Value::Real() const {
-    if (kind_ == mdf_Kind::Int) return int_;
-    Expect(mdf_Kind::Real);
-    return real_;
+    if (const double* real = std::get_if<double>(&data_)) return *real;
+    if (const Large* large = std::get_if<Large>(&data_)) return large->value;
+    if (!IsInt()) RaiseMismatch(mdf_KindText(mdf_Kind::Real));
+    return Int();
 }
 
 const std::string& mdf_Value::String() const {
-    Expect(mdf_Kind::String);
-    return *string_;
+    return Get<std::string>(mdf_KindText(mdf_Kind::String));
 }
 
 std::string mdf_Value::TakeString() {
-    Expect(mdf_Kind::String);
-    std::string text = std::move(*string_);
-    Release();
+    std::string text = std::move(Get<std::string>(mdf_KindText(mdf_Kind::String)));
+    data_ = {};
     return text;
 }
 
 std::size_t mdf_Value::Size() const {
-    switch (kind_) {
-    case mdf_Kind::Null:
-    case mdf_Kind::Bool:
-    case mdf_Kind::Int:
-    case mdf_Kind::Real:
-    case mdf_Kind::String: return 0;
-    case mdf_Kind::Array: return array_->size();
-    case mdf_Kind::Object: return object_->members.size();
-    case mdf_Kind::IntArray:
-    case mdf_Kind::RealArray: return numbers_->Size();
-    case mdf_Kind::Matrix: return rows_->count;
-    case mdf_Kind::FacetArray: return facets_->Count();
-    }
-    return 0;
+    if (const auto* items = As<std::vector<mdf_Value>>()) return items->size();
+    if (const mdf_ObjectData* object = As<mdf_ObjectData>()) return object->members.size();
+    if (const mdf_Numbers* numbers = As<mdf_Numbers>()) return numbers->Size();
+    if (const mdf_Rows* rows = As<mdf_Rows>()) return rows->count;
+    const mdf_Facets* facets = As<mdf_Facets>();
+    return facets == nullptr ? 0 : facets->Count();
 }
 
 mdf_Value mdf_Value::Item(std::size_t index) const {
     if (!IsArray()) RaiseMismatch("an array");
     if (index >= Size()) throw std::logic_error("an item beyond the end was asked for");
-    if (kind_ == mdf_Kind::Array) return (*array_)[index];
-    if (kind_ == mdf_Kind::Matrix) return rows_->numbers.Slice(rows_->Begin(index), rows_->End(index));
-    if (kind_ != mdf_Kind::FacetArray) return numbers_->At(index);
-    mdf_Value row;
-    if (facets_->IsNamed(index)) {
-        auto items = std::make_unique<std::vector<mdf_Value>>();
-        items->emplace_back(FacetLabel(index));
-        items->emplace_back(FacetName(index));
-        row.array_ = items.release();
-        row.kind_ = mdf_Kind::Array;
-    } else {
-        auto numbers = std::make_unique<mdf_Numbers>();
-        numbers->AddInt(FacetLabel(index));
-        numbers->AddInt(FacetId(index));
-        row.numbers_ = numbers.release();
-        row.kind_ = mdf_Kind::IntArray;
+    if (const auto* items = As<std::vector<mdf_Value>>()) return (*items)[index];
+    if (const mdf_Rows* rows = As<mdf_Rows>())
+        return rows->numbers.Slice(rows->Begin(index), rows->End(index));
+    if (const mdf_Numbers* numbers = As<mdf_Numbers>()) return numbers->At(index);
+    if (FacetHasName(index)) {
+        std::vector<mdf_Value> items;
+        items.emplace_back(FacetLabel(index));
+        items.emplace_back(FacetName(index));
+        return Of(std::move(items));
     }
-    return row;
+    mdf_Numbers numbers;
+    numbers.AddInt(FacetLabel(index));
+    numbers.AddInt(FacetId(index));
+    return Of(std::move(numbers));
 }
 
 const std::vector<mdf_Value>& mdf_Value::Items() const {
-    Expect(mdf_Kind::Array);
-    return *array_;
+    return Get<std::vector<mdf_Value>>(mdf_KindText(mdf_Kind::Array));
 }
 
 std::vector<mdf_Value>& mdf_Value::Items() {
-    Expect(mdf_Kind::Array);
-    return *array_;
+    return Get<std::vector<mdf_Value>>(mdf_KindText(mdf_Kind::Array));
 }
 
 std::span<const mdf_Member> mdf_Value::Members() const {
-    Expect(mdf_Kind::Object);
-    return object_->members;
+    return Get<mdf_ObjectData>(mdf_KindText(mdf_Kind::Object)).members;
 }
 
 std::span<mdf_Member> mdf_Value::Members() {
-    Expect(mdf_Kind::Object);
-    return object_->members;
+    return Get<mdf_ObjectData>(mdf_KindText(mdf_Kind::Object)).members;
 }
 
 const mdf_Value* mdf_Value::Find(std::string_view name) const {
-    Expect(mdf_Kind::Object);
-    const mdf_Member* member = object_->Find(name);
+    const mdf_Member* member = Get<mdf_ObjectData>(mdf_KindText(mdf_Kind::Object)).Find(name);
     return member == nullptr ? nullptr : &member->value;
 }
 
@@ -407,7 +172,9 @@ mdf_Value* mdf_Value::Find(std::string_view name) {
 }
 
 bool mdf_Value::AllInts() const {
-    return (kind_ == mdf_Kind::IntArray || kind_ == mdf_Kind::Matrix) && Numbers().allInts;
+    if (const mdf_Numbers* numbers = As<mdf_Numbers>()) return numbers->allInts;
+    const mdf_Rows* rows = As<mdf_Rows>();
+    return rows != nullptr && rows->numbers.allInts;
 }
 
 std::span<const int> mdf_Value::Ints() const {
@@ -428,7 +195,7 @@ std::size_t mdf_Value::FirstReal() const {
 }
 
 int mdf_Value::UniformRowLength() const {
-    const mdf_Rows& rows = Rows();
+    const auto& rows = Get<mdf_Rows>(mdf_KindText(mdf_Kind::Matrix));
     return rows.ends.empty() ? static_cast<int>(rows.length) : -1;
 }
 
@@ -441,35 +208,37 @@ std::size_t mdf_Value::RowBegin(std::size_t row) const {
 }
 
 std::vector<int> mdf_Value::TakeInts() {
-    Expect(mdf_Kind::IntArray);
-    std::vector<int> ints = std::move(numbers_->ints);
-    Release();
+    auto& numbers = Get<mdf_Numbers>(mdf_KindText(mdf_Kind::IntArray));
+    if (!numbers.allInts) RaiseMismatch(mdf_KindText(mdf_Kind::IntArray));
+    std::vector<int> ints = std::move(numbers.ints);
+    data_ = {};
     return ints;
 }
 
 std::vector<double> mdf_Value::TakeReals() {
-    if (kind_ != mdf_Kind::IntArray) Expect(mdf_Kind::RealArray);
-    std::vector<double> reals = std::move(numbers_->reals);
-    if (numbers_->allInts) reals.assign(numbers_->ints.begin(), numbers_->ints.end());
-    Release();
+    auto& numbers = Get<mdf_Numbers>(mdf_KindText(mdf_Kind::RealArray));
+    std::vector<double> reals = std::move(numbers.reals);
+    if (numbers.allInts) reals.assign(numbers.ints.begin(), numbers.ints.end());
+    data_ = {};
     return reals;
 }
 
 mdf_MatrixData mdf_Value::TakeMatrix() {
     mdf_MatrixData data;
-    if (kind_ != mdf_Kind::IntArray || !Empty()) {
-        Expect(mdf_Kind::Matrix);
-        data.rows = rows_->count;
+    const bool isEmpty = Kind() == mdf_Kind::IntArray && Empty();
+    if (!isEmpty) {
+        auto& rows = Get<mdf_Rows>(mdf_KindText(mdf_Kind::Matrix));
+        data.rows = rows.count;
         data.rowLength = UniformRowLength();
         if (data.rowLength < 0) {
             data.rowLengths.reserve(data.rows);
             for (std::size_t row = 0; row < data.rows; ++row)
                 data.rowLengths.push_back(static_cast<int>(RowLength(row)));
         }
-        data.ints = std::move(rows_->numbers.ints);
-        data.reals = std::move(rows_->numbers.reals);
+        data.ints = std::move(rows.numbers.ints);
+        data.reals = std::move(rows.numbers.reals);
     }
-    Release();
+    data_ = {};
     return data;
 }
 
@@ -490,12 +259,11 @@ int mdf_Value::FacetId(std::size_t row) const {
 std::string_view mdf_Value::FacetName(std::size_t row) const {
     const int index = FacetNameIndex(row);
     if (index < 0) throw std::logic_error("the name of a facet that has a number was asked for");
-    return facets_->names[static_cast<std::size_t>(index)];
+    return FacetNames()[static_cast<std::size_t>(index)];
 }
 
 const std::vector<std::string>& mdf_Value::FacetNames() const {
-    Expect(mdf_Kind::FacetArray);
-    return facets_->names;
+    return Get<mdf_Facets>(mdf_KindText(mdf_Kind::FacetArray)).names;
 }
 
 int mdf_Value::FacetNameIndex(std::size_t row) const {
@@ -505,12 +273,10 @@ int mdf_Value::FacetNameIndex(std::size_t row) const {
 
 void mdf_Value::Generalise() {
     if (!IsArray()) RaiseMismatch("an array");
-    if (kind_ == mdf_Kind::Array) return;
-    auto items = std::make_unique<std::vector<mdf_Value>>();
+    if (As<std::vector<mdf_Value>>() != nullptr) return;
+    std::vector<mdf_Value> items;
     const std::size_t size = Size();
-    items->reserve(size + 1);
-    for (std::size_t i = 0; i < size; ++i) items->push_back(Item(i));
-    Release();
-    array_ = items.release();
-    kind_ = mdf_Kind::Array;
+    items.reserve(size + 1);
+    for (std::size_t i = 0; i < size; ++i) items.push_back(Item(i));
+    *this = Of(std::move(items));
 }

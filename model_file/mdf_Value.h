@@ -3,9 +3,11 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <memory>
 #include <span>
 #include <string>
 #include <string_view>
+#include <variant>
 #include <vector>
 
 struct mdf_Numbers;
@@ -47,10 +49,10 @@ struct mdf_MatrixData {
 /// std::logic_error: a reader asks for the kind first.
 class mdf_Value {
 public:
-    mdf_Value() noexcept : real_(0.0) {}
-    explicit mdf_Value(bool value) noexcept : kind_(mdf_Kind::Bool), bool_(value) {}
-    explicit mdf_Value(int value) noexcept : kind_(mdf_Kind::Int), int_(value) {}
-    explicit mdf_Value(double value) noexcept : kind_(mdf_Kind::Real), real_(value) {}
+    mdf_Value() noexcept;
+    explicit mdf_Value(bool value) noexcept;
+    explicit mdf_Value(int value) noexcept;
+    explicit mdf_Value(double value) noexcept;
     explicit mdf_Value(std::string_view text);
     explicit mdf_Value(const char* text) : mdf_Value(std::string_view(text)) {}
     explicit mdf_Value(std::string&& text);
@@ -60,23 +62,26 @@ public:
     mdf_Value& operator=(mdf_Value&& other) noexcept;
     ~mdf_Value();
 
-    mdf_Kind Kind() const { return kind_; }
-    const char* KindText() const { return mdf_KindText(kind_); }
-    bool IsNull() const { return kind_ == mdf_Kind::Null; }
-    bool IsBool() const { return kind_ == mdf_Kind::Bool; }
-    bool IsInt() const { return kind_ == mdf_Kind::Int; }
-    bool IsNumber() const { return kind_ == mdf_Kind::Int || kind_ == mdf_Kind::Real; }
-    bool IsString() const { return kind_ == mdf_Kind::String; }
-    bool IsObject() const { return kind_ == mdf_Kind::Object; }
+    mdf_Kind Kind() const;
+    const char* KindText() const { return mdf_KindText(Kind()); }
+    bool IsNull() const { return std::holds_alternative<std::monostate>(data_); }
+    bool IsBool() const { return std::holds_alternative<bool>(data_); }
+    bool IsInt() const { return std::holds_alternative<int>(data_); }
+    bool IsNumber() const { return IsInt() || std::holds_alternative<double>(data_) || IsLargeInteger(); }
+    bool IsString() const { return As<std::string>() != nullptr; }
+    bool IsObject() const { return As<mdf_ObjectData>() != nullptr; }
     /// True for the general and every compact form.
-    bool IsArray() const { return kind_ == mdf_Kind::Array || kind_ >= mdf_Kind::IntArray; }
+    bool IsArray() const {
+        return As<std::vector<mdf_Value>>() != nullptr || As<mdf_Numbers>() != nullptr ||
+               As<mdf_Rows>() != nullptr || As<mdf_Facets>() != nullptr;
+    }
 
     bool Bool() const;
     int Int() const;
     /// The number, of an Int too.
     double Real() const;
     /// A Real that was written without fraction and exponent but doesn't fit 32 bits.
-    bool IsLargeInteger() const { return kind_ == mdf_Kind::Real && largeInteger_; }
+    bool IsLargeInteger() const { return std::holds_alternative<Large>(data_); }
     const std::string& String() const;
     std::string TakeString();
 
@@ -136,27 +141,39 @@ private:
     friend class mdf_Builder;
     friend struct mdf_Numbers;
 
-    void Release() noexcept;
+    struct Large {
+        double value;
+    };
+    template <class T>
+    using Own = std::unique_ptr<T>;
+    using Data =
+        std::variant<std::monostate, bool, int, double, Large, Own<std::string>, Own<std::vector<mdf_Value>>,
+                     Own<mdf_ObjectData>, Own<mdf_Numbers>, Own<mdf_Rows>, Own<mdf_Facets>>;
+
+    explicit mdf_Value(Data&& data) noexcept;
+    /// A value of a compound kind.
+    template <class T>
+    static mdf_Value Of(T content);
+    /// What the value holds, or null when that is something else.
+    template <class T>
+    T* As() const {
+        const Own<T>* own = std::get_if<Own<T>>(&data_);
+        return own == nullptr ? nullptr : own->get();
+    }
+    /// The same; raises when it is something else.
+    template <class T>
+    T& Get(const char* wanted) const {
+        T* held = As<T>();
+        if (held == nullptr) RaiseMismatch(wanted);
+        return *held;
+    }
+
     [[noreturn]] void RaiseMismatch(const char* wanted) const;
-    void Expect(mdf_Kind kind) const;
     const mdf_Numbers& Numbers() const;
-    const mdf_Rows& Rows() const;
     const mdf_Rows& Rows(std::size_t row) const;
     const mdf_Facets& FacetRow(std::size_t row) const;
 
-    mdf_Kind kind_ = mdf_Kind::Null;
-    bool largeInteger_ = false;
-    union {
-        bool bool_;
-        int int_;
-        double real_;
-        std::string* string_;
-        std::vector<mdf_Value>* array_;
-        mdf_ObjectData* object_;
-        mdf_Numbers* numbers_;
-        mdf_Rows* rows_;
-        mdf_Facets* facets_;
-    };
+    Data data_;
 };
 
 struct mdf_Member {

@@ -7,7 +7,6 @@
 #include <cstdint>
 #include <functional>
 #include <map>
-#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -30,6 +29,7 @@ struct mdf_Numbers {
 
     mdf_Numbers() = default;
     mdf_Numbers(const mdf_Numbers& other);
+    mdf_Numbers(mdf_Numbers&& other) = default;
 
     std::size_t Size() const { return allInts ? ints.size() : reals.size(); }
     bool Full() const { return allInts ? ints.size() == ints.capacity() : reals.size() == reals.capacity(); }
@@ -82,5 +82,10 @@ struct mdf_ObjectData {
     std::vector<std::string> Index();
     const mdf_Member* Find(std::string_view name) const;
 };
+
+template <class T>
+mdf_Value mdf_Value::Of(T content) {
+    return mdf_Value(Data(std::make_unique<T>(std::move(content))));
+}
 
 #endif

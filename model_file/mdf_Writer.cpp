@@ -1,5 +1,7 @@
 #include "model_file/mdf_Writer.h"
 
+#include "model_file/mdf_Utf8.h"
+
 #include <algorithm>
 #include <array>
 #include <charconv>
@@ -13,22 +15,6 @@ constexpr std::size_t wrapColumn = 100;
 constexpr std::size_t bufferSize = 1 << 16;
 
 } // namespace
-
-std::size_t mdf_Utf8Length(std::string_view text) {
-    if (text.empty()) return 0;
-    const auto byte = [&](std::size_t i) { return static_cast<unsigned char>(text[i]); };
-    const unsigned char lead = byte(0);
-    if (lead < 0x80) return 1;
-    const std::size_t length = lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : 2;
-    if (lead < 0xC2 || lead > 0xF4 || text.size() < length) return 0;
-    for (std::size_t i = 1; i < length; ++i) {
-        if ((byte(i) & 0xC0) != 0x80) return 0;
-    }
-    const bool overlong = (lead == 0xE0 && byte(1) < 0xA0) || (lead == 0xF0 && byte(1) < 0x90);
-    const bool surrogate = lead == 0xED && byte(1) > 0x9F;
-    const bool beyond = lead == 0xF4 && byte(1) > 0x8F;
-    return overlong || surrogate || beyond ? 0 : length;
-}
 
 void mdf_Writer::NewLine(std::size_t depth) {
     text_ += '\n';
@@ -115,12 +101,29 @@ void mdf_Writer::Int(int value) {
 void mdf_Writer::Real(double value) {
     if (!std::isfinite(value)) throw std::invalid_argument("a number that is not finite has no text in JSON");
     std::array<char, 40> digits;
+    RealText(digits.data(), std::to_chars(digits.data(), digits.data() + digits.size() - 2, value).ptr);
+}
+
+void mdf_Writer::Real(float value) {
+    std::array<char, 40> digits;
     char* end = std::to_chars(digits.data(), digits.data() + digits.size() - 2, value).ptr;
-    if (std::none_of(digits.data(), end, [](char c) { return c == '.' || c == 'e'; })) {
+    double read = 0.0;
+    const bool isRead = std::from_chars(digits.data(), end, read).ec == std::errc();
+    // A text half way between two floats may round to the other one.
+    if (isRead && std::isfinite(value) && static_cast<float>(read) == value) {
+        RealText(digits.data(), end);
+    } else {
+        Real(static_cast<double>(value));
+    }
+}
+
+/// The text from `begin` to `end`, which has room for two characters behind it.
+void mdf_Writer::RealText(char* begin, char* end) {
+    if (std::none_of(begin, end, [](char c) { return c == '.' || c == 'e'; })) {
         *end++ = '.';
         *end++ = '0';
     }
-    Scalar({digits.data(), static_cast<std::size_t>(end - digits.data())});
+    Scalar({begin, static_cast<std::size_t>(end - begin)});
 }
 
 void mdf_Writer::String(std::string_view value) {
@@ -167,6 +170,12 @@ void mdf_Writer::Row(std::span<const int> row) {
 void mdf_Writer::Row(std::span<const double> row) {
     BeginArray(mdf_Layout::OneLine);
     for (const double value : row) Real(value);
+    EndArray();
+}
+
+void mdf_Writer::Row(std::span<const float> row) {
+    BeginArray(mdf_Layout::OneLine);
+    for (const float value : row) Real(value);
     EndArray();
 }
 

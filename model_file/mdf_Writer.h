@@ -11,9 +11,6 @@
 #include <string_view>
 #include <vector>
 
-/// Bytes of the UTF-8 character that the text begins with; 0 when it begins with none.
-std::size_t mdf_Utf8Length(std::string_view text);
-
 /// How the items of an array or object stand. Inside OneLine and Wrapped everything stays on the line.
 enum class mdf_Layout : std::uint8_t {
     Lines,   ///< one item per line, indented
@@ -42,6 +39,8 @@ public:
     void Int(int value);
     /// The shortest text that reads back as the same double, always with a fraction or an exponent.
     void Real(double value);
+    /// The shortest text that a reader in double precision rounds to the same float.
+    void Real(float value);
     void String(std::string_view value);
     /// A whole value; arrays of numbers are Wrapped, rows of a Matrix or FacetArray OneLine.
     void Value(const mdf_Value& value);
@@ -49,6 +48,7 @@ public:
     /// An array on one line.
     void Row(std::span<const int> row);
     void Row(std::span<const double> row);
+    void Row(std::span<const float> row);
 
     /// Ends the text with a newline and hands everything to the stream; to be called once, after the root's
     /// end. True when the stream took it all.
@@ -64,6 +64,7 @@ private:
     void Begin(char bracket, mdf_Layout layout);
     void End(char bracket);
     void Scalar(std::string_view text);
+    void RealText(char* begin, char* end);
     void Separate(std::size_t length, bool isKey = false);
     void NewLine(std::size_t depth);
     void Quote(std::string_view text);

@@ -2,12 +2,17 @@
 
 #include "deck/oif_Writer.h"
 #include "foundation/nex_Exception.h"
+#include "foundation/qio_Device.h"
 #include "model_file/mdf_ModelFile.h"
+#include "model_file/mdf_Parser.h"
+#include "model_file/mdf_Token.h"
+#include "tools/DeckCounts.h"
 #include "tools/DeckFile.h"
+#include "tools/LeftOut.h"
 #include "tools/LoadChecks.h"
 #include "tools/ModelChecks.h"
+#include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
-#include "tools/ModelSummary.h"
 #include "tools/VariableList.h"
 
 #include <algorithm>
@@ -17,6 +22,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iostream>
+#include <sstream>
 #include <system_error>
 
 using nlohmann::ordered_json;
@@ -108,6 +114,37 @@ void Summarise(const std::string& target, const DeckFile::Result& result, double
     }
 }
 
+/// Replaces the file as a whole; false, with the reason, when the file system refuses. What `write` raises
+/// beyond that comes through.
+bool Replace(DeckFile& file, const std::function<void(const char* jobName)>& write, DeckFile::Result& result,
+             RunReport& report) {
+    try {
+        result = file.Replace(write);
+    } catch (const DeckFileError& failure) {
+        report.Error(file.Target(), failure.what());
+        return false;
+    }
+    if (result.removeError != 0) {
+        report.Warning(file.Target(), "the temporary folder '" + file.TemporaryFolder() +
+                                          "' can't be removed: " + ReasonText(result.removeError));
+    }
+    if (result.folderSyncError != 0) {
+        report.Warning(file.Target(), "the " + file.Thing() +
+                                          " stands, but its folder can't be brought to the disk: " +
+                                          ReasonText(result.folderSyncError));
+    }
+    return true;
+}
+
+/// Writes the text where DeckFile wants it.
+void WriteText(const std::string& text, const std::string& jobName) {
+    qio_ios device;
+    std::FILE* file = qio_OpenFile((jobName + ".inp").c_str(), "wb");
+    if (file == nullptr) return;
+    device.attach(file, true);
+    device.Write(text.data(), text.size());
+}
+
 double SecondsSince(std::chrono::steady_clock::time_point start) {
     return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
 }
@@ -141,21 +178,11 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     DeckFile deck(target);
     DeckFile::Result result;
     try {
-        result = deck.Replace([&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); });
+        const auto write = [&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); };
+        if (!Replace(deck, write, result, report)) return ExitCode::FILE_SYSTEM_REFUSED;
     } catch (const QRXBasException& failure) {
         report.WriterError(failure.what(), failure.Context());
         return ExitCode::CANNOT_BE_EXPRESSED;
-    } catch (const DeckFileError& failure) {
-        report.Error(target, failure.what());
-        return ExitCode::FILE_SYSTEM_REFUSED;
-    }
-    if (result.removeError != 0) {
-        report.Warning(target, "the temporary folder '" + deck.TemporaryFolder() +
-                                   "' can't be removed: " + ReasonText(result.removeError));
-    }
-    if (result.folderSyncError != 0) {
-        report.Warning(target, "the deck stands, but its folder can't be brought to the disk: " +
-                                   ReasonText(result.folderSyncError));
     }
     Summarise(target, result, SecondsSince(start), counts, leftOut, report);
     return ExitCode::DONE;
@@ -186,10 +213,41 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
         models[key] = DescribeModel(*entry);
         report.Print(TextOfDescription(key, models[key]));
         if (!history) continue;
-        models[key]["history"] = DescribeHistory(odb->ddb().model(name));
+        models[key]["history"] = DescribeHistory(*odb, name);
         report.Print(TextOfHistory(models[key]["history"]));
     }
     return code;
+}
+
+ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
+    std::string text;
+    mdf_Error unreadable;
+    if (!mdf_ReadFile(request.model, text, unreadable)) {
+        report.Error(request.model, unreadable.text);
+        return ExitCode::FILE_SYSTEM_REFUSED;
+    }
+    mdf_Report found;
+    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found);
+    report.AddAll(found);
+    if (odb == nullptr) return ExitCode::MODEL_IS_WRONG;
+    std::ostringstream formatted;
+    mdf_WriteModelFile(*odb, formatted);
+    const bool isCanonical = formatted.view() == text;
+    report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
+    if (request.check) {
+        if (!isCanonical) report.Print(request.model + "\n");
+        return isCanonical ? ExitCode::DONE : ExitCode::MODEL_IS_WRONG;
+    }
+    if (mdf_HasComments(text)) report.Warning(request.model, "its comments are left out");
+    if (request.output.empty()) {
+        if (report.AsJson()) report.Member("formatted")["text"] = formatted.str();
+        report.Print(formatted.str());
+        return ExitCode::DONE;
+    }
+    DeckFile file(request.output, DeckFileSystem::Standard(), "model file");
+    DeckFile::Result result;
+    const auto write = [&](const char* jobName) { WriteText(formatted.str(), jobName); };
+    return Replace(file, write, result, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
 }
 
 ExitCode RunVariables(const std::string& stepType, RunReport& report) {

@@ -14,6 +14,14 @@ struct WriteRequest {
     std::string outputDir;
 };
 
+struct FormatRequest {
+    std::string model;
+    /// Empty: the standard output. May be the model file itself.
+    std::string output;
+    /// Writes nothing, and names the file when it would be changed.
+    bool check = false;
+};
+
 ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 /// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
@@ -21,6 +29,8 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
 ExitCode RunCheck(const std::string& model, RunReport& report);
 /// `history`: also what every object is in each step.
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report);
+/// Writes the model file anew in its canonical form.
+ExitCode RunFormat(const FormatRequest& request, RunReport& report);
 /// The catalogue of output variables; `stepType` empty for all procedures.
 ExitCode RunVariables(const std::string& stepType, RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.

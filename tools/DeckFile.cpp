@@ -102,8 +102,8 @@ private:
     bool removed_ = false;
 };
 
-DeckFile::DeckFile(std::string target, const DeckFileSystem& system)
-    : target_(std::move(target)), folder_(FolderOf(target_)), system_(system) {}
+DeckFile::DeckFile(std::string target, const DeckFileSystem& system, std::string thing)
+    : target_(std::move(target)), thing_(std::move(thing)), folder_(FolderOf(target_)), system_(system) {}
 
 DeckFile::Result DeckFile::Replace(const std::function<void(const char* jobName)>& write) {
     CheckTarget();
@@ -114,10 +114,10 @@ DeckFile::Result DeckFile::Replace(const std::function<void(const char* jobName)
 
     const qio_Report report = qio_LastReport();
     if (!report.opened) throw DeckFileError("cannot make the file", report.error);
-    if (report.error != 0) throw DeckFileError("cannot write the deck", report.error);
+    if (report.error != 0) throw DeckFileError("cannot write the " + thing_, report.error);
     SyncFile(scratch.Deck());
     const int error = ErrorOf([&] { return system_.rename(scratch.Deck().c_str(), target_.c_str()); });
-    if (error != 0) throw DeckFileError("cannot put the deck in its place", error);
+    if (error != 0) throw DeckFileError("cannot put the " + thing_ + " in its place", error);
 
     scratch.MarkMoved();
     Result result;
@@ -138,7 +138,7 @@ void DeckFile::CheckTarget() const {
 
 void DeckFile::SyncFile(const std::string& path) const {
     const int error = Sync(path.c_str());
-    if (error != 0) throw DeckFileError("cannot bring the deck to the disk", error);
+    if (error != 0) throw DeckFileError("cannot bring the " + thing_ + " to the disk", error);
 }
 
 int DeckFile::Sync(const char* path) const {

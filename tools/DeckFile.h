@@ -36,9 +36,9 @@ private:
     int error_;
 };
 
-/// A deck that is replaced as a whole or not at all: it is written in a fresh hidden folder beside its place,
-/// brought to the disk, and renamed onto its place in one step. Whatever fails before that, an exception of
-/// the writer included, leaves an older deck as it was and nothing else behind.
+/// A deck, or another file, that is replaced as a whole or not at all: it is written in a fresh hidden folder
+/// beside its place, brought to the disk, and renamed onto its place in one step. Whatever fails before that,
+/// an exception of the writer included, leaves an older deck as it was and nothing else behind.
 class DeckFile {
 public:
     struct Result {
@@ -50,7 +50,9 @@ public:
     };
 
     /// A symbolic link at the target is replaced, not followed. The system must outlive the deck file.
-    explicit DeckFile(std::string target, const DeckFileSystem& system = DeckFileSystem::Standard());
+    /// Messages call the file by the word `thing`.
+    explicit DeckFile(std::string target, const DeckFileSystem& system = DeckFileSystem::Standard(),
+                      std::string thing = "deck");
 
     /// Calls `write` with a job name to write `<job name>.inp` under; the name is free of whatever the
     /// target's name holds. The bytes must go through the library's device, whose report of this thread tells
@@ -58,6 +60,7 @@ public:
     Result Replace(const std::function<void(const char* jobName)>& write);
 
     const std::string& Target() const { return target_; }
+    const std::string& Thing() const { return thing_; }
     /// The temporary folder of the last Replace().
     const std::string& TemporaryFolder() const { return temporaryFolder_; }
 
@@ -70,6 +73,7 @@ private:
     int Sync(const char* path) const;
 
     std::string target_;
+    std::string thing_;
     std::string folder_;
     std::string temporaryFolder_;
     const DeckFileSystem& system_;

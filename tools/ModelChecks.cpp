@@ -197,12 +197,12 @@ void FindSectionsOfMeshes(const odiK_Model& model, Findings& findings) {
         if (!instance->isPartInstance) continue;
         const auto mesh = instance->Mesh();
         if (mesh.IsNull() || instance->part.IsNull()) continue;
-        const bool isOwn = !instance->ownMesh.IsNull() || instance->ownSectionAssignments != nullptr;
+        const bool isOwn = !instance->ownMesh.IsNull() || instance->ownSectionAssignments.has_value();
         // Instances that only show their part have its findings.
         if (!isOwn && !shownParts.insert(instance->partName).second) continue;
         FindInMesh(model, *mesh,
-                   instance->ownSectionAssignments != nullptr ? *instance->ownSectionAssignments
-                                                              : instance->part->attributes.sectionAssignments,
+                   instance->ownSectionAssignments ? *instance->ownSectionAssignments
+                                                   : instance->part->attributes.sectionAssignments,
                    isOwn ? "/assembly" + Place("instances", name) : Place("parts", instance->partName),
                    findings);
     }

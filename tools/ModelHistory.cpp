@@ -2,12 +2,14 @@
 
 #include "base/oif_ModelInfo.h"
 #include "conditions/oif_BoundaryConditionBuilder.h"
+#include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
 #include <functional>
+#include <map>
 #include <optional>
 
 using nlohmann::ordered_json;
@@ -18,61 +20,45 @@ struct Mark {
     bool written;
     bool opNew;
 };
-template <class T>
-using MarkOf = std::function<Mark(const T& object, const cow_String& name, const cow_String& stepName)>;
+/// Whether a step writes the object, and how; empty where only statuses are told.
+using MarkOf = std::function<Mark(const cls_Record& object, const cow_String& name, const cow_String& step)>;
 
-template <class T>
-ordered_json HistoryOf(const kprC_PropagatingContainer<T>& objects, const kprC_StepContainer& steps,
-                       const MarkOf<T>& markOf = nullptr) {
+/// The same by a function of the objects' own class.
+template <class T, class Function>
+MarkOf MarkOfA(const Function& function) {
+    return [function](const cls_Record& object, const cow_String& name, const cow_String& step) {
+        return function(static_cast<const T&>(object), name, step);
+    };
+}
+
+ordered_json HistoryOf(const mdl_Repository& objects, const kprC_StepContainer& steps, const MarkOf& markOf) {
     ordered_json all = ordered_json::object();
-    for (kprC_PropagatingContainerIT<T> it(objects); !it.IsDone(); it.Next()) {
-        const T& object = it.CurrentValue();
+    for (const auto& [name, record] : objects) {
+        const auto& object = static_cast<const kprC_PropagatingObject&>(record);
         ordered_json states = ordered_json::array();
-        for (int i = 0; i < steps.Size(); ++i) {
-            const cow_String& step = steps.NameAt(i);
+        for (const auto& [step, stepRecord] : steps) {
             ordered_json state = {{"step", Text(step)},
                                   {"status", omu_EnumTableOf(mdl_PropagationStatusEnm())
-                                                 .Row(static_cast<int>(object.Status(step)))
+                                                 .Row(static_cast<int>(object.StatusIn(step)))
                                                  ->name}};
             if (markOf != nullptr) {
-                const Mark mark = markOf(object, it.CurrentKey(), step);
+                const Mark mark = markOf(object, name, step);
                 state["written"] = mark.written;
                 state["opNew"] = mark.opNew;
             }
             states.push_back(std::move(state));
         }
-        all[Text(it.CurrentKey())] = {{"class", Text(cls_Classes().NameOf(object.DynTypeId()))},
-                                      {"suppressed", object.suppressed},
-                                      {"steps", std::move(states)}};
+        all[Text(name)] = {{"class", Text(cls_Classes().NameOf(object.DynTypeId()))},
+                           {"suppressed", object.suppressed},
+                           {"steps", std::move(states)}};
     }
     return all;
 }
 
-/// What `configure` gives, or nothing and the text of its failure.
-template <class Status, class Configure>
-std::optional<Status> Configured(std::string& failure, const Configure& configure) {
-    try {
-        Status status;
-        configure(status);
-        return status;
-    } catch (const QRXBasException& raised) {
-        failure = raised.what();
-        return std::nullopt;
-    }
+/// What lives across steps and reaches the deck has a history there.
+bool HasHistory(const odiK_Repository& repository) {
+    return repository.IsPropagating() && repository.ReachesDeck();
 }
-
-struct HistoryKind {
-    const char* key;
-    const char* name;
-};
-constexpr HistoryKind kKinds[] = {
-    {"boundaryConditions", "boundary conditions"},
-    {"loads", "loads"},
-    {"fields", "fields"},
-    {"interactions", "interactions"},
-    {"fieldOutputRequests", "field output requests"},
-    {"historyOutputRequests", "history output requests"},
-};
 
 /// "BUILT_INTO_BASE_STATE" as "built into base state"; a dash before an object begins.
 std::string StatusText(const std::string& status) {
@@ -83,76 +69,105 @@ std::string StatusText(const std::string& status) {
     return text;
 }
 
+/// The marks of the conditions, by the member of their repository.
+class Marks {
+public:
+    Marks(const oif_ModelInfo& info, ordered_json& root) : info_(info), view_(info.Model()), root_(root) {
+        MarkBoundaryConditions();
+        MarkLoads();
+        MarkFields();
+    }
+    MarkOf Of(const char* member) const {
+        const auto place = marks_.find(member);
+        return place == marks_.end() ? MarkOf() : place->second;
+    }
+
+private:
+    /// What `configure` makes of a status; nothing, and a failure of the kind, when it raises.
+    template <class Status, class Configure>
+    std::optional<Status> Configured(const char* member, const Configure& configure) {
+        try {
+            Status status;
+            configure(status);
+            return status;
+        } catch (const QRXBasException& raised) {
+            root_["failures"][member] = raised.what();
+            return std::nullopt;
+        }
+    }
+
+    void MarkBoundaryConditions() {
+        const kprC_StepContainer& steps = view_.Steps();
+        const char* member = "boundaryConditions";
+        const auto status = Configured<oif_BCOpStatus>(member, [&](oif_BCOpStatus& made) {
+            made = oif_BoundaryConditionBuilder::OpStatusOf(view_.BCs(), view_.Loads(), steps);
+        });
+        if (!status) return;
+        marks_[member] = MarkOfA<kbcC_BC>(
+            [&steps, status](const kbcC_BC& bc, const cow_String& name, const cow_String& step) {
+                const auto places = oif_BCOpStatus::Places(steps.ConstGet(step), name, bc.Status(step));
+                bool inCase = false;
+                const bool written =
+                    std::any_of(places.begin(), places.end(), [&](const oif_ConditionPlace& place) {
+                        inCase = !place.loadCase.IsEmpty();
+                        return status->Writes(bc, step, inCase);
+                    });
+                return Mark{written, written && (inCase || status->OpNew(bc.DynTypeId(), step))};
+            });
+    }
+
+    void MarkLoads() {
+        MarkPlaced<kloC_Load, oif_LoadOpStatus>("loads", [&](oif_LoadOpStatus& status) {
+            status.Configure(view_.Loads(), view_.Steps().Keys(), info_);
+        });
+    }
+
+    void MarkFields() {
+        MarkPlaced<kpfC_Field, oif_FieldOpStatus>("fields", [&](oif_FieldOpStatus& status) {
+            status.Configure(view_.Fields(), view_.Steps().Keys());
+        });
+    }
+
+    /// Objects that a step writes wherever they have a place in it.
+    template <class T, class Status, class Configure>
+    void MarkPlaced(const char* member, const Configure& configure) {
+        const kprC_StepContainer& steps = view_.Steps();
+        const auto status = Configured<Status>(member, configure);
+        if (!status) return;
+        marks_[member] =
+            MarkOfA<T>([&steps, status](const T& object, const cow_String& name, const cow_String& step) {
+                const bool written =
+                    !Status::Places(steps.ConstGet(step), name).empty() && status->Writes(object, step);
+                return Mark{written, written && status->OpNew(object.DynTypeId(), step)};
+            });
+    }
+
+    const oif_ModelInfo& info_;
+    const qkw_Model& view_;
+    ordered_json& root_;
+    std::map<std::string, MarkOf, std::less<>> marks_;
+};
+
 } // namespace
 
-ordered_json DescribeHistory(const ddb_Model& model) {
-    const oif_ModelInfo info(model);
-    const qkw_Model& view = info.Model();
-    const kprC_StepContainer& steps = view.Steps();
-    const auto anyPlace = [](const oif_ConditionPlaces& places, const auto& writes) {
-        return std::any_of(places.begin(), places.end(), writes);
-    };
+ordered_json DescribeHistory(const odb_Odb& odb, const cow_String& modelName) {
+    const oif_ModelInfo info(odb.ddb().model(modelName));
+    const odiK_Model& model = *odb.FindModel(modelName);
     ordered_json root = ordered_json::object();
-    std::string failure;
-    const auto note = [&](const char* kind) {
-        if (!failure.empty()) root["failures"][kind] = failure;
-        failure.clear();
-    };
-
-    const auto conditions = Configured<oif_BCOpStatus>(failure, [&](oif_BCOpStatus& status) {
-        status = oif_BoundaryConditionBuilder::OpStatusOf(view.BCs(), view.Loads(), steps);
-    });
-    note("boundaryConditions");
-    MarkOf<kbcC_BC> markCondition;
-    if (conditions) {
-        markCondition = [&](const kbcC_BC& bc, const cow_String& name, const cow_String& step) {
-            const auto places = oif_BCOpStatus::Places(steps.ConstGet(step), name, bc.Status(step));
-            bool inCase = false;
-            const bool written = anyPlace(places, [&](const oif_ConditionPlace& place) {
-                inCase = !place.loadCase.IsEmpty();
-                return conditions->Writes(bc, step, inCase);
-            });
-            return Mark{written, written && (inCase || conditions->OpNew(bc.DynTypeId(), step))};
-        };
+    const Marks marks(info, root);
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        if (!HasHistory(repository)) continue;
+        root[repository.member] =
+            HistoryOf(repository.In(model), info.Model().Steps(), marks.Of(repository.member));
     }
-    root["boundaryConditions"] = HistoryOf(view.BCs(), steps, markCondition);
-
-    const auto loads = Configured<oif_LoadOpStatus>(
-        failure, [&](oif_LoadOpStatus& status) { status.Configure(view.Loads(), steps.Keys(), info); });
-    note("loads");
-    MarkOf<kloC_Load> markLoad;
-    if (loads) {
-        markLoad = [&](const kloC_Load& load, const cow_String& name, const cow_String& step) {
-            const bool written =
-                !oif_LoadOpStatus::Places(steps.ConstGet(step), name).empty() && loads->Writes(load, step);
-            return Mark{written, written && loads->OpNew(load.DynTypeId(), step)};
-        };
-    }
-    root["loads"] = HistoryOf(view.Loads(), steps, markLoad);
-
-    const auto fields = Configured<oif_FieldOpStatus>(
-        failure, [&](oif_FieldOpStatus& status) { status.Configure(view.Fields(), steps.Keys()); });
-    note("fields");
-    MarkOf<kpfC_Field> markField;
-    if (fields) {
-        markField = [&](const kpfC_Field& field, const cow_String& name, const cow_String& step) {
-            const bool written =
-                !oif_FieldOpStatus::Places(steps.ConstGet(step), name).empty() && fields->Writes(field, step);
-            return Mark{written, written && fields->OpNew(field.DynTypeId(), step)};
-        };
-    }
-    root["fields"] = HistoryOf(view.Fields(), steps, markField);
-
-    root["interactions"] = HistoryOf(view.Interactions(), steps);
-    root["fieldOutputRequests"] = HistoryOf(view.FieldOutputs(), steps);
-    root["historyOutputRequests"] = HistoryOf(view.HistoryOutputs(), steps);
     return root;
 }
 
 std::string TextOfHistory(const ordered_json& history) {
     std::string text;
-    for (const HistoryKind& kind : kKinds) {
-        const ordered_json& objects = history[kind.key];
+    for (const odiK_Repository& kind : odiK_Repositories()) {
+        if (!HasHistory(kind)) continue;
+        const ordered_json& objects = history[kind.member];
         if (objects.empty()) continue;
         TextTable table;
         for (const auto& [name, object] : objects.items()) {
@@ -169,9 +184,10 @@ std::string TextOfHistory(const ordered_json& history) {
             }
             table.Row(std::move(row));
         }
-        text += std::string("  history of ") + kind.name + "\n" + table.Text("    ");
-        if (history.contains("failures") && history["failures"].contains(kind.key)) {
-            text += "    a deck can't tell them: " + history["failures"][kind.key].get<std::string>() + "\n";
+        text += std::string("  history of ") + kind.plural + "\n" + table.Text("    ");
+        if (history.contains("failures") && history["failures"].contains(kind.member)) {
+            text +=
+                "    a deck can't tell them: " + history["failures"][kind.member].get<std::string>() + "\n";
         }
     }
     if (!text.empty())

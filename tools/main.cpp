@@ -16,7 +16,7 @@ constexpr char kAbout[] = "Writes finite-element models, held in JSON model file
 constexpr char kExitCodes[] =
     "Exit codes:\n"
     "  0  done (there may be warnings)\n"
-    "  1  the model is wrong\n"
+    "  1  the model is wrong, or not in canonical form (format --check)\n"
     "  2  wrong usage\n"
     "  3  a file can't be read or written, or there is not enough memory\n"
     "  4  a deck can't express the model: the reason on a line, object and step on the next\n"
@@ -27,6 +27,7 @@ constexpr char kExitCodes[] =
 struct CommandLine {
     CLI::App app{kAbout, "qrxdeck"};
     WriteRequest write;
+    FormatRequest format;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
@@ -35,6 +36,7 @@ struct CommandLine {
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
     CLI::App* checkCommand = app.add_subcommand("check", "Look for errors in a model, write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
+    CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =
         app.add_subcommand("variables", "List the variables that output requests can ask for");
     CLI::App* schemaCommand =
@@ -62,6 +64,17 @@ struct CommandLine {
             "--history", history,
             "Also what conditions, loads, interactions and output requests are in each step, "
             "and what the step writes of them");
+        AddModel(formatCommand, format.model);
+        auto* output =
+            formatCommand
+                ->add_option("-o,--output", format.output,
+                             "File to write, which may be MODEL itself (default: the standard output); "
+                             "comments are left out, and on failure the old file stays as it was")
+                ->type_name("FILE");
+        formatCommand
+            ->add_flag("--check", format.check,
+                       "Write nothing; exit with 1 and name the file when it isn't in that form")
+            ->excludes(output);
         variablesCommand
             ->add_option("--step-type", stepType,
                          "Only those of one procedure, by the class of its step, such as StaticStep")
@@ -76,13 +89,14 @@ struct CommandLine {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
         return std::string("there is no command '") + argv[1] +
-               "'; the commands are write, check, info, variables and schema";
+               "'; the commands are write, check, info, format, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return RunCheck(model, report);
         if (*infoCommand) return RunInfo(model, history, report);
+        if (*formatCommand) return RunFormat(format, report);
         if (*variablesCommand) return RunVariables(stepType, report);
         return RunSchema(schemaOutput, report);
     }

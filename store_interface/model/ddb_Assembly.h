@@ -167,8 +167,8 @@ using ddb_InstanceContainerIT = ddb_ContainerIT<odiK_Instance, ddb_BaseInstance>
 class ddb_Assembly {
 public:
     explicit ddb_Assembly(const cow_CountedHld<odiK_Model>& model) : model_(model) {}
-    const cow_String& name() const { return model_->assemblyName; }
-    const cow_String& solverInput() const { return model_->assemblySolverInput; }
+    const cow_String& name() const { return model_->AssemblyObject().name; }
+    const cow_String& solverInput() const { return model_->AssemblyObject().solverInput; }
     bool hasMesh() const { return !model_->ConstAssemblyMesh().IsNull(); }
     /// The assembly's own mesh, an empty one if it has none; mesh index 0.
     ddb_Mesh mesh() const;

@@ -1,6 +1,7 @@
 #include "store_interface/model/odiK_Model.h"
 
 #include "foundation/nex_Exception.h"
+#include "store_interface/model/odiK_Repositories.h"
 
 #include <cmath>
 
@@ -37,6 +38,14 @@ void Place(odiK_Datum& datum) {
         }
     }
     if (csys || datum.type == dtu_DatumType::PLANE) NormalizeAxis(datum.zAxis, datum.name, "zAxis");
+}
+
+void Propagate(mdl_Repository& repository, const kprC_StepContainer& steps) {
+    for (const cow_String& name : repository.Keys()) {
+        const auto problems =
+            static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name)).Propagate(steps);
+        if (!problems.empty()) mdl_RaisePropagationProblem(name, problems.front());
+    }
 }
 
 std::string PathOfSet(const cow_String& owner, int id) {
@@ -88,24 +97,32 @@ odiK_Part& odiK_Model::AddPart(const cow_String& name) {
 
 odiK_Instance& odiK_Model::AddInstance(const cow_String& name, const cow_String& partName) {
     if (parts_.count(partName) == 0) RaiseNoSuchPart(name, partName);
-    odiK_Instance& instance = AddOtherEntry(name, partName);
-    instance.isPartInstance = true;
-    return instance;
+    odiK_Instance instance;
+    instance.name = name;
+    instance.partName = partName;
+    return AddEntry(std::move(instance));
 }
 
 odiK_Instance& odiK_Model::AddOtherEntry(const cow_String& name, const cow_String& partName) {
-    CheckNewName(instances_, name, "an instance");
-    if (sealed_)
-        Raise("instance " + Quoted(name) + ": instances must be added before the first set or region");
-    cow_CountedHld<odiK_Instance> instance(new odiK_Instance());
-    instance->name = name;
-    instance->partName = partName;
-    instance->isPartInstance = false;
-    if (!partName.IsEmpty()) {
-        const auto part = parts_.find(partName);
-        if (part == parts_.end()) RaiseNoSuchPart(name, partName);
-        instance->part = part->second;
+    odiK_Instance entry;
+    entry.name = name;
+    entry.partName = partName;
+    entry.isPartInstance = false;
+    return AddEntry(std::move(entry));
+}
+
+odiK_Instance& odiK_Model::AddEntry(odiK_Instance entry) {
+    CheckNewName(instances_, entry.name, "an instance");
+    if (sealed_) {
+        Raise("instance " + Quoted(entry.name) + ": instances must be added before the first set or region");
     }
+    if (!entry.partName.IsEmpty()) {
+        const auto part = parts_.find(entry.partName);
+        if (part == parts_.end()) RaiseNoSuchPart(entry.name, entry.partName);
+        entry.part = part->second;
+    }
+    const cow_String name = entry.name;
+    cow_CountedHld<odiK_Instance> instance(new odiK_Instance(std::move(entry)));
     return *instances_.emplace(name, std::move(instance)).first->second;
 }
 
@@ -214,23 +231,23 @@ void odiK_Model::CompleteTree(odiK_Problems& problems) {
         const cow_CountedHld<odiK_Instance>& instance = entry.second;
         const odiK_AttributeInputs none;
         const odiK_AttributeInputs& part = instance->part.IsNull() ? none : instance->part->attributes;
-        const auto fill =
-            [&](ptoC_PartAttributeList& list, const std::vector<odiK_AttributeInput>& partInputs,
-                const std::unique_ptr<std::vector<odiK_AttributeInput>>& ownInputs, const char* member) {
-                list = {};
-                const auto& inputs = ownInputs == nullptr ? partInputs : *ownInputs;
-                for (std::size_t i = 0; i < inputs.size(); ++i) {
-                    mdl_ObjCow<ptoC_PartAttribute> record = inputs[i].record;
-                    record.Get().region = FindRegion(name, inputs[i].setName);
-                    if (!record.ConstGet().region.HasValue()) {
-                        problems.Error("/assembly/instances/" + std::string(name.View()) + "/" + member +
-                                           "/" + std::to_string(i) + "/region",
-                                       "found " + Quoted(inputs[i].setName) +
-                                           ", expected the name of a set of the instance's mesh");
-                    }
-                    list.Append(record.ConstGet());
+        const auto fill = [&](ptoC_PartAttributeList& list,
+                              const std::vector<odiK_AttributeInput>& partInputs,
+                              const odiK_Instance::OwnInputs& ownInputs, const char* member) {
+            list = {};
+            const auto& inputs = ownInputs ? *ownInputs : partInputs;
+            for (std::size_t i = 0; i < inputs.size(); ++i) {
+                mdl_ObjCow<ptoC_PartAttribute> record = inputs[i].record;
+                record.Get().region = FindRegion(name, inputs[i].setName);
+                if (!record.ConstGet().region.HasValue()) {
+                    problems.Error("/assembly/instances/" + std::string(name.View()) + "/" + member + "/" +
+                                       std::to_string(i) + "/region",
+                                   "found " + Quoted(inputs[i].setName) +
+                                       ", expected the name of a set of the instance's mesh");
                 }
-            };
+                list.Append(record.ConstGet());
+            }
+        };
         fill(instance->attributes.sectionAssignments, part.sectionAssignments,
              instance->ownSectionAssignments, "sectionAssignments");
         fill(instance->attributes.materialOrientations, part.materialOrientations,
@@ -250,12 +267,8 @@ void odiK_Model::Complete() {
     }
     if (!assemblyMesh_.IsNull()) assemblyMesh_->FinishElements(problems);
     CompleteTree(problems);
-    boundaryConditions.Propagate(steps);
-    loads.Propagate(steps);
-    fields.Propagate(steps);
-    interactions.Propagate(steps);
-    fieldOutputRequests.Propagate(steps);
-    historyOutputRequests.Propagate(steps);
-    adaptiveMeshConstraints.Propagate(steps);
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        if (repository.IsPropagating()) Propagate(repository.In(*this), steps);
+    }
     SetComplete();
 }

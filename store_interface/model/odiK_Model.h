@@ -15,7 +15,7 @@
 #include "store_interface/records/sections/kseC_ConnectorSection.h"
 
 #include <map>
-#include <memory>
+#include <optional>
 
 /// What hangs behind a part, or behind an instance that differs from its part: attributes on the sets of its
 /// mesh. A later section assignment wins on an element.
@@ -40,15 +40,23 @@ struct odiK_AttributeInputs {
     std::vector<odiK_AttributeInput> beamOrientations;
 };
 
-struct odiK_Part {
+struct odiK_Part : cls_RecordOf<odiK_Part> {
+    static constexpr cls_ClassInfo Class{"odiK_Part", "A part: a mesh, and attributes on its sets."};
+
     cow_String name;
     cow_String solverInput;
     cow_CountedHld<odiK_Mesh> mesh; // null: none
     odiK_AttributeInputs attributes;
+
+    static const cls_FieldTable& Fields();
 };
 
 /// An entry of the assembly. What it doesn't have of its own it takes from its part.
-struct odiK_Instance {
+struct odiK_Instance : cls_RecordOf<odiK_Instance> {
+    static constexpr cls_ClassInfo Class{
+        "odiK_Instance", "An instance of a part. What it gives of its own takes the place of the part's."};
+    using OwnInputs = std::optional<std::vector<odiK_AttributeInput>>;
+
     cow_String name;
     cow_String partName;
     cow_CountedHld<odiK_Part> part; // null for an entry that is no part instance and names none
@@ -59,9 +67,9 @@ struct odiK_Instance {
     float rotation[3] = {0.0F, 0.0F, 0.0F};
     cow_String solverInput;
     cow_CountedHld<odiK_Mesh> ownMesh; // null: the part's
-    std::unique_ptr<std::vector<odiK_AttributeInput>> ownSectionAssignments;
-    std::unique_ptr<std::vector<odiK_AttributeInput>> ownMaterialOrientations;
-    std::unique_ptr<std::vector<odiK_AttributeInput>> ownBeamOrientations;
+    OwnInputs ownSectionAssignments;
+    OwnInputs ownMaterialOrientations;
+    OwnInputs ownBeamOrientations;
 
     /// 1, 2, ... in ascending order of the names; negative for entries that are no part instances. Known when
     /// the instances are sealed.
@@ -73,10 +81,16 @@ struct odiK_Instance {
     cow_CountedHld<odiK_Mesh> Mesh() const {
         return !ownMesh.IsNull() || part.IsNull() ? ownMesh : part->mesh;
     }
+
+    static const cls_FieldTable& Fields();
 };
 
-/// The assembly-level object that holds the assembly's attribute lists.
-struct odiK_Assembly {
+/// The assembly-level object: its texts and its attribute lists.
+struct odiK_Assembly : cls_RecordOf<odiK_Assembly> {
+    static constexpr cls_ClassInfo Class{"odiK_Assembly", "The assembly of a model."};
+
+    cow_String name = "Assembly";
+    cow_String solverInput;
     ptoC_PartAttributeList sectionAssignments;
     ptoC_PartAttributeList connectorOrientations;
 
@@ -86,14 +100,23 @@ struct odiK_Assembly {
     static cow_String ConnectorOrientationName(int place);
     /// Appends; an orientation without a name gets that of its place.
     void AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation);
+
+    static const cls_FieldTable& Fields();
 };
 
 enum class dtu_DatumType : int { POINT = 1, AXIS = 2, PLANE = 3, CSYS = 4 };
 enum class dtu_DatumCsysType : int { RECTANGULAR = 1, CYLINDRICAL = 2, SPHERICAL = 3 };
+const omu_EnumTable& omu_EnumTableOf(dtu_DatumType);
+const omu_EnumTable& omu_EnumTableOf(dtu_DatumCsysType);
 
 /// A datum. Axes are unit vectors. A point has an origin; an axis has its direction in xAxis; a plane its
 /// normal in zAxis.
-struct odiK_Datum {
+struct odiK_Datum : cls_RecordOf<odiK_Datum> {
+    static constexpr cls_ClassInfo Class{
+        "odiK_Datum", "A coordinate system, point, axis or plane. A csys takes origin and axes, a point its "
+                      "origin, an axis "
+                      "origin and xAxis (its direction), a plane origin and zAxis (its normal)."};
+
     cow_String name;
     dtu_DatumType type = dtu_DatumType::CSYS;
     dtu_DatumCsysType csysType = dtu_DatumCsysType::RECTANGULAR;
@@ -103,6 +126,8 @@ struct odiK_Datum {
     gsl_Vector zAxis{0.0, 0.0, 1.0};
     /// The axes as they were given, kept by AddDatum: normalising twice may change the last bit.
     gsl_Vector givenAxes[3];
+
+    static const cls_FieldTable& Fields();
 };
 
 /// One entry of a set of the assembly: members in the mesh of an instance, or in the assembly's own mesh when
@@ -113,17 +138,9 @@ struct odiK_MemberInput {
     std::span<const odiK_FacetInput> facets;
 };
 
-/// A model in memory: the object behind all views, and the interface through which a program fills a store.
-/// Parts first, then instances, then sets, regions and records; the first region or set of the assembly
-/// seals the instances. Complete() works out what follows from all that; the store calls it when the model is
-/// first read. A model must not change while it is being written.
-class odiK_Model {
-public:
-    explicit odiK_Model(const cow_String& name) : name_(name) {}
-    odiK_Model(const odiK_Model&) = delete;
-    odiK_Model& operator=(const odiK_Model&) = delete;
-
-    const cow_String& Name() const { return name_; }
+/// The data of a model besides its tree, its steps and its repositories.
+struct odiK_ModelData : cls_RecordOf<odiK_ModelData> {
+    static constexpr cls_ClassInfo Class{"odiK_ModelData", "A model: all that one deck is written from."};
 
     cow_String description;
     cow_String topLevelSolverInput;
@@ -143,6 +160,22 @@ public:
     /// Null: none.
     mdl_ObjCow<ddb_ModelSectorDefinition> cyclicSymmetry;
 
+    static const cls_FieldTable& Fields();
+};
+
+/// A model in memory: the object behind all views, and the interface through which a program fills a store.
+/// Parts first, then instances, then sets, regions and records; the first region or set of the assembly
+/// seals the instances. Complete() works out what follows from all that; the store calls it when the model is
+/// first read. A model must not change while it is being written.
+class odiK_Model : public odiK_ModelData {
+public:
+    explicit odiK_Model(const cow_String& name) : name_(name) {}
+    odiK_Model(const odiK_Model&) = delete;
+    odiK_Model& operator=(const odiK_Model&) = delete;
+
+    const cow_String& Name() const { return name_; }
+
+    // A repository has a row in odiK_Repositories.cpp too.
     kprC_StepContainer steps;
     mdl_MapString2ObjCow<kmaC_Material> materials;
     mdl_MapString2ObjCow<kseC_Section> sections;
@@ -175,6 +208,8 @@ public:
     odiK_Instance& AddInstance(const cow_String& name, const cow_String& partName);
     /// Adds an entry that is no part instance, with a part or without ("").
     odiK_Instance& AddOtherEntry(const cow_String& name, const cow_String& partName);
+    /// Adds an entry of either kind, with its name, that of its part and all it has of its own.
+    odiK_Instance& AddEntry(odiK_Instance entry);
     const std::map<cow_String, cow_CountedHld<odiK_Part>>& Parts() const { return parts_; }
     const std::map<cow_String, cow_CountedHld<odiK_Instance>>& Instances() const { return instances_; }
     /// The entry, or null.
@@ -185,8 +220,6 @@ public:
     void SealInstances();
     bool InstancesAreSealed() const { return sealed_; }
 
-    cow_String assemblyName = "Assembly";
-    cow_String assemblySolverInput;
     /// The assembly's own mesh, made at the first use.
     odiK_Mesh& AssemblyMesh();
     const cow_CountedHld<odiK_Mesh>& ConstAssemblyMesh() const { return assemblyMesh_; }

@@ -74,6 +74,8 @@ public:
     /// Works out all steps; must run again after a change of states or steps. Gives the states that can't
     /// be, in step order, then those of unknown steps; they are treated as if nothing had been said.
     virtual std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) = 0;
+    /// The status in the step. An unknown step raises.
+    virtual mdl_PropagationStatusEnm StatusIn(const cow_String& stepName) const = 0;
 
     /// Statuses in which an object is in force: 1, 2, 3, 8, 9, 10 and 14.
     static bool IsActive(mdl_PropagationStatusEnm status);
@@ -149,10 +151,10 @@ class kprC_PropagatingOf : public cls_AbstractRecordOf<T, kprC_PropagatingObject
 public:
     using StateRecord = S;
 
-    /// The status in the step. An unknown step raises.
     mdl_PropagationStatusEnm Status(const cow_String& stepName) const {
         return ConstGetStateQuad(stepName).status;
     }
+    mdl_PropagationStatusEnm StatusIn(const cow_String& stepName) const override { return Status(stepName); }
     /// Status, state and procedure in the step. An unknown step raises.
     const kprC_PropagatingState<S>& ConstGetStateQuad(const cow_String& stepName) const {
         const int index = steps_.IndexOf(stepName);

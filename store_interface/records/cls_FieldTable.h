@@ -36,6 +36,22 @@ enum class cls_FieldKind {
     Region,    ///< rgnC_Region
     Datum,     ///< dtmC_DatumRef
     Attribute, ///< a value with a state, in per-step states: cls_AttributeType
+    Tree,      ///< a part of the model's tree: cls_TreeType
+};
+
+/// The parts of a model's tree that the tables of its frame name. What is no record has a reader, a writer
+/// and a shape in the schema of its own.
+enum class cls_TreeEnm {
+    Datums,
+    Parts,
+    Assembly,
+    Instances,
+    Mesh,
+    AssemblyMesh,
+    AssemblySets,
+    Attributes,         ///< on sets of the mesh, by name: std::vector<odiK_AttributeInput>
+    OwnAttributes,      ///< the same of an instance, where none is the part's: std::optional of it
+    AssemblyAttributes, ///< on regions: ptoC_PartAttributeList
 };
 
 /// A type of fields, for code that works on every record: one object per C++ type.
@@ -68,6 +84,8 @@ public:
     cls_TripleType() : cls_FieldType(cls_FieldKind::Triple) {}
     virtual void Get(const void* value, double (&xyz)[3]) const = 0;
     virtual void Set(void* value, const double (&xyz)[3]) const = 0;
+    /// Whether it holds its numbers in single precision.
+    virtual bool IsSingle() const { return false; }
 };
 
 class cls_TableType : public cls_FieldType {
@@ -140,6 +158,23 @@ private:
     const cls_FieldType* valueType_;
 };
 
+class cls_TreeType : public cls_FieldType {
+public:
+    explicit cls_TreeType(cls_TreeEnm part) : cls_FieldType(cls_FieldKind::Tree), part_(part) {}
+    cls_TreeEnm Part() const { return part_; }
+    /// Parts of the tree are never compared or copied as fields.
+    bool Equal(const void* a, const void* b) const override { return a == b; }
+    void Assign(void*, const void*) const override {}
+    template <cls_TreeEnm Part>
+    static const cls_FieldType& Instance() {
+        static const cls_TreeType type(Part);
+        return type;
+    }
+
+private:
+    cls_TreeEnm part_;
+};
+
 /// The field type of the C++ type T; specialised for all types that records have members of.
 template <class T, class Enable = void>
 struct cls_TypeOf;
@@ -161,6 +196,14 @@ struct cls_Field {
     const cls_FieldType* type;
     void* (*access)(cls_Record& record);
 
+    /// For a text that is a name and must be able to stand in a deck: what it names ("part"), or "".
+    const char* nameOf = nullptr;
+    /// For a text that is one of a few words, in any capitals: these.
+    std::span<const char* const> words;
+    /// For an enumeration: model files give it by its words alone, not by its numbers.
+    bool wordsOnly = false;
+    /// For a triple of reals: each must be a number of single precision, although held in double.
+    bool singlePrecision = false;
     /// For a text field: the kind of object that it names ("amplitude", "material", ...), else null.
     const char* refersTo = nullptr;
     /// The class that the named object must be of or derive from; null: any of its kind.
@@ -180,6 +223,7 @@ struct cls_Field {
     bool notModelData = false;
     cls_BaseStateRule baseState = cls_BaseStateRule::Carried;
 
+    /// Null for a part of the tree that is no member of the record.
     const void* In(const cls_Record& record) const { return access(const_cast<cls_Record&>(record)); }
     void* In(cls_Record& record) const { return access(record); }
 };
@@ -212,6 +256,52 @@ public:
         field.type = &cls_TypeOf<Value>::Instance();
         field.access = [](cls_Record& record) -> void* { return &(static_cast<C&>(record).*Member); };
         fields_.push_back(field);
+        return *this;
+    }
+    /// A part of the tree that is in the record: a member of it, or what a function gives of it.
+    template <auto Member, cls_TreeEnm Part>
+    cls_Describe& Tree(const char* name, const char* doc) {
+        Tree<Part>(name, doc);
+        fields_.back().access = [](cls_Record& record) -> void* {
+            if constexpr (std::is_member_object_pointer_v<decltype(Member)>) {
+                return &(static_cast<C&>(record).*Member);
+            } else {
+                return &Member(static_cast<C&>(record));
+            }
+        };
+        return *this;
+    }
+    /// A part of the tree that stands elsewhere.
+    template <cls_TreeEnm Part>
+    cls_Describe& Tree(const char* name, const char* doc) {
+        cls_Field field{};
+        field.name = name;
+        field.doc = doc;
+        field.type = &cls_TreeType::Instance<Part>();
+        field.access = [](cls_Record&) -> void* { return nullptr; };
+        fields_.push_back(field);
+        return *this;
+    }
+    /// The class of the records in a part of the tree.
+    template <class T>
+    cls_Describe& Of() {
+        fields_.back().refersToClass = &T::Class;
+        return *this;
+    }
+    cls_Describe& NameOf(const char* kind) {
+        fields_.back().nameOf = kind;
+        return *this;
+    }
+    cls_Describe& Words(std::span<const char* const> words) {
+        fields_.back().words = words;
+        return *this;
+    }
+    cls_Describe& WordsOnly() {
+        fields_.back().wordsOnly = true;
+        return *this;
+    }
+    cls_Describe& SinglePrecision() {
+        fields_.back().singlePrecision = true;
         return *this;
     }
     /// Lets `describe` declare fields here, for groups of fields that many classes have.

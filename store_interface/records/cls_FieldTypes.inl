@@ -83,6 +83,33 @@ struct cls_TypeOf<gsl_Vector> : cls_TripleTypeOf<gsl_Vector> {};
 template <>
 struct cls_TypeOf<g3d_Vector> : cls_TripleTypeOf<g3d_Vector> {};
 
+/// Three numbers of single precision.
+template <>
+struct cls_TypeOf<float[3]> {
+    class Type : public cls_TripleType {
+    public:
+        bool Equal(const void* a, const void* b) const override {
+            return std::equal(At(a), At(a) + 3, At(b));
+        }
+        void Assign(void* to, const void* from) const override { std::copy(At(from), At(from) + 3, At(to)); }
+        void Get(const void* value, double (&xyz)[3]) const override {
+            std::copy(At(value), At(value) + 3, xyz);
+        }
+        void Set(void* value, const double (&xyz)[3]) const override {
+            for (int i = 0; i < 3; ++i) At(value)[i] = static_cast<float>(xyz[i]);
+        }
+        bool IsSingle() const override { return true; }
+
+    private:
+        static float* At(void* value) { return static_cast<float*>(value); }
+        static const float* At(const void* value) { return static_cast<const float*>(value); }
+    };
+    static const cls_FieldType& Instance() {
+        static const Type type;
+        return type;
+    }
+};
+
 template <>
 struct cls_TypeOf<cow_2DArray<double>> {
     class Type : public cls_TypedField<cow_2DArray<double>, cls_TableType> {

@@ -117,6 +117,7 @@ inline mdl_RepositoryPlace<cls_Record> mdl_Repository::end() const {
 template <class T>
 class mdl_MapString2ObjCow : public mdl_Repository {
 public:
+    using ItemRecord = T;
     mdl_MapString2ObjCow() : mdl_Repository(T::Class.name, T::TypeId()) {}
     const T& ConstGet(const cow_String& name) const { return static_cast<const T&>(ConstGetRecord(name)); }
     /// The record for writing.

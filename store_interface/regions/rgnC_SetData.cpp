@@ -1,5 +1,28 @@
 #include "store_interface/regions/rgnC_SetData.h"
 
+#include "store_interface/records/cls_FieldTable.h"
+
+const omu_EnumTable& omu_EnumTableOf(res_SetTypeEnm) {
+    static constexpr omu_EnumRow rows[] = {
+        {0, "node", "node"}, {1, "element", "element"}, {2, "surface", "surface"}};
+    static constexpr omu_EnumTable table{"res_SetTypeEnm", rows};
+    return table;
+}
+
+const cls_FieldTable& odiK_SetHead::Fields() {
+    using R = odiK_SetHead;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::name>("name", "the name of the set")
+            .NameOf("set")
+            .Required()
+            .Field<&R::type>("kind", "what its members are")
+            .WordsOnly()
+            .Required()
+            .Field<&R::internal>("internal", "a set that the deck marks as made by a program");
+    return fields;
+}
+
 rgnC_SubsetData rgnC_SetData::SubSet(int index) const {
     if (index < 0 || index >= NumSubSets()) cow_RaiseOutOfRange(index, NumSubSets());
     rgnC_SubsetData subset = set_->subsets[static_cast<std::size_t>(index)];

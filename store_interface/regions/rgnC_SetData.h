@@ -4,11 +4,15 @@
 #include "foundation/cow_CountedHld.h"
 #include "foundation/cow_List.h"
 #include "foundation/cow_String.h"
+#include "store_interface/records/cls_Record.h"
 
 #include <vector>
 
+struct omu_EnumTable;
+
 /// What the entries of a set are.
 enum class res_SetTypeEnm : int { NODES = 0, ELEMENTS = 1, FACETS = 2 };
+const omu_EnumTable& omu_EnumTableOf(res_SetTypeEnm);
 
 /// The part of a set that lies in one mesh and, for elements and facets, in one element class of it.
 struct rgnC_SubsetData {
@@ -27,11 +31,19 @@ struct rgnC_SubsetData {
     const cow_List<int>& FacetIds() const { return facetIds; }
 };
 
-/// A set as the store holds it. Sets of a mesh that several instances share stand once.
-struct odiK_Set {
+/// What a set is, but for its members.
+struct odiK_SetHead : cls_RecordOf<odiK_SetHead> {
+    static constexpr cls_ClassInfo Class{"odiK_SetHead", "a named set"};
+
     cow_String name;
     res_SetTypeEnm type = res_SetTypeEnm::NODES;
     bool internal = false;
+
+    static const cls_FieldTable& Fields();
+};
+
+/// A set as the store holds it. Sets of a mesh that several instances share stand once.
+struct odiK_Set : odiK_SetHead {
     std::vector<rgnC_SubsetData> subsets;
 
     /// What the entries come to for the deck, worked out at the first use: labels, and face names for

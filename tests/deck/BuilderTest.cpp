@@ -148,8 +148,8 @@ TEST(Builder, TwoInstancesOfOnePart_CloseThePartOnce) {
     store.AddPart("P", {}).solverInput = "part text";
     store.model.AddInstance("I2", "P").solverInput = "two";
     store.model.AddInstance("I1", "P").solverInput = "one\n";
-    store.model.assemblyName = "the assembly";
-    store.model.assemblySolverInput = "assembly text";
+    store.model.AssemblyObject().name = "the assembly";
+    store.model.AssemblyObject().solverInput = "assembly text";
     store.model.solverInput = "model text";
     EXPECT_EQ(WrittenDeck(store), "**\n** PARTS\n**\n"
                                   "*Part, name=P\n"
@@ -172,7 +172,7 @@ TEST(Builder, OtherFormat_HasNoBannersAndNoOpeningOrClosingLinesOfInstances) {
     TestStore store;
     store.AddPart("P", {}).solverInput = "part text";
     store.model.AddInstance("I", "P").solverInput = "instance text";
-    store.model.assemblySolverInput = "assembly text";
+    store.model.AssemblyObject().solverInput = "assembly text";
     OtherFormatInfo info(store.View());
     oif_Builder builder(info);
     const TestFolder folder;

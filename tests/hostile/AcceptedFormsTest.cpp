@@ -81,7 +81,7 @@ TEST(AcceptedForms, Texts_AsLines_AreEndedEach) {
                                     "steps": [{"name": "S", "class": "kprC_InitialStep", "solverInput": ["x"]}])"));
     EXPECT_EQ(TheModel(odb).solverInput, "*A\n\nb\n");
     EXPECT_EQ(TheModel(odb).topLevelSolverInput, "as it stands");
-    EXPECT_EQ(TheModel(odb).assemblySolverInput, "");
+    EXPECT_EQ(TheModel(odb).AssemblyObject().solverInput, "");
     EXPECT_EQ(TheModel(odb).steps.ConstGet("S").solverInput, "x\n");
 }
 

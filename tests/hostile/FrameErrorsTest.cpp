@@ -47,10 +47,11 @@ const FindingCase frameCases[] = {
      Model(R"("materail": {})"),
      {"@/materail: found an unknown member 'materail', expected one of description, topLevelSolverInput, "
       "solverInput, absoluteZero, stefanBoltzmann, waveFormulation, restartJob, restartStep, "
-      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, datums, parts, assembly, "
+      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, cyclicSymmetry, datums, "
+      "parts, assembly, "
       "materials, sections, beamProfiles, amplitudes, constraints, contactControls, contactInitializations, "
       "interactionProperties, timePoints, adaptiveMeshControls, steps, boundaryConditions, loads, fields, "
-      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints, cyclicSymmetry; "
+      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints; "
       "did you mean 'materials'?"}},
     {"TwiceTheSameMember",
      Model(R"("restartJob": "a", "restartJob": "b")"),
@@ -86,10 +87,12 @@ const FindingCase frameCases[] = {
      {"@/restartIncrement: found null, expected an integer of 32 bits"}},
     {"UnknownWave",
      Model(R"("waveFormulation": "TOTALLY")"),
-     {"@/waveFormulation: found 'TOTALLY', expected one of NOT_SET, SCATTERED, TOTAL"}},
+     {"@/waveFormulation: found 'TOTALLY', expected one of NOT_SET, SCATTERED, TOTAL; did you mean "
+      "'TOTAL'?"}},
     {"UnknownProduct",
      Model(R"("analysisProduct": "explizit")"),
-     {"@/analysisProduct: found 'explizit', expected one of STANDARD, IMPLICIT, EXPLICIT, or an integer"}},
+     {"@/analysisProduct: found 'explizit', expected an integer of 32 bits or null, or one of STANDARD, "
+      "IMPLICIT, EXPLICIT; did you mean 'EXPLICIT'?"}},
     {"LongTextIsShownInPart",
      Model(R"("absoluteZero": ")" + std::string(59, 'x') + "\xC3\xA9\xC3\xA9\""),
      {"@/absoluteZero: found '" + std::string(59, 'x') + "'..., expected a number"}},
@@ -97,10 +100,11 @@ const FindingCase frameCases[] = {
      Model(R"("a\u001b[2J": 1)"),
      {"@/a\\x1B[2J: found an unknown member 'a\\x1B[2J', expected one of description, topLevelSolverInput, "
       "solverInput, absoluteZero, stefanBoltzmann, waveFormulation, restartJob, restartStep, "
-      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, datums, parts, assembly, "
+      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, cyclicSymmetry, datums, "
+      "parts, assembly, "
       "materials, sections, beamProfiles, amplitudes, constraints, contactControls, contactInitializations, "
       "interactionProperties, timePoints, adaptiveMeshControls, steps, boundaryConditions, loads, fields, "
-      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints, cyclicSymmetry"}},
+      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints"}},
 
     {"NameEmpty",
      Model(R"("parts": {"": {}})"),
@@ -210,8 +214,8 @@ const FindingCase frameCases[] = {
      {"@/assembly/instances/I/rotation/2: found -1e+39, expected a number of single precision"}},
     {"InstanceUnknownMember",
      Model(R"("parts": {"P": {}}, "assembly": {"instances": {"I": {"part": "P", "rotate": []}}})"),
-     {"@/assembly/instances/I/rotate: found an unknown member 'rotate', expected one of part, translation, "
-      "rotation, solverInput, partInstance, mesh, sectionAssignments, materialOrientations, "
+     {"@/assembly/instances/I/rotate: found an unknown member 'rotate', expected one of part, "
+      "partInstance, translation, rotation, solverInput, mesh, sectionAssignments, materialOrientations, "
       "beamOrientations"}},
 
     {"CyclicAsText",

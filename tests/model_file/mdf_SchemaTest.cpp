@@ -1,4 +1,5 @@
 #include "model_file/mdf_ModelFile.h"
+#include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <gtest/gtest.h>
@@ -82,5 +83,27 @@ TEST(ModelFileSchema, EveryReference_HasItsDefinition) {
     for (const std::string& reference : references) {
         ASSERT_TRUE(reference.starts_with("#/$defs/")) << reference;
         EXPECT_TRUE(Schema().at("$defs").contains(reference.substr(8))) << reference;
+    }
+}
+
+TEST(ModelFileSchema, EveryMemberOfTheFrame_HasADocumentation) {
+    for (const char* name : {"MODEL", "DATUM", "PART", "INSTANCE", "ASSEMBLY", "MESH", "NODES", "ELEMENTS",
+                             "SET", "ASSEMBLY_SET", "MEMBERS"}) {
+        const Json& definition = Schema().at("$defs").at(name);
+        EXPECT_FALSE(definition.value("description", "").empty()) << name;
+        EXPECT_EQ(definition.at("additionalProperties"), false) << name;
+        for (const auto& [member, schema] : definition.at("properties").items())
+            EXPECT_FALSE(schema.value("description", "").empty()) << name << ": " << member;
+    }
+    const Json& step = Schema().at("$defs").at("kprC_InitialStep").at("properties");
+    for (const char* member : {"name", "class", "description", "suppressed", "solverInput"})
+        EXPECT_FALSE(step.at(member).value("description", "").empty()) << member;
+}
+
+TEST(ModelFileSchema, Repositories_OfAModel_AreMembersOfIt) {
+    const Json& members = Schema().at("$defs").at("MODEL").at("properties");
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        ASSERT_TRUE(members.contains(repository.member)) << repository.member;
+        EXPECT_EQ(members.at(repository.member).at("type"), repository.IsInOrder() ? "array" : "object");
     }
 }

@@ -107,9 +107,9 @@ TEST(Model, Attributes_AreThePartsUntilTheInstanceHasItsOwn) {
     part.attributes.beamOrientations = {{"E", mdl_ObjCow<ptoC_PartAttribute>(ptoC_BeamOrientation())}};
     model.AddInstance("A", "P");
     odiK_Instance& own = model.AddInstance("B", "P");
-    own.ownSectionAssignments = std::make_unique<std::vector<odiK_AttributeInput>>();
+    own.ownSectionAssignments.emplace();
     own.ownSectionAssignments->push_back(Assignment("E", "Wood"));
-    own.ownMaterialOrientations = std::make_unique<std::vector<odiK_AttributeInput>>();
+    own.ownMaterialOrientations.emplace();
     model.Complete();
 
     const odiK_PartInstance& a = model.FindInstance("A")->attributes;

@@ -1,7 +1,12 @@
 #include "store/PropagationRecords.h"
 #include "store/StoreTesting.h"
+#include "store_interface/model/odiK_Repositories.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <gtest/gtest.h>
+
+#include <set>
+#include <string>
 
 namespace {
 
@@ -263,3 +268,27 @@ TEST(Step, SuppressAndResume_SetTheFlag) {
 }
 
 } // namespace
+
+TEST(Repositories, Rows_HaveNamesOfTheirOwnAndLeadToTheirMembers) {
+    odiK_Model model("m");
+    std::set<std::string> members;
+    std::set<const mdl_Repository*> repositories;
+    for (const odiK_Repository& row : odiK_Repositories()) {
+        EXPECT_TRUE(members.insert(row.member).second) << row.member;
+        EXPECT_EQ(row.IsPropagating(),
+                  cls_Classes().InheritanceCheck(row.ItemTypeId(), kprC_PropagatingObject::TypeId()));
+        if (row.IsInOrder()) continue;
+        EXPECT_TRUE(repositories.insert(&row.In(model)).second) << row.member;
+        EXPECT_EQ(row.In(model).ItemTypeId(), row.ItemTypeId()) << row.member;
+    }
+    EXPECT_EQ(repositories.count(&model.loads), 1u);
+    EXPECT_EQ(members.count("steps"), 1u);
+}
+
+TEST(Repositories, Steps_StandInFrontOfWhatLivesAcrossThem) {
+    bool stepsSeen = false;
+    for (const odiK_Repository& row : odiK_Repositories()) {
+        stepsSeen = stepsSeen || row.IsInOrder();
+        EXPECT_TRUE(stepsSeen || !row.IsPropagating()) << row.member;
+    }
+}

@@ -38,8 +38,8 @@ protected:
         m.AddInstance("I-1", "Part");
         m.AddInstance("I-3", "Alone");
         m.AddOtherEntry("H", "Part");
-        m.assemblyName = "Root";
-        m.assemblySolverInput = "assembly text\n";
+        m.AssemblyObject().name = "Root";
+        m.AssemblyObject().solverInput = "assembly text\n";
     }
 
     static mdl_ObjCow<ptoC_PartAttribute> Record(const ptoC_PartAttribute& record) {

@@ -16,7 +16,9 @@ const cls_FieldTable& ddb_ModelSectorDefinition::Fields() {
             .Field<&R::symmetryType>("symmetryType", "CYCLIC makes the model cyclic")
             .Field<&R::numberOfSectors>("numberOfSectors", "number of sectors in the full circle")
             .Field<&R::startPoint>("startPoint", "first point of the axis (length, single precision)")
-            .Field<&R::endPoint>("endPoint", "second point of the axis (length, single precision)");
+            .SinglePrecision()
+            .Field<&R::endPoint>("endPoint", "second point of the axis (length, single precision)")
+            .SinglePrecision();
     return fields;
 }
 

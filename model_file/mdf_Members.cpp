@@ -1,0 +1,32 @@
+#include "model_file/mdf_Members.h"
+
+#include <algorithm>
+
+std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields, const std::vector<std::string>& others) {
+    std::vector<std::string> names;
+    for (const cls_Field& field : fields.All()) {
+        if (!field.notModelData) names.emplace_back(field.name);
+    }
+    for (const std::string& other : others) {
+        if (std::find(names.begin(), names.end(), other) == names.end()) names.push_back(other);
+    }
+    return names;
+}
+
+void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
+                      const std::vector<std::string>& known, const mdf_Path& path) {
+    for (const mdf_Member& member : object.Members()) {
+        if (std::find(known.begin(), known.end(), member.name) != known.end()) continue;
+        diagnostics.Error(mdf_Path(path, member.name),
+                          "found an unknown member " + mdf_Quoted(member.name) +
+                              (known.empty() ? ", expected none" : ", expected " + mdf_OneOf(known)) +
+                              mdf_DidYouMean(member.name, known));
+    }
+}
+
+std::string mdf_MeaningWord(const cls_IntMeaning& meaning) {
+    std::string word(meaning.word);
+    word.erase(std::min(word.find_first_of("(,:"), word.size()));
+    while (!word.empty() && word.back() == ' ') word.pop_back();
+    return word;
+}

@@ -1,0 +1,98 @@
+#include "model_file/mdf_PlaceReader.h"
+
+#include "model_file/mdf_Members.h"
+
+namespace {
+
+std::string Text(const cow_String& text) {
+    return std::string(text.View());
+}
+
+} // namespace
+
+bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const mdf_Path& path) {
+    if (json.IsNull()) {
+        datum = {};
+        return true;
+    }
+    std::vector<std::string> names;
+    for (const odiK_Datum& known : model_.Datums()) names.push_back(Text(known.name));
+    if (json.IsString()) datum = model_.FindDatum(cow_String(json.String()));
+    if (json.IsString() && (!datum.IsNullRef() || references_.IsWrong(json.String()))) return true;
+    diagnostics_.Expected(path, json,
+                          "the name of a datum, or null" +
+                              (json.IsString() ? mdf_DidYouMean(json.String(), names) : std::string()));
+    return false;
+}
+
+void mdf_PlaceReader::ReportNoInstance(const std::string& name, const mdf_Path& path) {
+    if (references_.IsWrong(name)) return;
+    std::vector<std::string> names;
+    for (const auto& [known, entry] : model_.Instances()) names.push_back(Text(known));
+    diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
+                                 mdf_DidYouMean(name, names));
+}
+
+bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const mdf_Path& path) {
+    const std::string& given = text.String();
+    const std::size_t dot = given.find('.');
+    if (dot == std::string::npos) {
+        names.set = given;
+        return true;
+    }
+    if (dot == 0 || given.find('.', dot + 1) != std::string::npos) {
+        diagnostics_.Expected(path, text, "{\"instance\": ..., \"set\": ...} for names with dots");
+        return false;
+    }
+    names = {given.substr(0, dot), given.substr(dot + 1)};
+    return true;
+}
+
+bool mdf_PlaceReader::ReadNames(Names& names, const mdf_Value& value, const mdf_Path& path) {
+    if (value.IsString()) return ReadDottedNames(names, value, path);
+    if (!value.IsObject()) {
+        diagnostics_.Expected(path, value, "\"SET\", \"INSTANCE.SET\", an object of both names, or null");
+        return false;
+    }
+    mdf_CheckMembers(diagnostics_, value, {"instance", "set"}, path);
+    for (const auto& [member, target] :
+         {std::pair("instance", &names.instance), std::pair("set", &names.set)}) {
+        const mdf_Value* name = value.Find(member);
+        if (name == nullptr) continue;
+        if (!name->IsString()) {
+            diagnostics_.Expected(mdf_Path(path, std::string_view(member)), *name, "a name");
+            return false;
+        }
+        *target = name->String();
+    }
+    if (value.Find("set") != nullptr) return true;
+    diagnostics_.Error(mdf_Path(path, "set"), "found nothing, expected the name of a set");
+    return false;
+}
+
+rgnC_Region mdf_PlaceReader::ReadRegion(const mdf_Value& value, const mdf_Path& path) {
+    Names names;
+    if (value.IsNull() || !ReadNames(names, value, path)) return {};
+    rgnC_Region region = model_.FindRegion(cow_String(names.instance), cow_String(names.set));
+    if (!region.HasValue()) ReportNoSet(names, path);
+    return region;
+}
+
+void mdf_PlaceReader::ReportNoSet(const Names& names, const mdf_Path& path) {
+    const odiK_Instance* owner = model_.FindInstance(cow_String(names.instance));
+    if (!names.instance.empty() && owner == nullptr) {
+        ReportNoInstance(names.instance, path);
+        return;
+    }
+    if (references_.IsWrong(names.set)) return;
+    static const std::vector<cow_CountedHld<odiK_Set>> none;
+    const auto mesh = owner == nullptr ? cow_CountedHld<odiK_Mesh>() : owner->Mesh();
+    std::vector<std::string> known;
+    for (const auto& set : owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets()) {
+        known.push_back(Text(set->name));
+    }
+    diagnostics_.Error(path,
+                       "found set " + mdf_Quoted(names.set) + ", expected the name of a set of " +
+                           (owner == nullptr ? "the assembly" : "instance " + mdf_Quoted(names.instance)) +
+                           mdf_DidYouMean(names.set, known));
+}
