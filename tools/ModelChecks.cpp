@@ -1,5 +1,6 @@
 #include "tools/ModelChecks.h"
 
+#include "conditions/oif_BCTable.h"
 #include "conditions/oif_BoundaryConditionBuilder.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kbcC_MotionBCs.h"
@@ -225,11 +226,11 @@ std::set<std::string> ElementSetsOf(const odiK_Model& model) {
 }
 
 void FindOnRegion(const kbcC_BC& bc, const std::string& place, Findings& findings) {
-    const bool ofConnectors = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc) != nullptr;
-    const int expected = ofConnectors ? 2 : 1;
+    const oif_RegionKind expected = oif_FindBCRow(bc.DynTypeId())->region;
     if (!bc.region.HasValue()) {
         findings.push_back({place, "the condition has no region, so its lines name no set"});
-    } else if (bc.region.FlagWord() != expected) {
+    } else if (bc.region.FlagWord() != static_cast<int>(expected)) {
+        const bool ofConnectors = expected == oif_RegionKind::ELEMENTS;
         findings.push_back({place + "/region", "found " + Quoted(bc.region.SetName()) + ", which is " +
                                                    KindOf(bc.region) + "; the condition acts on " +
                                                    (ofConnectors ? "connector elements" : "nodes")});
@@ -240,10 +241,9 @@ void FindOnConditions(const odiK_Model& model, Findings& findings) {
     const oif_BCOpStatus status =
         oif_BoundaryConditionBuilder::OpStatusOf(model.boundaryConditions, model.loads, model.steps);
     std::optional<std::set<std::string>> elementSets;
-    for (kprC_PropagatingContainerIT<kbcC_BC> it(model.boundaryConditions); !it.IsDone(); it.Next()) {
-        const kbcC_BC& bc = it.CurrentValue();
+    for (const auto& [name, bc] : model.boundaryConditions) {
         if (bc.suppressed) continue;
-        const std::string place = Place("boundaryConditions", it.CurrentKey());
+        const std::string place = Place("boundaryConditions", name);
         FindOnRegion(bc, place, findings);
         if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
             if (!elementSets) elementSets = ElementSetsOf(model);
@@ -258,11 +258,9 @@ void FindOnConditions(const odiK_Model& model, Findings& findings) {
             }
         }
         bool written = false;
-        for (int i = 0; i < model.steps.Size() && !written; ++i) {
-            const cow_String& step = model.steps.NameAt(i);
-            for (const auto& [loadCase, scale] :
-                 oif_BCOpStatus::Places(model.steps.StepAt(i), it.CurrentKey(), bc.Status(step))) {
-                written = written || status.Writes(bc, step, !loadCase.IsEmpty());
+        for (const auto& [stepName, step] : model.steps) {
+            for (const auto& at : oif_BCOpStatus::Places(step, name, bc.Status(stepName))) {
+                written = written || status.Writes(bc, stepName, at.IsLoadCase());
             }
         }
         if (!written) findings.push_back({place, "no step writes the condition"});

@@ -97,23 +97,9 @@ private:
     }
 
     void MarkBoundaryConditions() {
-        const kprC_StepContainer& steps = view_.Steps();
-        const char* member = "boundaryConditions";
-        const auto status = Configured<oif_BCOpStatus>(member, [&](oif_BCOpStatus& made) {
-            made = oif_BoundaryConditionBuilder::OpStatusOf(view_.BCs(), view_.Loads(), steps);
+        MarkPlaced<kbcC_BC, oif_BCOpStatus>("boundaryConditions", [&](oif_BCOpStatus& status) {
+            status = oif_BoundaryConditionBuilder::OpStatusOf(view_.BCs(), view_.Loads(), view_.Steps());
         });
-        if (!status) return;
-        marks_[member] = MarkOfA<kbcC_BC>(
-            [&steps, status](const kbcC_BC& bc, const cow_String& name, const cow_String& step) {
-                const auto places = oif_BCOpStatus::Places(steps.ConstGet(step), name, bc.Status(step));
-                bool inCase = false;
-                const bool written =
-                    std::any_of(places.begin(), places.end(), [&](const oif_ConditionPlace& place) {
-                        inCase = !place.loadCase.IsEmpty();
-                        return status->Writes(bc, step, inCase);
-                    });
-                return Mark{written, written && (inCase || status->OpNew(bc.DynTypeId(), step))};
-            });
     }
 
     void MarkLoads() {
@@ -136,9 +122,13 @@ private:
         if (!status) return;
         marks_[member] =
             MarkOfA<T>([&steps, status](const T& object, const cow_String& name, const cow_String& step) {
-                const bool written =
-                    !Status::Places(steps.ConstGet(step), name).empty() && status->Writes(object, step);
-                return Mark{written, written && status->OpNew(object.DynTypeId(), step)};
+                Mark mark{false, false};
+                for (const oif_ConditionPlace& place :
+                     Status::Places(steps.ConstGet(step), name, object.Status(step))) {
+                    if (!status->Writes(object, step, place.IsLoadCase())) continue;
+                    mark = {true, status->Op(object, step, place.IsLoadCase()) == oif_Op::NEW};
+                }
+                return mark;
             });
     }
 

@@ -240,10 +240,25 @@ TEST(BoundaryConditionBuilder, BoltNamedWithAPrefix_LosesIt) {
     EXPECT_EQ(model.StepText("S1"), kBanner + "** Name: b Type: Bolt load\n");
 }
 
-TEST(BoundaryConditionBuilder, Comment_OfAClassWithoutALabelEndsWithABlank) {
-    EXPECT_EQ(oif_BoundaryConditionBuilder::Comment("x", 1, "", 2.0F), cow_String("Name: x Type: "));
-    EXPECT_EQ(oif_BoundaryConditionBuilder::Comment("x", 0x2980010, "case", 0.1F),
-              cow_String("Name: x Type: Temperature   Scale factor: 0.1"));
+TEST(BoundaryConditionBuilder, Comment_WithoutALabelEndsWithABlank) {
+    EXPECT_EQ(oif_BoundaryConditionBuilder::Comment("x", ""), cow_String("Name: x Type: "));
+    EXPECT_EQ(oif_BoundaryConditionBuilder::Comment("__basename__x", "Temperature"),
+              cow_String("Name: x Type: Temperature"));
+}
+
+TEST(BoundaryConditionBuilder, Comment_HasTheScaleOfItsLoadCaseInSinglePrecision) {
+    ConditionModel model(
+        R"(IL{"loadCases": {"case": {"bcs": {"x": 0.1}}}})",
+        Conditions(
+            R"("x": {"class": "kbcC_TemperatureBC", "region": "A.N", "states": {"S1": {"magnitude": 0}}})"));
+    EXPECT_EQ(model.StepText("S1", "case"),
+              "** Name: x Type: Temperature   Scale factor: 0.1\n*Boundary, op=NEW\nA.N, 11, 11\n");
+}
+
+TEST(BoundaryConditionBuilder, BoltOfTheInitialStep_IsPassedOverThere) {
+    ConditionModel model("IG", R"("loads": {"b": {"class": "kloC_BoltLoad", "region": "A.F",
+                                             "states": {"S0": {"boltMethod": 1}}}})");
+    EXPECT_EQ(model.StepText("S0") + model.StepText("S1"), "");
 }
 
 TEST(BoundaryConditionBuilder, EveryStatus_IsWrittenAlwaysInLoadCasesOrNever) {

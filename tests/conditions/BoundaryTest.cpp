@@ -15,12 +15,18 @@ public:
                                     R"(, "region": "A.N", "states": {)" + states + "}}}") {}
 
     const kbcC_BC& Record() const { return Condition("B"); }
-    std::string Boundary(const char* step, bool opMod = true, double scale = 1.0, const char* name = "B",
-                         bool shellToSolid = false) const {
-        return Written(oif_Boundary(Record(), name, step, opMod, "A.N", shellToSolid, "S0", scale));
+    oif_BCCard Card(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0,
+                    const char* name = "B") const {
+        return {name, Record(), "A.N", step, op, {}, static_cast<float>(scale)};
     }
-    std::string Motion(const char* step, bool opMod = true, double scale = 1.0) const {
-        return Written(oif_ConnectorMotion(Record(), "A.E", step, opMod, "S0", scale));
+    std::string Boundary(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0,
+                         const char* name = "B", bool shellToSolid = false) const {
+        return Written(oif_Boundary(Card(step, op, scale, name), shellToSolid, "S0"));
+    }
+    std::string Motion(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0) const {
+        oif_BCCard card = Card(step, op, scale);
+        card.setName = "A.E";
+        return Written(oif_ConnectorMotion(card, "S0"));
     }
 };
 
@@ -59,7 +65,7 @@ TEST(Boundary, DisplacementThatAddsAndChanges_WritesWhatWasSetInTheStep) {
 
 TEST(Boundary, DisplacementWithOpNew_WritesWhatIsCarriedToo) {
     const OneCondition model("IG", kDisplacement, R"("S0": {"u1": 1, "u2": 2}, "S1": {"u2": 3})");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW\nA.N, 1, 1, 1.\nA.N, 2, 2, 3.\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\nA.N, 1, 1, 1.\nA.N, 2, 2, 3.\n");
 }
 
 TEST(Boundary, DisplacementWithoutAComponentThatPasses_StillWritesItsCard) {
@@ -69,13 +75,13 @@ TEST(Boundary, DisplacementWithoutAComponentThatPasses_StillWritesItsCard) {
 
 TEST(Boundary, ComponentThatIsCleared_IsNotWritten) {
     const OneCondition model("IG", kDisplacement, R"("S0": {"u1": 1, "u2": 2}, "S1": {"u1": null})");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW\nA.N, 2, 2, 2.\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\nA.N, 2, 2, 2.\n");
 }
 
 TEST(Boundary, Scale_MultipliesEveryValue) {
     const OneCondition model("IG", kDisplacement, R"("S1": {"u1": 2, "ur3": -4})");
-    EXPECT_EQ(model.Boundary("S1", false, 0.5), "*Boundary, op=NEW\nA.N, 1, 1, 1.\nA.N, 6, 6, -2.\n");
-    EXPECT_EQ(model.Boundary("S1", false, 0.0), "*Boundary, op=NEW\nA.N, 1, 1\nA.N, 6, 6\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW, 0.5), "*Boundary, op=NEW\nA.N, 1, 1, 1.\nA.N, 6, 6, -2.\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW, 0.0), "*Boundary, op=NEW\nA.N, 1, 1\nA.N, 6, 6\n");
 }
 
 TEST(Boundary, AmplitudeThatIsNew_BringsAllComponentsAlong) {
@@ -100,14 +106,14 @@ TEST(Boundary, ConditionThatEnds_IsItsCardAlone) {
     const OneCondition model("IG", kDisplacement,
                              R"("S0": {"u1": 1, "amplitude": "Ramp"}, "S1": {"u2": 3, "deactivated": true})",
                              R"("fixed": true, "distributionType": 1)");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\n");
 }
 
 TEST(Boundary, ConditionThatEndsInABucklingStep_HasTheFirstLoadCase) {
     const OneCondition model("IB", kDisplacement, R"("S0": {"u1": 1}, "S1": {"deactivated": true})");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW, load case=1\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW, load case=1\n");
     const OneCondition other("IL", kDisplacement, R"("S0": {"u1": 1}, "S1": {"deactivated": true})");
-    EXPECT_EQ(other.Boundary("S1", false), "*Boundary, op=NEW\n");
+    EXPECT_EQ(other.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\n");
 }
 
 TEST(Boundary, FixedDisplacement_HasNoValues) {
@@ -126,9 +132,9 @@ TEST(Boundary, UserDefinedDistribution_IsAFlagAndAFieldIsNone) {
 TEST(Boundary, BaseName_IsTheLastParameter) {
     const OneCondition model("IG", kDisplacement, R"("S1": {"u1": 1, "amplitude": "Ramp"})",
                              R"("fixed": true)");
-    EXPECT_EQ(model.Boundary("S1", true, 1.0, "__basename__Base 1"),
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 1.0, "__basename__Base 1"),
               "*Boundary, amplitude=Ramp, fixed, base name=\"Base 1\"\nA.N, 1, 1\n");
-    EXPECT_EQ(model.Boundary("S1", true, 1.0, "not__basename__"),
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 1.0, "not__basename__"),
               "*Boundary, amplitude=Ramp, fixed\nA.N, 1, 1\n");
 }
 
@@ -142,21 +148,21 @@ TEST(Boundary, FixBCNameHack_TakesThePrefixAwayAtTheBeginningOnly) {
 TEST(Boundary, LongCard_BreaksAheadOfTheTypeAndNotAheadOfTheBaseName) {
     const OneCondition model("IG", "kbcC_VelocityBC", R"("S1": {"v2": 1})");
     const std::string name(150, 'n');
-    EXPECT_EQ(model.Boundary("S1", true, 1.0, ("__basename__" + name).c_str()),
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 1.0, ("__basename__" + name).c_str()),
               "*Boundary, base name=" + name + ", \ntype=VELOCITY\nA.N, 2, 2, 1.\n");
 }
 
 TEST(Boundary, ComplexDisplacement_IsTwoBlocksOfRealAndImaginaryParts) {
     const OneCondition model("ID", kDisplacement,
                              R"("S1": {"u1": 1, "u2": 2, "u1Imag": 3, "ur3": 0, "ur3Imag": 4})");
-    EXPECT_EQ(model.Boundary("S1", true, 2.0), "*Boundary, load case=1\n"
-                                               "A.N, 1, 1, 2.\n"
-                                               "A.N, 2, 2, 4.\n"
-                                               "A.N, 6, 6\n"
-                                               "*Boundary, load case=2\n"
-                                               "A.N, 1, 1, 6.\n"
-                                               "A.N, 2, 2\n"
-                                               "A.N, 6, 6, 8.\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 2.0), "*Boundary, load case=1\n"
+                                                         "A.N, 1, 1, 2.\n"
+                                                         "A.N, 2, 2, 4.\n"
+                                                         "A.N, 6, 6\n"
+                                                         "*Boundary, load case=2\n"
+                                                         "A.N, 1, 1, 6.\n"
+                                                         "A.N, 2, 2\n"
+                                                         "A.N, 6, 6, 8.\n");
 }
 
 TEST(Boundary, DisplacementInABucklingStep_EntersTheLoadCasesOfItsBuckleCase) {
@@ -166,7 +172,7 @@ TEST(Boundary, DisplacementInABucklingStep_EntersTheLoadCasesOfItsBuckleCase) {
     for (const auto& [buckleCase, text] : cases) {
         const OneCondition model("IB", kDisplacement,
                                  R"("S1": {"u1": 2, "buckleCase": )" + std::to_string(buckleCase) + "}");
-        EXPECT_EQ(model.Boundary("S1", false), text) << buckleCase;
+        EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), text) << buckleCase;
     }
 }
 
@@ -174,26 +180,27 @@ TEST(Boundary, BuckleCaseOfAnotherNumber_WritesNothingAtAll) {
     for (const char* number : {"5", "4", "-1"}) {
         const OneCondition model("IB", kDisplacement,
                                  std::string(R"("S1": {"u1": 2, "buckleCase": )") + number + "}");
-        EXPECT_EQ(model.Boundary("S1", false), "");
+        EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "");
         const OneCondition type("IB", "kbcC_TypeBC",
                                 std::string(R"("S1": {"typeName": "PINNED", "buckleCase": )") + number + "}");
-        EXPECT_EQ(type.Boundary("S1", false), "");
+        EXPECT_EQ(type.Boundary("S1", oif_Op::NEW), "");
     }
 }
 
 TEST(Boundary, ConditionOfTheBaseState_IsRewrittenWithoutItsValue) {
     const OneCondition model("IGB", kDisplacement,
                              R"("S0": {"u1": 0.5, "amplitude": "Ramp"}, "S1": {"u2": 3})");
-    EXPECT_EQ(model.Boundary("S2", false), "*Boundary, op=NEW, load case=1\nA.N, 1, 1\nA.N, 2, 2\n"
-                                           "*Boundary, op=NEW, load case=2\nA.N, 1, 1\nA.N, 2, 2\n");
+    EXPECT_EQ(model.Boundary("S2", oif_Op::NEW), "*Boundary, op=NEW, load case=1\nA.N, 1, 1\nA.N, 2, 2\n"
+                                                 "*Boundary, op=NEW, load case=2\nA.N, 1, 1\nA.N, 2, 2\n");
 }
 
 TEST(Boundary, VelocityAndAcceleration_HaveTheirTypeLast) {
     const OneCondition velocity("IG", "kbcC_VelocityBC",
                                 R"("S1": {"v1": 1, "v3": 0, "vr2": 5, "amplitude": "Ramp"})",
                                 R"("distributionType": 1)");
-    EXPECT_EQ(velocity.Boundary("S1", false, 2.0), "*Boundary, op=NEW, amplitude=Ramp, user, type=VELOCITY\n"
-                                                   "A.N, 1, 1, 2.\nA.N, 3, 3\nA.N, 5, 5, 10.\n");
+    EXPECT_EQ(velocity.Boundary("S1", oif_Op::NEW, 2.0),
+              "*Boundary, op=NEW, amplitude=Ramp, user, type=VELOCITY\n"
+              "A.N, 1, 1, 2.\nA.N, 3, 3\nA.N, 5, 5, 10.\n");
     const OneCondition acceleration("IG", "kbcC_AccelerationBC",
                                     R"("S0": {"a1": 1}, "S1": {"a2": 2, "ar1": 4, "ar3": 6})");
     EXPECT_EQ(acceleration.Boundary("S1"),
@@ -211,14 +218,14 @@ TEST(Boundary, VelocityInHarmonicAndBucklingSteps_HasTheFirstLoadCaseOnly) {
 
 TEST(Boundary, BaseNameOfAVelocity_StandsAheadOfTheType) {
     const OneCondition velocity("IG", "kbcC_VelocityBC", R"("S1": {"v2": 1})");
-    EXPECT_EQ(velocity.Boundary("S1", true, 1.0, "__basename__X"),
+    EXPECT_EQ(velocity.Boundary("S1", oif_Op::MODIFY, 1.0, "__basename__X"),
               "*Boundary, base name=X, type=VELOCITY\nA.N, 2, 2, 1.\n");
 }
 
 TEST(Boundary, Type_IsTheWordInPlaceOfTheDegreesOfFreedom) {
     const OneCondition model("IG", "kbcC_TypeBC", R"("S1": {"typeName": "ENCASTRE"})",
                              R"("distributionType": 1)");
-    EXPECT_EQ(model.Boundary("S1", true, 7.0), "*Boundary, user\nA.N, ENCASTRE\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 7.0), "*Boundary, user\nA.N, ENCASTRE\n");
     const char* const words[] = {"XSYMM",  "YSYMM",    "ZSYMM",  "XASYMM", "YASYMM",  "ZASYMM",
                                  "PINNED", "ENCASTRE", "NOWARP", "NOOVAL", "NODEFORM"};
     for (int i = 0; i < 11; ++i) {
@@ -230,7 +237,7 @@ TEST(Boundary, Type_IsTheWordInPlaceOfTheDegreesOfFreedom) {
 TEST(Boundary, TypeThatIsNotSaid_WritesNotEvenItsCard) {
     const OneCondition model("IG", "kbcC_TypeBC", R"("S0": {"typeName": 6}, "S1": {"buckleCase": 1})");
     EXPECT_EQ(model.Boundary("S1"), "");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW\nA.N, PINNED\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\nA.N, PINNED\n");
 }
 
 TEST(Boundary, TypeInABucklingStep_EntersTheLoadCasesOfItsBuckleCase) {
@@ -253,13 +260,13 @@ TEST(Boundary, TypeInAHarmonicStep_IsNotComplex) {
 TEST(Boundary, SymmetryRecord_IsAFixedTextWithABlankAtItsEnd) {
     const OneCondition model("IG", "kbcC_SymmetryBC", R"("S0": {}, "S1": {"deactivated": true})");
     EXPECT_EQ(model.Boundary("S0"), "**** symm BC output \n");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\n");
 }
 
 TEST(Boundary, Temperature_IsOnDegreeOfFreedomEleven) {
     const OneCondition model("IG", "kbcC_TemperatureBC",
                              R"("S0": {"magnitude": 20}, "S1": {"amplitude": "Ramp"})");
-    EXPECT_EQ(model.Boundary("S0", true, 2.0), "*Boundary\nA.N, 11, 11, 40.\n");
+    EXPECT_EQ(model.Boundary("S0", oif_Op::MODIFY, 2.0), "*Boundary\nA.N, 11, 11, 40.\n");
     EXPECT_EQ(model.Boundary("S1"), "*Boundary, amplitude=Ramp\nA.N, 11, 11, 20.\n");
     const OneCondition carried("IG", "kbcC_TemperatureBC",
                                R"("S0": {"magnitude": 20}, "S1": {"dofs": [12]})");
@@ -274,7 +281,7 @@ TEST(Boundary, TemperatureOfShells_HasALineForEachListedDegreeOfFreedom) {
     EXPECT_EQ(model.Boundary("S1"), "*Boundary\nA.N, 11, 11, 5.\nA.N, 13, 13, 5.\nA.N, 12, 12, 5.\n");
     EXPECT_EQ(model.Boundary("S2"), "*Boundary\nA.N, 14, 14, 5.\n") << "the list alone calls for its lines";
     EXPECT_EQ(model.Boundary("S3"), "*Boundary\n");
-    EXPECT_EQ(model.Boundary("S4", false), "*Boundary, op=NEW\n");
+    EXPECT_EQ(model.Boundary("S4", oif_Op::NEW), "*Boundary, op=NEW\n");
 }
 
 TEST(Boundary, ScalarQuantities_HaveTheirDegreesOfFreedom) {
@@ -287,7 +294,7 @@ TEST(Boundary, ScalarQuantities_HaveTheirDegreesOfFreedom) {
         const OneCondition model("IG", name, R"("S0": {"magnitude": 4}, "S1": {"amplitude": "Ramp"})",
                                  R"("distributionType": 1)");
         const std::string line = std::string("A.N, ") + dof + ", " + dof;
-        EXPECT_EQ(model.Boundary("S0", true, 0.5), "*Boundary, user\n" + line + ", 2.\n") << name;
+        EXPECT_EQ(model.Boundary("S0", oif_Op::MODIFY, 0.5), "*Boundary, user\n" + line + ", 2.\n") << name;
         EXPECT_EQ(model.Boundary("S1"), "*Boundary, amplitude=Ramp, user\n" + line + ", 4.\n") << name;
     }
 }
@@ -310,8 +317,8 @@ TEST(Boundary, ScalarQuantityThatIsNotSaid_WritesItsCardAlone) {
 TEST(Boundary, ComplexScalarQuantity_WritesBothPartsWhateverWasSaid) {
     const OneCondition model("ID", "kbcC_ElectricPotentialBC",
                              R"("S1": {"magnitude": 4, "imaginaryMagnitude": -2})", R"("fixed": true)");
-    EXPECT_EQ(model.Boundary("S1", true, 0.5), "*Boundary, load case=1, fixed\nA.N, 9, 9, 2.\n"
-                                               "*Boundary, load case=2, fixed\nA.N, 9, 9, -1.\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::MODIFY, 0.5), "*Boundary, load case=1, fixed\nA.N, 9, 9, 2.\n"
+                                                         "*Boundary, load case=2, fixed\nA.N, 9, 9, -1.\n");
     const OneCondition none("ID", "kbcC_AcousticPressureBC", R"("S1": {})");
     EXPECT_EQ(none.Boundary("S1"), "*Boundary, load case=1\nA.N, 8, 8\n*Boundary, load case=2\nA.N, 8, 8\n");
     const OneCondition pore("ID", "kbcC_PorePressureBC", R"("S1": {"magnitude": 4})");
@@ -323,7 +330,7 @@ TEST(Boundary, Submodel_LeavesItsKeywordLineToTheListOfItsStep) {
         "IG", "kbcC_SubmodelBC",
         R"("S1": {"dofs": [1, 3, 2], "stepName": "2", "increment": 5, "timeScale": true})");
     EXPECT_EQ(model.Boundary("S1"), "A.N, 1, 1\nA.N, 3, 3\nA.N, 2, 2\n");
-    const oif_Boundary boundary(model.Record(), "B", "S1", false, "A.N", false, "S0", 1.0);
+    const oif_Boundary boundary(model.Card("S1", oif_Op::NEW), false, "S0");
     EXPECT_TRUE(boundary.IsBCSubmodel());
     EXPECT_EQ(boundary.BCSubmodelKwd(), cow_String("*Boundary, op=NEW, submodel, step=2, inc=5, timescale"));
 }
@@ -333,7 +340,7 @@ TEST(Boundary, SubmodelWithoutIncrement_HasNoneInItsLine) {
         const OneCondition model("IG", "kbcC_SubmodelBC",
                                  std::string(R"("S1": {"dofs": [1], "stepName": "1", "increment": )") +
                                      increment + "}");
-        const oif_Boundary boundary(model.Record(), "B", "S1", true, "A.N", false, "S0", 1.0);
+        const oif_Boundary boundary(model.Card("S1"), false, "S0");
         EXPECT_EQ(boundary.BCSubmodelKwd(), cow_String("*Boundary, submodel, step=1"));
     }
 }
@@ -341,17 +348,17 @@ TEST(Boundary, SubmodelWithoutIncrement_HasNoneInItsLine) {
 TEST(Boundary, SubmodelThatIsHeld_WritesItsLineItselfAndItsDataAllTheSame) {
     const OneCondition model("IG", "kbcC_SubmodelBC",
                              R"("S1": {"dofs": [1, 2], "stepName": "2", "centerZone": true})");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW, fixed\nA.N, 1, 1\nA.N, 2, 2\n");
-    EXPECT_FALSE(oif_Boundary(model.Record(), "B", "S1", true, "A.N", false, "S0", 1.0).IsBCSubmodel());
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW, fixed\nA.N, 1, 1\nA.N, 2, 2\n");
+    EXPECT_FALSE(oif_Boundary(model.Card("S1"), false, "S0").IsBCSubmodel());
 }
 
 TEST(Boundary, SubmodelOutOfForceOrSuppressed_IsNoSubmodel) {
     const OneCondition ended("IG", "kbcC_SubmodelBC", R"("S0": {"dofs": [1]}, "S1": {"deactivated": true})");
-    EXPECT_FALSE(oif_Boundary(ended.Record(), "B", "S1", false, "A.N", false, "S0", 1.0).IsBCSubmodel());
-    EXPECT_EQ(ended.Boundary("S1", false), "*Boundary, op=NEW\n");
+    EXPECT_FALSE(oif_Boundary(ended.Card("S1", oif_Op::NEW), false, "S0").IsBCSubmodel());
+    EXPECT_EQ(ended.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\n");
     const OneCondition suppressed("IG", "kbcC_SubmodelBC", R"("S0": {"dofs": [1], "centerZone": true})",
                                   R"("suppressed": true)");
-    const oif_Boundary boundary(suppressed.Record(), "B", "S0", true, "A.N", false, "S0", 1.0);
+    const oif_Boundary boundary(suppressed.Card("S0"), false, "S0");
     EXPECT_FALSE(boundary.IsBCSubmodel());
     EXPECT_EQ(boundary.BCSubmodelKwd(), cow_String("*Boundary"));
 }
@@ -359,13 +366,13 @@ TEST(Boundary, SubmodelOutOfForceOrSuppressed_IsNoSubmodel) {
 TEST(Boundary, SubmodelBetweenShellAndSolid_HasAThicknessInPlaceOfTheDegreeOfFreedom) {
     const OneCondition zone("IG", "kbcC_SubmodelBC", R"("S1": {"dofs": [1, 2], "shellThicknessValue": 2})",
                             R"("shellThickness": 5)");
-    EXPECT_EQ(zone.Boundary("S1", true, 1.0, "B", true), "A.N, 2\n") << "a text, without a point";
+    EXPECT_EQ(zone.Boundary("S1", oif_Op::MODIFY, 1.0, "B", true), "A.N, 2\n") << "a text, without a point";
     const OneCondition none("IG", "kbcC_SubmodelBC", R"("S1": {"dofs": [1, 2], "shellThicknessValue": 0})",
                             R"("shellThickness": 5)");
-    EXPECT_EQ(none.Boundary("S1", true, 1.0, "B", true), "A.N, 0.5\n");
+    EXPECT_EQ(none.Boundary("S1", oif_Op::MODIFY, 1.0, "B", true), "A.N, 0.5\n");
     const OneCondition negative("IG", "kbcC_SubmodelBC", R"("S1": {"shellThicknessValue": -1})",
                                 R"("shellThickness": 0.25)");
-    EXPECT_EQ(negative.Boundary("S1", true, 3.0, "B", true), "A.N, 0.025\n");
+    EXPECT_EQ(negative.Boundary("S1", oif_Op::MODIFY, 3.0, "B", true), "A.N, 0.025\n");
 }
 
 TEST(Boundary, ClassWithoutAForm_Fails) {
@@ -374,9 +381,21 @@ TEST(Boundary, ClassWithoutAForm_Fails) {
     kprC_StepContainer steps;
     steps.Append("S0", kprC_InitialStep());
     other.Propagate(steps);
-    EXPECT_EQ(Raised([&] { Written(oif_Boundary(other, "B", "S0", true, "N", false, "S0", 1.0)); }),
+    EXPECT_EQ(Raised([&] {
+                  Written(oif_Boundary({"B", other, "N", "S0"}, false, "S0"));
+              }),
               "Unimplemented boundary condition in input file.");
-    EXPECT_EQ(Raised([&] { Written(oif_ConnectorMotion(other, "N", "S0", true, "S0", 1.0)); }),
+    EXPECT_EQ(Raised([&] {
+                  Written(oif_ConnectorMotion({"B", other, "N", "S0"}, "S0"));
+              }),
+              "Unimplemented ConnectorMotion condition in input file.");
+}
+
+TEST(Boundary, ClassOfTheOtherKeyword_Fails) {
+    const OneCondition motion("I", "kbcC_ConnVelocityBC", R"("S0": {"v1": 1})");
+    EXPECT_EQ(Raised([&] { motion.Boundary("S0"); }), "Unimplemented boundary condition in input file.");
+    const OneCondition boundary("I", kDisplacement, R"("S0": {"u1": 1})");
+    EXPECT_EQ(Raised([&] { boundary.Motion("S0"); }),
               "Unimplemented ConnectorMotion condition in input file.");
 }
 
@@ -384,7 +403,7 @@ TEST(ConnectorMotion, Displacement_HasOneNumberForEachDegreeOfFreedom) {
     const OneCondition model("IG", "kbcC_ConnDisplacementBC",
                              R"("S0": {"u1": 1}, "S1": {"u2": 3, "ur3": 0, "amplitude": "Ramp"})");
     EXPECT_EQ(model.Motion("S1"), "*Connector Motion, amplitude=Ramp\nA.E, 1, 1.\nA.E, 2, 3.\nA.E, 6\n");
-    EXPECT_EQ(model.Motion("S1", false, 2.0),
+    EXPECT_EQ(model.Motion("S1", oif_Op::NEW, 2.0),
               "*Connector Motion, op=NEW, amplitude=Ramp\nA.E, 1, 2.\nA.E, 2, 6.\nA.E, 6\n");
 }
 
@@ -400,7 +419,7 @@ TEST(ConnectorMotion, ComplexAndBuckling_GoAsDisplacementsOfNodes) {
     EXPECT_EQ(complex.Motion("S1"), "*Connector Motion, load case=1, user\nA.E, 1, 1.\n"
                                     "*Connector Motion, load case=2, user\nA.E, 1, 2.\n");
     const OneCondition buckling("IB", "kbcC_ConnDisplacementBC", R"("S1": {"u1": 1, "buckleCase": 2})");
-    EXPECT_EQ(buckling.Motion("S1", false), "*Connector Motion, op=NEW, load case=2\nA.E, 1, 1.\n");
+    EXPECT_EQ(buckling.Motion("S1", oif_Op::NEW), "*Connector Motion, op=NEW, load case=2\nA.E, 1, 1.\n");
 }
 
 TEST(ConnectorMotion, FixedDisplacement_HasTheFlagAndNoValues) {
@@ -419,23 +438,24 @@ TEST(ConnectorMotion, FixedVelocityAndAcceleration_LeaveTheirValuesOutButHaveNoF
 TEST(ConnectorMotion, ConditionThatEnds_IsItsCardAlone) {
     const OneCondition model("IGB", "kbcC_ConnVelocityBC",
                              R"("S0": {"v1": 1}, "S1": {"deactivated": true}, "S2": {"status": 11})");
-    EXPECT_EQ(model.Motion("S1", false), "*Connector Motion, op=NEW\n");
-    EXPECT_EQ(model.Motion("S2", false), "*Connector Motion, op=NEW, load case=1\n");
+    EXPECT_EQ(model.Motion("S1", oif_Op::NEW), "*Connector Motion, op=NEW\n");
+    EXPECT_EQ(model.Motion("S2", oif_Op::NEW), "*Connector Motion, op=NEW, load case=1\n");
 }
 
 TEST(BoundaryForBoltLoad, ByMethod_IsReleasedAdjustedOrHeld) {
     ConditionModel model("IGGGG", R"("loads": {"B": {"class": "kloC_BoltLoad", "region": "A.F", "states": {
         "S1": {"boltMethod": "APPLY_FORCE", "magnitude": 7}, "S2": {"boltMethod": "ADJUST_LENGTH", "adjustment": 0.25},
         "S3": {"boltMethod": "FIX_LENGTH"}, "S4": {"deactivated": true}}}})");
-    const auto text = [&](const char* step, bool opMod, double scale = 1.0) {
-        return Written(oif_BoundaryForBoltLoad(model.Bolt("B"), step, opMod, "A.N", scale));
+    const auto text = [&](const char* step, oif_Op op, float scale = 1.0F) {
+        const kloC_BoltLoad& bolt = model.Bolt("B");
+        return Written(oif_BoundaryForBoltLoad({"B", bolt, "A.N", step, op, {}, scale}, bolt));
     };
-    EXPECT_EQ(text("S1", true), "*Boundary, op=NEW\n") << "a release is never told by adding";
-    EXPECT_EQ(text("S2", true, 2.0), "*Boundary\nA.N, 1, 1, 0.5\n");
-    EXPECT_EQ(text("S2", false), "*Boundary, op=NEW\nA.N, 1, 1, 0.25\n");
-    EXPECT_EQ(text("S3", true), "*Boundary, fixed\nA.N, 1, 1\n");
-    EXPECT_EQ(text("S3", false), "*Boundary, op=NEW, fixed\nA.N, 1, 1\n");
-    EXPECT_EQ(text("S4", true), "*Boundary, op=NEW\n");
+    EXPECT_EQ(text("S1", oif_Op::MODIFY), "*Boundary, op=NEW\n") << "a release is never told by adding";
+    EXPECT_EQ(text("S2", oif_Op::MODIFY, 2.0F), "*Boundary\nA.N, 1, 1, 0.5\n");
+    EXPECT_EQ(text("S2", oif_Op::NEW), "*Boundary, op=NEW\nA.N, 1, 1, 0.25\n");
+    EXPECT_EQ(text("S3", oif_Op::MODIFY), "*Boundary, fixed\nA.N, 1, 1\n");
+    EXPECT_EQ(text("S3", oif_Op::NEW), "*Boundary, op=NEW, fixed\nA.N, 1, 1\n");
+    EXPECT_EQ(text("S4", oif_Op::MODIFY), "*Boundary, op=NEW\n");
 }
 
 TEST(BoundaryConditions, QueriesByName_GiveStateAndParts) {
@@ -550,16 +570,16 @@ TEST(BoundaryConditions, BaseState_HoldsWhatItHeldWithoutValuesAndAmplitude) {
 
     const OneCondition shell("IF", "kbcC_TemperatureBC", R"("S0": {"magnitude": 1, "dofs": [11, 12]})",
                              R"("dofsGiven": true)");
-    EXPECT_EQ(shell.Boundary("S1", false), "*Boundary, op=NEW\nA.N, 11, 11\nA.N, 12, 12\n");
+    EXPECT_EQ(shell.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\nA.N, 11, 11\nA.N, 12, 12\n");
     const OneCondition potential("ID", "kbcC_ElectricPotentialBC",
                                  R"("S0": {"magnitude": 1, "imaginaryMagnitude": 2})");
-    EXPECT_EQ(potential.Boundary("S1", false),
+    EXPECT_EQ(potential.Boundary("S1", oif_Op::NEW),
               "*Boundary, op=NEW, load case=1\nA.N, 9, 9\n*Boundary, op=NEW, load case=2\nA.N, 9, 9\n");
     const OneCondition type("IF", "kbcC_TypeBC", R"("S0": {"typeName": "PINNED"})");
-    EXPECT_EQ(type.Boundary("S1", false), "*Boundary, op=NEW\nA.N, PINNED\n");
+    EXPECT_EQ(type.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW\nA.N, PINNED\n");
 }
 
 TEST(BoundaryConditions, DisplacementInABucklingStepOfItsOwn_KeepsItsValue) {
     const OneCondition model("IB", kDisplacement, R"("S0": {"u1": 1}, "S1": {"u1": 0.01, "buckleCase": 1})");
-    EXPECT_EQ(model.Boundary("S1", false), "*Boundary, op=NEW, load case=1\nA.N, 1, 1, 0.01\n");
+    EXPECT_EQ(model.Boundary("S1", oif_Op::NEW), "*Boundary, op=NEW, load case=1\nA.N, 1, 1, 0.01\n");
 }

@@ -66,15 +66,9 @@ qkw_BuilderComponent& ConditionModel::Builder() {
 }
 
 std::string ConditionModel::StepText(const char* step, const char* loadCase) {
-    return TextOf(Builder().StepDefinition(step, loadCase));
+    return WrittenAll(Builder().StepDefinition(step, loadCase));
 }
 
 std::string ConditionModel::AssemblyText() {
-    return TextOf(Builder().AssemblyDefinition());
-}
-
-std::string ConditionModel::TextOf(const qkw_KeywordList& keywords) {
-    std::string text;
-    for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
-    return text;
+    return WrittenAll(Builder().AssemblyDefinition());
 }

@@ -6,8 +6,8 @@
 #include "support/DeckTest.h"
 
 /// Steps "S0", "S1", ... of a model file by one letter each: I initial, G static, F frequency, B buckling,
-/// L static perturbation, D harmonic direct, M modal dynamics, S harmonic modal. Text behind a letter in braces is the step's
-/// own: "IL{\"loadCases\": {}}".
+/// L static perturbation, D harmonic direct, M modal dynamics, S harmonic modal. Text behind a letter in
+/// braces is the step's own: "IL{\"loadCases\": {}}".
 std::string StepsJson(std::string_view kinds);
 
 /// A model read from the text of its members: an instance A with the node sets N, N2, N3, the element set E
@@ -30,7 +30,6 @@ public:
 
 private:
     qkw_BuilderComponent& Builder();
-    static std::string TextOf(const qkw_KeywordList& keywords);
 
     std::unique_ptr<odb_Odb> odb_;
     std::unique_ptr<oif_ModelInfo> info_;

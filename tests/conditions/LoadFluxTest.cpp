@@ -4,13 +4,13 @@
 namespace {
 
 template <class Keyword>
-std::string Text(const OneLoad& load, const char* step, bool opMod = true) {
-    return Written(Keyword(load.Record(), step, opMod, "A.N"));
+std::string Text(const OneLoad& load, const char* step, oif_Op op = oif_Op::MODIFY) {
+    return Written(Keyword(load.Card(step, op)));
 }
 
 struct FluxCase {
     const char* className;
-    std::string (*write)(const OneLoad&, const char*, bool);
+    std::string (*write)(const OneLoad&, const char*, oif_Op);
     const char* keyword;
     const char* label;
     const char* userLabel; // null: it has no distribution
@@ -52,7 +52,7 @@ class Electrical : public testing::TestWithParam<FluxCase> {};
 TEST_P(Flux, Line_HasTheLabelOfItsKeyword) {
     const FluxCase& c = GetParam();
     const OneLoad load("IG", c.className, R"("S1": {"magnitude": 5, "amplitude": "my amp"})");
-    EXPECT_EQ(c.write(load, "S1", true),
+    EXPECT_EQ(c.write(load, "S1", oif_Op::MODIFY),
               std::string(c.keyword) + ", amplitude=\"my amp\"\nA.N" + c.label + "5.\n");
 }
 
@@ -61,16 +61,17 @@ TEST_P(Flux, MagnitudeThatDidNotChange_IsWrittenAllTheSame) {
     const OneLoad load("IGGG", c.className,
                        R"("S1": {"magnitude": 5}, "S2": {}, "S3": {"magnitude": null, "amplitude": "Ramp"})");
     const std::string line = std::string("A.N") + c.label;
-    EXPECT_EQ(c.write(load, "S2", true), std::string(c.keyword) + "\n" + line + "5.\n");
-    EXPECT_EQ(c.write(load, "S2", false), std::string(c.keyword) + ", op=NEW\n" + line + "5.\n");
-    EXPECT_EQ(c.write(load, "S3", true), std::string(c.keyword) + ", amplitude=Ramp\n" + line + "0.\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::MODIFY), std::string(c.keyword) + "\n" + line + "5.\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::NEW), std::string(c.keyword) + ", op=NEW\n" + line + "5.\n");
+    EXPECT_EQ(c.write(load, "S3", oif_Op::MODIFY),
+              std::string(c.keyword) + ", amplitude=Ramp\n" + line + "0.\n");
 }
 
 TEST_P(Flux, LoadThatEnds_IsItsLineAloneWithOpNewAlways) {
     const FluxCase& c = GetParam();
     const OneLoad load("IGG", c.className,
                        R"("S1": {"magnitude": 5, "amplitude": "Ramp"}, "S2": {"deactivated": true})");
-    EXPECT_EQ(c.write(load, "S2", true), std::string(c.keyword) + ", op=NEW\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::MODIFY), std::string(c.keyword) + ", op=NEW\n");
 }
 
 INSTANTIATE_TEST_SUITE_P(All, Flux, testing::ValuesIn(kFluxes), CaseName);
@@ -80,9 +81,10 @@ TEST(FluxLabels, UserDefined_HasItsOwnAndANamedFieldThePlainOne) {
         if (c.userLabel == nullptr) continue;
         const OneLoad user("IG", c.className, R"("S1": {"magnitude": 5})",
                            R"("distributionType": "USER_DEFINED")");
-        EXPECT_EQ(c.write(user, "S1", true), std::string(c.keyword) + "\nA.N" + c.userLabel + "5.\n");
+        EXPECT_EQ(c.write(user, "S1", oif_Op::MODIFY),
+                  std::string(c.keyword) + "\nA.N" + c.userLabel + "5.\n");
         const OneLoad field("IG", c.className, R"("S1": {"magnitude": 5})", R"("distributionType": "FIELD")");
-        EXPECT_EQ(c.write(field, "S1", true), std::string(c.keyword) + "\nA.N" + c.label + "5.\n");
+        EXPECT_EQ(c.write(field, "S1", oif_Op::MODIFY), std::string(c.keyword) + "\nA.N" + c.label + "5.\n");
     }
 }
 
@@ -95,23 +97,25 @@ TEST_P(Electrical, RealLoad_IsOneBlockWithoutALoadCase) {
     const FluxCase& c = GetParam();
     const OneLoad load("IGG", c.className, R"("S1": {"magnitude": 5, "amplitude": "my amp"}, "S2": {})");
     const std::string line = std::string("A.N") + c.label + "5.\n";
-    EXPECT_EQ(c.write(load, "S1", true), std::string(c.keyword) + ", amplitude=\"my amp\"\n" + line);
+    EXPECT_EQ(c.write(load, "S1", oif_Op::MODIFY),
+              std::string(c.keyword) + ", amplitude=\"my amp\"\n" + line);
     // A magnitude that is carried over is written under op=NEW only.
-    EXPECT_EQ(c.write(load, "S2", true), std::string(c.keyword) + ", amplitude=\"my amp\"\n");
-    EXPECT_EQ(c.write(load, "S2", false), std::string(c.keyword) + ", op=NEW, amplitude=\"my amp\"\n" + line);
+    EXPECT_EQ(c.write(load, "S2", oif_Op::MODIFY), std::string(c.keyword) + ", amplitude=\"my amp\"\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::NEW),
+              std::string(c.keyword) + ", op=NEW, amplitude=\"my amp\"\n" + line);
 }
 
 TEST_P(Electrical, RealMagnitudeOfZero_IsWrittenWhereItWasSet) {
     const FluxCase& c = GetParam();
     const OneLoad load("IGG", c.className, R"("S1": {"magnitude": 0}, "S2": {"magnitude": null})");
-    EXPECT_EQ(c.write(load, "S1", true), std::string(c.keyword) + "\nA.N" + c.label + "0.\n");
-    EXPECT_EQ(c.write(load, "S2", false), std::string(c.keyword) + ", op=NEW\n");
+    EXPECT_EQ(c.write(load, "S1", oif_Op::MODIFY), std::string(c.keyword) + "\nA.N" + c.label + "0.\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::NEW), std::string(c.keyword) + ", op=NEW\n");
 }
 
 TEST_P(Electrical, ChangedAmplitude_DoesNotWriteTheMagnitudeAnew) {
     const FluxCase& c = GetParam();
     const OneLoad load("IGG", c.className, R"("S1": {"magnitude": 5}, "S2": {"amplitude": "Ramp"})");
-    EXPECT_EQ(c.write(load, "S2", true), std::string(c.keyword) + ", amplitude=Ramp\n");
+    EXPECT_EQ(c.write(load, "S2", oif_Op::MODIFY), std::string(c.keyword) + ", amplitude=Ramp\n");
 }
 
 TEST_P(Electrical, ComplexLoad_HasTwoCardsWhateverItsParts) {
@@ -121,7 +125,7 @@ TEST_P(Electrical, ComplexLoad_HasTwoCardsWhateverItsParts) {
     const auto text = [&](const char* value) {
         return c.write(OneLoad("ID", c.className, R"("S1": {"magnitude": 9})",
                                std::string(R"("complex": true, "complexMagnitude": )") + value),
-                       "S1", true);
+                       "S1", oif_Op::MODIFY);
     };
     EXPECT_EQ(text("[1, 2]"), card + "1\n" + line + "1.\n" + card + "2\n" + line + "2.\n");
     // A real part of 0 is written, an imaginary one is not.
@@ -132,9 +136,9 @@ TEST_P(Electrical, LoadThatEnds_KeepsAmplitudeAndLoadCaseOnPurpose) {
     const FluxCase& c = GetParam();
     const char states[] = R"("S1": {"magnitude": 5, "amplitude": "Ramp"}, "S2": {"deactivated": true})";
     const OneLoad real("IGG", c.className, states);
-    EXPECT_EQ(c.write(real, "S2", true), std::string(c.keyword) + ", op=NEW, amplitude=Ramp\n");
+    EXPECT_EQ(c.write(real, "S2", oif_Op::MODIFY), std::string(c.keyword) + ", op=NEW, amplitude=Ramp\n");
     const OneLoad complex("IGG", c.className, states, R"("complex": true)");
-    EXPECT_EQ(c.write(complex, "S2", true),
+    EXPECT_EQ(c.write(complex, "S2", oif_Op::MODIFY),
               std::string(c.keyword) + ", op=NEW, amplitude=Ramp, load case=0\n");
 }
 

@@ -8,8 +8,8 @@ namespace {
 class PointLoad : public OneLoad {
 public:
     using OneLoad::OneLoad;
-    std::string Cload(const char* step, bool opMod = true, double scale = 1.0) {
-        return Written(oif_Cload(Record(), step, opMod, Info(), "L", scale));
+    std::string Cload(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0) {
+        return Text(Card(step, op, scale));
     }
 };
 
@@ -18,8 +18,8 @@ public:
     ConnectorLoad(std::string_view steps, const char* className, const std::string& states,
                   const std::string& fields = "")
         : OneLoad(steps, className, states, fields, "A.two words") {}
-    std::string Text(const char* step, bool opMod = true, double scale = 1.0) const {
-        return Written(oif_ConnectorLoad(Record(), "A.\"two words\"", step, opMod, scale));
+    std::string Motion(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0) {
+        return Text(Card(step, op, scale, "A.\"two words\""));
     }
 };
 
@@ -28,9 +28,9 @@ public:
     BodyLoad(std::string_view steps, const char* className, const std::string& states,
              const std::string& fields = "")
         : OneLoad(steps, className, states, fields, "A.E") {}
-    std::string Dload(const char* step, bool opMod = true, double scale = 1.0, int space = 1) {
-        return Written(
-            oif_Dload(Record(), step, opMod, "A.E", space, Info(), true, 2, scale, "this text is left out"));
+    /// The cyclic mode reaches no line.
+    std::string Dload(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0, int space = 1) {
+        return Text(Card(step, op, scale, "A.E"), 2, space);
     }
 };
 
@@ -39,8 +39,9 @@ public:
     SurfaceLoad(std::string_view steps, const char* className, const std::string& states,
                 const std::string& fields = "")
         : OneLoad(steps, className, states, fields, "A.F") {}
-    std::string Dsload(const char* step, bool opMod = true, double scale = 1.0, const char* refNode = "") {
-        return Written(oif_Dsload(Record(), step, opMod, "A.F", Info(), false, 0, scale, refNode, "L"));
+    std::string Dsload(const char* step, oif_Op op = oif_Op::MODIFY, double scale = 1.0,
+                       std::optional<int> cyclicMode = {}) {
+        return Text(Card(step, op, scale, "A.F"), cyclicMode);
     }
 };
 
@@ -61,14 +62,15 @@ TEST(Cload, RealForce_WritesAComponentOfZeroThatWasSet) {
 TEST(Cload, Line_HasOpFollowerAndAmplitudeInThisOrder) {
     PointLoad load("IG", "ConcentratedForce", R"("S1": {"component3": 1.5, "amplitude": "my amp"})",
                    R"("follower": true)");
-    EXPECT_EQ(load.Cload("S1", false, 2.0), "*Cload, op=NEW, follower, amplitude=\"my amp\"\nA.N, 3, 3.\n");
+    EXPECT_EQ(load.Cload("S1", oif_Op::NEW, 2.0),
+              "*Cload, op=NEW, follower, amplitude=\"my amp\"\nA.N, 3, 3.\n");
 }
 
 TEST(Cload, LoadThatAddsAndChanges_WritesWhatWasSetInTheStep) {
     PointLoad load("IGG", "ConcentratedForce",
                    R"("S1": {"component1": 1, "component2": 2}, "S2": {"component2": 3})");
     EXPECT_EQ(load.Cload("S2"), "*Cload\nA.N, 2, 3.\n");
-    EXPECT_EQ(load.Cload("S2", false), "*Cload, op=NEW\nA.N, 1, 1.\nA.N, 2, 3.\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::NEW), "*Cload, op=NEW\nA.N, 1, 1.\nA.N, 2, 3.\n");
 }
 
 TEST(Cload, StateThatChangesNothing_LeavesTheBareLineOnPurpose) {
@@ -96,8 +98,8 @@ TEST(Cload, LoadThatEnds_IsItsLineWithoutFollowerAndAmplitude) {
     PointLoad load("IGG", "ConcentratedForce",
                    R"("S1": {"component1": 1, "amplitude": "Ramp"}, "S2": {"deactivated": true})",
                    R"("follower": true)");
-    EXPECT_EQ(load.Cload("S2", false), "*Cload, op=NEW\n");
-    EXPECT_EQ(load.Cload("S2", true), "*Cload\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::NEW), "*Cload, op=NEW\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::MODIFY), "*Cload\n");
 }
 
 TEST(Cload, Moment_HasTheDegreesOfFreedomOfRotation) {
@@ -114,10 +116,10 @@ TEST(Cload, PlaneStrainLoad_HasNoSetNameOnPurpose) {
 TEST(Cload, ComplexForce_HasABlockForEachPartWithoutItsZeros) {
     PointLoad load("ID", "ConcentratedForce", R"("S1": {"amplitude": "Ramp"})",
                    kComplexVector + R"(, "follower": true)");
-    EXPECT_EQ(load.Cload("S1", true, 2.0), "*Cload, follower, amplitude=Ramp, load case=1\n"
-                                           "A.N, 1, 2.\nA.N, 3, 6.\n"
-                                           "*Cload, follower, amplitude=Ramp, load case=2\n"
-                                           "A.N, 2, 4.\n");
+    EXPECT_EQ(load.Cload("S1", oif_Op::MODIFY, 2.0), "*Cload, follower, amplitude=Ramp, load case=1\n"
+                                                     "A.N, 1, 2.\nA.N, 3, 6.\n"
+                                                     "*Cload, follower, amplitude=Ramp, load case=2\n"
+                                                     "A.N, 2, 4.\n");
 }
 
 TEST(Cload, ComplexForceWithoutOnePart_LeavesItsBlockOut) {
@@ -128,7 +130,8 @@ TEST(Cload, ComplexForceWithoutOnePart_LeavesItsBlockOut) {
 
 TEST(Cload, ComplexForceScaledToNothing_KeepsItsLines) {
     PointLoad load("ID", "ConcentratedForce", R"("S1": {})", kComplexVector);
-    EXPECT_EQ(load.Cload("S1", false, 0.0), "*Cload, op=NEW, load case=1\n*Cload, op=NEW, load case=2\n");
+    EXPECT_EQ(load.Cload("S1", oif_Op::NEW, 0.0),
+              "*Cload, op=NEW, load case=1\n*Cload, op=NEW, load case=2\n");
 }
 
 TEST(Cload, ComplexForce_TakesNothingFromItsStates) {
@@ -138,8 +141,8 @@ TEST(Cload, ComplexForce_TakesNothingFromItsStates) {
 
 TEST(Cload, BoltForce_HasNoSetNameOnPurpose) {
     PointLoad load("IGG", "BoltLoad", R"("S1": {"magnitude": 100}, "S2": {})");
-    EXPECT_EQ(load.Cload("S1", true, 0.5), "*Cload\n, 1, 50.\n");
-    EXPECT_EQ(load.Cload("S2", false), "*Cload, op=NEW\n, 1, 100.\n");
+    EXPECT_EQ(load.Cload("S1", oif_Op::MODIFY, 0.5), "*Cload\n, 1, 50.\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::NEW), "*Cload, op=NEW\n, 1, 100.\n");
     EXPECT_EQ(load.Cload("S2"), "");
 }
 
@@ -149,13 +152,13 @@ TEST(Cload, BoltHeldByItsLength_IsTheLineAlone) {
                       "S2": {"boltMethod": "APPLY_FORCE", "magnitude": 5},
                       "S3": {"boltMethod": "FIX_LENGTH"})");
     EXPECT_EQ(load.Cload("S1"), "*Cload\n");
-    EXPECT_EQ(load.Cload("S2", false), "*Cload, op=NEW\n, 1, 5.\n");
-    EXPECT_EQ(load.Cload("S3", false), "*Cload, op=NEW\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::NEW), "*Cload, op=NEW\n, 1, 5.\n");
+    EXPECT_EQ(load.Cload("S3", oif_Op::NEW), "*Cload, op=NEW\n");
 }
 
 TEST(Cload, PoreFluid_IsOfDegreeOfFreedomEight) {
     PointLoad load("IGG", "ConcentratedPoreFluid", R"("S1": {"magnitude": 5}, "S2": {})");
-    EXPECT_EQ(load.Cload("S1", true, 3.0), "*Cload\nA.N, 8, 15.\n");
+    EXPECT_EQ(load.Cload("S1", oif_Op::MODIFY, 3.0), "*Cload\nA.N, 8, 15.\n");
     EXPECT_EQ(load.Cload("S2"), "");
 }
 
@@ -163,14 +166,14 @@ TEST(Cload, ComplexPoreFluid_RaisesUnlessItEnds) {
     PointLoad load("IGG", "ConcentratedPoreFluid", R"("S1": {"magnitude": 5}, "S2": {"deactivated": true})",
                    R"("complex": true)");
     EXPECT_EQ(Raised([&] { load.Cload("S1"); }), "\"Concentrated pore fluid load cannot be complex\" == 0");
-    EXPECT_EQ(load.Cload("S2", false), "*Cload, op=NEW\n");
+    EXPECT_EQ(load.Cload("S2", oif_Op::NEW), "*Cload, op=NEW\n");
 }
 
 TEST(Cload, InwardVolumeAcceleration_HasABlockForEachPartThatIsNotZero) {
     PointLoad real("IG", "InwardVolAccel", R"("S1": {"magnitude": 5})");
     EXPECT_EQ(real.Cload("S1"), "*Cload\nA.N, 8, 5.\n");
     PointLoad both("ID", "InwardVolAccel", R"("S1": {})", ComplexMagnitude("[1, -2]"));
-    EXPECT_EQ(both.Cload("S1", true, 2.0),
+    EXPECT_EQ(both.Cload("S1", oif_Op::MODIFY, 2.0),
               "*Cload, load case=1\nA.N, 8, 2.\n*Cload, load case=2\nA.N, 8, -4.\n");
     PointLoad one("ID", "InwardVolAccel", R"("S1": {})", ComplexMagnitude("[1, 0]"));
     EXPECT_EQ(one.Cload("S1"), "*Cload, load case=1\nA.N, 8, 1.\n");
@@ -178,60 +181,60 @@ TEST(Cload, InwardVolumeAcceleration_HasABlockForEachPartThatIsNotZero) {
 
 TEST(Cload, OtherLoad_RaisesTheTextOfAnAssertion) {
     PointLoad load("IG", "Gravity", R"("S1": {"component1": 5})");
-    EXPECT_EQ(Raised([&] { load.Cload("S1"); }), "\"Invalid load type for *Cload\" == 0");
+    EXPECT_EQ(Raised([&] { Written(oif_Cload(load.Card("S1"), load.Record())); }),
+              "\"Invalid load type for *Cload\" == 0");
 }
 
 TEST(ConnectorLoad, Force_KeepsANameInQuotes) {
-    const ConnectorLoad load("IG", "ConnectorForce",
-                             R"("S1": {"component1": 0, "component3": 2, "amplitude": "Ramp"})");
-    EXPECT_EQ(load.Text("S1", false, 2.0), "*Connector Load, op=NEW, amplitude=Ramp\n"
-                                           "A.\"two words\", 1, 0.\nA.\"two words\", 3, 4.\n");
+    ConnectorLoad load("IG", "ConnectorForce",
+                       R"("S1": {"component1": 0, "component3": 2, "amplitude": "Ramp"})");
+    EXPECT_EQ(load.Motion("S1", oif_Op::NEW, 2.0), "*Connector Load, op=NEW, amplitude=Ramp\n"
+                                                   "A.\"two words\", 1, 0.\nA.\"two words\", 3, 4.\n");
 }
 
 TEST(ConnectorLoad, NameThatNeedsQuotes_GetsThem) {
-    const OneLoad load("IG", "ConnectorForce", R"("S1": {"component1": 1})");
-    EXPECT_EQ(Written(oif_ConnectorLoad(load.Record(), "a b", "S1", true, 1.0)),
-              "*Connector Load\n\"a b\", 1, 1.\n");
+    OneLoad load("IG", "ConnectorForce", R"("S1": {"component1": 1})");
+    EXPECT_EQ(load.Text(load.Card("S1", oif_Op::MODIFY, 1.0, "a b")), "*Connector Load\n\"a b\", 1, 1.\n");
 }
 
 TEST(ConnectorLoad, ComplexMoment_HasABlockForEachPart) {
-    const ConnectorLoad load("ID", "ConnectorMoment", R"("S1": {})", kComplexVector);
-    EXPECT_EQ(load.Text("S1"),
+    ConnectorLoad load("ID", "ConnectorMoment", R"("S1": {})", kComplexVector);
+    EXPECT_EQ(load.Motion("S1"),
               "*Connector Load, load case=1\nA.\"two words\", 4, 1.\nA.\"two words\", 6, 3.\n"
               "*Connector Load, load case=2\nA.\"two words\", 5, 2.\n");
 }
 
 TEST(ConnectorLoad, ClearedAmplitude_DoesNotWriteTheValuesAnewOnPurpose) {
-    const ConnectorLoad load("IGG", "ConnectorMoment",
-                             R"("S1": {"component1": 1, "amplitude": "Ramp"}, "S2": {"amplitude": null})");
-    EXPECT_EQ(load.Text("S2"), "*Connector Load\n");
+    ConnectorLoad load("IGG", "ConnectorMoment",
+                       R"("S1": {"component1": 1, "amplitude": "Ramp"}, "S2": {"amplitude": null})");
+    EXPECT_EQ(load.Motion("S2"), "*Connector Load\n");
 }
 
 TEST(ConnectorLoad, LoadThatEnds_IsItsLineAlone) {
-    const ConnectorLoad load("IGG", "ConnectorMoment",
-                             R"("S1": {"component1": 1}, "S2": {"deactivated": true})");
-    EXPECT_EQ(load.Text("S2", false), "*Connector Load, op=NEW\n");
+    ConnectorLoad load("IGG", "ConnectorMoment", R"("S1": {"component1": 1}, "S2": {"deactivated": true})");
+    EXPECT_EQ(load.Motion("S2", oif_Op::NEW), "*Connector Load, op=NEW\n");
 }
 
 TEST(ConnectorLoad, OtherLoad_Raises) {
-    const ConnectorLoad load("IG", "Moment", R"("S1": {"component1": 5})");
-    EXPECT_EQ(Raised([&] { load.Text("S1"); }), "Invalid load type for *Connector Load");
+    ConnectorLoad load("IG", "Moment", R"("S1": {"component1": 5})");
+    EXPECT_EQ(Raised([&] { Written(oif_ConnectorLoad(load.Card("S1"), load.Record())); }),
+              "Invalid load type for *Connector Load");
 }
 
 TEST(Dload, BodyForce_HasALabelForEachComponent) {
     BodyLoad load("IG", "BodyForce", R"("S1": {"component1": 1, "component2": 0, "component3": 3})");
-    EXPECT_EQ(load.Dload("S1", true, 2.0), "*Dload\nA.E, BX, 2.\nA.E, BY, 0.\nA.E, BZ, 6.\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 2.0), "*Dload\nA.E, BX, 2.\nA.E, BY, 0.\nA.E, BZ, 6.\n");
 }
 
 TEST(Dload, UserDefinedBodyForce_HasItsLabels) {
     BodyLoad load("IG", "BodyForce", R"("S1": {"component2": 4})", R"("distributionType": "USER_DEFINED")");
-    EXPECT_EQ(load.Dload("S1", false), "*Dload, op=NEW\nA.E, BYNU, 4.\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::NEW), "*Dload, op=NEW\nA.E, BYNU, 4.\n");
 }
 
 TEST(Dload, BodyForceOfAnAxisymmetricModel_HasTwoComponents) {
     BodyLoad load("IG", "BodyForce", R"("S1": {"component1": 1, "component2": 2, "component3": 3})");
-    EXPECT_EQ(load.Dload("S1", true, 1.0, 4), "*Dload\nA.E, BR, 1.\nA.E, BZ, 2.\n");
-    EXPECT_EQ(load.Dload("S1", true, 1.0, 2), "*Dload\nA.E, BX, 1.\nA.E, BY, 2.\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 1.0, 4), "*Dload\nA.E, BR, 1.\nA.E, BZ, 2.\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 1.0, 2), "*Dload\nA.E, BX, 1.\nA.E, BY, 2.\n");
 }
 
 TEST(Dload, ComplexBodyForce_HasABlockForEachPart) {
@@ -257,9 +260,9 @@ TEST(Dload, ComplexLineLoadAlongTheSection_DoesNotLookAtTheThirdComponent) {
 
 TEST(Dload, Gravity_IsLengthAndDirection) {
     BodyLoad load("IG", "Gravity", R"("S1": {"component1": 3, "component2": 4})");
-    EXPECT_EQ(load.Dload("S1", true, 2.0), "*Dload\nA.E, GRAV, 10., 0.6, 0.8, 0.\n");
-    EXPECT_EQ(load.Dload("S1", true, 1.0, 4), "*Dload\nA.E, GRAV, 5., , 0.8\n");
-    EXPECT_EQ(load.Dload("S1", true, 1.0, 2), "*Dload\nA.E, GRAV, 5., 0.6, 0.8\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 2.0), "*Dload\nA.E, GRAV, 10., 0.6, 0.8, 0.\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 1.0, 4), "*Dload\nA.E, GRAV, 5., , 0.8\n");
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 1.0, 2), "*Dload\nA.E, GRAV, 5., 0.6, 0.8\n");
 }
 
 TEST(Dload, GravityWithOneChangedComponent_IsWrittenWhole) {
@@ -289,7 +292,7 @@ TEST(Dload, PipePressure_HasItsLabelAndDiameter) {
         return BodyLoad("IG", "PipePressure",
                         R"("S1": {"magnitude": 10, "zeroPressureHeight": 1, "referencePressureHeight": 2})",
                         diameter + fields)
-            .Dload("S1", true, 2.0);
+            .Dload("S1", oif_Op::MODIFY, 2.0);
     };
     EXPECT_EQ(text(R"("external": false)"), "*Dload\nA.E, PI, 20., 0.5\n");
     EXPECT_EQ(text(R"("external": true)"), "*Dload\nA.E, PE, 20., 0.5\n");
@@ -315,7 +318,7 @@ TEST(Dload, ChangedHeight_CountsForHydrostaticPipePressureOnly) {
 TEST(Dload, ComplexPipePressure_HasABlockForEachPart) {
     BodyLoad load("ID", "PipePressure", R"("S1": {})",
                   ComplexMagnitude("[1, 2]") + R"(, "effectiveDiameter": 3)");
-    EXPECT_EQ(load.Dload("S1", true, 2.0),
+    EXPECT_EQ(load.Dload("S1", oif_Op::MODIFY, 2.0),
               "*Dload, load case=1\nA.E, PI, 2., 3.\n*Dload, load case=2\nA.E, PI, 4., 3.\n");
 }
 
@@ -323,7 +326,7 @@ TEST(Dload, RotationalLoad_HasNoBlanksOnItsLine) {
     const std::string axis = R"("point1": [1, 2, 3], "point2": [1, 2, 8], )";
     const auto text = [&](const char* flags, int space = 1) {
         return BodyLoad("IGG", "RotationalBodyForce", R"("S1": {"magnitude": 25}, "S2": {})", axis + flags)
-            .Dload("S1", true, 2.0, space);
+            .Dload("S1", oif_Op::MODIFY, 2.0, space);
     };
     EXPECT_EQ(text(R"("centrifugal": true)"), "*Dload\nA.E,CENTRIF,50.,1.,2.,3.,0.,0.,1.\n");
     EXPECT_EQ(text(R"("centrifugal": true, "rotaryAcceleration": true)"),
@@ -342,19 +345,20 @@ TEST(Dload, RotationalLoadWithoutAnAxis_HasADirectionOfZeros) {
 
 TEST(Dload, LoadThatEnds_IsItsLineAlone) {
     BodyLoad load("IGG", "Gravity", R"("S1": {"component1": 1}, "S2": {"deactivated": true})");
-    EXPECT_EQ(load.Dload("S2", false), "*Dload, op=NEW\n");
+    EXPECT_EQ(load.Dload("S2", oif_Op::NEW), "*Dload, op=NEW\n");
 }
 
 TEST(Dload, OtherLoad_RaisesTheTextOfAnAssertion) {
     BodyLoad load("IG", "Moment", R"("S1": {"component1": 5})");
-    EXPECT_EQ(Raised([&] { load.Dload("S1"); }), "\"Invalid load type for *Dload\" == 0");
+    EXPECT_EQ(Raised([&] { Written(oif_Dload(load.Card("S1"), load.Record(), {load.Info()})); }),
+              "\"Invalid load type for *Dload\" == 0");
 }
 
 TEST(Dsload, Pressure_HasTheLabelOfItsDistribution) {
     const auto text = [](const char* distribution) {
         return SurfaceLoad("IG", "Pressure", R"("S1": {"magnitude": 5, "referencePressureHeight": 9})",
                            std::string(R"("distributionType": )") + distribution)
-            .Dsload("S1", true, 2.0);
+            .Dsload("S1", oif_Op::MODIFY, 2.0);
     };
     EXPECT_EQ(text("0"), "*Dsload\nA.F, P, 10.\n");
     EXPECT_EQ(text("1"), "*Dsload\nA.F, PNU, 10.\n");
@@ -363,8 +367,9 @@ TEST(Dsload, Pressure_HasTheLabelOfItsDistribution) {
 }
 
 TEST(Dsload, Line_HasItsParametersInOrder) {
-    SurfaceLoad load("IG", "Pressure", R"("S1": {"magnitude": 5, "amplitude": "my amp"})");
-    EXPECT_EQ(Written(oif_Dsload(load.Record(), "S1", false, "A.F", load.Info(), true, 3, 1.0, "A.N", "L")),
+    SurfaceLoad load("IG", "Pressure", R"("S1": {"magnitude": 5, "amplitude": "my amp"})",
+                     R"("distributionRegion": "A.N")");
+    EXPECT_EQ(load.Dsload("S1", oif_Op::NEW, 1.0, 3),
               "*Dsload, op=NEW, amplitude=\"my amp\", cyclic mode=3, ref node=A.N\nA.F, P, 5.\n");
 }
 
@@ -378,7 +383,7 @@ TEST(Dsload, ChangedHeight_CountsForHydrostaticPressureOnly) {
 
 TEST(Dsload, ComplexPressure_HasABlockForEachPartThatIsNotZero) {
     SurfaceLoad both("ID", "Pressure", R"("S1": {})", ComplexMagnitude("[1, 2]"));
-    EXPECT_EQ(both.Dsload("S1", true, 3.0),
+    EXPECT_EQ(both.Dsload("S1", oif_Op::MODIFY, 3.0),
               "*Dsload, load case=1\nA.F, P, 3.\n*Dsload, load case=2\nA.F, P, 6.\n");
     SurfaceLoad one("ID", "Pressure", R"("S1": {})", ComplexMagnitude("[0, 2]"));
     EXPECT_EQ(one.Dsload("S1"), "*Dsload, load case=2\nA.F, P, 2.\n");
@@ -387,13 +392,13 @@ TEST(Dsload, ComplexPressure_HasABlockForEachPartThatIsNotZero) {
 TEST(Dsload, ComplexHydrostaticPressure_HasItsHeightsOnALineOfTheirOwnOnPurpose) {
     SurfaceLoad load("ID", "Pressure", R"("S1": {"zeroPressureHeight": 1, "referencePressureHeight": 2})",
                      ComplexMagnitude("[5, 0]") + R"(, "distributionType": "HYDROSTATIC")");
-    EXPECT_EQ(load.Dsload("S1", true, 2.0), "*Dsload, load case=1\nA.F, HP, 10.\n, 1., 2.\n");
+    EXPECT_EQ(load.Dsload("S1", oif_Op::MODIFY, 2.0), "*Dsload, load case=1\nA.F, HP, 10.\n, 1., 2.\n");
 }
 
 TEST(Dsload, SurfaceTraction_IsShearOrGeneral) {
     const auto text = [](const char* fields) {
         return SurfaceLoad("IG", "SurfaceTraction", R"("S1": {"magnitude": 5})", fields)
-            .Dsload("S1", true, 2.0);
+            .Dsload("S1", oif_Op::MODIFY, 2.0);
     };
     EXPECT_EQ(text(R"("kind": "SHEAR")"), "*Dsload\nA.F, TRSHR, 10.\n");
     EXPECT_EQ(text(R"("kind": "NORMAL")"), "*Dsload\nA.F, TRVEC, 10.\n");
@@ -416,7 +421,7 @@ TEST(Dsload, TractionWithADirection_HasItOnItsLineAndItsFlags) {
     SurfaceLoad load(
         "IG", "SurfaceTraction", R"("S1": {"magnitude": 5})",
         R"("vectorGiven": true, "direction": [[1, 1, 1], [1, 4, 5]], "follower": false, "resultant": true)");
-    EXPECT_EQ(load.Dsload("S1", true, 2.0),
+    EXPECT_EQ(load.Dsload("S1", oif_Op::MODIFY, 2.0),
               "*Dsload, follower=NO, constant resultant=YES\nA.F, TRVEC, 10., 0., 0.6, 0.8\n");
 }
 
@@ -436,8 +441,9 @@ TEST(Dsload, ComplexTraction_HasABlockForEachPart) {
     SurfaceLoad load("ID", "ShellEdgeLoad", R"("S1": {})",
                      ComplexMagnitude("[1, 2]") +
                          R"(, "vectorGiven": true, "direction": [[0, 0, 0], [2, 0, 0]], "follower": false)");
-    EXPECT_EQ(load.Dsload("S1", true, 2.0), "*Dsload, load case=1, follower=NO\nA.F, EDLD, 2., 1., 0., 0.\n"
-                                            "*Dsload, load case=2, follower=NO\nA.F, EDLD, 4., 1., 0., 0.\n");
+    EXPECT_EQ(load.Dsload("S1", oif_Op::MODIFY, 2.0),
+              "*Dsload, load case=1, follower=NO\nA.F, EDLD, 2., 1., 0., 0.\n"
+              "*Dsload, load case=2, follower=NO\nA.F, EDLD, 4., 1., 0., 0.\n");
 }
 
 TEST(Dsload, TractionInASystem_NamesItAlsoWithoutADirection) {
@@ -450,9 +456,7 @@ TEST(Dsload, TractionInASystem_NamesItAlsoWithoutADirection) {
     store.model.steps.Append("S", kprC_StaticStep());
     mdl_StateEdit<kloC_DistributedState>(load.Give("S")).Set<&kloC_DistributedState::magnitude>(1.0);
     load.Propagate(store.model.steps);
-    const auto text = [&] {
-        return Written(oif_Dsload(load, "S", true, "F", store.Info(), false, 0, 1.0, "", "my load"));
-    };
+    const auto text = [&] { return Written(oif_Dsload({"my load", load, "F", "S"}, load, {store.Info()})); };
     EXPECT_EQ(text(), "*Dsload, orientation=\"Csys 1\"\nF, TRVEC, 1.\n");
     // An angle makes a system of the load's own.
     load.angle = 30.0;
@@ -463,24 +467,35 @@ TEST(Dsload, TractionInASystem_NamesItAlsoWithoutADirection) {
 }
 
 TEST(Dsload, LoadThatEnds_KeepsCyclicModeAndReferenceNode) {
-    SurfaceLoad load("IGG", "SurfaceTraction",
-                     R"("S1": {"magnitude": 5, "amplitude": "Ramp"}, "S2": {"deactivated": true})",
-                     R"("vectorGiven": true, "follower": false, "orientation": "O")");
-    EXPECT_EQ(Written(oif_Dsload(load.Record(), "S2", false, "A.F", load.Info(), true, 3, 1.0, "A.N", "L")),
-              "*Dsload, op=NEW, cyclic mode=3, ref node=A.N\n");
+    const char states[] = R"("S1": {"magnitude": 5, "amplitude": "Ramp"}, "S2": {"deactivated": true})";
+    SurfaceLoad traction("IGG", "SurfaceTraction", states,
+                         R"("vectorGiven": true, "follower": false, "orientation": "O")");
+    EXPECT_EQ(traction.Dsload("S2", oif_Op::NEW, 1.0, 3), "*Dsload, op=NEW, cyclic mode=3\n");
+    SurfaceLoad pressure("IGG", "Pressure", states, R"("distributionRegion": "A.N")");
+    EXPECT_EQ(pressure.Dsload("S2", oif_Op::NEW, 1.0, 3), "*Dsload, op=NEW, cyclic mode=3, ref node=A.N\n");
 }
 
 TEST(Dsload, EmptySetName_RaisesTheTextOfAnAssertion) {
     SurfaceLoad load("IG", "Pressure", R"("S1": {"magnitude": 5})");
-    EXPECT_EQ(Raised([&] { oif_Dsload(load.Record(), "S1", true, "", load.Info(), false, 0, 1.0, "", "L"); }),
-              "! setName.Empty()");
+    EXPECT_EQ(Raised([&] { load.Text(load.Card("S1", oif_Op::MODIFY, 1.0, "")); }), "! setName.Empty()");
+}
+
+TEST(Dsload, OtherLoad_RaisesTheTextOfAnAssertion) {
+    SurfaceLoad load("IG", "Moment", R"("S1": {"component1": 5})");
+    EXPECT_EQ(
+        Raised([&] { Written(oif_Dsload(load.Card("S1", {}, 1.0, "A.F"), load.Record(), {load.Info()})); }),
+        "\"Invalid load type for *Dsload\" == 0");
 }
 
 TEST(Dsload, SubmodelLoad_CanBeWrittenWhereItEndsOnly) {
     SurfaceLoad load("IGG", "SubmodelStressBased",
                      R"("S1": {"stepName": "Global 1", "scaleParameter": 0.5}, "S2": {"deactivated": true})");
-    EXPECT_EQ(Raised([&] { load.Dsload("S1"); }), "\"Invalid load type for *Dsload\" == 0");
-    EXPECT_EQ(load.Dsload("S2", false), "*Dsload, submodel, step=Global 1, scale=0.5, op=NEW\n");
+    const auto text = [](SurfaceLoad& of, const char* step, oif_Op op) {
+        const auto& record = static_cast<const kloC_SubmodelStressBased&>(of.Record());
+        return Written(oif_Dsload(of.Card(step, op, 1.0, "A.F"), record, {of.Info()}));
+    };
+    EXPECT_EQ(Raised([&] { text(load, "S1", oif_Op::MODIFY); }), "\"Invalid load type for *Dsload\" == 0");
+    EXPECT_EQ(text(load, "S2", oif_Op::NEW), "*Dsload, submodel, step=Global 1, scale=0.5, op=NEW\n");
     SurfaceLoad unscaled("IGG", "SubmodelStressBased", R"("S1": {}, "S2": {"deactivated": true})");
-    EXPECT_EQ(unscaled.Dsload("S2", false), "*Dsload, submodel, op=NEW\n");
+    EXPECT_EQ(text(unscaled, "S2", oif_Op::NEW), "*Dsload, submodel, op=NEW\n");
 }

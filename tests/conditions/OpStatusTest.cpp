@@ -90,12 +90,12 @@ TEST(ObjectsOfSteps, EachStep_HasThoseThatPassTheTestInTheOrderOfTheirNames) {
     const auto loads = Container<kloC_Load>({{"B", &one}, {"A", &other}, {"C", &other}}, steps);
     const oif_ObjectsOfSteps<kloC_Load> given(
         "load", loads, steps,
-        [](const kloC_Load& load, const cow_String& step) { return load.HasStep(step); });
+        [](const kloC_Load& load, const cow_String& step, bool) { return load.HasStep(step); });
     const auto names = [&](int step) {
         std::string text;
-        for (const auto& [name, load] : given.In(step)) {
-            EXPECT_EQ(load, &loads.ConstGet(*name));
-            text += name->View();
+        for (const auto* entry : given.In(step)) {
+            EXPECT_EQ(&entry->object, &loads.ConstGet(entry->name));
+            text += entry->name.View();
         }
         return text;
     };
@@ -109,7 +109,7 @@ TEST(ObjectsOfSteps, Test_RunsInTheContextOfStepAndObject) {
     const kprC_StepContainer steps = sample::StepsOf("IG");
     const auto loads = Container<kloC_Load>({{"L", &load}}, steps);
     atr_String context;
-    const auto test = [&](const kloC_Load&, const cow_String& step) -> bool {
+    const auto test = [&](const kloC_Load&, const cow_String& step, bool) -> bool {
         if (step == "S1") context = nex_Context::Text();
         return false;
     };

@@ -47,15 +47,11 @@ TEST(SubmodelList, BoundariesOfAStep_ShareOneCommentAndTheFirstLine) {
         "C": {"class": "kbcC_SubmodelBC", "states": {"S1": {"dofs": [2], "stepName": "9", "timeScale": true}}}})");
     oif_BoundarySubmodelList list;
     for (const char* name : {"B", "C"}) {
-        list.Append("S1", name,
-                    oif_Boundary(model.Condition(name), name, "S1", true, "A.N", false, "S0", 1.0));
+        list.Append("S1", name, oif_Boundary({name, model.Condition(name), "A.N", "S1"}, false, "S0"));
     }
-    std::string text;
-    const qkw_KeywordList keywords = list.Keywords("S1");
-    for (int i = 0; i < keywords.Length(); ++i) text += Written(keywords[i].ConstGet());
-    EXPECT_EQ(text, "** Name: B, C Type: Submodel\n"
-                    "*Boundary, submodel, step=1\n"
-                    "A.N, 1, 1\n"
-                    "A.N, 2, 2\n");
+    EXPECT_EQ(WrittenAll(list.Keywords("S1")), "** Name: B, C Type: Submodel\n"
+                                               "*Boundary, submodel, step=1\n"
+                                               "A.N, 1, 1\n"
+                                               "A.N, 2, 2\n");
     EXPECT_TRUE(list.Keywords("S2").IsEmpty());
 }

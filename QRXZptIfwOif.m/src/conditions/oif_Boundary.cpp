@@ -1,28 +1,23 @@
 #include "conditions/oif_Boundary.h"
 
-#include "base/oif_KeywordLine.h"
 #include "base/oif_Utils.h"
-#include "store_interface/records/cls_ClassRegistrar.h"
-#include "store_interface/records/conditions/kbcC_MotionBCs.h"
-#include "store_interface/records/conditions/kbcC_ScalarBCs.h"
-#include "store_interface/records/conditions/kbcC_SupportBCs.h"
+#include "foundation/nex_Exception.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
 
 using Distribution = kbcC_BC::DistribTypeEnum;
 using Method = kloC_BoltLoad::MethodEnm;
 
 namespace {
 
-constexpr unsigned kBuckling = 0x23C0066;
 constexpr std::string_view kBaseNamePrefix = "__basename__";
 
 } // namespace
 
-oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const mdl_ObjCow<kbcC_BC>& bc,
-                                           const cow_String& stepName, bool opMod, const cow_String& setName,
-                                           const cow_String& initialStepName, double scale)
-    : style_(style), opNew_(!opMod), bc_(bc), stepName_(stepName), setName_(setName), modifiedOnly_(opMod),
-      initialStepName_(initialStepName), scale_(scale) {
-    const auto& quad = Quad();
+oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const oif_BCCard& card,
+                                           const cow_String& initialStepName)
+    : style_(style), card_(card), modifiedOnly_(card.op == oif_Op::MODIFY),
+      initialStepName_(initialStepName) {
+    const auto& quad = card_.Quad();
     oif_Utils::SetDeactivateOpFlags(quad.status, deactivated_, modifiedOnly_);
     if (deactivated_) return;
     const auto& amplitude = quad.state.ConstGet().amplitude;
@@ -33,11 +28,10 @@ oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const mdl_ObjCow<
 }
 
 void oif_ConditionKeyword::Write(utl_Stream& stream) const {
-    if (deactivated_) {
-        WriteBoundaryCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0, true);
-    } else {
-        WriteForms(stream);
-    }
+    if (deactivated_) return WriteBoundaryCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0);
+    const oif_BCRow* row = oif_FindBCRow(Condition().DynTypeId());
+    if (row == nullptr || row->family != style_.family) nex_Raise(style_.failure);
+    row->write(*this, stream);
 }
 
 bool oif_ConditionKeyword::IsSaid(mdl_PropAttributeStateEnm state) const {
@@ -45,23 +39,23 @@ bool oif_ConditionKeyword::IsSaid(mdl_PropAttributeStateEnm state) const {
 }
 
 unsigned oif_ConditionKeyword::Procedure() const {
-    return stepName_ == initialStepName_ ? 0 : Quad().procedureType;
+    return card_.step == initialStepName_ ? 0 : card_.Quad().procedureType;
 }
 
 bool oif_ConditionKeyword::IsBuckling() const {
-    return Procedure() == kBuckling;
+    return Procedure() == kprC_BuckleStep::TypeId();
 }
 
 void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, Distribution distributionType, bool fixed,
-                                             int loadCase, bool lineBreak) const {
+                                             int loadCase, const char* type) const {
     oif_KeywordLine line(stream, style_.keyword);
-    if (opNew_) line.Text(", op=NEW");
-    if (!amplitude_.IsEmpty()) line.Text(", amplitude=").Text(qkw_QuorixName(amplitude_, false));
-    line.BreakingIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
+    line.Op(card_.op)
+        .Amplitude(amplitude_)
+        .BreakingIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
         .BreakingIf(fixed, "fixed")
         .BreakingIf(distributionType == Distribution::USER_DEFINED, "user");
-    WriteLastParameters(stream);
-    if (lineBreak) stream.LineBreak();
+    WriteBaseName(line);
+    line.BreakingIf(type != nullptr, type).End();
 }
 
 template <class Block>
@@ -70,49 +64,46 @@ void oif_ConditionKeyword::ForEachLoadCase(const Block& block) const {
         block(0);
         return;
     }
-    const int entered = Quad().state.ConstGet().BuckleCase();
+    const int entered = card_.Quad().state.ConstGet().BuckleCase();
     for (const int loadCase : {1, 2}) {
         if (entered == 0 || entered == 3 || entered == loadCase) block(loadCase);
     }
 }
 
 void oif_ConditionKeyword::WriteDisplacements(utl_Stream& stream, bool fixed) const {
-    const Distribution distribution = bc_.ConstGet().distributionType;
+    const Distribution distribution = Condition().distributionType;
     if (UsesComplex()) {
         for (const int loadCase : {1, 2}) {
-            WriteBoundaryCard(stream, distribution, fixed, loadCase, true);
+            WriteBoundaryCard(stream, distribution, fixed, loadCase);
             WriteComponents(stream, fixed, loadCase == 2);
         }
         return;
     }
     ForEachLoadCase([&](int loadCase) {
-        WriteBoundaryCard(stream, distribution, fixed, loadCase, true);
+        WriteBoundaryCard(stream, distribution, fixed, loadCase);
         WriteComponents(stream, fixed, false);
     });
 }
 
 void oif_ConditionKeyword::WriteRates(utl_Stream& stream, const char* type, bool held) const {
     // Of a complex value only the real part is ever written.
-    WriteBoundaryCard(stream, bc_.ConstGet().distributionType, false, UsesComplex() || IsBuckling() ? 1 : 0,
-                      false);
-    stream << ", ";
-    stream.OptionalLineBreak();
-    stream << type;
-    stream.LineBreak();
+    WriteBoundaryCard(stream, Condition().distributionType, false, UsesComplex() || IsBuckling() ? 1 : 0,
+                      type);
     WriteComponents(stream, held, false);
 }
 
 void oif_ConditionKeyword::WriteComponents(utl_Stream& stream, bool held, bool imaginary) const {
-    const kbcC_BCState& state = Quad().state.ConstGet();
+    const kbcC_BCState& state = card_.Quad().state.ConstGet();
     for (int i = 0; i < 6; ++i) {
         const kbcC_Component component = state.Component(i);
         if (!IsSaid(component.state)) continue;
-        WriteLine(stream, Dof(i + 1), held ? 0.0 : (imaginary ? component.imag : component.real) * scale_);
+        WriteLine(stream, Dof(i + 1),
+                  held ? 0.0 : (imaginary ? component.imag : component.real) * card_.Factor());
     }
 }
 
 void oif_ConditionKeyword::WriteLine(utl_Stream& stream, const cow_String& dofs, double value) const {
-    stream << setName_ << dofs;
+    stream << card_.setName << dofs;
     if (value != 0.0) stream << ", " << value;
     stream.LineBreak();
 }
@@ -122,25 +113,25 @@ cow_String oif_ConditionKeyword::Dof(int number) const {
     return style_.dofRange ? one + one : one;
 }
 
-oif_Boundary::oif_Boundary(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& name, const cow_String& stepName,
-                           bool opMod, const cow_String& setName, bool shellToSolid,
-                           const cow_String& initialStepName, double scale)
-    : qkw_KeywordOf({"*Boundary", true, true}, bc, stepName, opMod, setName, initialStepName, scale),
-      name_(name), shellToSolid_(shellToSolid) {
+oif_Boundary::oif_Boundary(const oif_BCCard& card, bool shellToSolid, const cow_String& initialStepName)
+    : qkw_KeywordOf({"*Boundary", oif_BCFamily::BOUNDARY, true, true,
+                     "Unimplemented boundary condition in input file."},
+                    card, initialStepName),
+      shellToSolid_(shellToSolid) {
     CheckForSubmodelBC();
 }
 
 void oif_Boundary::CheckForSubmodelBC() {
-    const kbcC_BC& bc = bc_.ConstGet();
+    const kbcC_BC& bc = Condition();
     if (bc.DynTypeId() != kbcC_SubmodelBC::TypeId()) return;
     const auto& state = State<kbcC_SubmodelBCState>();
     bool held = false;
-    if (!bc.suppressed && kbcC_SubmodelBC::IsSubmodelActive(Quad().status)) {
+    if (!bc.suppressed && kbcC_SubmodelBC::IsSubmodelActive(card_.Quad().status)) {
         held = state.centerZone.ConstGet();
         isBCSubmodel_ = !held;
     }
     submodelKeyword_ = style_.keyword;
-    if (opNew_) submodelKeyword_ += ", op=NEW";
+    if (card_.op == oif_Op::NEW) submodelKeyword_ += ", op=NEW";
     if (held) submodelKeyword_ += ", fixed";
     if (!isBCSubmodel_) return;
     submodelKeyword_ += cow_String(", submodel, step=") + state.stepName;
@@ -153,39 +144,9 @@ cow_String oif_Boundary::FixBCNameHack(const cow_String& name) {
     return text.starts_with(kBaseNamePrefix) ? cow_String(text.substr(kBaseNamePrefix.size())) : name;
 }
 
-void oif_Boundary::WriteLastParameters(utl_Stream& stream) const {
-    const cow_String fixedName = FixBCNameHack(name_);
-    if (fixedName == name_) return;
-    stream << ", "
-           << "base name=" << qkw_QuorixName(fixedName, false);
-}
-
-void oif_Boundary::WriteForms(utl_Stream& stream) const {
-    const kbcC_BC& bc = bc_.ConstGet();
-    switch (bc.DynTypeId()) {
-    case kbcC_DisplacementBC::Class.Id():
-        WriteDisplacements(stream, static_cast<const kbcC_DisplacementBC&>(bc).fixed);
-        return;
-    case kbcC_VelocityBC::Class.Id(): WriteRates(stream, "type=VELOCITY", false); return;
-    case kbcC_AccelerationBC::Class.Id(): WriteRates(stream, "type=ACCELERATION", false); return;
-    case kbcC_TypeBC::Class.Id(): WriteType(stream); return;
-    case kbcC_SymmetryBC::Class.Id():
-        // No keyword: the text goes out with its four stars and its last blank.
-        stream << "**** symm BC output ";
-        stream.LineBreak();
-        return;
-    case kbcC_TemperatureBC::Class.Id(): WriteTemperature(stream); return;
-    case kbcC_ConcentrationBC::Class.Id(): WriteDistributed(stream, 11); return;
-    case kbcC_PorePressureBC::Class.Id():
-    case kbcC_FluidPressureBC::Class.Id():
-    case kbcC_FluidCavityPressureBC::Class.Id(): WriteDistributed(stream, 8); return;
-    case kbcC_AcousticPressureBC::Class.Id(): WriteComplexDistributed(stream, 8); return;
-    case kbcC_ElectricPotentialBC::Class.Id(): WriteComplexDistributed(stream, 9); return;
-    case kbcC_SubmodelBC::Class.Id(): WriteSubmodel(stream); return;
-    default:
-        QRXBasException::Throw(
-            nex_PrimException<atr_String, 1>("Unimplemented boundary condition in input file."));
-    }
+void oif_Boundary::WriteBaseName(oif_KeywordLine& line) const {
+    const cow_String fixedName = FixBCNameHack(card_.name);
+    if (fixedName != card_.name) line.Fixed(", base name=", qkw_QuorixName(fixedName, false));
 }
 
 void oif_Boundary::WriteType(utl_Stream& stream) const {
@@ -194,48 +155,45 @@ void oif_Boundary::WriteType(utl_Stream& stream) const {
     const cow_String support =
         cow_String(", ") + omu_PrimEnum<kbcC_TypeBC::TypeNameEnm, 1>(typeName.ConstGet()).GetString();
     ForEachLoadCase([&](int loadCase) {
-        WriteBoundaryCard(stream, bc_.ConstGet().distributionType, false, loadCase, true);
+        WriteBoundaryCard(stream, Condition().distributionType, false, loadCase);
         WriteLine(stream, support, 0.0);
     });
 }
 
-void oif_Boundary::WriteTemperature(utl_Stream& stream) const {
-    const auto& bc = static_cast<const kbcC_TemperatureBC&>(bc_.ConstGet());
+void oif_Boundary::WriteTemperature(utl_Stream& stream, const kbcC_TemperatureBC& bc) const {
     const auto& dofs = State<kbcC_TemperatureBCState>().dofs;
-    const double value = bc.Magnitude(stepName_) * scale_;
-    const bool valueIsSaid = IsSaid(bc.MagnitudeState(stepName_));
-    WriteBoundaryCard(stream, bc.distributionType, false, 0, true);
+    const double value = bc.Magnitude(card_.step) * card_.Factor();
+    const bool valueIsSaid = IsSaid(bc.MagnitudeState(card_.step));
+    WriteBoundaryCard(stream, bc.distributionType, false, 0);
     if (!bc.dofsGiven) {
         if (valueIsSaid) WriteLine(stream, Dof(11), value);
     } else if (valueIsSaid || IsSaid(dofs.State())) {
         const cow_List<int>& numbers = dofs.ConstGet();
-        for (int i = 0; i < numbers.Length(); ++i) WriteLine(stream, Dof(numbers[i]), value);
+        for (const int number : numbers) WriteLine(stream, Dof(number), value);
     }
 }
 
 // Unlike a displacement's, the value stands beside "fixed" too.
-void oif_Boundary::WriteDistributed(utl_Stream& stream, int dof) const {
-    const auto& bc = static_cast<const kbcC_DistributedBC&>(bc_.ConstGet());
-    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 0, true);
-    if (IsSaid(bc.MagnitudeState(stepName_))) {
-        WriteLine(stream, Dof(dof), bc.Magnitude(stepName_) * scale_);
+void oif_Boundary::WriteDistributed(utl_Stream& stream, const kbcC_DistributedBC& bc, int dof) const {
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 0);
+    if (IsSaid(bc.MagnitudeState(card_.step))) {
+        WriteLine(stream, Dof(dof), bc.Magnitude(card_.step) * card_.Factor());
     }
 }
 
-void oif_Boundary::WriteComplexDistributed(utl_Stream& stream, int dof) const {
+void oif_Boundary::WriteComplexDistributed(utl_Stream& stream, const kbcC_DistributedBC& bc, int dof) const {
     if (!UsesComplex()) {
-        WriteDistributed(stream, dof);
+        WriteDistributed(stream, bc, dof);
         return;
     }
     // Both parts are always written, changed or not.
-    const auto& bc = static_cast<const kbcC_DistributedBC&>(bc_.ConstGet());
-    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 1, true);
-    WriteLine(stream, Dof(dof), bc.Magnitude(stepName_) * scale_);
-    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 2, true);
-    WriteLine(stream, Dof(dof), bc.ImaginaryMagnitude(stepName_) * scale_);
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 1);
+    WriteLine(stream, Dof(dof), bc.Magnitude(card_.step) * card_.Factor());
+    WriteBoundaryCard(stream, bc.distributionType, bc.fixed, 2);
+    WriteLine(stream, Dof(dof), bc.ImaginaryMagnitude(card_.step) * card_.Factor());
 }
 
-void oif_Boundary::WriteSubmodel(utl_Stream& stream) const {
+void oif_Boundary::WriteSubmodel(utl_Stream& stream, const kbcC_SubmodelBC& bc) const {
     // A boundary that is held gets its data lines all the same.
     if (!isBCSubmodel_) {
         stream << submodelKeyword_;
@@ -244,49 +202,28 @@ void oif_Boundary::WriteSubmodel(utl_Stream& stream) const {
     const auto& state = State<kbcC_SubmodelBCState>();
     if (shellToSolid_) {
         const double zone = state.shellThicknessValue.ConstGet();
-        const double value =
-            zone > 0.0 ? zone : static_cast<const kbcC_SubmodelBC&>(bc_.ConstGet()).shellThickness * 0.1;
+        const double value = zone > 0.0 ? zone : bc.shellThickness * 0.1;
         // The thickness stands in the place of the degree of freedom, as a name's text would.
         WriteLine(stream, cow_String(", ") + cow_String(value), 0.0);
         return;
     }
-    const cow_List<int>& dofs = state.dofs.ConstGet();
-    for (int i = 0; i < dofs.Length(); ++i) WriteLine(stream, Dof(dofs[i]), 0.0);
+    for (const int number : state.dofs.ConstGet()) WriteLine(stream, Dof(number), 0.0);
 }
 
-oif_ConnectorMotion::oif_ConnectorMotion(const mdl_ObjCow<kbcC_BC>& bc, const cow_String& setName,
-                                         const cow_String& stepName, bool opMod,
-                                         const cow_String& initialStepName, double scale)
-    : qkw_KeywordOf({"*Connector Motion", false, false}, bc, stepName, opMod, setName, initialStepName,
-                    scale) {}
+oif_ConnectorMotion::oif_ConnectorMotion(const oif_BCCard& card, const cow_String& initialStepName)
+    : qkw_KeywordOf({"*Connector Motion", oif_BCFamily::CONNECTOR_MOTION, false, false,
+                     "Unimplemented ConnectorMotion condition in input file."},
+                    card, initialStepName) {}
 
-void oif_ConnectorMotion::WriteForms(utl_Stream& stream) const {
-    const kbcC_BC& bc = bc_.ConstGet();
-    const auto fixed = [&bc] { return static_cast<const kbcC_ConnectorBC&>(bc).fixed; };
-    switch (bc.DynTypeId()) {
-    case kbcC_ConnDisplacementBC::Class.Id(): WriteDisplacements(stream, fixed()); return;
-    case kbcC_ConnVelocityBC::Class.Id(): WriteRates(stream, "type=VELOCITY", fixed()); return;
-    case kbcC_ConnAccelerationBC::Class.Id(): WriteRates(stream, "type=ACCELERATION", fixed()); return;
-    default:
-        QRXBasException::Throw(
-            nex_PrimException<atr_String, 1>("Unimplemented ConnectorMotion condition in input file."));
-    }
-}
-
-oif_BoundaryForBoltLoad::oif_BoundaryForBoltLoad(const kloC_BoltLoad& boltLoad, const cow_String& stepName,
-                                                 bool opMod, const cow_String& setName, double scale)
-    : boltLoad_(boltLoad), stepName_(stepName), setName_(setName), opMod_(opMod),
-      clear_(boltLoad.Status(stepName) == mdl_PropagationStatusEnm::DEACTIVATED ||
-             boltLoad.BoltState(stepName).boltMethod.ConstGet() == Method::APPLY_FORCE),
-      scale_(scale) {
-    if (clear_) opMod_ = false;
+oif_BoundaryForBoltLoad::oif_BoundaryForBoltLoad(const oif_LoadCard& card, const kloC_BoltLoad& boltLoad)
+    : boltLoad_(boltLoad), stepName_(card.step), setName_(card.setName), op_(card.op),
+      clear_(card.Quad().status == mdl_PropagationStatusEnm::DEACTIVATED || boltLoad.IsByForce(card.step)),
+      scale_(card.Factor()) {
+    if (clear_) op_ = oif_Op::NEW;
 }
 
 void oif_BoundaryForBoltLoad::Write(utl_Stream& stream) const {
-    if (clear_) {
-        WriteBCCard(stream, false);
-        return;
-    }
+    if (clear_) return WriteBCCard(stream, false);
     const kloC_BoltLoadState& state = boltLoad_.ConstGet().BoltState(stepName_);
     const Method method = state.boltMethod.ConstGet();
     WriteBCCard(stream, method == Method::FIX_LENGTH);
@@ -294,10 +231,7 @@ void oif_BoundaryForBoltLoad::Write(utl_Stream& stream) const {
 }
 
 void oif_BoundaryForBoltLoad::WriteBCCard(utl_Stream& stream, bool fixed) const {
-    stream << "*Boundary";
-    if (!opMod_) stream << ", op=NEW";
-    if (fixed) stream << ", fixed";
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Boundary").Op(op_).FixedIf(fixed, ", fixed").End();
 }
 
 void oif_BoundaryForBoltLoad::WriteBCData(utl_Stream& stream, double value) const {

@@ -1,39 +1,39 @@
 #include "conditions/oif_FluxLoads.h"
 
-#include "keyword_layer/qkw_QuorixName.h"
+#include "base/oif_KeywordLine.h"
 
 using AttributeState = mdl_PropAttributeStateEnm;
 
 namespace {
 
-bool Ends(const kloC_Load& load, const cow_String& stepName) {
-    return load.Status(stepName) == mdl_PropagationStatusEnm::DEACTIVATED;
+bool Ends(const oif_LoadCard& card) {
+    return card.Quad().status == mdl_PropagationStatusEnm::DEACTIVATED;
 }
 
-cow_String AmplitudeOf(const kloC_Load& load, const cow_String& stepName) {
-    return load.ConstGetStateQuad(stepName).state.ConstGet().amplitude.ConstGet();
+/// A load that ends begins its family anew.
+oif_Op OpOf(const oif_LoadCard& card) {
+    return Ends(card) ? oif_Op::NEW : card.op;
+}
+
+cow_String AmplitudeOf(const oif_LoadCard& card) {
+    return card.Quad().state.ConstGet().amplitude.ConstGet();
 }
 
 } // namespace
 
-oif_FluxLoad::oif_FluxLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                           const cow_String& setName)
-    : opMod_(opMod), setName_(setName), amplitude_(AmplitudeOf(load, stepName)), selector_(load.Selector()),
-      deactivated_(Ends(load, stepName)) {
-    if (deactivated_) opMod_ = false;
-    const auto values = load.Values(stepName);
+oif_FluxLoad::oif_FluxLoad(const oif_LoadCard& card)
+    : op_(OpOf(card)), setName_(card.setName), amplitude_(AmplitudeOf(card)),
+      selector_(card.Object().Selector()), deactivated_(Ends(card)) {
+    const auto values = card.Object().Values(card.step);
     if (!values.empty()) magnitude_ = values.front().real;
 }
 
 void oif_FluxLoad::WriteAs(const oif_FluxText& text, utl_Stream& stream) const {
-    stream << text.keyword;
-    if (!opMod_) stream << ", op=NEW";
-    if (deactivated_) return stream.LineBreak();
-    if (!amplitude_.IsEmpty()) {
-        stream.OptionalLineBreak();
-        stream << ", amplitude=" << qkw_QuorixName(amplitude_, false);
-    }
-    stream.LineBreak();
+    oif_KeywordLine line(stream, text.keyword);
+    line.Op(op_);
+    if (deactivated_) return line.End();
+    if (!amplitude_.IsEmpty()) line.MayBreak().Amplitude(amplitude_);
+    line.End();
     stream << setName_;
     if (text.label == nullptr) {
         stream << ", " << selector_ << ", ";
@@ -44,12 +44,10 @@ void oif_FluxLoad::WriteAs(const oif_FluxText& text, utl_Stream& stream) const {
     stream << magnitude_ << endl;
 }
 
-oif_ElectricalLoad::oif_ElectricalLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                                       const cow_String& setName)
-    : amplitude_(AmplitudeOf(load, stepName)), setName_(setName), complex_(load.IsComplex()), opMod_(opMod),
-      deactivated_(Ends(load, stepName)), writeAlways_(complex_) {
-    if (deactivated_) opMod_ = false;
-    const auto values = load.Values(stepName);
+oif_ElectricalLoad::oif_ElectricalLoad(const oif_LoadCard& card)
+    : amplitude_(AmplitudeOf(card)), setName_(card.setName), complex_(card.Object().IsComplex()),
+      op_(OpOf(card)), deactivated_(Ends(card)), writeAlways_(complex_) {
+    const auto values = card.Object().Values(card.step);
     if (values.empty()) return;
     real_ = values.front().real;
     imag_ = values.front().imag;
@@ -57,13 +55,13 @@ oif_ElectricalLoad::oif_ElectricalLoad(const kloC_Load& load, const cow_String& 
 }
 
 void oif_ElectricalLoad::WriteCard(utl_Stream& stream, const oif_ElectricalText& text, int loadCase) const {
-    stream << text.keyword;
-    if (!opMod_) stream << ", op=NEW";
-    // Also on the line of a load that ends, when it carries one.
-    if (!amplitude_.IsEmpty()) stream << ", amplitude=" << qkw_QuorixName(amplitude_, false);
-    // A complex load that ends says load case 0.
-    if (complex_) stream << ", load case=" << loadCase;
-    stream.LineBreak();
+    // The amplitude stands also on the line of a load that ends, when it carries one. A complex load that
+    // ends says load case 0.
+    oif_KeywordLine(stream, text.keyword)
+        .Op(op_)
+        .Amplitude(amplitude_)
+        .FixedIf(complex_, ", load case=", loadCase)
+        .End();
 }
 
 void oif_ElectricalLoad::WriteAs(const oif_ElectricalText& text, utl_Stream& stream) const {
@@ -72,7 +70,7 @@ void oif_ElectricalLoad::WriteAs(const oif_ElectricalText& text, utl_Stream& str
     WriteCard(stream, text, 1);
     // The real part of a complex load is written also when it is 0.
     if (writeAlways_ || magnitudeState_ == AttributeState::SET ||
-        (magnitudeState_ == AttributeState::CARRIED && !opMod_)) {
+        (magnitudeState_ == AttributeState::CARRIED && op_ == oif_Op::NEW)) {
         line(real_);
     }
     if (!complex_) return;

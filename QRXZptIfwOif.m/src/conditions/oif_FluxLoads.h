@@ -1,8 +1,8 @@
 #ifndef QRX_OIF_FLUXLOADS_H
 #define QRX_OIF_FLUXLOADS_H
 
+#include "conditions/oif_Card.h"
 #include "keyword_layer/qkw_Keyword.h"
-#include "store_interface/records/conditions/kloC_Load.h"
 
 /// The texts of a keyword of thermal and flow loads. Where there is no label, the load's degree of freedom
 /// takes its place.
@@ -15,11 +15,11 @@ struct oif_FluxText {
 /// What these keywords share. Their one magnitude is written whatever its state, and never scaled.
 class oif_FluxLoad : public qkw_Keyword {
 protected:
-    oif_FluxLoad(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName);
+    explicit oif_FluxLoad(const oif_LoadCard& card);
     void WriteAs(const oif_FluxText& text, utl_Stream& stream) const;
 
 private:
-    bool opMod_;
+    oif_Op op_;
     cow_String setName_;
     cow_String amplitude_;
     double magnitude_ = 0.0;
@@ -34,8 +34,8 @@ private:
 template <const oif_FluxText& Text>
 class oif_FluxLoadOf final : public qkw_KeywordOf<oif_FluxLoadOf<Text>, oif_FluxLoad> {
 public:
-    oif_FluxLoadOf(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName)
-        : qkw_KeywordOf<oif_FluxLoadOf<Text>, oif_FluxLoad>(load, stepName, opMod, setName) {}
+    explicit oif_FluxLoadOf(const oif_LoadCard& card)
+        : qkw_KeywordOf<oif_FluxLoadOf<Text>, oif_FluxLoad>(card) {}
     void Write(utl_Stream& stream) const override { oif_FluxLoad::WriteAs(Text, stream); }
 };
 
@@ -60,8 +60,7 @@ struct oif_ElectricalText {
 /// What the electrical keywords share: one magnitude, or its two parts, never scaled.
 class oif_ElectricalLoad : public qkw_Keyword {
 protected:
-    oif_ElectricalLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                       const cow_String& setName);
+    explicit oif_ElectricalLoad(const oif_LoadCard& card);
     void WriteAs(const oif_ElectricalText& text, utl_Stream& stream) const;
 
 private:
@@ -73,7 +72,7 @@ private:
     cow_String amplitude_;
     cow_String setName_;
     bool complex_;
-    bool opMod_;
+    oif_Op op_;
     bool deactivated_;
     bool writeAlways_;
 };
@@ -86,9 +85,8 @@ private:
 template <const oif_ElectricalText& Text>
 class oif_ElectricalLoadOf final : public qkw_KeywordOf<oif_ElectricalLoadOf<Text>, oif_ElectricalLoad> {
 public:
-    oif_ElectricalLoadOf(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                         const cow_String& setName)
-        : qkw_KeywordOf<oif_ElectricalLoadOf<Text>, oif_ElectricalLoad>(load, stepName, opMod, setName) {}
+    explicit oif_ElectricalLoadOf(const oif_LoadCard& card)
+        : qkw_KeywordOf<oif_ElectricalLoadOf<Text>, oif_ElectricalLoad>(card) {}
     void Write(utl_Stream& stream) const override { oif_ElectricalLoad::WriteAs(Text, stream); }
 };
 

@@ -1,7 +1,7 @@
 #include "conditions/oif_InitialConditions.h"
 
 #include "conditions/oif_PredefinedFields.h"
-#include "store_interface/records/cls_ClassRegistrar.h"
+#include "foundation/nex_Exception.h"
 
 #include <initializer_list>
 
@@ -23,119 +23,108 @@ void WriteFunctionData(utl_Stream& stream, double value, double place, bool forc
     WriteComponentData(stream, {value, place}, forced);
 }
 
-void WriteFileNumbers(utl_Stream& stream, const kpfC_ResultsFile& file) {
-    oif_FieldText::WriteNumber(stream, ", step=", file.beginStep);
-    oif_FieldText::WriteNumber(stream, ", inc=", file.beginIncrement);
+void WriteFileNumbers(oif_KeywordLine& line, const kpfC_ResultsFile& file) {
+    oif_FieldText::WriteNumber(line, ", step=", file.beginStep);
+    oif_FieldText::WriteNumber(line, ", inc=", file.beginIncrement);
 }
 
 } // namespace
 
-oif_InitialConditions::oif_InitialConditions(const kpfC_Field& field, const cow_String&,
-                                             const cow_String& stepName, bool, const cow_String& setName,
-                                             int maxTemperatureSize, int maxGeneralFieldSize)
-    : record_(field), state_(field.ConstGetStateQuad(stepName).state),
-      distributionType_(field.distributionType), setName_(setName), maxTemperatureSize_(maxTemperatureSize),
-      maxGeneralFieldSize_(maxGeneralFieldSize) {}
-
 oif_InitialConditions::oif_InitialConditions(const kinC_ActuatorSensor& actuator, const cow_String& setName,
                                              int count)
-    : record_(actuator), setName_(setName) {
+    : record_(actuator), setName_(setName), parameters_([](const Self& self, oif_KeywordLine& line) {
+          self.WriteParameters(line, self.record_.ConstGet());
+      }),
+      form_([](const Self& self, utl_Stream& stream) {
+          self.WriteForm(stream, static_cast<const kinC_ActuatorSensor&>(self.record_.ConstGet()));
+      }) {
     for (int i = 0; i < count; ++i) {
         values_.Append(i < actuator.initialValues.Length() ? actuator.initialValues[i] : 0.0);
     }
 }
 
-bool oif_InitialConditions::HasDataLines() const {
-    return distributionType_ != Distribution::USER_DEFINED && distributionType_ != Distribution::FROM_FILE &&
-           distributionType_ != Distribution::FROM_FILE_AND_USER_DEFINED;
+bool oif_InitialConditions::IsFromFile() const {
+    return distributionType_ == Distribution::FROM_FILE ||
+           distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED;
 }
 
-void oif_InitialConditions::WriteDistributionType(utl_Stream& stream, const cow_String& fileName) const {
-    switch (distributionType_) {
-    case Distribution::USER_DEFINED: stream << ", USER"; break;
-    case Distribution::FROM_FILE:
-    case Distribution::FROM_FILE_AND_USER_DEFINED:
-        // Hardening has no file.
-        if (record_.ConstGet().DynTypeId() != kpfC_Hardening::TypeId())
-            oif_FieldText::WriteFile(stream, fileName);
-        break;
-    case Distribution::GEOSTATIC:
-        if (record_.ConstGet().DynTypeId() == kpfC_Stress::TypeId()) stream << ", GEOSTATIC";
-        break;
-    default: break;
-    }
+bool oif_InitialConditions::HasDataLines() const {
+    return distributionType_ != Distribution::USER_DEFINED && !IsFromFile();
+}
+
+void oif_InitialConditions::WriteDistributionType(oif_KeywordLine& line, const cow_String* fileName) const {
+    line.FixedIf(distributionType_ == Distribution::USER_DEFINED, ", USER");
+    if (IsFromFile() && fileName != nullptr) oif_FieldText::WriteFile(line, *fileName);
 }
 
 void oif_InitialConditions::WriteInitialConditionsCard(utl_Stream& stream) const {
-    const bool isFromFile = distributionType_ == Distribution::FROM_FILE ||
-                            distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED;
-    stream << "*Initial Conditions, ";
-    switch (record_.ConstGet().DynTypeId()) {
-    case kpfC_Temperature::Class.Id(): {
-        const auto& state = StateAs<kpfC_TemperatureState>();
-        stream << "type=TEMPERATURE";
-        WriteDistributionType(stream, state.magnitude.ConstGet());
-        if (!isFromFile) break;
-        WriteFileNumbers(stream, state);
-        oif_FieldText::WriteInterpolation(stream, state);
-        break;
-    }
-    case kpfC_GeneralField::Class.Id(): {
-        const auto& state = StateAs<kpfC_GeneralFieldState>();
-        // The blanks around this "=" belong there.
-        stream << "type=FIELD, variable = " << state.variable;
-        WriteDistributionType(stream, state.fileName.ConstGet());
-        if (!isFromFile) break;
-        WriteFileNumbers(stream, state);
-        if (!state.interpolate.IsActive()) break;
-        if (state.interpolate == Interpolate::MIDSIDE) stream << ", midside";
-        if (state.interpolate == Interpolate::INTERPOLATE) stream << ", interpolate";
-        break;
-    }
-    case kpfC_Velocity::Class.Id():
-        stream << (FieldAs<kpfC_Velocity>().IsRotatingVelocity() ? "type=ROTATING VELOCITY"
-                                                                 : "type=VELOCITY");
-        break;
-    case kpfC_Stress::Class.Id(): {
-        const auto& stress = FieldAs<kpfC_Stress>();
-        stream << "type=STRESS";
-        WriteDistributionType(stream, stress.fileName);
-        if (isFromFile && stress.step != 0) stream << ", step=" << stress.step;
-        if (isFromFile && stress.increment != 0) stream << ", inc=" << stress.increment;
-        break;
-    }
-    case kpfC_Hardening::Class.Id():
-        stream << "type=HARDENING";
-        WriteDistributionType(stream, {});
-        break;
-    default: nex_Raise("Unimplemented initial condition!");
-    }
-    stream.LineBreak();
+    oif_KeywordLine line(stream, "*Initial Conditions");
+    parameters_(*this, line);
+    line.End();
 }
 
-void oif_InitialConditions::Write(utl_Stream& stream) const {
-    switch (record_.ConstGet().DynTypeId()) {
-    case kinC_ActuatorSensor::Class.Id(): return WriteActuator(stream);
-    case kpfC_Temperature::Class.Id():
-        WriteInitialConditionsCard(stream);
-        // A load case's scale never comes here.
-        if (HasDataLines()) {
-            oif_FieldText::WriteValues(stream, setName_, StateAs<kpfC_TemperatureState>().values, 1.0,
-                                       maxTemperatureSize_);
-        }
-        return;
-    case kpfC_GeneralField::Class.Id():
-        WriteInitialConditionsCard(stream);
-        if (HasDataLines()) {
-            oif_FieldText::WriteGeneralFieldBaseData(stream, setName_, maxGeneralFieldSize_,
-                                                     StateAs<kpfC_GeneralFieldState>().values);
-        }
-        return;
-    case kpfC_Velocity::Class.Id(): return WriteVelocity(stream);
-    case kpfC_Stress::Class.Id(): return WriteStress(stream);
-    case kpfC_Hardening::Class.Id(): return WriteHardening(stream);
-    default: nex_Raise("Unimplemented field for initial condition!");
+void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Temperature&) const {
+    const auto& state = StateAs<kpfC_TemperatureState>();
+    line.Fixed(", type=TEMPERATURE");
+    WriteDistributionType(line, &state.magnitude.ConstGet());
+    if (!IsFromFile()) return;
+    WriteFileNumbers(line, state);
+    oif_FieldText::WriteInterpolation(line, state);
+}
+
+void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_GeneralField&) const {
+    const auto& state = StateAs<kpfC_GeneralFieldState>();
+    // The blanks around this "=" belong there.
+    line.Fixed(", type=FIELD").Fixed(", variable = ", state.variable);
+    WriteDistributionType(line, &state.fileName.ConstGet());
+    if (!IsFromFile()) return;
+    WriteFileNumbers(line, state);
+    if (!state.interpolate.IsActive()) return;
+    line.FixedIf(state.interpolate == Interpolate::MIDSIDE, ", midside")
+        .FixedIf(state.interpolate == Interpolate::INTERPOLATE, ", interpolate");
+}
+
+void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Velocity& velocity) const {
+    line.Fixed(velocity.IsRotatingVelocity() ? ", type=ROTATING VELOCITY" : ", type=VELOCITY");
+}
+
+void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Stress& stress) const {
+    line.Fixed(", type=STRESS");
+    WriteDistributionType(line, &stress.fileName);
+    line.FixedIf(distributionType_ == Distribution::GEOSTATIC, ", GEOSTATIC")
+        .FixedIf(IsFromFile() && stress.step != 0, ", step=", stress.step)
+        .FixedIf(IsFromFile() && stress.increment != 0, ", inc=", stress.increment);
+}
+
+void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Hardening&) const {
+    line.Fixed(", type=HARDENING");
+    // Hardening has no file.
+    WriteDistributionType(line, nullptr);
+}
+
+void oif_InitialConditions::WriteParameters(oif_KeywordLine&, const cls_Record&) const {
+    nex_Raise("Unimplemented initial condition!");
+}
+
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Temperature&) const {
+    WriteInitialConditionsCard(stream);
+    // A load case's scale never comes here.
+    if (HasDataLines()) {
+        oif_FieldText::WriteValues(stream, setName_, StateAs<kpfC_TemperatureState>().values, 1.0,
+                                   setting_.maxTemperatureSize);
     }
+}
+
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_GeneralField&) const {
+    WriteInitialConditionsCard(stream);
+    if (HasDataLines()) {
+        oif_FieldText::WriteGeneralFieldBaseData(stream, setName_, setting_.maxGeneralFieldSize,
+                                                 StateAs<kpfC_GeneralFieldState>().values);
+    }
+}
+
+void oif_InitialConditions::WriteForm(utl_Stream&, const cls_Record&) const {
+    nex_Raise("Unimplemented field for initial condition!");
 }
 
 void oif_InitialConditions::WriteSetMagnitudeData(utl_Stream& stream, double magnitude) const {
@@ -152,8 +141,7 @@ void oif_InitialConditions::WriteStressTensorData(utl_Stream& stream, const kpfC
     stream.LineBreak();
 }
 
-void oif_InitialConditions::WriteVelocity(utl_Stream& stream) const {
-    const auto& velocity = FieldAs<kpfC_Velocity>();
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Velocity& velocity) const {
     const double components[] = {velocity.velocity1, velocity.velocity2, velocity.velocity3};
     WriteInitialConditionsCard(stream);
     if (velocity.IsRotatingVelocity()) {
@@ -176,8 +164,7 @@ void oif_InitialConditions::WriteVelocity(utl_Stream& stream) const {
     }
 }
 
-void oif_InitialConditions::WriteStress(utl_Stream& stream) const {
-    const auto& stress = FieldAs<kpfC_Stress>();
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Stress& stress) const {
     WriteInitialConditionsCard(stream);
     if (distributionType_ == Distribution::GEOSTATIC) {
         stream << setName_ << ", ";
@@ -191,8 +178,7 @@ void oif_InitialConditions::WriteStress(utl_Stream& stream) const {
     }
 }
 
-void oif_InitialConditions::WriteHardening(utl_Stream& stream) const {
-    const auto& hardening = FieldAs<kpfC_Hardening>();
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Hardening& hardening) const {
     WriteInitialConditionsCard(stream);
     if (distributionType_ == Distribution::USER_DEFINED) return;
     WriteSetMagnitudeData(stream, hardening.equivPlasticStrain);
@@ -202,8 +188,9 @@ void oif_InitialConditions::WriteHardening(utl_Stream& stream) const {
     stream.LineBreak();
 }
 
-void oif_InitialConditions::WriteActuator(utl_Stream& stream) const {
-    stream << "*Initial Conditions, type=SOLUTION" << endl << setName_;
-    for (int i = 0; i < values_.Length(); ++i) stream << ", " << values_[i];
+void oif_InitialConditions::WriteForm(utl_Stream& stream, const kinC_ActuatorSensor&) const {
+    oif_KeywordLine(stream, "*Initial Conditions").Fixed(", type=SOLUTION").End();
+    stream << setName_;
+    for (const double value : values_) stream << ", " << value;
     stream.LineBreak();
 }

@@ -1,11 +1,8 @@
 #include "conditions/oif_MechanicalLoads.h"
 
 #include "base/oif_Utils.h"
-#include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
-#include "store_interface/records/conditions/kloC_BoltLoad.h"
-#include "store_interface/records/conditions/kloC_Loads.h"
 
 #include <algorithm>
 #include <initializer_list>
@@ -22,6 +19,8 @@ constexpr const char* kGlobalLineLabels[] = {"PX", "PY", "PZ"};
 constexpr const char* kLocalLineLabels[] = {"P1", "P2"};
 constexpr const char* kBodyLabels[] = {"BX", "BY", "BZ"};
 constexpr const char* kAxisymmetricBodyLabels[] = {"BR", "BZ"};
+constexpr const char* kBoltLabels[] = {"1"};
+constexpr const char* kPressureLabels[] = {"8"};
 constexpr const char* kEdgeLabels[] = {"EDNOR", "EDTRA", "EDSHR", "EDMOM", "EDLD"};
 
 constexpr int kThreeDimensional = 1;
@@ -49,12 +48,10 @@ const char* UserSuffix(Distribution distribution) {
 
 } // namespace
 
-oif_MechanicalLoad::oif_MechanicalLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                                       const cow_String& setName, double scale,
-                                       ClearedAmplitude clearedAmplitude)
-    : typeId_(load.DynTypeId()), setName_(setName), opNew_(!opMod), scale_(scale), modifiedOnly_(opMod),
-      complex_(load.IsComplex()), values_(load.Values(stepName)) {
-    const auto& quad = load.ConstGetStateQuad(stepName);
+oif_MechanicalLoad::oif_MechanicalLoad(const oif_LoadCard& card, ClearedAmplitude clearedAmplitude)
+    : setName_(card.setName), op_(card.op), scale_(card.Factor()), modifiedOnly_(card.op == oif_Op::MODIFY),
+      complex_(card.Object().IsComplex()), values_(card.Object().Values(card.step)) {
+    const auto& quad = card.Quad();
     oif_Utils::SetDeactivateOpFlags(quad.status, deactivated_, modifiedOnly_);
     if (deactivated_) return;
     const auto& amplitude = quad.state.ConstGet().amplitude;
@@ -69,26 +66,14 @@ bool oif_MechanicalLoad::Passes(AttributeState state) const {
     return oif_Utils::CheckDataState(state, modifiedOnly_);
 }
 
-void oif_MechanicalLoad::WriteOpNew(utl_Stream& stream) const {
-    if (opNew_) stream << ", op=NEW";
-}
-
-void oif_MechanicalLoad::WriteAmplitude(utl_Stream& stream) const {
-    if (!amplitude_.IsEmpty()) stream << ", amplitude=" << qkw_QuorixName(amplitude_, false);
-}
-
-void oif_MechanicalLoad::WriteLoadCase(utl_Stream& stream, int loadCase) {
-    if (loadCase != 0) stream << ", load case=" << loadCase;
-}
-
 void oif_MechanicalLoad::WriteCard(utl_Stream& stream, const char* keyword, int loadCase,
                                    bool follower) const {
-    stream << keyword;
-    WriteOpNew(stream);
-    if (follower) stream << ", follower";
-    WriteAmplitude(stream);
-    WriteLoadCase(stream, loadCase);
-    stream.LineBreak();
+    oif_KeywordLine(stream, keyword)
+        .Op(op_)
+        .FixedIf(follower, ", follower")
+        .Amplitude(amplitude_)
+        .FixedIf(loadCase != 0, ", load case=", loadCase)
+        .End();
 }
 
 void oif_MechanicalLoad::BeginLine(utl_Stream& stream, const cow_String& label, const char* separator) const {
@@ -101,8 +86,8 @@ void oif_MechanicalLoad::WriteLine(utl_Stream& stream, const cow_String& label, 
 }
 
 template <class Card>
-void oif_MechanicalLoad::WriteComponents(utl_Stream& stream, std::span<const char* const> labels,
-                                         const char* suffix, const Card& card) const {
+void oif_MechanicalLoad::WriteComponents(utl_Stream& stream, oif_Labels labels, const char* suffix,
+                                         const Card& card) const {
     const auto line = [&](std::size_t i, double value) {
         WriteLine(stream, cow_String(labels[i]) + suffix, value);
     };
@@ -138,31 +123,48 @@ void oif_MechanicalLoad::WriteMagnitude(bool passes, const Block& block) const {
     }
 }
 
-oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                     const qkw_ModelInfo& modelInfo, const cow_String&, double scale)
-    : oif_Cload(load, stepName, opMod, oif_RegionName(load.region, modelInfo), scale) {}
+oif_Cload::oif_Cload(const oif_LoadCard& card, oif_Labels labels, bool follower)
+    : qkw_KeywordOf(card, ClearedAmplitude::COUNTS), labels_(labels), follower_(follower) {}
 
-oif_Cload::oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                     const cow_String& regionName, double scale)
-    : qkw_KeywordOf(load, stepName, opMod, cow_String(), scale, ClearedAmplitude::COUNTS) {
-    // The lines of bolts and of plane strain loads begin with an empty name.
-    if (typeId_ != kloC_BoltLoad::TypeId() && typeId_ != kloC_PEGLoad::TypeId()) setName_ = regionName;
-    if (typeId_ == kloC_ConcentratedForce::TypeId()) {
-        follower_ = static_cast<const kloC_ConcentratedForce&>(load).follower;
-    } else if (typeId_ == kloC_Moment::TypeId()) {
-        follower_ = static_cast<const kloC_Moment&>(load).follower;
-    } else if (typeId_ == kloC_BoltLoad::TypeId()) {
-        const kloC_BoltLoadState& state = static_cast<const kloC_BoltLoad&>(load).BoltState(stepName);
-        bolted_ = state.boltMethod.ConstGet() != kloC_BoltLoad::MethodEnm::APPLY_FORCE;
-        values_ = {{state.magnitude.ConstGet(), 0.0, state.magnitude.State()}};
-    }
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_ConcentratedForce& force)
+    : oif_Cload(card, kForceLabels, force.follower) {}
+
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_Moment& moment)
+    : oif_Cload(card, kMomentLabels, moment.follower) {}
+
+// The lines of bolts and of plane strain loads begin with an empty name.
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_PEGLoad&) : oif_Cload(card, kPlaneStrainLabels) {
+    setName_ = {};
+}
+
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_BoltLoad& bolt) : oif_Cload(card, kBoltLabels) {
+    const kloC_BoltLoadState& state = bolt.BoltState(card.step);
+    setName_ = {};
+    bolted_ = !bolt.IsByForce(card.step);
+    values_ = {{state.magnitude.ConstGet(), 0.0, state.magnitude.State()}};
+}
+
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_ConcentratedPoreFluid& flow)
+    : oif_Cload(card, kPressureLabels) {
+    if (IsComplexPoreFluid(flow)) failure_ = ComplexPoreFluid;
+}
+
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_InwardVolAccel&)
+    : oif_Cload(card, kPressureLabels) {}
+
+oif_Cload::oif_Cload(const oif_LoadCard& card, const kloC_Load&) : oif_Cload(card, oif_Labels()) {
+    failure_ = "\"Invalid load type for *Cload\" == 0";
+}
+
+bool oif_Cload::IsComplexPoreFluid(const kloC_Load& load) {
+    return load.DynTypeId() == kloC_ConcentratedPoreFluid::TypeId() && load.IsComplex();
 }
 
 void oif_Cload::WriteCloadCard(utl_Stream& stream, int loadCase, bool follower) const {
     WriteCard(stream, "*Cload", loadCase, follower);
 }
 
-void oif_Cload::WriteSingle(utl_Stream& stream, const cow_String& label) const {
+void oif_Cload::WriteSingle(utl_Stream& stream, const char* label) const {
     WriteMagnitude(Passes(values_.front().state), [&](int part, double value) {
         WriteCloadCard(stream, part, false);
         WriteLine(stream, label, value);
@@ -172,85 +174,83 @@ void oif_Cload::WriteSingle(utl_Stream& stream, const cow_String& label) const {
 void oif_Cload::Write(utl_Stream& stream) const {
     // A load that ends has its line alone, and never ", follower".
     if (deactivated_) return WriteCloadCard(stream, 0, false);
-    const auto writeVector = [&](std::span<const char* const> labels) {
-        WriteComponents(stream, labels, "", [&](int part) { WriteCloadCard(stream, part, follower_); });
-    };
-    switch (typeId_) {
-    case kloC_ConcentratedForce::Class.Id(): return writeVector(kForceLabels);
-    case kloC_Moment::Class.Id(): return writeVector(kMomentLabels);
-    case kloC_PEGLoad::Class.Id(): return writeVector(kPlaneStrainLabels);
-    case kloC_BoltLoad::Class.Id():
-        return bolted_ ? WriteCloadCard(stream, 0, false) : WriteSingle(stream, "1");
-    case kloC_ConcentratedPoreFluid::Class.Id():
-        if (complex_) nex_Raise("\"Concentrated pore fluid load cannot be complex\" == 0");
-        return WriteSingle(stream, "8");
-    case kloC_InwardVolAccel::Class.Id(): return WriteSingle(stream, "8");
-    default: nex_Raise("\"Invalid load type for *Cload\" == 0");
-    }
+    if (failure_ != nullptr) nex_Raise(failure_);
+    if (bolted_) return WriteCloadCard(stream, 0, false);
+    if (labels_.size() == 1) return WriteSingle(stream, labels_.front());
+    WriteComponents(stream, labels_, "", [&](int part) { WriteCloadCard(stream, part, follower_); });
 }
 
-oif_ConnectorLoad::oif_ConnectorLoad(const kloC_Load& load, const cow_String& setName,
-                                     const cow_String& stepName, bool opMod, double scale)
-    : qkw_KeywordOf(load, stepName, opMod, oif_Utils::GetConnectorSetName(setName), scale,
-                    ClearedAmplitude::IGNORED) {}
+oif_ConnectorLoad::oif_ConnectorLoad(const oif_LoadCard& card, oif_Labels labels)
+    : qkw_KeywordOf(card, ClearedAmplitude::IGNORED), labels_(labels) {
+    setName_ = oif_Utils::GetConnectorSetName(card.setName);
+}
+
+oif_ConnectorLoad::oif_ConnectorLoad(const oif_LoadCard& card, const kloC_ConnectorForce&)
+    : oif_ConnectorLoad(card, kForceLabels) {}
+
+oif_ConnectorLoad::oif_ConnectorLoad(const oif_LoadCard& card, const kloC_ConnectorMoment&)
+    : oif_ConnectorLoad(card, kMomentLabels) {}
+
+oif_ConnectorLoad::oif_ConnectorLoad(const oif_LoadCard& card, const kloC_Load&)
+    : oif_ConnectorLoad(card, oif_Labels()) {}
 
 void oif_ConnectorLoad::Write(utl_Stream& stream) const {
     const auto card = [&](int part) { WriteCard(stream, "*Connector Load", part); };
     if (deactivated_) return card(0);
-    switch (typeId_) {
-    case kloC_ConnectorForce::Class.Id(): return WriteComponents(stream, kForceLabels, "", card);
-    case kloC_ConnectorMoment::Class.Id(): return WriteComponents(stream, kMomentLabels, "", card);
-    default: nex_Raise("Invalid load type for *Connector Load");
-    }
+    if (labels_.empty()) nex_Raise("Invalid load type for *Connector Load");
+    WriteComponents(stream, labels_, "", card);
 }
 
-oif_Dload::oif_Dload(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName,
-                     int space, const qkw_ModelInfo&, bool, int, double scale, const cow_String&)
-    : qkw_KeywordOf(load, stepName, opMod, setName, scale, ClearedAmplitude::IGNORED), space_(space) {
-    if (const auto* distributed = nex_canDynamicCastPtr<kloC_DistributedLoad>(&load)) {
-        suffix_ = UserSuffix(distributed->distributionType);
-        hydrostatic_ = distributed->distributionType == Distribution::HYDROSTATIC;
-    }
-    switch (typeId_) {
-    case kloC_LineLoad::Class.Id():
-        local_ = static_cast<const kloC_LineLoad&>(load).system == kloC_LineLoad::SystemEnm::LOCAL;
-        break;
-    case kloC_PipePressure::Class.Id(): {
-        const auto& pipe = static_cast<const kloC_PipePressure&>(load);
-        const kloC_HydrostaticHeights& heights = pipe.StateIn(stepName);
-        label_ = cow_String(hydrostatic_ ? "H" : "") + (pipe.external ? "PE" : "PI") + suffix_;
-        diameter_ = pipe.effectiveDiameter;
-        heights_[0] = heights.zeroPressureHeight.ConstGet();
-        heights_[1] = heights.referencePressureHeight.ConstGet();
-        heightsPass_ =
-            Passes(heights.zeroPressureHeight.State()) || Passes(heights.referencePressureHeight.State());
-        break;
-    }
-    case kloC_RotationalBodyForce::Class.Id(): {
-        const auto& rotation = static_cast<const kloC_RotationalBodyForce&>(load);
-        label_ = rotation.centrifugal ? "CENTRIF" : rotation.rotaryAcceleration ? "ROTA" : "";
-        axis_ = gsl_ModelSegment(rotation.point1, rotation.point2);
-        break;
-    }
-    default: break;
-    }
+oif_Dload::oif_Dload(const oif_LoadCard& card, const oif_LoadSetting& setting, Form form)
+    : qkw_KeywordOf(card, ClearedAmplitude::IGNORED), form_(form), space_(setting.space) {}
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_RotationalBodyForce& rotation,
+                     const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, &oif_Dload::WriteRotation) {
+    label_ = rotation.centrifugal ? "CENTRIF" : rotation.rotaryAcceleration ? "ROTA" : "";
+    axis_ = gsl_ModelSegment(rotation.point1, rotation.point2);
 }
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_LineLoad& load, const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, &oif_Dload::WriteVector) {
+    suffix_ = UserSuffix(load.distributionType);
+    // Along the axes of the section there are two.
+    labels_ = load.system == kloC_LineLoad::SystemEnm::LOCAL ? oif_Labels(kLocalLineLabels)
+                                                             : oif_Labels(kGlobalLineLabels);
+}
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_PipePressure& pipe, const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, &oif_Dload::WritePipePressure) {
+    const kloC_HydrostaticHeights& heights = pipe.StateIn(card.step);
+    suffix_ = UserSuffix(pipe.distributionType);
+    hydrostatic_ = pipe.distributionType == Distribution::HYDROSTATIC;
+    label_ = cow_String(hydrostatic_ ? "H" : "") + (pipe.external ? "PE" : "PI") + suffix_;
+    diameter_ = pipe.effectiveDiameter;
+    heights_[0] = heights.zeroPressureHeight.ConstGet();
+    heights_[1] = heights.referencePressureHeight.ConstGet();
+    heightsPass_ =
+        Passes(heights.zeroPressureHeight.State()) || Passes(heights.referencePressureHeight.State());
+}
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_BodyForce& force, const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, &oif_Dload::WriteVector) {
+    suffix_ = UserSuffix(force.distributionType);
+    labels_ = space_ == kAxisymmetric ? oif_Labels(kAxisymmetricBodyLabels) : oif_Labels(kBodyLabels);
+    if (space_ != kThreeDimensional) labels_ = labels_.first(2);
+}
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_Gravity&, const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, &oif_Dload::WriteGravity) {}
+
+oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_Load&, const oif_LoadSetting& setting)
+    : oif_Dload(card, setting, nullptr) {}
 
 void oif_Dload::WriteDloadCard(utl_Stream& stream, int loadCase) const {
     WriteCard(stream, "*Dload", loadCase);
 }
 
-void oif_Dload::WriteLineLoad(utl_Stream& stream) const {
-    const auto labels = local_ ? std::span<const char* const>(kLocalLineLabels)
-                               : std::span<const char* const>(kGlobalLineLabels);
-    WriteComponents(stream, labels, suffix_, [&](int part) { WriteDloadCard(stream, part); });
-}
-
-void oif_Dload::WriteBodyForce(utl_Stream& stream) const {
-    auto labels = space_ == kAxisymmetric ? std::span<const char* const>(kAxisymmetricBodyLabels)
-                                          : std::span<const char* const>(kBodyLabels);
-    if (space_ != kThreeDimensional) labels = labels.first(2);
-    WriteComponents(stream, labels, suffix_, [&](int part) { WriteDloadCard(stream, part); });
+void oif_Dload::WriteVector(utl_Stream& stream) const {
+    WriteComponents(stream, labels_, suffix_, [&](int part) { WriteDloadCard(stream, part); });
 }
 
 void oif_Dload::WriteGravity(utl_Stream& stream) const {
@@ -298,99 +298,108 @@ void oif_Dload::WriteRotBodyForceData(utl_Stream& stream, double magnitude) cons
     stream.LineBreak();
 }
 
-void oif_Dload::Write(utl_Stream& stream) const {
-    if (deactivated_) return WriteDloadCard(stream, 0);
-    switch (typeId_) {
-    case kloC_RotationalBodyForce::Class.Id():
-        return WriteMagnitude(Passes(values_.front().state), [&](int part, double value) {
-            WriteDloadCard(stream, part);
-            WriteRotBodyForceData(stream, value);
-        });
-    case kloC_LineLoad::Class.Id(): return WriteLineLoad(stream);
-    case kloC_PipePressure::Class.Id():
-        return WriteMagnitude(Passes(values_.front().state) || (hydrostatic_ && heightsPass_),
-                              [&](int part, double value) {
-                                  WriteDloadCard(stream, part);
-                                  BeginLine(stream, label_);
-                                  stream << value;
-                                  WritePipePressureData(stream);
-                              });
-    case kloC_BodyForce::Class.Id(): return WriteBodyForce(stream);
-    case kloC_Gravity::Class.Id(): return WriteGravity(stream);
-    default: nex_Raise("\"Invalid load type for *Dload\" == 0");
-    }
+void oif_Dload::WritePipePressure(utl_Stream& stream) const {
+    WriteMagnitude(Passes(values_.front().state) || (hydrostatic_ && heightsPass_),
+                   [&](int part, double value) {
+                       WriteDloadCard(stream, part);
+                       BeginLine(stream, label_);
+                       stream << value;
+                       WritePipePressureData(stream);
+                   });
 }
 
-oif_Dsload::oif_Dsload(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                       const cow_String& setName, const qkw_ModelInfo& modelInfo, bool cyclicApplies,
-                       int cyclicMode, double scale, const cow_String& refNode, const cow_String& name)
-    : qkw_KeywordOf(load, stepName, opMod, setName, scale, ClearedAmplitude::IGNORED), refNode_(refNode),
-      cyclicApplies_(cyclicApplies), cyclicMode_(cyclicMode) {
-    // The text of an assertion is the message.
-    if (setName.IsEmpty()) nex_Raise("! setName.Empty()");
-    switch (typeId_) {
-    case kloC_Pressure::Class.Id(): {
-        const auto& pressure = static_cast<const kloC_Pressure&>(load);
-        const kloC_HydrostaticHeights& heights = pressure.StateIn(stepName);
-        const Distribution distribution = pressure.distributionType;
-        hydrostatic_ = distribution == Distribution::HYDROSTATIC;
-        if (hydrostatic_) {
-            label_ = "HP";
-        } else if (distribution == Distribution::UNIFORM || distribution == Distribution::USER_DEFINED) {
-            label_ = cow_String("P") + UserSuffix(distribution);
-        }
-        heights_[0] = heights.zeroPressureHeight.ConstGet();
-        heights_[1] = heights.referencePressureHeight.ConstGet();
-        heightsPass_ =
-            Passes(heights.zeroPressureHeight.State()) || Passes(heights.referencePressureHeight.State());
-        break;
+void oif_Dload::WriteRotation(utl_Stream& stream) const {
+    WriteMagnitude(Passes(values_.front().state), [&](int part, double value) {
+        WriteDloadCard(stream, part);
+        WriteRotBodyForceData(stream, value);
+    });
+}
+
+void oif_Dload::Write(utl_Stream& stream) const {
+    if (deactivated_) return WriteDloadCard(stream, 0);
+    if (form_ == nullptr) nex_Raise("\"Invalid load type for *Dload\" == 0");
+    (this->*form_)(stream);
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const oif_LoadSetting& setting, Form form)
+    : qkw_KeywordOf(card, ClearedAmplitude::IGNORED), form_(form), cyclicMode_(setting.cyclicMode) {
+    if (card.setName.IsEmpty()) nex_Raise(EmptySetName);
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_Pressure& pressure,
+                       const oif_LoadSetting& setting)
+    : oif_Dsload(card, setting, &oif_Dsload::WritePressure) {
+    const kloC_HydrostaticHeights& heights = pressure.StateIn(card.step);
+    const Distribution distribution = pressure.distributionType;
+    refNode_ = oif_RegionName(pressure.distributionRegion, setting.modelInfo);
+    hydrostatic_ = distribution == Distribution::HYDROSTATIC;
+    if (hydrostatic_) {
+        label_ = "HP";
+    } else if (distribution == Distribution::UNIFORM || distribution == Distribution::USER_DEFINED) {
+        label_ = cow_String("P") + UserSuffix(distribution);
     }
-    case kloC_SurfaceTraction::Class.Id():
-    case kloC_ShellEdgeLoad::Class.Id(): {
-        const auto& traction = static_cast<const kloC_Traction&>(load);
-        if (typeId_ == kloC_SurfaceTraction::TypeId()) {
-            label_ = traction.kind == kloC_Traction::KindEnm::SHEAR ? "TRSHR" : "TRVEC";
-        } else if (const auto kind = static_cast<std::size_t>(traction.kind); kind < std::size(kEdgeLabels)) {
-            label_ = kEdgeLabels[kind];
-        }
-        label_.Append(UserSuffix(traction.distributionType));
-        vectorGiven_ = traction.vectorGiven;
-        followerNo_ = vectorGiven_ && !traction.follower;
-        constantResultant_ = vectorGiven_ && traction.resultant;
-        direction_ = Unit(traction.direction.Direction());
-        // The system stands on the line also when no direction is given in it.
-        orientation_ = traction.orientation;
-        if (orientation_.IsEmpty() && !traction.datum.IsNullRef()) {
-            orientation_ = modelInfo.GetOrientationName(traction.datum, traction.angle, name);
-        }
-        break;
-    }
-    case kloC_SubmodelStressBased::Class.Id(): {
-        const auto& state = static_cast<const kloC_SubmodelStressBased&>(load).StateIn(stepName);
-        isSubmodel_ = true;
-        submodelStep_ = state.stepName;
-        scaleParameter_ = state.scaleParameter.ConstGet();
-        break;
-    }
-    default: break;
+    heights_[0] = heights.zeroPressureHeight.ConstGet();
+    heights_[1] = heights.referencePressureHeight.ConstGet();
+    heightsPass_ =
+        Passes(heights.zeroPressureHeight.State()) || Passes(heights.referencePressureHeight.State());
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_SurfaceTraction& traction,
+                       const oif_LoadSetting& setting)
+    : oif_Dsload(card, setting, &oif_Dsload::WriteTraction) {
+    label_ = traction.kind == kloC_Traction::KindEnm::SHEAR ? "TRSHR" : "TRVEC";
+    TakeTraction(traction, card.name, setting);
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_ShellEdgeLoad& load,
+                       const oif_LoadSetting& setting)
+    : oif_Dsload(card, setting, &oif_Dsload::WriteTraction) {
+    const auto kind = static_cast<std::size_t>(load.kind);
+    if (kind < std::size(kEdgeLabels)) label_ = kEdgeLabels[kind];
+    TakeTraction(load, card.name, setting);
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_SubmodelStressBased& load,
+                       const oif_LoadSetting& setting)
+    : oif_Dsload(card, setting, nullptr) {
+    const auto& state = load.StateIn(card.step);
+    isSubmodel_ = true;
+    submodelStep_ = state.stepName;
+    scaleParameter_ = state.scaleParameter.ConstGet();
+}
+
+oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_Load&, const oif_LoadSetting& setting)
+    : oif_Dsload(card, setting, nullptr) {}
+
+void oif_Dsload::TakeTraction(const kloC_Traction& traction, const cow_String& name,
+                              const oif_LoadSetting& setting) {
+    label_.Append(UserSuffix(traction.distributionType));
+    vectorGiven_ = traction.vectorGiven;
+    followerNo_ = vectorGiven_ && !traction.follower;
+    constantResultant_ = vectorGiven_ && traction.resultant;
+    direction_ = Unit(traction.direction.Direction());
+    // The system stands on the line also when no direction is given in it.
+    orientation_ = traction.orientation;
+    if (orientation_.IsEmpty() && !traction.datum.IsNullRef()) {
+        orientation_ = setting.modelInfo.GetOrientationName(traction.datum, traction.angle, name);
     }
 }
 
 void oif_Dsload::WriteDsloadCard(utl_Stream& stream, int loadCase, bool followerNo, bool constantResultant,
                                  const cow_String& orientation) const {
-    stream << "*Dsload";
-    if (isSubmodel_) stream << ", submodel";
-    if (!submodelStep_.IsEmpty()) stream << ", step=" << submodelStep_;
-    if (scaleParameter_ != 1.0) stream << ", scale=" << scaleParameter_;
-    WriteOpNew(stream);
-    WriteAmplitude(stream);
-    if (cyclicApplies_) stream << ", cyclic mode=" << cyclicMode_;
-    WriteLoadCase(stream, loadCase);
-    if (followerNo) stream << ", follower=NO";
-    if (!orientation.IsEmpty()) stream << ", orientation=" << orientation;
-    if (constantResultant) stream << ", constant resultant=YES";
-    if (!refNode_.IsEmpty()) stream << ", ref node=" << refNode_;
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Dsload")
+        .FixedIf(isSubmodel_, ", submodel")
+        .FixedIf(!submodelStep_.IsEmpty(), ", step=", submodelStep_)
+        .FixedUnless(", scale=", scaleParameter_, 1.0)
+        .Op(op_)
+        .Amplitude(amplitude_)
+        .FixedIf(cyclicMode_.has_value(), ", cyclic mode=", cyclicMode_.value_or(0))
+        .FixedIf(loadCase != 0, ", load case=", loadCase)
+        .FixedIf(followerNo, ", follower=NO")
+        .FixedIf(!orientation.IsEmpty(), ", orientation=", orientation)
+        .FixedIf(constantResultant, ", constant resultant=YES")
+        .FixedIf(!refNode_.IsEmpty(), ", ref node=", refNode_)
+        .End();
 }
 
 void oif_Dsload::WriteHydrostaticData(utl_Stream& stream) const {
@@ -426,10 +435,6 @@ void oif_Dsload::WriteTraction(utl_Stream& stream) const {
 
 void oif_Dsload::Write(utl_Stream& stream) const {
     if (deactivated_) return WriteDsloadCard(stream, 0, false, false, {});
-    switch (typeId_) {
-    case kloC_Pressure::Class.Id(): return WritePressure(stream);
-    case kloC_SurfaceTraction::Class.Id():
-    case kloC_ShellEdgeLoad::Class.Id(): return WriteTraction(stream);
-    default: nex_Raise("\"Invalid load type for *Dsload\" == 0");
-    }
+    if (form_ == nullptr) nex_Raise("\"Invalid load type for *Dsload\" == 0");
+    (this->*form_)(stream);
 }

@@ -1,12 +1,16 @@
 #ifndef QRX_OIF_MECHANICALLOADS_H
 #define QRX_OIF_MECHANICALLOADS_H
 
+#include "base/oif_KeywordLine.h"
+#include "conditions/oif_Card.h"
+#include "conditions/oif_LoadTable.h"
 #include "keyword_layer/qkw_Keyword.h"
-#include "keyword_layer/qkw_ModelInfo.h"
-#include "store_interface/records/conditions/kloC_Load.h"
+#include "store_interface/records/conditions/kloC_BoltLoad.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
 
-#include <span>
 #include <vector>
+
+using oif_Labels = std::span<const char* const>;
 
 /// What the mechanical load keywords share. In the add-and-change mode a real load writes what was set in
 /// the step, under op=NEW also what is carried over; a changed amplitude writes everything. A complex load
@@ -17,13 +21,9 @@ protected:
     /// Whether an amplitude that was taken away counts as a change.
     enum class ClearedAmplitude { IGNORED, COUNTS };
 
-    oif_MechanicalLoad(const kloC_Load& load, const cow_String& stepName, bool opMod,
-                       const cow_String& setName, double scale, ClearedAmplitude clearedAmplitude);
+    oif_MechanicalLoad(const oif_LoadCard& card, ClearedAmplitude clearedAmplitude);
 
     bool Passes(mdl_PropAttributeStateEnm state) const;
-    void WriteOpNew(utl_Stream& stream) const;
-    void WriteAmplitude(utl_Stream& stream) const;
-    static void WriteLoadCase(utl_Stream& stream, int loadCase);
     /// The whole line of a keyword without parameters of its own.
     void WriteCard(utl_Stream& stream, const char* keyword, int loadCase, bool follower = false) const;
     void BeginLine(utl_Stream& stream, const cow_String& label, const char* separator = ", ") const;
@@ -32,16 +32,14 @@ protected:
     /// One block, or one for each part, of a line for each label. `card(part)` writes the keyword line; part
     /// 0 is the real load, 1 and 2 are the real and the imaginary parts of a complex one.
     template <class Card>
-    void WriteComponents(utl_Stream& stream, std::span<const char* const> labels, const char* suffix,
-                         const Card& card) const;
+    void WriteComponents(utl_Stream& stream, oif_Labels labels, const char* suffix, const Card& card) const;
     /// The same of one value. `block(part, value)` writes keyword and data.
     template <class Block>
     void WriteMagnitude(bool passes, const Block& block) const;
 
-    unsigned typeId_;
     cow_String setName_;
     cow_String amplitude_;
-    bool opNew_;
+    oif_Op op_;
     double scale_;
     bool deactivated_ = false;
     bool modifiedOnly_;
@@ -56,19 +54,29 @@ protected:
 /// has the keyword line alone. Writing another load, or a complex flow of pore fluid, raises.
 class oif_Cload final : public qkw_KeywordOf<oif_Cload, oif_MechanicalLoad> {
 public:
-    oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod, const qkw_ModelInfo& modelInfo,
-              const cow_String& name, double scale);
-    /// With the name of the load's region, for many keywords of one load to share.
-    oif_Cload(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& regionName,
-              double scale);
+    static constexpr const char* ComplexPoreFluid = "\"Concentrated pore fluid load cannot be complex\" == 0";
+
+    oif_Cload(const oif_LoadCard& card, const kloC_ConcentratedForce& force);
+    oif_Cload(const oif_LoadCard& card, const kloC_Moment& moment);
+    oif_Cload(const oif_LoadCard& card, const kloC_PEGLoad& load);
+    oif_Cload(const oif_LoadCard& card, const kloC_BoltLoad& bolt);
+    oif_Cload(const oif_LoadCard& card, const kloC_ConcentratedPoreFluid& flow);
+    oif_Cload(const oif_LoadCard& card, const kloC_InwardVolAccel& acceleration);
+    oif_Cload(const oif_LoadCard& card, const kloC_Load& other);
     void Write(utl_Stream& stream) const override;
 
-private:
-    void WriteCloadCard(utl_Stream& stream, int loadCase, bool follower) const;
-    void WriteSingle(utl_Stream& stream, const cow_String& label) const;
+    /// Whether writing the load raises ComplexPoreFluid unless it ends.
+    static bool IsComplexPoreFluid(const kloC_Load& load);
 
-    bool follower_ = false;
+private:
+    oif_Cload(const oif_LoadCard& card, oif_Labels labels, bool follower = false);
+    void WriteCloadCard(utl_Stream& stream, int loadCase, bool follower) const;
+    void WriteSingle(utl_Stream& stream, const char* label) const;
+
+    oif_Labels labels_; // of the components, or of the one magnitude
+    bool follower_;
     bool bolted_ = false; // held by its length
+    const char* failure_ = nullptr;
 };
 
 /// Forces and moments in the relative motions of connectors:
@@ -77,9 +85,15 @@ private:
 /// Writing another load raises.
 class oif_ConnectorLoad final : public qkw_KeywordOf<oif_ConnectorLoad, oif_MechanicalLoad> {
 public:
-    oif_ConnectorLoad(const kloC_Load& load, const cow_String& setName, const cow_String& stepName,
-                      bool opMod, double scale);
+    oif_ConnectorLoad(const oif_LoadCard& card, const kloC_ConnectorForce& force);
+    oif_ConnectorLoad(const oif_LoadCard& card, const kloC_ConnectorMoment& moment);
+    oif_ConnectorLoad(const oif_LoadCard& card, const kloC_Load& other);
     void Write(utl_Stream& stream) const override;
+
+private:
+    oif_ConnectorLoad(const oif_LoadCard& card, oif_Labels labels);
+
+    oif_Labels labels_;
 };
 
 /// Loads on lines and volumes:
@@ -88,25 +102,32 @@ public:
 /// Writing another load raises.
 class oif_Dload final : public qkw_KeywordOf<oif_Dload, oif_MechanicalLoad> {
 public:
-    /// `space` is 1 in three dimensions, 4 for an axisymmetric model. The cyclic mode and the last text
-    /// reach no line.
-    oif_Dload(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName,
-              int space, const qkw_ModelInfo& modelInfo, bool cyclicApplies, int cyclicMode, double scale,
-              const cow_String& extraName);
+    oif_Dload(const oif_LoadCard& card, const kloC_RotationalBodyForce& rotation,
+              const oif_LoadSetting& setting);
+    oif_Dload(const oif_LoadCard& card, const kloC_LineLoad& load, const oif_LoadSetting& setting);
+    oif_Dload(const oif_LoadCard& card, const kloC_PipePressure& pipe, const oif_LoadSetting& setting);
+    oif_Dload(const oif_LoadCard& card, const kloC_BodyForce& force, const oif_LoadSetting& setting);
+    oif_Dload(const oif_LoadCard& card, const kloC_Gravity& gravity, const oif_LoadSetting& setting);
+    oif_Dload(const oif_LoadCard& card, const kloC_Load& other, const oif_LoadSetting& setting);
     void Write(utl_Stream& stream) const override;
 
 private:
+    using Form = void (oif_Dload::*)(utl_Stream& stream) const;
+
+    oif_Dload(const oif_LoadCard& card, const oif_LoadSetting& setting, Form form);
     void WriteDloadCard(utl_Stream& stream, int loadCase) const;
-    void WriteLineLoad(utl_Stream& stream) const;
-    void WriteBodyForce(utl_Stream& stream) const;
+    void WriteVector(utl_Stream& stream) const;
     void WriteGravity(utl_Stream& stream) const;
+    void WritePipePressure(utl_Stream& stream) const;
+    void WriteRotation(utl_Stream& stream) const;
     void WritePipePressureData(utl_Stream& stream) const;
     void WriteRotBodyForceData(utl_Stream& stream, double magnitude) const;
 
+    Form form_; // null for another load
     int space_;
-    cow_String label_;
+    oif_Labels labels_;       // of the components
+    cow_String label_;        // of the one magnitude
     const char* suffix_ = ""; // of user-defined loads
-    bool local_ = false;      // a line load along the axes of the section
     bool hydrostatic_ = false;
     double heights_[2] = {0.0, 0.0};
     bool heightsPass_ = false;
@@ -120,12 +141,23 @@ private:
 /// An empty set name raises. Writing another load raises; one that ends is written.
 class oif_Dsload final : public qkw_KeywordOf<oif_Dsload, oif_MechanicalLoad> {
 public:
-    oif_Dsload(const kloC_Load& load, const cow_String& stepName, bool opMod, const cow_String& setName,
-               const qkw_ModelInfo& modelInfo, bool cyclicApplies, int cyclicMode, double scale,
-               const cow_String& refNode, const cow_String& name);
+    /// The text of an assertion is the message.
+    static constexpr const char* EmptySetName = "! setName.Empty()";
+
+    oif_Dsload(const oif_LoadCard& card, const kloC_Pressure& pressure, const oif_LoadSetting& setting);
+    oif_Dsload(const oif_LoadCard& card, const kloC_SurfaceTraction& traction,
+               const oif_LoadSetting& setting);
+    oif_Dsload(const oif_LoadCard& card, const kloC_ShellEdgeLoad& load, const oif_LoadSetting& setting);
+    oif_Dsload(const oif_LoadCard& card, const kloC_SubmodelStressBased& load,
+               const oif_LoadSetting& setting);
+    oif_Dsload(const oif_LoadCard& card, const kloC_Load& other, const oif_LoadSetting& setting);
     void Write(utl_Stream& stream) const override;
 
 private:
+    using Form = void (oif_Dsload::*)(utl_Stream& stream) const;
+
+    oif_Dsload(const oif_LoadCard& card, const oif_LoadSetting& setting, Form form);
+    void TakeTraction(const kloC_Traction& traction, const cow_String& name, const oif_LoadSetting& setting);
     void WriteDsloadCard(utl_Stream& stream, int loadCase, bool followerNo, bool constantResultant,
                          const cow_String& orientation) const;
     void WritePressure(utl_Stream& stream) const;
@@ -133,6 +165,7 @@ private:
     void WriteHydrostaticData(utl_Stream& stream) const;
     void WriteDirectionVectorData(utl_Stream& stream) const;
 
+    Form form_; // null for another load
     cow_String label_;
     bool hydrostatic_ = false;
     double heights_[2] = {0.0, 0.0};
@@ -146,8 +179,7 @@ private:
     double scaleParameter_ = 1.0;
     cow_String refNode_;
     cow_String submodelStep_;
-    bool cyclicApplies_;
-    int cyclicMode_;
+    std::optional<int> cyclicMode_;
 };
 
 #endif

@@ -1,10 +1,10 @@
 #ifndef QRX_OIF_OPSTATUS_H
 #define QRX_OIF_OPSTATUS_H
 
+#include "base/oif_Op.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 
-#include <span>
 #include <vector>
 
 /// Where in a step an object stands, if it is written: in a load case with a factor, or, under the empty
@@ -12,40 +12,10 @@
 struct oif_ConditionPlace {
     cow_String loadCase;
     float scale = 1.0F;
+
+    bool IsLoadCase() const { return !loadCase.IsEmpty(); }
 };
 using oif_ConditionPlaces = std::vector<oif_ConditionPlace>;
-
-/// The objects for which a test holds, step by step in the order of their names. One walk over the objects
-/// asks for all steps, so that a step costs nothing for what it only carries on.
-template <class T>
-class oif_ObjectsOfSteps {
-public:
-    struct Entry {
-        const cow_String* name;
-        const T* object;
-    };
-
-    oif_ObjectsOfSteps() = default;
-    /// `kind` is what messages call the objects; `test(object, stepName)`.
-    template <class Test>
-    oif_ObjectsOfSteps(const char* kind, const kprC_PropagatingContainer<T>& objects,
-                       const kprC_StepContainer& steps, const Test& test)
-        : entries_(static_cast<std::size_t>(steps.Size())) {
-        for (kprC_PropagatingContainerIT<T> it(objects); !it.IsDone(); it.Next()) {
-            const Entry entry{&it.CurrentKey(), &it.CurrentValue()};
-            for (int i = 0; i < steps.Size(); ++i) {
-                const nex_Context stepContext("step", steps.NameAt(i));
-                const nex_Context context(kind, *entry.name);
-                if (test(*entry.object, steps.NameAt(i)))
-                    entries_[static_cast<std::size_t>(i)].push_back(entry);
-            }
-        }
-    }
-    const std::vector<Entry>& In(int step) const { return entries_.at(static_cast<std::size_t>(step)); }
-
-private:
-    std::vector<std::vector<Entry>> entries_;
-};
 
 /// Which keyword families are written with ", op=NEW" in which steps. A keyword without it adds to what the
 /// steps before said and changes it; one with it wipes out all earlier definitions of its family, so that
@@ -58,6 +28,11 @@ public:
     /// Whether the family of the class is written with ", op=NEW" in the step. A class without a family and
     /// an unknown step raise.
     bool OpNew(unsigned int typeId, const cow_String& stepName) const;
+    /// The same of an object's keyword.
+    template <class T>
+    oif_Op Op(const T& object, const cow_String& stepName) const {
+        return OpNew(object.DynTypeId(), stepName) ? oif_Op::NEW : oif_Op::MODIFY;
+    }
     /// Sets the flags of all families in the step; an index behind the last step is passed over.
     void ForceOpNew(int stepIndex);
 
@@ -65,13 +40,6 @@ protected:
     oif_OpStatus() = default;
     oif_OpStatus(const oif_OpStatus&) = default;
     oif_OpStatus& operator=(const oif_OpStatus&) = default;
-
-    struct KeyRow {
-        unsigned typeId;
-        int key;
-    };
-    /// The family of the class; raises the text if no row has it.
-    static int FindKey(std::span<const KeyRow> rows, unsigned typeId, const char* failure);
 
     void InitializeMembers(const cow_List<cow_String>& steps, int numberOfKeys);
     bool IsInitialStep(const cow_String& stepName) const {
@@ -82,9 +50,8 @@ protected:
     /// `kind` is what messages call them.
     template <class T, class Test>
     void SetFlagsWhere(const char* kind, const kprC_PropagatingContainer<T>& objects, const Test& test) {
-        for (kprC_PropagatingContainerIT<T> it(objects); !it.IsDone(); it.Next()) {
-            const T& object = it.CurrentValue();
-            const nex_Context context(kind, it.CurrentKey());
+        for (const auto& [name, object] : objects) {
+            const nex_Context context(kind, name);
             for (int i = 1; i < stepNames.Length(); ++i) {
                 if (test(object, stepNames[i])) SetFlag(Key(object.DynTypeId()), i);
             }
@@ -104,11 +71,18 @@ private:
 /// "*Boundary" and "*Connector Motion".
 class oif_BCOpStatus final : public oif_OpStatus {
 public:
+    static constexpr const char* NoFamily = "Unimplemented bc->statusKey conversion";
+
     oif_BCOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kbcC_BC>& bcs,
                    const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps);
+    /// In a load case each keyword begins anew.
+    template <class T>
+    oif_Op Op(const T& object, const cow_String& stepName, bool inLoadCase) const {
+        return inLoadCase ? oif_Op::NEW : oif_OpStatus::Op(object, stepName);
+    }
     /// Whether the condition is written in the step: in each load case that takes it, or without load cases
-    /// in the step itself.
+    /// in the step itself. A class without a family raises, whatever its status.
     bool Writes(const kbcC_BC& bc, const cow_String& stepName, bool inLoadCase) const;
     /// The load cases that take the condition, those of the base state taken without being named; in a step
     /// without load cases the step itself.
@@ -117,8 +91,10 @@ public:
     /// Status 9 or 10.
     static bool IsOfBaseState(mdl_PropagationStatusEnm status);
     /// Whether the bolt load stands among the boundary conditions of the step: while its length is given, and
-    /// when that ends. `opMod` is false in a load case and where the family's flag is set.
-    static bool WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool opMod);
+    /// when that ends.
+    bool WritesBolt(const kloC_BoltLoad& load, const cow_String& stepName, bool inLoadCase) const;
+    /// The load cases that name the bolt load; in a step without load cases the step itself.
+    static oif_ConditionPlaces PlacesOfBolt(const kprC_Step& step, const cow_String& name);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kbcC_BC>& bcs,
@@ -129,13 +105,20 @@ private:
 /// The families of load keywords.
 class oif_LoadOpStatus final : public oif_OpStatus {
 public:
+    static constexpr const char* NoFamily = "Unimplemented load->statusKey conversion";
+
     oif_LoadOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps,
                    const qkw_ModelInfo& modelInfo);
+    template <class T>
+    oif_Op Op(const T& object, const cow_String& stepName, bool) const {
+        return oif_OpStatus::Op(object, stepName);
+    }
     /// Whether the load is written in the step; none is in the initial one.
-    bool Writes(const kloC_Load& load, const cow_String& stepName) const;
+    bool Writes(const kloC_Load& load, const cow_String& stepName, bool inLoadCase = false) const;
     /// The load cases that take the load; the step itself if it has none, or none with loads of its own.
-    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name);
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name,
+                                      mdl_PropagationStatusEnm status = {});
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kloC_Load>& loads);
@@ -148,12 +131,19 @@ private:
 /// Predefined fields, each kind a family of its own.
 class oif_FieldOpStatus final : public oif_OpStatus {
 public:
+    static constexpr const char* NoFamily = "Unimplemented field->statusKey conversion";
+
     oif_FieldOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kpfC_Field>& fields, const cow_List<cow_String>& steps);
+    template <class T>
+    oif_Op Op(const T& object, const cow_String& stepName, bool) const {
+        return oif_OpStatus::Op(object, stepName);
+    }
     /// Whether the field is written in the step.
-    bool Writes(const kpfC_Field& field, const cow_String& stepName) const;
+    bool Writes(const kpfC_Field& field, const cow_String& stepName, bool inLoadCase = false) const;
     /// The load cases that take the field; in a step without load cases the step itself.
-    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name);
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name,
+                                      mdl_PropagationStatusEnm status = {});
 
 private:
     /// General fields are written again in each step that carries them.
@@ -162,9 +152,23 @@ private:
     int Key(unsigned int typeId) const override;
 };
 
+/// The families of interactions, one a class: those that op=NEW ends.
+enum class oif_InteractionFamily : int {
+    FILM_CONDITION,
+    RADIATION_TO_AMBIENT,
+    GENERAL_CONTACT,
+    CONCENTRATED_RADIATION
+};
+
+/// Null for a class without a family.
+const oif_InteractionFamily* oif_FindInteractionFamily(unsigned typeId);
+
 /// The interactions that op=NEW ends: films, radiation and general contact.
 class oif_InteractionOpStatus final : public oif_OpStatus {
 public:
+    /// The text of an assertion, quotes and all, is the message.
+    static constexpr const char* NoFamily = "\"Unimplemented interaction->statusKey conversion\" == 0";
+
     oif_InteractionOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kinC_Interaction>& interactions,
                    const cow_List<cow_String>& steps);

@@ -2,7 +2,6 @@
 
 #include "base/oif_DataLines.h"
 #include "foundation/omu_PrimEnum.h"
-#include "keyword_layer/qkw_QuorixName.h"
 
 using Distribution = kpfC_Field::DistribTypeEnm;
 using Interpolate = kpfC_InterpolateEnm;
@@ -22,29 +21,29 @@ cow_String oif_FieldText::FileStem(const cow_String& fileName) {
     return omu_EqualInAnyCapitals(text.substr(stem), ending) ? cow_String(text.substr(0, stem)) : fileName;
 }
 
-void oif_FieldText::WriteFile(utl_Stream& stream, const cow_String& fileName) {
-    stream << ", file=" << qkw_QuorixName(FileStem(fileName), true);
+void oif_FieldText::WriteFile(oif_KeywordLine& line, const cow_String& fileName) {
+    line.Fixed(", file=", qkw_QuorixName(FileStem(fileName), true));
 }
 
-void oif_FieldText::WriteNumber(utl_Stream& stream, const char* parameter, const mdl_PropAttr<int>& number) {
-    if (number.IsActive() && number.ConstGet() != 0) stream << parameter << number.ConstGet();
+void oif_FieldText::WriteNumber(oif_KeywordLine& line, const char* parameter,
+                                const mdl_PropAttr<int>& number) {
+    line.FixedIf(number.IsActive() && number.ConstGet() != 0, parameter, number.ConstGet());
 }
 
-void oif_FieldText::WriteFile(utl_Stream& stream, const cow_String& fileName, const kpfC_ResultsFile& file) {
-    WriteFile(stream, fileName);
-    WriteNumber(stream, ", bstep=", file.beginStep);
-    WriteNumber(stream, ", binc=", file.beginIncrement);
-    WriteNumber(stream, ", estep=", file.endStep);
-    WriteNumber(stream, ", einc=", file.endIncrement);
+void oif_FieldText::WriteFileRange(oif_KeywordLine& line, const kpfC_ResultsFile& file) {
+    WriteNumber(line, ", bstep=", file.beginStep);
+    WriteNumber(line, ", binc=", file.beginIncrement);
+    WriteNumber(line, ", estep=", file.endStep);
+    WriteNumber(line, ", einc=", file.endIncrement);
 }
 
-void oif_FieldText::WriteInterpolation(utl_Stream& stream, const kpfC_TemperatureState& state) {
+void oif_FieldText::WriteInterpolation(oif_KeywordLine& line, const kpfC_TemperatureState& state) {
     if (!state.interpolate.IsActive()) return;
-    if (state.interpolate == Interpolate::MIDSIDE) stream << ", midside";
+    line.FixedIf(state.interpolate == Interpolate::MIDSIDE, ", midside");
     if (!(state.interpolate == Interpolate::INTERPOLATE)) return;
-    stream << ", interpolate";
+    line.Fixed(", interpolate");
     const auto tolerance = [&](const char* parameter, const mdl_PropAttr<double>& value, double byDefault) {
-        if (value.IsActive() && value.ConstGet() != byDefault) stream << parameter << value.ConstGet();
+        line.FixedIf(value.IsActive() && value.ConstGet() != byDefault, parameter, value.ConstGet());
     };
     tolerance(", absolute exterior tolerance=", state.absoluteExteriorTolerance,
               kpfC_TemperatureState::absoluteExteriorToleranceDef());
@@ -61,7 +60,7 @@ void oif_FieldText::PadLines(utl_Stream& stream, int written, int maxSize) {
 void oif_FieldText::WriteValues(utl_Stream& stream, const cow_String& setName,
                                 const cow_List<mdl_PropAttr<double>>& values, double scale, int maxSize) {
     stream << setName;
-    for (int i = 0; i < values.Length(); ++i) stream << ", " << values[i].ConstGet() * scale;
+    for (const auto& value : values) stream << ", " << value.ConstGet() * scale;
     stream.LineBreak();
     PadLines(stream, 1, maxSize);
 }
@@ -76,117 +75,73 @@ void oif_FieldText::WriteGeneralFieldBaseData(utl_Stream& stream, const cow_Stri
     stream << ", ";
     // The set does not count as one of the eight.
     oif_DataLines lines(stream, kValuesPerLine);
-    for (int i = 0; i < values.Length(); ++i) lines.Add(values[i].ConstGet());
+    for (const auto& value : values) lines.Add(value.ConstGet());
     lines.End();
     PadLines(stream, GetNumberOfDataLines(values.Length(), kValuesPerLine), maxSize);
 }
 
-oif_StepField::oif_StepField(const kpfC_Field& field, const cow_String& stepName, bool opMod,
-                             const cow_String& setName)
-    : distributionType_(field.distributionType), setName_(setName), opMod_(opMod),
-      state_(field.ConstGetStateQuad(stepName).state) {
-    CheckDeactivate(field.Status(stepName));
+oif_StepField::oif_StepField(const oif_FieldCard& card)
+    : setName_(card.setName), state_(card.Quad().state), distributionType_(card.Object().distributionType),
+      op_(card.op),
+      deactivated_(card.Quad().status == Status::DEACTIVATED || card.Quad().status == Status::FIELD_RESET) {
+    if (deactivated_) op_ = oif_Op::NEW;
 }
 
-void oif_StepField::CheckDeactivate(Status status) {
-    deactivated_ = status == Status::DEACTIVATED || status == Status::FIELD_RESET;
-    if (deactivated_) opMod_ = false;
-}
-
-void oif_StepField::WriteOpNew(utl_Stream& stream) const {
-    if (!opMod_) stream << ", op=NEW";
-}
-
-void oif_StepField::WriteAmplitude(utl_Stream& stream, const cow_String& amplitude) {
-    if (!amplitude.IsEmpty()) stream << ", amplitude=" << qkw_QuorixName(amplitude, false);
-    stream.LineBreak();
-}
-
-void oif_StepField::WriteUserData(utl_Stream& stream) const {
-    stream << ", user" << endl << setName_ << endl;
-}
-
-void oif_StepField::WriteUserOfFile(utl_Stream& stream) const {
-    if (distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED) stream << ", user";
-}
-
-void oif_FieldTemperature::Write(utl_Stream& stream) const {
-    const auto& state = StateAs<kpfC_TemperatureState>();
-    stream << "*Temperature";
-    WriteOpNew(stream);
-    if (deactivated_) return stream.LineBreak();
+void oif_StepField::Write(utl_Stream& stream) const {
+    oif_KeywordLine line(stream, Keyword());
+    line.Op(op_);
+    WriteVariable(line);
+    if (deactivated_) return line.End();
     switch (distributionType_) {
-    case Distribution::USER_DEFINED: return WriteUserData(stream);
-    case Distribution::FROM_FILE:
-    case Distribution::FROM_FILE_AND_USER_DEFINED:
-        WriteUserOfFile(stream);
-        oif_FieldText::WriteFile(stream, state.magnitude.ConstGet(), state);
-        oif_FieldText::WriteInterpolation(stream, state);
-        return stream.LineBreak();
-    case Distribution::UNIFORM:
-        WriteAmplitude(stream, state.amplitude.ConstGet());
-        return oif_FieldText::WriteValues(stream, setName_, state.values, scale_, maxSize_);
-    default: return stream.LineBreak();
-    }
-}
-
-void oif_GeneralField::Write(utl_Stream& stream) const {
-    const auto& state = StateAs<kpfC_GeneralFieldState>();
-    stream << "*Field";
-    WriteOpNew(stream);
-    // Also where it ends: there are several variables.
-    stream << ", variable=" << state.variable << ", number=" << state.NumberOfValues();
-    if (deactivated_) return stream.LineBreak();
-    switch (distributionType_) {
-    case Distribution::USER_DEFINED: return WriteUserData(stream);
-    case Distribution::FROM_FILE:
-    case Distribution::FROM_FILE_AND_USER_DEFINED:
-        WriteUserOfFile(stream);
-        oif_FieldText::WriteFile(stream, state.fileName.ConstGet(), state);
-        // ", interpolate" is for temperatures and initial conditions only.
-        if (state.interpolate.IsActive() && state.interpolate == Interpolate::MIDSIDE) stream << ", midside";
-        return stream.LineBreak();
-    case Distribution::UNIFORM:
-        WriteAmplitude(stream, state.amplitude.ConstGet());
-        // Without values there is nothing to fill up either.
-        return oif_FieldText::WriteGeneralFieldBaseData(
-            stream, setName_, state.values.IsEmpty() ? 0 : state.NumberOfValues(), state.values);
-    default: return stream.LineBreak();
-    }
-}
-
-void oif_PressureStress::Write(utl_Stream& stream) const {
-    const auto& state = StateAs<kpfC_PressureStressState>();
-    stream << "*Pressure stress";
-    WriteOpNew(stream);
-    if (deactivated_) return stream.LineBreak();
-    switch (distributionType_) {
-    case Distribution::USER_DEFINED: return WriteUserData(stream);
-    case Distribution::FROM_FILE:
-    case Distribution::FROM_FILE_AND_USER_DEFINED:
-        WriteUserOfFile(stream);
-        oif_FieldText::WriteFile(stream, state.fileName.ConstGet());
-        return stream.LineBreak();
-    case Distribution::UNIFORM:
-        WriteAmplitude(stream, state.amplitude.ConstGet());
-        stream << setName_ << ", " << state.magnitude.ConstGet() << endl;
+    case Distribution::USER_DEFINED:
+        line.Fixed(", user").End();
+        stream << setName_ << endl;
         return;
-    default: return stream.LineBreak();
+    case Distribution::FROM_FILE:
+    case Distribution::FROM_FILE_AND_USER_DEFINED:
+        if (const cow_String* fileName = FileName()) {
+            line.FixedIf(distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED, ", user");
+            oif_FieldText::WriteFile(line, *fileName);
+            WriteFileParameters(line);
+        }
+        return line.End();
+    case Distribution::UNIFORM: line.Amplitude(Amplitude()).End(); return WriteData(stream);
+    default: return line.End();
     }
 }
 
-void oif_MassFlowRate::Write(utl_Stream& stream) const {
-    const auto& state = StateAs<kpfC_MassFlowRateState>();
-    stream << "*Mass flow rate";
-    WriteOpNew(stream);
-    if (deactivated_) return stream.LineBreak();
-    switch (distributionType_) {
-    case Distribution::USER_DEFINED: return WriteUserData(stream);
-    case Distribution::UNIFORM:
-        WriteAmplitude(stream, state.amplitude.ConstGet());
-        stream << setName_ << ", " << state.component1.ConstGet() << ", " << state.component2.ConstGet()
-               << ", " << state.component3.ConstGet() << endl;
-        return;
-    default: return stream.LineBreak();
-    }
+void oif_FieldTemperature::WriteFileParameters(oif_KeywordLine& line) const {
+    oif_FieldText::WriteFileRange(line, State());
+    oif_FieldText::WriteInterpolation(line, State());
+}
+
+void oif_FieldTemperature::WriteData(utl_Stream& stream) const {
+    oif_FieldText::WriteValues(stream, setName_, State().values, scale_, maxSize_);
+}
+
+// Also where it ends: there are several variables.
+void oif_GeneralField::WriteVariable(oif_KeywordLine& line) const {
+    line.Fixed(", variable=", State().variable).Fixed(", number=", State().NumberOfValues());
+}
+
+void oif_GeneralField::WriteFileParameters(oif_KeywordLine& line) const {
+    const auto& interpolate = State().interpolate;
+    oif_FieldText::WriteFileRange(line, State());
+    // ", interpolate" is for temperatures and initial conditions only.
+    line.FixedIf(interpolate.IsActive() && interpolate == Interpolate::MIDSIDE, ", midside");
+}
+
+void oif_GeneralField::WriteData(utl_Stream& stream) const {
+    // Without values there is nothing to fill up either.
+    const int size = State().values.IsEmpty() ? 0 : State().NumberOfValues();
+    oif_FieldText::WriteGeneralFieldBaseData(stream, setName_, size, State().values);
+}
+
+void oif_PressureStress::WriteData(utl_Stream& stream) const {
+    stream << setName_ << ", " << State().magnitude.ConstGet() << endl;
+}
+
+void oif_MassFlowRate::WriteData(utl_Stream& stream) const {
+    stream << setName_ << ", " << State().component1.ConstGet() << ", " << State().component2.ConstGet()
+           << ", " << State().component3.ConstGet() << endl;
 }

@@ -1,7 +1,9 @@
 #ifndef QRX_OIF_PREDEFINEDFIELDS_H
 #define QRX_OIF_PREDEFINEDFIELDS_H
 
-#include "keyword_layer/qkw_Keyword.h"
+#include "base/oif_KeywordLine.h"
+#include "conditions/oif_Card.h"
+#include "conditions/oif_FieldTable.h"
 #include "store_interface/records/conditions/kpfC_Fields.h"
 
 /// Text that the field keywords and the initial conditions share.
@@ -9,13 +11,13 @@ class oif_FieldText {
 public:
     /// A results file without its ending ".fil", in any capitals; a name that is nothing else keeps it.
     static cow_String FileStem(const cow_String& fileName);
-    static void WriteFile(utl_Stream& stream, const cow_String& fileName);
-    /// With the steps and increments to read.
-    static void WriteFile(utl_Stream& stream, const cow_String& fileName, const kpfC_ResultsFile& file);
+    static void WriteFile(oif_KeywordLine& line, const cow_String& fileName);
     /// The parameter with its number, unless it is 0 or wasn't said.
-    static void WriteNumber(utl_Stream& stream, const char* parameter, const mdl_PropAttr<int>& number);
+    static void WriteNumber(oif_KeywordLine& line, const char* parameter, const mdl_PropAttr<int>& number);
+    /// The steps and increments to read.
+    static void WriteFileRange(oif_KeywordLine& line, const kpfC_ResultsFile& file);
     /// ", midside", or ", interpolate" with the tolerances.
-    static void WriteInterpolation(utl_Stream& stream, const kpfC_TemperatureState& state);
+    static void WriteInterpolation(oif_KeywordLine& line, const kpfC_TemperatureState& state);
 
     static int GetNumberOfDataLines(int count, int perLine) { return (count + perLine - 1) / perLine; }
     /// Empty lines until there are as many as `maxSize` values take, eight to a line.
@@ -28,31 +30,50 @@ public:
                                           const cow_List<mdl_PropAttr<double>>& values);
 };
 
-/// What the field keywords of steps share. A field that ends has its keyword line alone, with op=NEW.
+/// A field in a step:
+///     *Keyword, op=NEW, amplitude=Amp-1
+///     Set-1, DATA
+///     *Keyword, user
+///     Set-1
+///     *Keyword, user, file=job-1, PARAMETERS
+/// A field that ends has its keyword line alone, with op=NEW.
 class oif_StepField : public qkw_Keyword {
+public:
+    void Write(utl_Stream& stream) const override;
+
 protected:
-    oif_StepField(const kpfC_Field& field, const cow_String& stepName, bool opMod, const cow_String& setName);
+    explicit oif_StepField(const oif_FieldCard& card);
 
-    template <class State>
-    const State& StateAs() const {
-        return static_cast<const State&>(state_.ConstGet());
-    }
-    void WriteOpNew(utl_Stream& stream) const;
-    static void WriteAmplitude(utl_Stream& stream, const cow_String& amplitude);
-    /// The end of a user-defined field: ", user" and the set.
-    void WriteUserData(utl_Stream& stream) const;
-    /// ", user" of a field that takes both a file and a user's routine.
-    void WriteUserOfFile(utl_Stream& stream) const;
-
-    kpfC_Field::DistribTypeEnm distributionType_;
     cow_String setName_;
-    bool opMod_;
-    bool deactivated_ = false;
+    mdl_ObjCow<kpfC_FieldState> state_;
 
 private:
-    void CheckDeactivate(mdl_PropagationStatusEnm status);
+    virtual const char* Keyword() const = 0;
+    virtual const cow_String& Amplitude() const = 0;
+    /// Parameters that stand also where it ends.
+    virtual void WriteVariable(oif_KeywordLine&) const {}
+    /// The results file; null for a class that reads none.
+    virtual const cow_String* FileName() const { return nullptr; }
+    virtual void WriteFileParameters(oif_KeywordLine&) const {}
+    /// The data lines of a uniform field.
+    virtual void WriteData(utl_Stream& stream) const = 0;
 
-    mdl_ObjCow<kpfC_FieldState> state_;
+    kpfC_Field::DistribTypeEnm distributionType_;
+    oif_Op op_;
+    bool deactivated_;
+};
+
+/// Base of the keyword K of fields whose states are of class S.
+template <class K, class S>
+class oif_StepFieldOf : public qkw_KeywordOf<K, oif_StepField> {
+public:
+    explicit oif_StepFieldOf(const oif_FieldCard& card) : qkw_KeywordOf<K, oif_StepField>(card) {}
+
+protected:
+    const S& State() const { return static_cast<const S&>(this->state_.ConstGet()); }
+
+private:
+    const cow_String& Amplitude() const override { return State().amplitude.ConstGet(); }
 };
 
 /// Temperatures in a step, constant or by section points, from a results file, or user-defined:
@@ -60,14 +81,17 @@ private:
 ///     Set-1, 100., 110.
 ///     *Temperature, file=job-1, bstep=1, binc=2, interpolate, exterior tolerance=0.1
 /// The data takes as many lines as the model's largest temperature field.
-class oif_FieldTemperature final : public qkw_KeywordOf<oif_FieldTemperature, oif_StepField> {
+class oif_FieldTemperature final : public oif_StepFieldOf<oif_FieldTemperature, kpfC_TemperatureState> {
 public:
-    oif_FieldTemperature(const kpfC_Field& field, const cow_String& stepName, bool opMod,
-                         const cow_String& setName, int maxSize, double scale)
-        : qkw_KeywordOf(field, stepName, opMod, setName), scale_(scale), maxSize_(maxSize) {}
-    void Write(utl_Stream& stream) const override;
+    oif_FieldTemperature(const oif_FieldCard& card, const kpfC_Temperature&, const oif_FieldSetting& setting)
+        : oif_StepFieldOf(card), scale_(card.Factor()), maxSize_(setting.maxTemperatureSize) {}
 
 private:
+    const char* Keyword() const override { return "*Temperature"; }
+    const cow_String* FileName() const override { return &State().magnitude.ConstGet(); }
+    void WriteFileParameters(oif_KeywordLine& line) const override;
+    void WriteData(utl_Stream& stream) const override;
+
     double scale_;
     int maxSize_;
 };
@@ -76,36 +100,43 @@ private:
 ///     *Field, variable=1, number=2, amplitude=Amp-1
 ///     Set-1, 100., 110.
 /// or from a results file, or user-defined. Values are neither scaled nor padded.
-class oif_GeneralField final : public qkw_KeywordOf<oif_GeneralField, oif_StepField> {
+class oif_GeneralField final : public oif_StepFieldOf<oif_GeneralField, kpfC_GeneralFieldState> {
 public:
-    oif_GeneralField(const kpfC_Field& field, const cow_String& stepName, bool opMod,
-                     const cow_String& setName)
-        : qkw_KeywordOf(field, stepName, opMod, setName) {}
-    void Write(utl_Stream& stream) const override;
+    using oif_StepFieldOf::oif_StepFieldOf;
+
+private:
+    const char* Keyword() const override { return "*Field"; }
+    void WriteVariable(oif_KeywordLine& line) const override;
+    const cow_String* FileName() const override { return &State().fileName.ConstGet(); }
+    void WriteFileParameters(oif_KeywordLine& line) const override;
+    void WriteData(utl_Stream& stream) const override;
 };
 
 /// Equivalent pressure stress, also in the initial step:
 ///     *Pressure stress, op=NEW, amplitude=Amp-1
 ///     Set-1, 100.
 /// or from a results file, or user-defined.
-class oif_PressureStress final : public qkw_KeywordOf<oif_PressureStress, oif_StepField> {
+class oif_PressureStress final : public oif_StepFieldOf<oif_PressureStress, kpfC_PressureStressState> {
 public:
-    oif_PressureStress(const kpfC_Field& field, const cow_String& stepName, bool opMod,
-                       const cow_String& setName)
-        : qkw_KeywordOf(field, stepName, opMod, setName) {}
-    void Write(utl_Stream& stream) const override;
+    using oif_StepFieldOf::oif_StepFieldOf;
+
+private:
+    const char* Keyword() const override { return "*Pressure stress"; }
+    const cow_String* FileName() const override { return &State().fileName.ConstGet(); }
+    void WriteData(utl_Stream& stream) const override;
 };
 
 /// Mass flow rate, also in the initial step:
 ///     *Mass flow rate, amplitude=Amp-1
 ///     Set-1, 1., 0., 0.
 /// or user-defined.
-class oif_MassFlowRate final : public qkw_KeywordOf<oif_MassFlowRate, oif_StepField> {
+class oif_MassFlowRate final : public oif_StepFieldOf<oif_MassFlowRate, kpfC_MassFlowRateState> {
 public:
-    oif_MassFlowRate(const kpfC_Field& field, const cow_String& stepName, bool opMod,
-                     const cow_String& setName)
-        : qkw_KeywordOf(field, stepName, opMod, setName) {}
-    void Write(utl_Stream& stream) const override;
+    using oif_StepFieldOf::oif_StepFieldOf;
+
+private:
+    const char* Keyword() const override { return "*Mass flow rate"; }
+    void WriteData(utl_Stream& stream) const override;
 };
 
 #endif

@@ -1,6 +1,6 @@
 #include "conditions/oif_Submodel.h"
 
-#include "keyword_layer/qkw_QuorixName.h"
+#include "base/oif_KeywordLine.h"
 
 oif_Submodel::oif_Submodel(bool shellToSolid, const kbcC_SubmodelBC& bc, const cow_String& setName)
     : shellToSolid_(shellToSolid), globalElset_(bc.globalElset), shellThickness_(bc.shellThickness),
@@ -14,17 +14,16 @@ bool oif_Submodel::IsEqual(const kbcC_SubmodelBC& bc) const {
 }
 
 void oif_Submodel::Write(utl_Stream& stream) const {
-    stream << "*Submodel";
-    if (shellToSolid_) stream << ", shell to solid";
-    if (shellThickness_ != 0.0) stream << ", shell thickness=" << shellThickness_;
-    if (absoluteExteriorTolerance_ != 0.0)
-        stream << ", absolute exterior tolerance=" << absoluteExteriorTolerance_;
-    // One word with a capital in it, unlike the parameter before.
-    if (exteriorTolerance_ != 0.0) stream << ", exteriorTolerance=" << exteriorTolerance_;
-    if (!globalElset_.IsEmpty()) stream << ", global elset=" << qkw_QuorixName(globalElset_, false);
-    stream.LineBreak();
-    for (int i = 0; i < regions_.Length(); ++i) {
-        stream << regions_[i] << ", ";
+    oif_KeywordLine(stream, "*Submodel")
+        .FixedIf(shellToSolid_, ", shell to solid")
+        .FixedUnless(", shell thickness=", shellThickness_, 0.0)
+        .FixedUnless(", absolute exterior tolerance=", absoluteExteriorTolerance_, 0.0)
+        // One word with a capital in it, unlike the parameter before.
+        .FixedUnless(", exteriorTolerance=", exteriorTolerance_, 0.0)
+        .FixedName(", global elset=", globalElset_)
+        .End();
+    for (const cow_String& region : regions_) {
+        stream << region << ", ";
         stream.LineBreak();
     }
 }
@@ -50,9 +49,11 @@ qkw_KeywordList oif_BoundarySubmodelList::Keywords(const cow_String& stepName) c
 
 cow_String oif_BoundarySubmodelList::Joined(const cow_List<cow_String>& names) {
     cow_String joined;
-    for (int i = 0; i < names.Length(); ++i) {
-        if (i > 0) joined += ", ";
-        joined += names[i];
+    const char* separator = "";
+    for (const cow_String& name : names) {
+        joined += separator;
+        joined += name;
+        separator = ", ";
     }
     return joined;
 }

@@ -18,6 +18,14 @@ const kloC_BoltLoadState& kloC_BoltLoad::BoltState(const cow_String& stepName) c
     return static_cast<const kloC_BoltLoadState&>(ConstGetStateQuad(stepName).state.ConstGet());
 }
 
+bool kloC_BoltLoad::IsByForce(const cow_String& stepName) const {
+    return BoltState(stepName).boltMethod.ConstGet() == MethodEnm::APPLY_FORCE;
+}
+
+bool kloC_BoltLoad::ChangesMethod(const cow_String& stepName) const {
+    return BoltState(stepName).boltMethod.IsModified();
+}
+
 const cls_FieldTable& kloC_BoltLoadState::Fields() {
     using R = kloC_BoltLoadState;
     static const cls_FieldTable fields =

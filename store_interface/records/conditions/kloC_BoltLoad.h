@@ -19,6 +19,10 @@ public:
     cls_Record* NewState(unsigned procedureType) const override;
     /// The state in the step, a default one where the load has none.
     const kloC_BoltLoadState& BoltState(const cow_String& stepName) const;
+    /// Whether a force tightens the bolt in the step, and not its length.
+    bool IsByForce(const cow_String& stepName) const;
+    /// Whether the step says another method.
+    bool ChangesMethod(const cow_String& stepName) const;
 };
 const omu_EnumTable& omu_EnumTableOf(kloC_BoltLoad::MethodEnm);
 

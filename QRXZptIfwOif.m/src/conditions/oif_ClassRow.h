@@ -1,0 +1,40 @@
+#ifndef QRX_OIF_CLASSROW_H
+#define QRX_OIF_CLASSROW_H
+
+#include "keyword_layer/qkw_Keyword.h"
+
+#include <algorithm>
+#include <span>
+
+/// What the lines of a condition have to name. Those that name no set, or may go without, take anything.
+enum class oif_RegionKind : int { ANY = 0, NODES = 1, ELEMENTS = 2, SURFACE = 8 };
+
+/// The row of a class in the table of its family; null if it has none.
+template <class Row>
+const Row* oif_FindRow(std::span<const Row> rows, unsigned typeId) {
+    const auto row = std::ranges::find(rows, typeId, &Row::typeId);
+    return row == rows.end() ? nullptr : &*row;
+}
+
+/// How many families the rows are of.
+template <class Row>
+constexpr int oif_NumberOfFamilies(std::span<const Row> rows) {
+    int number = 0;
+    for (const Row& row : rows) number = std::max(number, static_cast<int>(row.family) + 1);
+    return number;
+}
+
+/// The keyword K of a record of class R, made from its card and as much of the setting as K asks for.
+template <class K, class R, class Card, class Setting>
+qkw_KeywordHandle oif_MakeKeyword(const Card& card, const Setting& setting) {
+    [[maybe_unused]] const R& record = static_cast<const R&>(card.Object());
+    if constexpr (std::is_constructible_v<K, const Card&, const R&, const Setting&>) {
+        return qkw_KeywordHandle(K(card, record, setting));
+    } else if constexpr (std::is_constructible_v<K, const Card&, const R&>) {
+        return qkw_KeywordHandle(K(card, record));
+    } else {
+        return qkw_KeywordHandle(K(card));
+    }
+}
+
+#endif
