@@ -1,6 +1,9 @@
 #include "conditions/oif_OpStatus.h"
 
 #include "conditions/ConditionTesting.h"
+#include "conditions/oif_BCTable.h"
+#include "conditions/oif_FieldTable.h"
+#include "conditions/oif_LoadTable.h"
 #include "store/PropagationRecords.h"
 
 #include <chrono>
@@ -278,7 +281,7 @@ TEST(OpStatus, GeneralField_IsWrittenAlsoWhereItIsCarriedAndOthersOnlyWithTheFla
     const auto writes = [&](kpfC_Field& field) {
         field.Propagate(steps);
         std::string text;
-        for (int i = 0; i < steps.Size(); ++i) text += status.Writes(field, steps.NameAt(i)) ? '1' : '0';
+        for (const auto& [name, step] : steps) text += status.Writes(field, name) ? '1' : '0';
         return text;
     };
     EXPECT_EQ(writes(general), "11100");
@@ -343,45 +346,59 @@ TEST(OpStatus, Copy_KeepsTheFlags) {
     EXPECT_EQ(Flags(copy, 0x2980005, 3), "010");
 }
 
+TEST(OpStatus, EndOfAnObject_FlagsTheClassesOfItsRowsFamilyAndNoOther) {
+    const kprC_StepContainer steps = sample::StepsOf("IGG");
+    // For each class of the rows, the status with one object of the class that ends.
+    const auto expect = [&](auto rows, const auto& statusOf) {
+        for (const auto& row : rows) {
+            const std::unique_ptr<cls_Record> record(cls_Classes().Find(row.typeId)->create());
+            auto& object = static_cast<kprC_PropagatingObject&>(*record);
+            object.Give("S1");
+            object.Give("S2").deactivated = true;
+            object.Propagate(steps);
+            const auto status = statusOf(object);
+            for (const auto& other : rows) {
+                EXPECT_EQ(status.OpNew(other.typeId, "S2"), other.family == row.family)
+                    << row.label << ", " << other.label;
+                EXPECT_FALSE(status.OpNew(other.typeId, "S1")) << row.label << ", " << other.label;
+            }
+        }
+    };
+    expect(oif_BCRows(), [&](const kprC_PropagatingObject& bc) {
+        oif_BCOpStatus status;
+        status.Configure(Container<kbcC_BC>({{"B", static_cast<const kbcC_BC*>(&bc)}}, steps), {},
+                         steps.Keys());
+        return status;
+    });
+    expect(oif_LoadRows(), [&](const kprC_PropagatingObject& load) {
+        return LoadStatus({{"L", static_cast<const kloC_Load*>(&load)}}, "IGG");
+    });
+    expect(oif_FieldRows(), [&](const kprC_PropagatingObject& field) {
+        oif_FieldOpStatus status;
+        status.Configure(Container<kpfC_Field>({{"F", static_cast<const kpfC_Field*>(&field)}}, steps),
+                         steps.Keys());
+        return status;
+    });
+}
+
 TEST(OpStatus, EveryClassOfItsTable_HasAFamily) {
     ConditionModel model("IG", "");
-    oif_BCOpStatus conditions = ConditionStatus(model);
+    const oif_BCOpStatus conditions = ConditionStatus(model);
     for (const unsigned id : {0x2880024U, 0x2980005U, 0x2980007U, 0x2980009U, 0x298000CU, 0x298000EU,
                               0x2980010U, 0x2980014U, 0x2980016U, 0x2980018U, 0x298001AU, 0x298001CU,
                               0x2980022U, 0x2980031U, 0x2980024U, 0x2980026U, 0x2980028U}) {
         EXPECT_FALSE(conditions.OpNew(id, "S1")) << id;
     }
-    // Each load's family by one load that ends.
-    const auto flagged = [](const kloC_Load& load) {
-        const oif_LoadOpStatus status = LoadStatus({{"L", &load}}, "IGG");
-        std::set<unsigned> family;
-        for (unsigned id = 0x2880000; id < 0x2880060; ++id) {
-            if (Raised([&] { status.OpNew(id, "S2"); }) == "nothing raised" && status.OpNew(id, "S2")) {
-                family.insert(id);
-            }
-        }
-        return family;
-    };
-    using Family = std::set<unsigned>;
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880018>>(".sd")),
-              (Family{0x2880018, 0x2880022, 0x2880024, 0x288002A, 0x2880042, 0x2880047}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880014>>(".sd")),
-              (Family{0x2880014, 0x288001A, 0x288001C, 0x288001E, 0x2880020}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880008>>(".sd")), (Family{0x2880008, 0x2880055, 0x2880057}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880026>>(".sd")), (Family{0x2880026, 0x288003C}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880028>>(".sd")), (Family{0x2880028, 0x2880040}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288003E>>(".sd")), (Family{0x288003E, 0x2880045}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288002C>>(".sd")), (Family{0x288002C}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288002E>>(".sd")), (Family{0x288002E}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880012>>(".sd")), (Family{0x2880012}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880030>>(".sd")), (Family{0x2880030}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880038>>(".sd")), (Family{0x2880038}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880034>>(".sd")), (Family{0x2880034}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880032>>(".sd")), (Family{0x2880032}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288003A>>(".sd")), (Family{0x288003A}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x2880036>>(".sd")), (Family{0x2880036}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288000E>>(".sd")), (Family{0x288000E, 0x2880049}));
-    EXPECT_EQ(flagged(Given<AnyLoad<0x288004B>>(".sd")), (Family{0x288004B}));
+}
+
+TEST(OpStatus, BoltThatIsLetGo_FlagsTheBoundariesAndNotTheConnectors) {
+    ConditionModel model("IGG", R"("loads": {"B": {"class": "kloC_BoltLoad", "region": "A.F", "states": {
+        "S1": {"boltMethod": 1}, "S2": {"deactivated": true}}}})");
+    const oif_BCOpStatus status = ConditionStatus(model);
+    for (const oif_BCRow& row : oif_BCRows()) {
+        EXPECT_EQ(Flags(status, row.typeId, 3), row.family == oif_BCFamily::BOUNDARY ? "001" : "000")
+            << row.label;
+    }
 }
 
 TEST(OpStatus, PlacesOfAStep_AreItsLoadCasesOrItself) {
@@ -423,8 +440,8 @@ TEST(OpStatus, TenThousandLoadsInAHundredSteps_TakeNoSquareOfTheirNumber) {
     oif_LoadOpStatus status;
     status.Configure(loads, steps.Keys(), store.Info());
     int written = 0;
-    for (mdl_MapString2ObjCowIT<kloC_Load> it(loads); !it.IsDone(); it.Next()) {
-        for (int i = 0; i < steps.Size(); ++i) written += status.Writes(it.CurrentValue(), steps.NameAt(i));
+    for (const auto& [loadName, load] : loads) {
+        for (const auto& [stepName, step] : steps) written += status.Writes(load, stepName) ? 1 : 0;
     }
     EXPECT_EQ(written, 10000 * 99);
     // Seconds would show a walk over all loads or steps for each of them; a slow machine needs less.

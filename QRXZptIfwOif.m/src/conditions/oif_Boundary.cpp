@@ -15,7 +15,7 @@ constexpr std::string_view kBaseNamePrefix = "__basename__";
 
 oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const oif_BCCard& card,
                                            const cow_String& initialStepName)
-    : style_(style), card_(card), modifiedOnly_(card.op == oif_Op::MODIFY),
+    : style_(&style), card_(card), modifiedOnly_(card.op == oif_Op::MODIFY),
       initialStepName_(initialStepName) {
     const auto& quad = card_.Quad();
     oif_Utils::SetDeactivateOpFlags(quad.status, deactivated_, modifiedOnly_);
@@ -30,7 +30,7 @@ oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const oif_BCCard&
 void oif_ConditionKeyword::Write(utl_Stream& stream) const {
     if (deactivated_) return WriteBoundaryCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0);
     const oif_BCRow* row = oif_FindBCRow(Condition().DynTypeId());
-    if (row == nullptr || row->family != style_.family) nex_Raise(style_.failure);
+    if (row == nullptr || row->family != style_->family) nex_Raise(style_->failure);
     row->write(*this, stream);
 }
 
@@ -48,7 +48,7 @@ bool oif_ConditionKeyword::IsBuckling() const {
 
 void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, Distribution distributionType, bool fixed,
                                              int loadCase, const char* type) const {
-    oif_KeywordLine line(stream, style_.keyword);
+    oif_KeywordLine line(stream, style_->keyword);
     line.Op(card_.op)
         .Amplitude(amplitude_)
         .BreakingIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
@@ -110,14 +110,11 @@ void oif_ConditionKeyword::WriteLine(utl_Stream& stream, const cow_String& dofs,
 
 cow_String oif_ConditionKeyword::Dof(int number) const {
     const cow_String one = cow_String(", ") + cow_String(number);
-    return style_.dofRange ? one + one : one;
+    return style_->dofRange ? one + one : one;
 }
 
 oif_Boundary::oif_Boundary(const oif_BCCard& card, bool shellToSolid, const cow_String& initialStepName)
-    : qkw_KeywordOf({"*Boundary", oif_BCFamily::BOUNDARY, true, true,
-                     "Unimplemented boundary condition in input file."},
-                    card, initialStepName),
-      shellToSolid_(shellToSolid) {
+    : qkw_KeywordOf(kStyle, card, initialStepName), shellToSolid_(shellToSolid) {
     CheckForSubmodelBC();
 }
 
@@ -130,7 +127,7 @@ void oif_Boundary::CheckForSubmodelBC() {
         held = state.centerZone.ConstGet();
         isBCSubmodel_ = !held;
     }
-    submodelKeyword_ = style_.keyword;
+    submodelKeyword_ = style_->keyword;
     if (card_.op == oif_Op::NEW) submodelKeyword_ += ", op=NEW";
     if (held) submodelKeyword_ += ", fixed";
     if (!isBCSubmodel_) return;
@@ -211,9 +208,7 @@ void oif_Boundary::WriteSubmodel(utl_Stream& stream, const kbcC_SubmodelBC& bc) 
 }
 
 oif_ConnectorMotion::oif_ConnectorMotion(const oif_BCCard& card, const cow_String& initialStepName)
-    : qkw_KeywordOf({"*Connector Motion", oif_BCFamily::CONNECTOR_MOTION, false, false,
-                     "Unimplemented ConnectorMotion condition in input file."},
-                    card, initialStepName) {}
+    : qkw_KeywordOf(kStyle, card, initialStepName) {}
 
 oif_BoundaryForBoltLoad::oif_BoundaryForBoltLoad(const oif_LoadCard& card, const kloC_BoltLoad& boltLoad)
     : boltLoad_(boltLoad), stepName_(card.step), setName_(card.setName), op_(card.op),

@@ -58,7 +58,7 @@ protected:
     bool IsBuckling() const;
     bool UsesComplex() const { return card_.Quad().state.ConstGet().UseComplex(Procedure()); }
 
-    Style style_;
+    const Style* style_; // of the class
     oif_BCCard card_;
     cow_String amplitude_;
     bool deactivated_ = false;
@@ -91,6 +91,9 @@ public:
     void WriteSubmodel(utl_Stream& stream, const kbcC_SubmodelBC& bc) const;
 
 private:
+    static constexpr Style kStyle{"*Boundary", oif_BCFamily::BOUNDARY, true, true,
+                                  "Unimplemented boundary condition in input file."};
+
     void CheckForSubmodelBC();
     void WriteBaseName(oif_KeywordLine& line) const override;
 
@@ -105,6 +108,10 @@ private:
 class oif_ConnectorMotion final : public qkw_KeywordOf<oif_ConnectorMotion, oif_ConditionKeyword> {
 public:
     oif_ConnectorMotion(const oif_BCCard& card, const cow_String& initialStepName);
+
+private:
+    static constexpr Style kStyle{"*Connector Motion", oif_BCFamily::CONNECTOR_MOTION, false, false,
+                                  "Unimplemented ConnectorMotion condition in input file."};
 };
 
 /// A bolt that is tightened by its length, or held:

@@ -77,7 +77,9 @@ protected:
             const nex_Context context(written.Kind(), entry->name);
             if (entry->shared.IsNull()) {
                 entry->shared = mdl_ObjCow<T>(entry->object);
-                entry->setName = oif_RegionName(entry->object.region, this->ModelInfo());
+                if constexpr (requires { entry->object.region; }) {
+                    entry->setName = oif_RegionName(entry->object.region, this->ModelInfo());
+                }
                 entry->label = labelOf(entry->name, entry->object);
                 entry->comment = oif_Comment(entry->label);
             }

@@ -268,6 +268,10 @@ void oif_InteractionOpStatus::Configure(const kprC_PropagatingContainer<kinC_Int
     PopulateMembers(interactions);
 }
 
+oif_ConditionPlaces oif_InteractionOpStatus::Places(const kprC_Step&, const cow_String&, Status) {
+    return {{}};
+}
+
 void oif_InteractionOpStatus::PopulateMembers(
     const kprC_PropagatingContainer<kinC_Interaction>& interactions) {
     // Suppressed interactions count too; those of other classes have no family.

@@ -28,9 +28,9 @@ public:
     /// Whether the family of the class is written with ", op=NEW" in the step. A class without a family and
     /// an unknown step raise.
     bool OpNew(unsigned int typeId, const cow_String& stepName) const;
-    /// The same of an object's keyword.
+    /// The same of an object's keyword, in the step or in a load case of it.
     template <class T>
-    oif_Op Op(const T& object, const cow_String& stepName) const {
+    oif_Op Op(const T& object, const cow_String& stepName, bool /*inLoadCase*/ = false) const {
         return OpNew(object.DynTypeId(), stepName) ? oif_Op::NEW : oif_Op::MODIFY;
     }
     /// Sets the flags of all families in the step; an index behind the last step is passed over.
@@ -110,10 +110,6 @@ public:
     oif_LoadOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kloC_Load>& loads, const cow_List<cow_String>& steps,
                    const qkw_ModelInfo& modelInfo);
-    template <class T>
-    oif_Op Op(const T& object, const cow_String& stepName, bool) const {
-        return oif_OpStatus::Op(object, stepName);
-    }
     /// Whether the load is written in the step; none is in the initial one.
     bool Writes(const kloC_Load& load, const cow_String& stepName, bool inLoadCase = false) const;
     /// The load cases that take the load; the step itself if it has none, or none with loads of its own.
@@ -135,10 +131,6 @@ public:
 
     oif_FieldOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kpfC_Field>& fields, const cow_List<cow_String>& steps);
-    template <class T>
-    oif_Op Op(const T& object, const cow_String& stepName, bool) const {
-        return oif_OpStatus::Op(object, stepName);
-    }
     /// Whether the field is written in the step.
     bool Writes(const kpfC_Field& field, const cow_String& stepName, bool inLoadCase = false) const;
     /// The load cases that take the field; in a step without load cases the step itself.
@@ -172,6 +164,9 @@ public:
     oif_InteractionOpStatus() = default;
     void Configure(const kprC_PropagatingContainer<kinC_Interaction>& interactions,
                    const cow_List<cow_String>& steps);
+    /// The step itself: load cases take no interactions.
+    static oif_ConditionPlaces Places(const kprC_Step& step, const cow_String& name,
+                                      mdl_PropagationStatusEnm status);
 
 private:
     void PopulateMembers(const kprC_PropagatingContainer<kinC_Interaction>& interactions);
