@@ -8,6 +8,8 @@
 #include "store_interface/records/steps/kprC_ModalSteps.h"
 #include "store_interface/records/steps/kprC_StaticSteps.h"
 
+#include <algorithm>
+
 namespace {
 
 const kbcC_ConnectorBC* ConnectorCondition(const kbcC_BC& bc) {

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <span>
+#include <type_traits>
 
 /// What the lines of a condition have to name. Those that name no set, or may go without, take anything.
 enum class oif_RegionKind : int { ANY = 0, NODES = 1, ELEMENTS = 2, SURFACE = 8 };
