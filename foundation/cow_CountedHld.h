@@ -3,6 +3,7 @@
 
 #include "foundation/mem_Allocation.h"
 
+#include <type_traits>
 #include <utility>
 
 /// A plain integer reference count; not for use by several threads.
@@ -18,7 +19,19 @@ private:
     int count_;
 };
 
-/// A counted handle on a T of its own on the heap, which the last holder deletes. May be null.
+/// The count of an object on the heap, and how to delete it.
+class cow_OwnerCount : public cow_Counter {
+public:
+    using Destroy = void (*)(void* referent);
+    explicit cow_OwnerCount(Destroy destroy) : destroy_(destroy) {}
+    Destroy HowToDestroy() const { return destroy_; }
+
+private:
+    Destroy destroy_;
+};
+
+/// A counted handle on a T of its own on the heap, which the last holder deletes. May be null. Only who makes
+/// the first handle must know what a T is.
 template <class T>
 class cow_CountedHld {
 public:
@@ -27,9 +40,9 @@ public:
     explicit cow_CountedHld(T* referent) : referent_(referent) {
         if (referent_ == nullptr) return;
         try {
-            count_ = new cow_Counter(1);
+            count_ = new cow_OwnerCount([](void* object) { delete static_cast<T*>(object); });
         } catch (...) {
-            DeleteReferent();
+            delete referent_;
             throw;
         }
     }
@@ -72,12 +85,12 @@ protected:
 
 private:
     void Delete() noexcept {
+        const cow_OwnerCount::Destroy destroy = count_->HowToDestroy();
         delete count_;
-        DeleteReferent();
+        destroy(const_cast<std::remove_const_t<T>*>(referent_));
     }
-    void DeleteReferent() noexcept { delete referent_; }
 
-    cow_Counter* count_ = nullptr;
+    cow_OwnerCount* count_ = nullptr;
     T* referent_ = nullptr;
 };
 

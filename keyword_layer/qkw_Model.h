@@ -2,8 +2,19 @@
 #define QRX_KEYWORD_QKW_MODEL_H
 
 #include "store_interface/model/ddb_Model.h"
+#include "store_interface/records/amplitudes/kamC_Amplitude.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/cls_UnreadFamilies.h"
+#include "store_interface/records/conditions/kbcC_BC.h"
+#include "store_interface/records/conditions/kloC_Load.h"
+#include "store_interface/records/conditions/kpfC_Field.h"
+#include "store_interface/records/constraints/kcoC_Constraint.h"
+#include "store_interface/records/interactions/kinC_Interaction.h"
+#include "store_interface/records/materials/kmaC_Material.h"
 #include "store_interface/records/output/karC_RemeshingRule.h"
+#include "store_interface/records/output/korC_Output.h"
+#include "store_interface/records/sections/kbpC_BeamProfile.h"
+#include "store_interface/records/sections/kseC_Section.h"
 
 /// The store's base of a model's attributes; here for its enumeration.
 class mdl_Model {

@@ -467,44 +467,9 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
         std::vector<odiK_MemberInput> inputs;
         bool good = true;
         for (std::size_t m = 0; m < entries->Size(); ++m) {
-            mdf_Value& entry = entries->Items()[m];
-            const mdf_Path entryPath(entriesPath, m);
-            if (!entry.IsObject()) {
-                diagnostics_.Expected(entryPath, entry, "an object");
-                good = false;
-                continue;
-            }
-            const bool facets = head.type == res_SetTypeEnm::FACETS;
-            mdf_CheckMembers(diagnostics_, entry, {"instance", facets ? "facets" : "labels"}, entryPath);
-            const mdf_Value* instance = entry.Find("instance");
-            if (instance != nullptr && (!instance->IsString() || instance->String().empty())) {
-                diagnostics_.Expected(mdf_Path(entryPath, "instance"), *instance, "the name of an instance");
-                good = false;
-                continue;
-            }
-            const cow_String instanceName =
-                instance == nullptr ? cow_String() : cow_String(instance->String());
-            const odiK_Instance* owner = model_.FindInstance(instanceName);
-            if (instance != nullptr && owner == nullptr) {
-                records_.Places().ReportNoInstance(instance->String(), mdf_Path(entryPath, "instance"));
-                good = false;
-                continue;
-            }
-            const auto mesh = owner == nullptr ? model_.ConstAssemblyMesh() : owner->Mesh();
-            if (IsIncomplete(mesh.Referent())) {
-                good = false;
-                continue;
-            }
-            const std::size_t most = head.type == res_SetTypeEnm::NODES ? NumNodes(mesh) : NumElements(mesh);
-            if (!ReadMembers(members[m], head.type, entry, entryPath, most)) {
-                good = false;
-                continue;
-            }
-            if (members[m].empty) {
-                diagnostics_.Error(entryPath, "found an entry without members, expected at least one");
-                good = false;
-            }
-            inputs.push_back({instanceName, members[m].labels, members[m].facets});
+            odiK_MemberInput& input = inputs.emplace_back();
+            good = ReadEntry(input, members[m], head.type, entries->Items()[m], mdf_Path(entriesPath, m)) &&
+                   good;
         }
         if (!good) {
             records_.References().NoteWrong(head.name.View());
@@ -513,4 +478,37 @@ void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
         mdf_StoreProblems problems(diagnostics_, place);
         model_.AddAssemblySet(head.name, head.type, head.internal, inputs, problems);
     });
+}
+
+bool mdf_MeshReader::ReadEntry(odiK_MemberInput& input, Members& members, res_SetTypeEnm type,
+                               mdf_Value& json, const mdf_Path& path) {
+    if (!json.IsObject()) {
+        diagnostics_.Expected(path, json, "an object");
+        return false;
+    }
+    const bool facets = type == res_SetTypeEnm::FACETS;
+    mdf_CheckMembers(diagnostics_, json, {"instance", facets ? "facets" : "labels"}, path);
+    const mdf_Value* instance = json.Find("instance");
+    const mdf_Path instancePath(path, "instance");
+    if (instance != nullptr && (!instance->IsString() || instance->String().empty())) {
+        diagnostics_.Expected(instancePath, *instance, "the name of an instance");
+        return false;
+    }
+    if (instance != nullptr) input.instanceName = cow_String(instance->String());
+    const odiK_Instance* owner = model_.FindInstance(input.instanceName);
+    if (instance != nullptr && owner == nullptr) {
+        records_.Places().ReportNoInstance(instance->String(), instancePath);
+        return false;
+    }
+    const auto mesh = owner == nullptr ? model_.ConstAssemblyMesh() : owner->Mesh();
+    if (IsIncomplete(mesh.Referent())) return false;
+    const std::size_t most = type == res_SetTypeEnm::NODES ? NumNodes(mesh) : NumElements(mesh);
+    if (!ReadMembers(members, type, json, path, most)) return false;
+    if (members.empty) {
+        diagnostics_.Error(path, "found an entry without members, expected at least one");
+        return false;
+    }
+    input.labels = members.labels;
+    input.facets = members.facets;
+    return true;
 }

@@ -42,6 +42,9 @@ private:
                      mdf_CapitalsCheck& capitals);
     bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
                      std::size_t mostLabels);
+    /// One entry of a set of the assembly; the members must outlive the input.
+    bool ReadEntry(odiK_MemberInput& input, Members& members, res_SetTypeEnm type, mdf_Value& json,
+                   const mdf_Path& path);
     bool ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json, const mdf_Path& path);
     /// `most` is the largest number of labels that can be right, so that a wild range costs nothing.
     bool ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path, std::size_t most);

@@ -1,6 +1,7 @@
 #include "model_file/mdf_RecordReader.h"
 
 #include "model_file/checks/mdf_RecordChecks.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
 #include <cmath>

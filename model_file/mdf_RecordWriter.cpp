@@ -205,10 +205,8 @@ void mdf_RecordWriter::WriteGiven(const cls_FieldType& type, const void* value, 
 }
 
 void mdf_RecordWriter::WriteValue(const cls_FieldType& type, const void* value) {
-    if (cls_IsUnset(type, value)) {
-        out_.Null();
-        return;
-    }
+    // The marker of a number without a value is a number too: where null may stand, the marker is the
+    // default.
     switch (type.Kind()) {
     case cls_FieldKind::Bool: out_.Bool(*static_cast<const bool*>(value)); break;
     case cls_FieldKind::Int: out_.Int(*static_cast<const int*>(value)); break;

@@ -321,20 +321,7 @@ private:
     static Json TypeOf(const cls_FieldType& type, const cls_Field* field) {
         switch (type.Kind()) {
         case cls_FieldKind::Bool: return {{"type", "boolean"}};
-        case cls_FieldKind::Int: {
-            if (field == nullptr || field->meanings.empty()) return Reference("INT");
-            Json words = Json::array();
-            std::string inAnyCapitals;
-            for (const cls_IntMeaning& meaning : field->meanings) {
-                const std::string word = mdf_MeaningWord(meaning);
-                words.push_back(word);
-                inAnyCapitals += (inAnyCapitals.empty() ? "" : "|") + PatternOf(word);
-            }
-            return {{"anyOf",
-                     {Reference("INT"),
-                      {{"enum", words}},
-                      {{"type", "string"}, {"pattern", "^(" + inAnyCapitals + ")$"}}}}};
-        }
+        case cls_FieldKind::Int: return IntOf(field);
         case cls_FieldKind::Double:
         case cls_FieldKind::Float: return {{"type", "number"}};
         case cls_FieldKind::String: return StringOf(field);
@@ -370,20 +357,37 @@ private:
             return Nullable(VariantOf(static_cast<const cls_HolderType&>(type).ClassId()));
         case cls_FieldKind::Region: return Reference("REGION");
         case cls_FieldKind::Datum: return {{"type", {"string", "null"}}};
-        case cls_FieldKind::Attribute: {
-            const Json value = TypeOf(static_cast<const cls_AttributeType&>(type).ValueType(), field);
-            const Json state = TypeOf(cls_TypeOf<mdl_PropAttributeStateEnm>::Instance(), nullptr);
-            return {{"anyOf",
-                     {value,
-                      {{"type", "null"}},
-                      {{"type", "object"},
-                       {"additionalProperties", false},
-                       {"required", {"state"}},
-                       {"properties", {{"value", value}, {"state", state}}}}}}};
-        }
+        case cls_FieldKind::Attribute: return AttributeOf(static_cast<const cls_AttributeType&>(type), field);
         case cls_FieldKind::Tree: return TreeOf(type, *field);
         }
         return {};
+    }
+
+    static Json IntOf(const cls_Field* field) {
+        if (field == nullptr || field->meanings.empty()) return Reference("INT");
+        Json words = Json::array();
+        std::string inAnyCapitals;
+        for (const cls_IntMeaning& meaning : field->meanings) {
+            const std::string word = mdf_MeaningWord(meaning);
+            words.push_back(word);
+            inAnyCapitals += (inAnyCapitals.empty() ? "" : "|") + PatternOf(word);
+        }
+        return {{"anyOf",
+                 {Reference("INT"),
+                  {{"enum", words}},
+                  {{"type", "string"}, {"pattern", "^(" + inAnyCapitals + ")$"}}}}};
+    }
+
+    static Json AttributeOf(const cls_AttributeType& type, const cls_Field* field) {
+        const Json value = TypeOf(type.ValueType(), field);
+        const Json state = TypeOf(cls_TypeOf<mdl_PropAttributeStateEnm>::Instance(), nullptr);
+        return {{"anyOf",
+                 {value,
+                  {{"type", "null"}},
+                  {{"type", "object"},
+                   {"additionalProperties", false},
+                   {"required", {"state"}},
+                   {"properties", {{"value", value}, {"state", state}}}}}}};
     }
 
     static Json StringOf(const cls_Field* field) {

@@ -1,5 +1,8 @@
 #include "store_interface/model/ddb_Assembly.h"
 
+#include "store_interface/model/odiK_Model.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+
 namespace {
 
 const cow_CountedHld<odiK_Mesh>& EmptyMesh() {
@@ -66,4 +69,62 @@ ddb_Set ddb_Assembly::nset(const cow_String& name) const {
 
 ddr_ShortcutTo<odiK_Assembly> ddb_Assembly::Shortcut() const {
     return {"rootAssembly", name(), model_->AssemblyObject()};
+}
+
+const cow_String& ddb_Part::solverInput() const {
+    return part_->solverInput;
+}
+
+int ddb_PartContainer::size() const {
+    return static_cast<int>(model_->Parts().size());
+}
+
+ddb_ContainerIT<odiK_Part, ddb_Part> ddb_PartContainer::createIterator() const {
+    return {model_->Parts(), model_};
+}
+
+bool ddb_BaseInstance::IsPartInstance() const {
+    return instance_->isPartInstance;
+}
+
+int ddb_NumAttributes(const ptoC_PartAttributeList& list) {
+    return list.Size();
+}
+
+const ptoC_PartAttribute& ddb_AttributeAt(const ptoC_PartAttributeList& list, int index) {
+    return list.ConstGet(index);
+}
+
+ddb_OrientationView::ddb_OrientationView(const ptoC_PartAttribute& record) : region_(record.region) {}
+
+const cow_String& ddb_PartInstance::name() const {
+    return instance_->name;
+}
+
+const cow_String& ddb_PartInstance::partName() const {
+    return instance_->partName;
+}
+
+const cow_String& ddb_PartInstance::solverInput() const {
+    return instance_->solverInput;
+}
+
+int ddb_InstanceContainer::size() const {
+    return static_cast<int>(model_->Instances().size());
+}
+
+ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> ddb_InstanceContainer::createIterator() const {
+    return {model_->Instances(), model_};
+}
+
+const cow_String& ddb_Assembly::name() const {
+    return model_->AssemblyObject().name;
+}
+
+const cow_String& ddb_Assembly::solverInput() const {
+    return model_->AssemblyObject().solverInput;
+}
+
+bool ddb_Assembly::hasMesh() const {
+    return !model_->ConstAssemblyMesh().IsNull();
 }

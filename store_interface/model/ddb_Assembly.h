@@ -2,15 +2,22 @@
 #define QRX_STORE_DDB_ASSEMBLY_H
 
 #include "store_interface/model/ddb_Mesh.h"
-#include "store_interface/records/cls_ClassRegistrar.h"
 
+#include <map>
 #include <optional>
+
+class ptoC_PartAttribute;
+class ptoC_PartAttributeList;
+struct odiK_Assembly;
+struct odiK_Instance;
+struct odiK_Part;
+struct odiK_PartInstance;
 
 /// View on a part.
 class ddb_Part {
 public:
     explicit ddb_Part(const cow_CountedHld<odiK_Part>& part) : part_(part) {}
-    const cow_String& solverInput() const { return part_->solverInput; }
+    const cow_String& solverInput() const;
 
 private:
     cow_CountedHld<odiK_Part> part_;
@@ -54,8 +61,8 @@ public:
     explicit ddb_PartContainer(const cow_CountedHld<odiK_Model>& model) : model_(model) {}
     /// A name that is not there raises.
     ddb_Part get(const cow_String& name) const;
-    int size() const { return static_cast<int>(model_->Parts().size()); }
-    ddb_ContainerIT<odiK_Part, ddb_Part> createIterator() const { return {model_->Parts(), model_}; }
+    int size() const;
+    ddb_ContainerIT<odiK_Part, ddb_Part> createIterator() const;
     ddb_ContainerIT<odiK_Part, ddb_Part> begin() const { return createIterator(); }
     static std::default_sentinel_t end() { return {}; }
 
@@ -72,7 +79,7 @@ public:
     ddb_BaseInstance(const cow_CountedHld<odiK_Instance>& instance, const cow_CountedHld<odiK_Model>& model)
         : instance_(instance), model_(model) {}
     unsigned DynTypeId() const;
-    bool IsPartInstance() const { return instance_->isPartInstance; }
+    bool IsPartInstance() const;
     /// Six values: the translation, and the rotation vector, whose length is the angle in radians.
     cow_List<float> transform() const;
 
@@ -84,6 +91,9 @@ protected:
 class ddb_MaterialOrientation;
 class ddb_BeamOrientation;
 
+int ddb_NumAttributes(const ptoC_PartAttributeList& list);
+const ptoC_PartAttribute& ddb_AttributeAt(const ptoC_PartAttributeList& list, int index);
+
 /// The orientations of one kind of an instance.
 template <class View>
 class ddb_OrientationContainer {
@@ -91,9 +101,9 @@ public:
     ddb_OrientationContainer(const cow_CountedHld<odiK_Instance>& instance,
                              const ptoC_PartAttributeList& list)
         : instance_(instance), list_(&list) {}
-    int size() const { return list_->Size(); }
+    int size() const { return ddb_NumAttributes(*list_); }
     /// An index outside the list raises.
-    View get(int index) const { return View(list_->ConstGet(index)); }
+    View get(int index) const { return View(ddb_AttributeAt(*list_, index)); }
     const ptoC_PartAttributeList& materialOrientations() const { return *list_; }
     const ptoC_PartAttributeList& beamOrientations() const { return *list_; }
 
@@ -105,7 +115,7 @@ private:
 /// View on one orientation assignment.
 class ddb_OrientationView {
 public:
-    explicit ddb_OrientationView(const ptoC_PartAttribute& record) : region_(record.region) {}
+    explicit ddb_OrientationView(const ptoC_PartAttribute& record);
     /// The set that it is assigned to.
     ddb_Set region() const { return {region_.ConstSet().Id(), region_}; }
 
@@ -132,9 +142,9 @@ public:
     /// Raises unless the entry is a part instance.
     explicit ddb_PartInstance(const ddb_BaseInstance& instance);
 
-    const cow_String& name() const { return instance_->name; }
-    const cow_String& partName() const { return instance_->partName; }
-    const cow_String& solverInput() const { return instance_->solverInput; }
+    const cow_String& name() const;
+    const cow_String& partName() const;
+    const cow_String& solverInput() const;
     ddb_Mesh mesh() const;
     ddb_NodeData nodeData() const { return mesh().nodeData(); }
     ddb_ElementData elementData() const { return mesh().elementData(); }
@@ -149,10 +159,8 @@ public:
 class ddb_InstanceContainer {
 public:
     explicit ddb_InstanceContainer(const cow_CountedHld<odiK_Model>& model) : model_(model) {}
-    int size() const { return static_cast<int>(model_->Instances().size()); }
-    ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> createIterator() const {
-        return {model_->Instances(), model_};
-    }
+    int size() const;
+    ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> createIterator() const;
     ddb_ContainerIT<odiK_Instance, ddb_BaseInstance> begin() const { return createIterator(); }
     static std::default_sentinel_t end() { return {}; }
     /// The part instance whose mesh has the index; none for any other index.
@@ -167,9 +175,9 @@ using ddb_InstanceContainerIT = ddb_ContainerIT<odiK_Instance, ddb_BaseInstance>
 class ddb_Assembly {
 public:
     explicit ddb_Assembly(const cow_CountedHld<odiK_Model>& model) : model_(model) {}
-    const cow_String& name() const { return model_->AssemblyObject().name; }
-    const cow_String& solverInput() const { return model_->AssemblyObject().solverInput; }
-    bool hasMesh() const { return !model_->ConstAssemblyMesh().IsNull(); }
+    const cow_String& name() const;
+    const cow_String& solverInput() const;
+    bool hasMesh() const;
     /// The assembly's own mesh, an empty one if it has none; mesh index 0.
     ddb_Mesh mesh() const;
     ddb_InstanceContainer instance() const { return ddb_InstanceContainer(model_); }

@@ -1,7 +1,8 @@
 #ifndef QRX_STORE_DDB_DATUM_H
 #define QRX_STORE_DDB_DATUM_H
 
-#include "store_interface/model/odiK_Model.h"
+#include "store_interface/model/odiK_Datum.h"
+#include "store_interface/regions/ddr_Shortcut.h"
 
 /// View on a coordinate system.
 class ddb_DatumCsys {

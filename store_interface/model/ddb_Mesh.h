@@ -1,9 +1,15 @@
 #ifndef QRX_STORE_DDB_MESH_H
 #define QRX_STORE_DDB_MESH_H
 
-#include "store_interface/model/odiK_Model.h"
+#include "store_interface/model/ddb_ElementShape.h"
+#include "store_interface/regions/rgnC_Region.h"
 
+// What the views look at.
+class bme_ElemCtrlParams;
 class ddb_PartInstance;
+class odiK_Mesh;
+class odiK_Model;
+struct odiK_ElementClass;
 
 /// Single-precision coordinates of one node.
 struct uti_Coord3D {
@@ -36,14 +42,14 @@ public:
         : mesh_(mesh), model_(model), instanceName_(instanceName) {}
 
     /// Number of the mesh's own nodes.
-    int NumNodes() const { return mesh_->Nodes().NumNodes(); }
-    uti_CoordCont3D CoordContainer() const { return uti_CoordCont3D(mesh_->Nodes().coordinates); }
+    int NumNodes() const;
+    uti_CoordCont3D CoordContainer() const;
     /// The user's label of a node index; an index outside the nodes raises.
-    int GetUserNodeLabel(unsigned index) const { return mesh_->Nodes().Label(static_cast<int>(index)); }
+    int GetUserNodeLabel(unsigned index) const;
     /// All labels in the order of the nodes; shared, not copied.
-    void GetUserNodeLabels(cow_List<int>& labels) const { labels = mesh_->Nodes().labels; }
+    void GetUserNodeLabels(cow_List<int>& labels) const;
     /// The index of a label, or -1.
-    int GetMeshNodeIndex(int label) const { return mesh_->FindNode(label); }
+    int GetMeshNodeIndex(int label) const;
 
 protected:
     cow_CountedHld<odiK_Mesh> mesh_;
@@ -66,17 +72,17 @@ class ddb_ElementClass {
 public:
     ddb_ElementClass(const cow_CountedHld<odiK_Mesh>& mesh, int index) : mesh_(mesh), index_(index) {}
 
-    int numElements() const { return Class().NumElements(); }
-    int numNodesPerElement() const { return Class().nodesPerElement; }
-    const cow_String& elementTypeLabel() const { return Class().type; }
+    int numElements() const;
+    int numNodesPerElement() const;
+    const cow_String& elementTypeLabel() const;
     /// Node indices, numNodesPerElement() for each element.
-    const std::vector<int>& elementConnectivity() const { return Class().connectivity; }
+    const std::vector<int>& elementConnectivity() const;
     /// The user's labels, one for each element.
-    const std::vector<int>& userElementLabelsAsFlatArray() const { return Class().labels; }
-    const ddb_ElementShape& shape() const { return Class().shape; }
+    const std::vector<int>& userElementLabelsAsFlatArray() const;
+    const ddb_ElementShape& shape() const;
 
 private:
-    const odiK_ElementClass& Class() const { return mesh_->Classes()[static_cast<std::size_t>(index_)]; }
+    const odiK_ElementClass& Class() const;
 
     cow_CountedHld<odiK_Mesh> mesh_;
     int index_;
@@ -86,8 +92,8 @@ private:
 class ddb_ElementData {
 public:
     explicit ddb_ElementData(const cow_CountedHld<odiK_Mesh>& mesh) : mesh_(mesh) {}
-    int numClasses() const { return static_cast<int>(mesh_->Classes().size()); }
-    int numElements() const { return mesh_->NumElements(); }
+    int numClasses() const;
+    int numElements() const;
     /// A class index outside the classes raises.
     ddb_ElementClass elementClass(int index) const;
 
@@ -177,9 +183,9 @@ private:
 class bme_ElementClass {
 public:
     explicit bme_ElementClass(const odiK_ElementClass& elements) : class_(&elements) {}
-    const bme_ElemCtrlParams& GetElemControlParams() const { return class_->controls; }
-    int FirstElementIndex() const { return class_->firstElementIndex; }
-    int NumElements() const { return class_->NumElements(); }
+    const bme_ElemCtrlParams& GetElemControlParams() const;
+    int FirstElementIndex() const;
+    int NumElements() const;
 
 private:
     const odiK_ElementClass* class_;
@@ -188,13 +194,9 @@ private:
 class bme_ElementData {
 public:
     explicit bme_ElementData(const odiK_Mesh& mesh) : mesh_(&mesh) {}
-    unsigned NumClasses() const { return static_cast<unsigned>(mesh_->Classes().size()); }
+    unsigned NumClasses() const;
     /// An index outside the classes raises.
-    bme_ElementClass GetClass(unsigned index) const {
-        if (index >= NumClasses())
-            cow_RaiseOutOfRange(static_cast<int>(index), static_cast<int>(NumClasses()));
-        return bme_ElementClass(mesh_->Classes()[index]);
-    }
+    bme_ElementClass GetClass(unsigned index) const;
 
 private:
     const odiK_Mesh* mesh_;

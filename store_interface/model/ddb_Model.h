@@ -3,6 +3,25 @@
 
 #include "store_interface/model/ddb_Assembly.h"
 #include "store_interface/model/ddb_Datum.h"
+#include "store_interface/propagation/kprC_PropagatingObject.h"
+
+class ddb_ModelSectorDefinition;
+class kadC_AdptMeshCtrl;
+class kamC_Amplitude;
+class kbcC_BC;
+class kbpC_BeamProfile;
+class kcoC_Constraint;
+class kinC_ContactControls;
+class kinC_ContactInitialization;
+class kinC_Interaction;
+class kinC_InteractionProperty;
+class kloC_Load;
+class kmaC_Material;
+class korC_FieldOutput;
+class korC_HistoryOutput;
+class kpfC_Field;
+class kprC_AdptMeshCons;
+class kprC_TimePoint;
 
 /// A container object of the model; container() gives what it holds.
 template <class Container>
@@ -44,8 +63,7 @@ private:
 /// The steps of the model.
 class ddb_DdbStepContainer : public ddb_Container<kprC_StepContainer> {
 public:
-    ddb_DdbStepContainer(const cow_CountedHld<odiK_Model>& model, int analysisProduct)
-        : ddb_Container(model, model->steps), analysisProduct_(analysisProduct) {}
+    explicit ddb_DdbStepContainer(const cow_CountedHld<odiK_Model>& model);
     int size() const { return container().Size(); }
     /// The model's own when it is set; else EXPLICIT when a step behind the first is explicit, else IMPLICIT.
     kprC_AnalysisProductEnm AnalysisProduct() const {
@@ -63,7 +81,7 @@ class ddr_Model {
 public:
     explicit ddr_Model(const odiK_Model& model) : model_(&model) {}
     /// The sections, as a repository; a mdl_MapString2ObjCow<kseC_Section>.
-    const mdl_Repository& ConstGetSections() const { return model_->sections; }
+    const mdl_Repository& ConstGetSections() const;
 
 private:
     const odiK_Model* model_;
@@ -72,11 +90,11 @@ private:
 /// View on a model: the entry to everything in it.
 class ddb_Model {
 public:
-    explicit ddb_Model(const cow_CountedHld<odiK_Model>& model) : model_(model), attributes_(*model) {}
+    explicit ddb_Model(const cow_CountedHld<odiK_Model>& model);
 
     ddb_Assembly rootAssembly() const { return ddb_Assembly(model_); }
     ddb_PartContainer part() const { return ddb_PartContainer(model_); }
-    ddb_DdbStepContainer step() const { return {model_, model_->analysisProduct}; }
+    ddb_DdbStepContainer step() const { return ddb_DdbStepContainer(model_); }
     /// The mesh of an index: 0 the assembly's, else a part instance's. Another index raises.
     ddb_Mesh mesh(int meshIndex) const;
     /// The datum of an id from 1; another id raises.
@@ -84,62 +102,46 @@ public:
     /// The object of the model under a key; there is one, under "rootAssembly". Another key raises.
     const odiK_Assembly& Object(const cow_String& key) const;
     /// Leads to the model's attributes. Must not outlive this view.
-    ddr_ShortcutTo<ddr_Model> Shortcut() const { return {"model", model_->Name(), attributes_}; }
+    ddr_ShortcutTo<ddr_Model> Shortcut() const;
 
-    const cow_String& solverInput() const { return model_->solverInput; }
-    const cow_String& topLevelSolverInput() const { return model_->topLevelSolverInput; }
-    double absoluteZero() const { return model_->absoluteZero; }
-    double stefanBoltzmann() const { return model_->stefanBoltzmann; }
-    const cow_String& waveFormulation() const { return model_->waveFormulation; }
-    const cow_String& restartJob() const { return model_->restartJob; }
-    const cow_String& restartStep() const { return model_->restartStep; }
-    int restartIncrement() const { return model_->restartIncrement; }
-    bool endRestartStep() const { return model_->endRestartStep; }
-    const cow_String& globalJob() const { return model_->globalJob; }
-    bool shellToSolid() const { return model_->shellToSolid; }
+    const cow_String& solverInput() const;
+    const cow_String& topLevelSolverInput() const;
+    double absoluteZero() const;
+    double stefanBoltzmann() const;
+    const cow_String& waveFormulation() const;
+    const cow_String& restartJob() const;
+    const cow_String& restartStep() const;
+    int restartIncrement() const;
+    bool endRestartStep() const;
+    const cow_String& globalJob() const;
+    bool shellToSolid() const;
     /// Whether the constraint of the name joins the two sides of the cyclic sector; false for an unknown
     /// name.
     bool hasCyclicSymmetry(const cow_String& constraintName) const;
     /// The sector definition; one without symmetry when the model has none.
     const ddb_ModelSectorDefinition& modelSectorForCyclicSymmetry() const;
 
-    ddr_ShortcutTo<mdl_MapString2ObjCow<kmaC_Material>> material() const {
-        return {"materials", "materials", model_->materials};
-    }
-    ddr_ShortcutTo<mdl_MapString2ObjCow<kamC_Amplitude>> amplitudes() const {
-        return {"amplitudes", "amplitudes", model_->amplitudes};
-    }
-    ddr_ShortcutTo<mdl_MapString2ObjCow<kbpC_BeamProfile>> beamProfile() const {
-        return {"beamProfiles", "beamProfiles", model_->beamProfiles};
-    }
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kmaC_Material>> material() const;
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kamC_Amplitude>> amplitudes() const;
+    ddr_ShortcutTo<mdl_MapString2ObjCow<kbpC_BeamProfile>> beamProfile() const;
 
     template <class T>
     using Named = ddb_Container<mdl_MapString2ObjCow<T>>;
     template <class T>
     using Propagating = ddb_Container<kprC_PropagatingContainer<T>>;
-    Named<kcoC_Constraint> constraints() const { return {model_, model_->constraints}; }
-    Named<kinC_ContactControls> contactControls() const { return {model_, model_->contactControls}; }
-    Named<kinC_ContactInitialization> contactInitializations() const {
-        return {model_, model_->contactInitializations};
-    }
-    Named<kinC_InteractionProperty> interactionProperties() const {
-        return {model_, model_->interactionProperties};
-    }
-    Named<kprC_TimePoint> timePoints() const { return {model_, model_->timePoints}; }
-    Named<kadC_AdptMeshCtrl> adaptiveMeshControls() const { return {model_, model_->adaptiveMeshControls}; }
-    Propagating<kbcC_BC> boundaryConditions() const { return {model_, model_->boundaryConditions}; }
-    Propagating<kloC_Load> loads() const { return {model_, model_->loads}; }
-    Propagating<kpfC_Field> fields() const { return {model_, model_->fields}; }
-    Propagating<kinC_Interaction> interactions() const { return {model_, model_->interactions}; }
-    Propagating<korC_FieldOutput> fieldOutputRequests() const {
-        return {model_, model_->fieldOutputRequests};
-    }
-    Propagating<korC_HistoryOutput> historyOutputRequests() const {
-        return {model_, model_->historyOutputRequests};
-    }
-    Propagating<kprC_AdptMeshCons> adaptiveMeshConstraints() const {
-        return {model_, model_->adaptiveMeshConstraints};
-    }
+    Named<kcoC_Constraint> constraints() const;
+    Named<kinC_ContactControls> contactControls() const;
+    Named<kinC_ContactInitialization> contactInitializations() const;
+    Named<kinC_InteractionProperty> interactionProperties() const;
+    Named<kprC_TimePoint> timePoints() const;
+    Named<kadC_AdptMeshCtrl> adaptiveMeshControls() const;
+    Propagating<kbcC_BC> boundaryConditions() const;
+    Propagating<kloC_Load> loads() const;
+    Propagating<kpfC_Field> fields() const;
+    Propagating<kinC_Interaction> interactions() const;
+    Propagating<korC_FieldOutput> fieldOutputRequests() const;
+    Propagating<korC_HistoryOutput> historyOutputRequests() const;
+    Propagating<kprC_AdptMeshCons> adaptiveMeshConstraints() const;
 
 private:
     cow_CountedHld<odiK_Model> model_;

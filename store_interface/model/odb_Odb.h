@@ -2,6 +2,7 @@
 #define QRX_STORE_ODB_ODB_H
 
 #include "store_interface/model/ddb_Model.h"
+#include "store_interface/model/odiK_Model.h"
 
 /// View on all models of a store.
 class ddb_Ddb {

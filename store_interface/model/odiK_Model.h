@@ -1,6 +1,8 @@
 #ifndef QRX_STORE_ODIK_MODEL_H
 #define QRX_STORE_ODIK_MODEL_H
 
+#include "store_interface/model/odiK_Assembly.h"
+#include "store_interface/model/odiK_Datum.h"
 #include "store_interface/model/odiK_Mesh.h"
 #include "store_interface/records/amplitudes/kamC_Amplitude.h"
 #include "store_interface/records/conditions/kbcC_BC.h"
@@ -16,16 +18,6 @@
 
 #include <map>
 #include <optional>
-
-/// What hangs behind a part, or behind an instance that differs from its part: attributes on the sets of its
-/// mesh. A later section assignment wins on an element.
-struct odiK_PartInstance {
-    ptoC_PartAttributeList sectionAssignments;
-    ptoC_PartAttributeList materialOrientations;
-    ptoC_PartAttributeList beamOrientations;
-
-    const ptoC_PartAttributeList& ConstGetSectionAssignment() const { return sectionAssignments; }
-};
 
 /// An attribute of a part, given on a set of the mesh by name until the instance is known.
 struct odiK_AttributeInput {
@@ -81,51 +73,6 @@ struct odiK_Instance : cls_RecordOf<odiK_Instance> {
     cow_CountedHld<odiK_Mesh> Mesh() const {
         return !ownMesh.IsNull() || part.IsNull() ? ownMesh : part->mesh;
     }
-
-    static const cls_FieldTable& Fields();
-};
-
-/// The assembly-level object: its texts and its attribute lists.
-struct odiK_Assembly : cls_RecordOf<odiK_Assembly> {
-    static constexpr cls_ClassInfo Class{"odiK_Assembly", "The assembly of a model."};
-
-    cow_String name = "Assembly";
-    cow_String solverInput;
-    ptoC_PartAttributeList sectionAssignments;
-    ptoC_PartAttributeList connectorOrientations;
-
-    const ptoC_PartAttributeList& ConstGetSectionAssignment() const { return sectionAssignments; }
-    const ptoC_PartAttributeList& ConstGetConnectorOrientation() const { return connectorOrientations; }
-    /// "ConnOri-" and the place in the list, from 0.
-    static cow_String ConnectorOrientationName(int place);
-    /// Appends; an orientation without a name gets that of its place.
-    void AppendConnectorOrientation(const ptoC_ConnectorOrientation& orientation);
-
-    static const cls_FieldTable& Fields();
-};
-
-enum class dtu_DatumType : int { POINT = 1, AXIS = 2, PLANE = 3, CSYS = 4 };
-enum class dtu_DatumCsysType : int { RECTANGULAR = 1, CYLINDRICAL = 2, SPHERICAL = 3 };
-const omu_EnumTable& omu_EnumTableOf(dtu_DatumType);
-const omu_EnumTable& omu_EnumTableOf(dtu_DatumCsysType);
-
-/// A datum. Axes are unit vectors. A point has an origin; an axis has its direction in xAxis; a plane its
-/// normal in zAxis.
-struct odiK_Datum : cls_RecordOf<odiK_Datum> {
-    static constexpr cls_ClassInfo Class{
-        "odiK_Datum", "A coordinate system, point, axis or plane. A csys takes origin and axes, a point its "
-                      "origin, an axis "
-                      "origin and xAxis (its direction), a plane origin and zAxis (its normal)."};
-
-    cow_String name;
-    dtu_DatumType type = dtu_DatumType::CSYS;
-    dtu_DatumCsysType csysType = dtu_DatumCsysType::RECTANGULAR;
-    gsl_Point origin;
-    gsl_Vector xAxis{1.0, 0.0, 0.0};
-    gsl_Vector yAxis{0.0, 1.0, 0.0};
-    gsl_Vector zAxis{0.0, 0.0, 1.0};
-    /// The axes as they were given, kept by AddDatum: normalising twice may change the last bit.
-    gsl_Vector givenAxes[3];
 
     static const cls_FieldTable& Fields();
 };

@@ -197,7 +197,7 @@ const FindingCase meshCases[] = {
      {"@/parts/P/mesh/sets/0/name: found nothing, expected the name of the set"}},
     {"SetNameNull",
      Sets(R"({"name": null, "kind": "node", "labels": []})"),
-     {"@/parts/P/mesh/sets/0/name: found null, expected the name of the set"}},
+     {"@/parts/P/mesh/sets/0/name: found null, expected the name of a set"}},
     {"SetNameWithATab",
      Sets(R"({"name": "a\tb", "kind": "node", "labels": []})"),
      {"@/parts/P/mesh/sets/0/name: found a name with a control character, expected a name that can stand in "

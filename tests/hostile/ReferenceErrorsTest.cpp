@@ -196,7 +196,8 @@ const FindingCase referenceCases[] = {
     {"WrongSetIsReportedOnce",
      Whole(R"("sets": [{"name": "S", "kind": "elements", "members": []}],
               "connectorOrientations": [{"region": "S"}])"),
-     {"@/assembly/sets/0/kind: found 'elements', expected one of node, element, surface"}},
+     {"@/assembly/sets/0/kind: found 'elements', expected one of node, element, surface; did you mean "
+      "'element'?"}},
     {"WrongInstanceIsReportedOnce",
      Model(R"("assembly": {"instances": {"I": 1},
                            "sets": [{"name": "S", "kind": "node", "members": [{"instance": "I", "labels": [1]}]}],

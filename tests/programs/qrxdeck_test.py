@@ -664,9 +664,82 @@ class OtherCommands(ProgramTest):
     def test_Help_NamesCommandsAndExitCodes(self):
         run = self.run_program("--help")
         self.assertEqual((run.returncode, run.errors), (0, ""))
-        for word in ["write", "check", "info", "schema", "--version", "Exit codes:"]:
+        for word in ["write", "check", "info", "format", "schema", "--version", "Exit codes:"]:
             self.assertIn(word, run.output)
         self.assertIn("--output-dir DIR", self.run_program("write", "--help").output)
+
+
+class Format(ProgramTest):
+    CANONICAL = """\
+{
+  "format": "qrx-model/1",
+  "models": {
+    "Default Model": {
+      "topLevelSolverInput": ["*Heading"],
+      "assembly": {}
+    }
+  }
+}
+"""
+    COMMENTED = """\
+// A heading.
+{"format": "qrx-model/1", "models": {"Default Model":
+    {"topLevelSolverInput": "*Heading\\n", "absoluteZero": 0, "assembly": {"name": "Assembly"}}}}
+"""
+
+    def test_ToTheStandardOutput_LeavesTheFileAsItIs(self):
+        self.put("model.json", self.COMMENTED)
+        run = self.run_program("format", "model.json")
+        self.assertEqual((run.returncode, run.errors), (0, "model.json: warning: its comments are left out\n"))
+        self.assertEqual(run.output, self.CANONICAL)
+        self.assertEqual((self.folder / "model.json").read_text(), self.COMMENTED)
+
+    def test_OntoTheFileItself_ReplacesIt(self):
+        self.put("model.json", self.COMMENTED.split("\n", 1)[1])
+        run = self.run_program("format", "model.json", "-o", "model.json")
+        self.assertEqual((run.returncode, run.output, run.errors), (0, "", ""))
+        self.assertEqual((self.folder / "model.json").read_text(), self.CANONICAL)
+        self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_Check_TellsTheNameOfAFileThatIsNotCanonical(self):
+        self.put("model.json", self.COMMENTED)
+        run = self.run_program("format", "--check", "model.json")
+        self.assertEqual((run.returncode, run.output, run.errors), (1, "model.json\n", ""))
+        self.put("model.json", self.CANONICAL)
+        run = self.run_program("format", "--check", "model.json")
+        self.assertEqual((run.returncode, run.output, run.errors), (0, "", ""))
+
+    def test_InJson_TheTextIsAMember(self):
+        self.put("model.json", self.COMMENTED)
+        run = self.run_program("format", "model.json", "--json")
+        self.assertEqual(json.loads(run.output)["formatted"],
+                         {"file": "model.json", "wasCanonical": False, "text": self.CANONICAL})
+
+    def test_WrongModel_IsCodeOneAndNothingIsWritten(self):
+        self.put("model.json", '{"format": "qrx-model/1"}')
+        self.assert_refused(self.run_program("format", "model.json", "-o", "out.json"), 1,
+                            "model.json: error: /models: found nothing, expected an object of models\n")
+        self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_FileThatCannotBeReadOrWritten_IsCodeThree(self):
+        self.assert_refused(self.run_program("format", "none.json"), 3,
+                            "none.json: error: the file can't be read: No such file or directory\n")
+        run = self.run_program("format", "model.json", "-o", "none/out.json")
+        self.assert_refused(run, 3, "none/out.json: error: cannot make a temporary folder in 'none': "
+                            "No such file or directory\n")
+
+    def test_FileThatOutgrowsItsLimit_LeavesTheOldFile(self):
+        self.put("model.json", large_model(20000))
+        old = (self.folder / "model.json").read_bytes()
+        run = self.run_program(
+            "format", "model.json", "-o", "model.json",
+            preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_FSIZE, (4096, resource.RLIM_INFINITY)))
+        self.assert_refused(run, 3, "model.json: error: cannot write the model file: File too large\n")
+        self.assertEqual((self.folder / "model.json").read_bytes(), old)
+        self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_CheckAndOutput_ExcludeEachOther(self):
+        self.assert_refused(self.run_program("format", "model.json", "--check", "-o", "out.json"), 2)
 
 
 class Variables(ProgramTest):

@@ -1,4 +1,5 @@
 #include "store_interface/model/odb_Odb.h"
+#include "store_interface/records/part_attributes/bme_MapPropertyArray.h"
 
 #include "store/PropagationRecords.h"
 #include "store/StoreTesting.h"

@@ -7,6 +7,7 @@
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 #include "mesh/oif_SetName.h"
+#include "store_interface/model/odiK_Assembly.h"
 
 #include <set>
 

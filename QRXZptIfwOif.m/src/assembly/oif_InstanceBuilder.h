@@ -2,6 +2,7 @@
 #define QRX_OIF_INSTANCEBUILDER_H
 
 #include "base/oif_Component.h"
+#include "store_interface/records/sections/kseC_ConnectorSection.h"
 
 /// The opening of an instance, with its placement:
 ///     *Instance, name=NAME, part=PART

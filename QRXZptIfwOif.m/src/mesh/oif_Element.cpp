@@ -2,6 +2,7 @@
 
 #include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_QuorixName.h"
+#include "store_interface/model/odiK_Mesh.h"
 
 #include <algorithm>
 #include <cstring>

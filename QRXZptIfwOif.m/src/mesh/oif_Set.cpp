@@ -2,6 +2,7 @@
 
 #include "foundation/omi_BlkBitVect.h"
 #include "keyword_layer/qkw_QuorixName.h"
+#include "store_interface/model/odiK_Mesh.h"
 
 namespace {
 

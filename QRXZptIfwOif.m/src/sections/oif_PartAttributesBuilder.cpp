@@ -10,6 +10,8 @@
 #include "sections/oif_PointInertia.h"
 #include "sections/oif_ShellSections.h"
 #include "sections/oif_SolidSections.h"
+#include "store_interface/model/odiK_Assembly.h"
+#include "store_interface/model/odiK_Mesh.h"
 #include "store_interface/records/sections/kbpC_BeamProfile.h"
 #include "store_interface/records/sections/kseC_BeamSection.h"
 #include "store_interface/records/sections/kseC_PointSection.h"

@@ -2,6 +2,9 @@
 #define QRX_OIF_PARTATTRIBUTESBUILDER_H
 
 #include "base/oif_Component.h"
+#include "store_interface/records/part_attributes/bme_ElemCtrlParams.h"
+#include "store_interface/records/part_attributes/bme_MapPropertyArray.h"
+#include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
 #include "store_interface/records/sections/kseC_Section.h"
 
 #include <map>

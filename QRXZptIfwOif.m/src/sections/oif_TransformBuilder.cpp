@@ -3,6 +3,7 @@
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_Orientation.h"
+#include "store_interface/model/odiK_Assembly.h"
 #include "store_interface/records/conditions/kbcC_SupportBCs.h"
 #include "store_interface/records/conditions/kloC_Loads.h"
 #include "store_interface/records/constraints/kcoC_Constraints.h"

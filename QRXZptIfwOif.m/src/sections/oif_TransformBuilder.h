@@ -2,6 +2,7 @@
 #define QRX_OIF_TRANSFORMBUILDER_H
 
 #include "base/oif_Component.h"
+#include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
 
 /// The local systems that the model uses: for each one that degrees of freedom are given in, a node set with
 /// all its regions as members and a transform on it; and an orientation for each system of a connector, a
