@@ -43,7 +43,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto odb =
         mdf_ReadModelText(std::string_view(reinterpret_cast<const char*>(data), size), "m.json", report);
     Require((odb == nullptr) == report.HasErrors());
-    for (const mdf_Message& message : report.messages) Require(!message.text.empty());
+    for (const fnd_Finding& finding : report.findings) Require(!finding.Text().empty());
     if (odb == nullptr) return 0;
 
     const std::string first = Written(*odb);

@@ -9,12 +9,12 @@ public:
     mdf_DatumReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics)
         : model_(model), records_(records), diagnostics_(diagnostics) {}
 
-    void ReadDatums(const mdf_Value& json, const mdf_Path& path);
+    void ReadDatums(const mdf_Value& json, const fnd_Path& path);
 
 private:
-    void ReadDatum(const mdf_Value& json, const mdf_Path& path, mdf_CapitalsCheck& capitals);
+    void ReadDatum(const mdf_Value& json, const fnd_Path& path, mdf_CapitalsCheck& capitals);
     /// `zGiven`: the file gives the third axis.
-    bool CheckAxes(const odiK_Datum& datum, bool zGiven, const mdf_Path& path);
+    bool CheckAxes(const odiK_Datum& datum, bool zGiven, const fnd_Path& path);
 
     odiK_Model& model_;
     mdf_RecordReader& records_;

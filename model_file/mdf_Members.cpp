@@ -14,13 +14,13 @@ std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields, const std::
 }
 
 void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
-                      const std::vector<std::string>& known, const mdf_Path& path) {
+                      const std::vector<std::string>& known, const fnd_Path& path) {
     for (const mdf_Member& member : object.Members()) {
         if (std::find(known.begin(), known.end(), member.name) != known.end()) continue;
-        diagnostics.Error(mdf_Path(path, member.name),
-                          "found an unknown member " + mdf_Quoted(member.name) +
-                              (known.empty() ? ", expected none" : ", expected " + mdf_OneOf(known)) +
-                              mdf_DidYouMean(member.name, known));
+        diagnostics.Add("unknown-member", fnd_Path(path, member.name),
+                        "found an unknown member " + fnd_Quoted(member.name),
+                        known.empty() ? std::string("none") : fnd_OneOf(known),
+                        fnd_DidYouMean(member.name, known));
     }
 }
 

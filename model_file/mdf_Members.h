@@ -8,7 +8,7 @@ std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields,
                                        const std::vector<std::string>& others = {});
 /// Reports members that are none of the known ones.
 void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
-                      const std::vector<std::string>& known, const mdf_Path& path);
+                      const std::vector<std::string>& known, const fnd_Path& path);
 /// The word of a meaning: what stands before "(", "," or ":".
 std::string mdf_MeaningWord(const cls_IntMeaning& meaning);
 

@@ -15,7 +15,7 @@ std::size_t NumElements(const cow_CountedHld<odiK_Mesh>& mesh) {
 
 } // namespace
 
-cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Path& path) {
+cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const fnd_Path& path) {
     cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
@@ -23,44 +23,44 @@ cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const mdf_Pa
     }
     mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
     ReadNodesAndElements(*mesh, json, path, false);
-    if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, mdf_Path(path, "sets"));
+    if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, fnd_Path(path, "sets"));
     return mesh;
 }
 
-void mdf_MeshReader::ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path,
+void mdf_MeshReader::ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path,
                                           bool inAssembly) {
     const int before = diagnostics_.NumErrors();
-    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(mesh, *nodes, mdf_Path(path, "nodes"));
+    if (mdf_Value* nodes = json.Find("nodes")) ReadNodes(mesh, *nodes, fnd_Path(path, "nodes"));
     if (diagnostics_.NumErrors() != before && mesh.Nodes().NumNodes() == 0) incomplete_.insert(&mesh);
     if (mdf_Value* elements = json.Find("elements")) {
         const std::size_t classes = elements->Size();
-        ReadElements(mesh, *elements, mdf_Path(path, "elements"), inAssembly);
+        ReadElements(mesh, *elements, fnd_Path(path, "elements"), inAssembly);
         if (mesh.Classes().size() != classes) incomplete_.insert(&mesh);
     }
-    mdf_StoreProblems problems(diagnostics_, path);
+    fnd_Below problems(diagnostics_, path);
     mesh.FinishElements(problems);
 }
 
-void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path) {
+void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const fnd_Path& path) {
     odiK_Mesh& mesh = model_.AssemblyMesh();
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
     }
     if (json.Find("sets") != nullptr) {
-        diagnostics_.Error(mdf_Path(path, "sets"),
-                           "found sets, expected them in the member \"sets\" of the assembly");
+        diagnostics_.Add("sets-in-assembly-mesh", fnd_Path(path, "sets"), "found sets",
+                         "them in the member \"sets\" of the assembly");
     }
     mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
     ReadNodesAndElements(mesh, json, path, true);
     if (mesh.Nodes().NumNodes() > 0) {
-        diagnostics_.Warning(mdf_Path(path, "nodes"), "the assembly's own " +
-                                                          std::to_string(mesh.Nodes().NumNodes()) +
-                                                          " nodes reach no deck");
+        diagnostics_.Add("assembly-nodes", fnd_Path(path, "nodes"),
+                         "the assembly's own " + std::to_string(mesh.Nodes().NumNodes()) +
+                             " nodes reach no deck");
     }
 }
 
-void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
+void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
@@ -69,17 +69,17 @@ void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path&
     mdf_Value* coordinates = json.Find("coordinates");
     mdf_Value* labelsJson = json.Find("labels");
     if (labelsJson == nullptr || coordinates == nullptr) {
-        diagnostics_.Error(path, "found no labels or no coordinates, expected both");
+        diagnostics_.Add("missing-field", path, "found no labels or no coordinates", "both");
         return;
     }
-    const mdf_Path coordinatesPath(path, "coordinates");
+    const fnd_Path coordinatesPath(path, "coordinates");
     if (!coordinates->IsArray()) {
         diagnostics_.Expected(coordinatesPath, *coordinates, "an array of points [x, y, z]");
         return;
     }
     const std::size_t count = coordinates->Size();
     std::vector<int> labels;
-    if (!ReadLabels(labels, *labelsJson, mdf_Path(path, "labels"), count)) return;
+    if (!ReadLabels(labels, *labelsJson, fnd_Path(path, "labels"), count)) return;
 
     std::vector<float> xyz(3 * count);
     bool good = true;
@@ -87,15 +87,15 @@ void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path&
         xyz[place] = static_cast<float>(value);
         if (!std::isinf(xyz[place])) return;
         good = false;
-        const mdf_Path row(coordinatesPath, place / 3);
-        diagnostics_.Expected(mdf_Path(row, place % 3), mdf_Value(value), "a coordinate of single precision");
+        const fnd_Path row(coordinatesPath, place / 3);
+        diagnostics_.Expected(fnd_Path(row, place % 3), mdf_Value(value), "a coordinate of single precision");
     };
     if (coordinates->Kind() == mdf_Kind::Matrix && coordinates->UniformRowLength() == 3) {
         const mdf_MatrixData rows = coordinates->TakeMatrix();
         for (std::size_t i = 0; i < 3 * count; ++i) put(i, rows.ints.empty() ? rows.reals[i] : rows.ints[i]);
     } else {
         for (std::size_t i = 0; i < count; ++i) {
-            const mdf_Path row(coordinatesPath, i);
+            const fnd_Path row(coordinatesPath, i);
             const mdf_Value point = coordinates->Item(i);
             if (!point.IsArray() || point.Size() != 3) {
                 diagnostics_.Expected(row, point, "three coordinates");
@@ -106,18 +106,18 @@ void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path&
                 if (point.Item(j).IsNumber()) {
                     put(3 * i + j, point.Item(j).Real());
                 } else {
-                    diagnostics_.Expected(mdf_Path(row, j), point.Item(j), "a number");
+                    diagnostics_.Expected(fnd_Path(row, j), point.Item(j), "a number");
                     good = false;
                 }
             }
         }
     }
     if (!good) return;
-    mdf_StoreProblems problems(diagnostics_, path);
+    fnd_Below problems(diagnostics_, path);
     mesh.SetNodes(std::move(labels), std::move(xyz), problems);
 }
 
-bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path,
+bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const fnd_Path& path,
                                 std::size_t most) {
     if (json.Kind() == mdf_Kind::IntArray) {
         labels = json.TakeInts();
@@ -126,7 +126,7 @@ bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const
     if (json.IsArray()) {
         for (std::size_t i = 0; i < json.Size(); ++i) {
             const mdf_Value label = json.Item(i);
-            if (!label.IsInt()) diagnostics_.Expected(mdf_Path(path, i), label, "a label");
+            if (!label.IsInt()) diagnostics_.Expected(fnd_Path(path, i), label, "a label");
         }
         return false;
     }
@@ -138,10 +138,10 @@ bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const
     int range[3] = {0, 0, 1};
     const char* const names[3] = {"from", "to", "by"};
     for (int i = 0; i < 3; ++i) {
-        const mdf_Path place(path, std::string_view(names[i]));
+        const fnd_Path place(path, std::string_view(names[i]));
         const mdf_Value* number = json.Find(names[i]);
         if (number == nullptr && i < 2) {
-            diagnostics_.Error(place, "found nothing, expected a label");
+            diagnostics_.Add("missing-field", place, "found nothing", "a label");
             return false;
         }
         if (number == nullptr) continue;
@@ -152,14 +152,15 @@ bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const
         range[i] = number->Int();
     }
     if (range[0] > range[1]) {
-        diagnostics_.Error(path, "found a range from " + std::to_string(range[0]) + " to " +
-                                     std::to_string(range[1]) + ", expected from not above to");
+        diagnostics_.Add("wrong-label", path,
+                         "found a range from " + std::to_string(range[0]) + " to " + std::to_string(range[1]),
+                         "from not above to");
         return false;
     }
     const std::size_t count = static_cast<std::size_t>((range[1] - range[0]) / range[2]) + 1;
     if (count > most) {
-        diagnostics_.Error(path, "found a range of " + std::to_string(count) + " labels, expected at most " +
-                                     std::to_string(most));
+        diagnostics_.Add("wrong-label", path, "found a range of " + std::to_string(count) + " labels",
+                         "at most " + std::to_string(most));
         return false;
     }
     labels.reserve(count);
@@ -168,21 +169,21 @@ bool mdf_MeshReader::ReadLabels(std::vector<int>& labels, mdf_Value& json, const
     return true;
 }
 
-void mdf_MeshReader::ReadElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly) {
+void mdf_MeshReader::ReadElements(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path, bool inAssembly) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array of element classes");
         return;
     }
     if (json.Kind() != mdf_Kind::Array) {
-        if (!json.Empty()) diagnostics_.Expected(mdf_Path(path, std::size_t{0}), json.Item(0), "an object");
+        if (!json.Empty()) diagnostics_.Expected(fnd_Path(path, std::size_t{0}), json.Item(0), "an object");
         return;
     }
     for (std::size_t i = 0; i < json.Size(); ++i) {
-        ReadElementClass(mesh, json.Items()[i], mdf_Path(path, i), inAssembly);
+        ReadElementClass(mesh, json.Items()[i], fnd_Path(path, i), inAssembly);
     }
 }
 
-void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path,
+void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path,
                                       bool inAssembly) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
@@ -193,47 +194,48 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const md
     mdf_Value* labelsJson = json.Find("labels");
     mdf_Value* connectivity = json.Find("connectivity");
     if (type == nullptr || labelsJson == nullptr || connectivity == nullptr) {
-        diagnostics_.Error(path,
-                           "found an element class without type, labels or connectivity, expected all three");
+        diagnostics_.Add("missing-field", path, "found an element class without type, labels or connectivity",
+                         "all three");
         return;
     }
     if (!type->IsString()) {
-        diagnostics_.Expected(mdf_Path(path, "type"), *type, "the label of an element type");
+        diagnostics_.Expected(fnd_Path(path, "type"), *type, "the label of an element type");
         return;
     }
-    const std::string problem = mdf_NameProblem(type->String());
-    if (!problem.empty()) {
-        diagnostics_.Error(mdf_Path(path, "type"), "found " + problem);
+    const fnd_NameProblem problem = fnd_ProblemOfName(type->String());
+    if (!problem.found.empty()) {
+        diagnostics_.Add("name-in-deck", fnd_Path(path, "type"), "found " + problem.found, problem.expected);
         return;
     }
     if (ddb_ShapeOfLabel(type->String()).unknown) {
-        diagnostics_.Warning(mdf_Path(path, "type"), mdf_Quoted(type->String()) +
-                                                         " is no known element type; it is "
-                                                         "taken for a point element");
+        diagnostics_.Add("unknown-element-type", fnd_Path(path, "type"),
+                         fnd_Quoted(type->String()) +
+                             " is no known element type; it is taken for a point element");
     }
     bme_ElemCtrlParams controls;
     if (const mdf_Value* given = json.Find("controls")) {
-        records_.ReadRecord(controls, *given, mdf_Path(path, "controls"));
+        records_.ReadRecord(controls, *given, fnd_Path(path, "controls"));
     }
-    const mdf_Path connectivityPath(path, "connectivity");
+    const fnd_Path connectivityPath(path, "connectivity");
     if (!connectivity->IsArray()) {
         diagnostics_.Expected(connectivityPath, *connectivity, "an array of rows of node labels");
         return;
     }
     const std::size_t count = connectivity->Size();
     std::vector<int> labels;
-    if (!ReadLabels(labels, *labelsJson, mdf_Path(path, "labels"), count)) return;
+    if (!ReadLabels(labels, *labelsJson, fnd_Path(path, "labels"), count)) return;
     if (labels.size() != count) {
         const auto counted = [](std::size_t number, const char* thing) {
             return std::to_string(number) + " " + thing + (number == 1 ? "" : "s");
         };
-        diagnostics_.Error(connectivityPath, "found " + counted(count, "row") + " for " +
-                                                 counted(labels.size(), "label") + ", expected one for each");
+        diagnostics_.Add("length-mismatch", connectivityPath,
+                         "found " + counted(count, "row") + " for " + counted(labels.size(), "label"),
+                         "one for each");
         return;
     }
     int width = 0;
     std::vector<int> nodes;
-    mdf_StoreProblems problems(diagnostics_, path);
+    fnd_Below problems(diagnostics_, path);
     if (inAssembly) {
         if (!ReadScopedConnectivity(mesh, *connectivity, connectivityPath, count, width, nodes)) return;
         if (IsIncomplete(&mesh)) return;
@@ -247,7 +249,7 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const md
     }
 }
 
-bool mdf_MeshReader::ReadConnectivity(mdf_Value& json, const mdf_Path& path, std::size_t numElements,
+bool mdf_MeshReader::ReadConnectivity(mdf_Value& json, const fnd_Path& path, std::size_t numElements,
                                       int& width, std::vector<int>& nodes) {
     if (json.Kind() == mdf_Kind::Matrix && json.UniformRowLength() > 0 && json.AllInts()) {
         mdf_MatrixData rows = json.TakeMatrix();
@@ -257,7 +259,7 @@ bool mdf_MeshReader::ReadConnectivity(mdf_Value& json, const mdf_Path& path, std
     }
     bool good = true;
     for (std::size_t i = 0; i < numElements; ++i) {
-        const mdf_Path rowPath(path, i);
+        const fnd_Path rowPath(path, i);
         const mdf_Value row = json.Item(i);
         if (i == 0 && row.IsArray()) width = static_cast<int>(row.Size());
         if (!row.IsArray() || row.Empty() || row.Size() != static_cast<std::size_t>(width)) {
@@ -270,18 +272,18 @@ bool mdf_MeshReader::ReadConnectivity(mdf_Value& json, const mdf_Path& path, std
         }
         for (std::size_t j = 0; j < row.Size(); ++j) {
             if (row.Item(j).IsInt()) continue;
-            diagnostics_.Expected(mdf_Path(rowPath, j), row.Item(j), "a node label");
+            diagnostics_.Expected(fnd_Path(rowPath, j), row.Item(j), "a node label");
             good = false;
         }
     }
     return good && numElements == 0;
 }
 
-bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path,
+bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const fnd_Path& path,
                                             std::size_t numElements, int& width, std::vector<int>& nodes) {
     bool good = true;
     for (std::size_t i = 0; i < numElements; ++i) {
-        const mdf_Path rowPath(path, i);
+        const fnd_Path rowPath(path, i);
         const mdf_Value row = json.Item(i);
         if (i == 0 && row.IsArray()) width = static_cast<int>(row.Size());
         if (!row.IsArray() || row.Empty() || row.Size() != static_cast<std::size_t>(width)) {
@@ -292,7 +294,7 @@ bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& js
             continue;
         }
         for (std::size_t j = 0; j < row.Size(); ++j) {
-            const int node = ReadScopedNode(mesh, row.Item(j), mdf_Path(rowPath, j));
+            const int node = ReadScopedNode(mesh, row.Item(j), fnd_Path(rowPath, j));
             good = good && node >= 0;
             nodes.push_back(node);
         }
@@ -300,7 +302,7 @@ bool mdf_MeshReader::ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& js
     return good;
 }
 
-int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path) {
+int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const fnd_Path& path) {
     if (json.IsInt()) {
         const int node = mesh.FindNode(json.Int());
         if (node < 0 && !IsIncomplete(&mesh))
@@ -321,7 +323,8 @@ int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const
         return -1;
     }
     if (!instance->isPartInstance) {
-        diagnostics_.Error(path, "found " + mdf_Quoted(name) + ", which is no part instance, expected one");
+        diagnostics_.Add("no-such-name", path, "found " + fnd_Quoted(name) + ", which is no part instance",
+                         "one");
         return -1;
     }
     const bool isNumber =
@@ -331,34 +334,35 @@ int mdf_MeshReader::ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const
     if (IsIncomplete(nodes.Referent())) return -1;
     if (label < 1 || label > std::numeric_limits<int>::max() || nodes.IsNull() ||
         nodes->FindNode(static_cast<int>(label)) < 0) {
-        diagnostics_.Error(path, "found node " + mdf_Quoted(digits) +
-                                     ", expected the label of a node of instance " + mdf_Quoted(name));
+        diagnostics_.Add("no-such-label", path, "found node " + fnd_Quoted(digits),
+                         "the label of a node of instance " + fnd_Quoted(name));
         return -1;
     }
     return mesh.AddForeignNode(instance->name, static_cast<int>(label));
 }
 
-bool mdf_MeshReader::ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const mdf_Path& path,
+bool mdf_MeshReader::ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const fnd_Path& path,
                                  mdf_CapitalsCheck& capitals) {
     const int errorsBefore = diagnostics_.NumErrors();
     for (const cls_Field& field : odiK_SetHead::Fields().All())
-        records_.ReadField(head, field, json.Find(field.name), mdf_Path(path, std::string_view(field.name)));
+        records_.ReadField(head, field, json.Find(field.name), fnd_Path(path, std::string_view(field.name)));
     if (head.name.IsEmpty()) return false;
     const std::string name(head.name.View());
-    capitals.Enter(name, mdf_Path(path, "name"), "set", diagnostics_);
+    capitals.Enter(name, fnd_Path(path, "name"), "set", diagnostics_);
     const bool good = diagnostics_.NumErrors() == errorsBefore;
     if (!good) records_.References().NoteWrong(name);
     return good;
 }
 
-bool mdf_MeshReader::ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
+bool mdf_MeshReader::ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const fnd_Path& path,
                                  std::size_t mostLabels) {
     const bool facets = type == res_SetTypeEnm::FACETS;
     const char* const member = facets ? "facets" : "labels";
     mdf_Value* given = json.Find(member);
-    const mdf_Path place(path, std::string_view(member));
+    const fnd_Path place(path, std::string_view(member));
     if (given == nullptr) {
-        diagnostics_.Error(place, std::string("found nothing, expected the ") + member + " of the set");
+        diagnostics_.Add("missing-field", place, "found nothing",
+                         std::string("the ") + member + " of the set");
         return false;
     }
     if (!facets) {
@@ -373,7 +377,7 @@ bool mdf_MeshReader::ReadMembers(Members& members, res_SetTypeEnm type, mdf_Valu
 }
 
 bool mdf_MeshReader::ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json,
-                                const mdf_Path& path) {
+                                const fnd_Path& path) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array of facets [label, face]");
         return false;
@@ -396,21 +400,21 @@ bool mdf_MeshReader::ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_
             const mdf_Value facet = json.Item(i);
             const bool good = facet.IsArray() && facet.Size() == 2 && facet.Item(0).IsInt() &&
                               (facet.Item(1).IsInt() || facet.Item(1).IsString());
-            if (!good) diagnostics_.Expected(mdf_Path(path, i), facet, "a facet [label, face]");
+            if (!good) diagnostics_.Expected(fnd_Path(path, i), facet, "a facet [label, face]");
         }
         return json.Empty();
     }
     for (std::size_t i = 0; i < facets.size(); ++i) {
         // An empty name would read as a number.
         if (facets[i].face.data() == nullptr || !facets[i].face.empty()) continue;
-        diagnostics_.Error(mdf_Path(path, i), "found an empty face, expected a face name or a number");
+        diagnostics_.Add("no-such-face", fnd_Path(path, i), "found an empty face", "a face name or a number");
         return false;
     }
     return true;
 }
 
 template <class Reader>
-void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Reader& read) {
+void mdf_MeshReader::ForEachSet(mdf_Value& json, const fnd_Path& path, const Reader& read) {
     if (!json.IsArray() || (json.Kind() != mdf_Kind::Array && !json.Empty())) {
         diagnostics_.Expected(path, json, "an array of sets");
         return;
@@ -418,7 +422,7 @@ void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Rea
     mdf_CapitalsCheck capitals;
     for (std::size_t i = 0; i < json.Size(); ++i) {
         mdf_Value& set = json.Items()[i];
-        const mdf_Path place(path, i);
+        const fnd_Path place(path, i);
         odiK_SetHead head;
         if (!set.IsObject()) {
             diagnostics_.Expected(place, set, "an object");
@@ -428,12 +432,12 @@ void mdf_MeshReader::ForEachSet(mdf_Value& json, const mdf_Path& path, const Rea
     }
 }
 
-void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path) {
-    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const odiK_SetHead& head) {
+void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path) {
+    ForEachSet(json, path, [&](mdf_Value& set, const fnd_Path& place, const odiK_SetHead& head) {
         const bool facets = head.type == res_SetTypeEnm::FACETS;
         mdf_CheckMembers(diagnostics_, set,
                          mdf_MembersOf(odiK_SetHead::Fields(), {facets ? "facets" : "labels"}), place);
-        mdf_StoreProblems problems(diagnostics_, place);
+        fnd_Below problems(diagnostics_, place);
         if (IsIncomplete(&mesh)) {
             mesh.AddSet({head.name, head.type, head.internal, {}, {}}, problems);
             return;
@@ -444,44 +448,46 @@ void mdf_MeshReader::ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& 
             records_.References().NoteWrong(head.name.View());
             return;
         }
-        if (members.empty) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
+        if (members.empty)
+            diagnostics_.Add("empty-set", place, "the set is empty, and will not stand in the deck");
         mesh.AddSet({head.name, head.type, head.internal, members.labels, members.facets}, problems);
     });
 }
 
-void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const mdf_Path& path) {
-    ForEachSet(json, path, [&](mdf_Value& set, const mdf_Path& place, const odiK_SetHead& head) {
+void mdf_MeshReader::ReadAssemblySets(mdf_Value& json, const fnd_Path& path) {
+    ForEachSet(json, path, [&](mdf_Value& set, const fnd_Path& place, const odiK_SetHead& head) {
         mdf_CheckMembers(diagnostics_, set, mdf_MembersOf(odiK_SetHead::Fields(), {"members"}), place);
         mdf_Value* entries = set.Find("members");
-        const mdf_Path entriesPath(place, "members");
+        const fnd_Path entriesPath(place, "members");
         if (entries == nullptr || !entries->IsArray() ||
             (entries->Kind() != mdf_Kind::Array && !entries->Empty())) {
-            diagnostics_.Error(
-                entriesPath, "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)) +
-                                 ", expected an array of members");
+            diagnostics_.Add("missing-field", entriesPath,
+                             "found " + (entries == nullptr ? std::string("nothing") : mdf_Shown(*entries)),
+                             "an array of members");
             records_.References().NoteWrong(head.name.View());
             return;
         }
-        if (entries->Empty()) diagnostics_.Warning(place, "the set is empty, and will not stand in the deck");
+        if (entries->Empty())
+            diagnostics_.Add("empty-set", place, "the set is empty, and will not stand in the deck");
         std::vector<Members> members(entries->Size());
         std::vector<odiK_MemberInput> inputs;
         bool good = true;
         for (std::size_t m = 0; m < entries->Size(); ++m) {
             odiK_MemberInput& input = inputs.emplace_back();
-            good = ReadEntry(input, members[m], head.type, entries->Items()[m], mdf_Path(entriesPath, m)) &&
+            good = ReadEntry(input, members[m], head.type, entries->Items()[m], fnd_Path(entriesPath, m)) &&
                    good;
         }
         if (!good) {
             records_.References().NoteWrong(head.name.View());
             return;
         }
-        mdf_StoreProblems problems(diagnostics_, place);
+        fnd_Below problems(diagnostics_, place);
         model_.AddAssemblySet(head.name, head.type, head.internal, inputs, problems);
     });
 }
 
 bool mdf_MeshReader::ReadEntry(odiK_MemberInput& input, Members& members, res_SetTypeEnm type,
-                               mdf_Value& json, const mdf_Path& path) {
+                               mdf_Value& json, const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return false;
@@ -489,7 +495,7 @@ bool mdf_MeshReader::ReadEntry(odiK_MemberInput& input, Members& members, res_Se
     const bool facets = type == res_SetTypeEnm::FACETS;
     mdf_CheckMembers(diagnostics_, json, {"instance", facets ? "facets" : "labels"}, path);
     const mdf_Value* instance = json.Find("instance");
-    const mdf_Path instancePath(path, "instance");
+    const fnd_Path instancePath(path, "instance");
     if (instance != nullptr && (!instance->IsString() || instance->String().empty())) {
         diagnostics_.Expected(instancePath, *instance, "the name of an instance");
         return false;
@@ -505,7 +511,7 @@ bool mdf_MeshReader::ReadEntry(odiK_MemberInput& input, Members& members, res_Se
     const std::size_t most = type == res_SetTypeEnm::NODES ? NumNodes(mesh) : NumElements(mesh);
     if (!ReadMembers(members, type, json, path, most)) return false;
     if (members.empty) {
-        diagnostics_.Error(path, "found an entry without members, expected at least one");
+        diagnostics_.Add("empty-entry", path, "found an entry without members", "at least one");
         return false;
     }
     input.labels = members.labels;

@@ -11,11 +11,11 @@ public:
         : model_(model), records_(records), diagnostics_(diagnostics) {}
 
     /// The mesh of a part or an instance.
-    cow_CountedHld<odiK_Mesh> ReadMesh(mdf_Value& json, const mdf_Path& path);
+    cow_CountedHld<odiK_Mesh> ReadMesh(mdf_Value& json, const fnd_Path& path);
     /// The assembly's own mesh: no sets, and ends of elements may lie in instances, which must be there.
-    void ReadAssemblyMesh(mdf_Value& json, const mdf_Path& path);
+    void ReadAssemblyMesh(mdf_Value& json, const fnd_Path& path);
     /// The sets of the assembly.
-    void ReadAssemblySets(mdf_Value& json, const mdf_Path& path);
+    void ReadAssemblySets(mdf_Value& json, const fnd_Path& path);
 
 private:
     struct Members {
@@ -25,29 +25,29 @@ private:
         bool empty = true;
     };
 
-    void ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
-    void ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
-    void ReadElements(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
-    void ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path, bool inAssembly);
-    bool ReadConnectivity(mdf_Value& json, const mdf_Path& path, std::size_t numElements, int& width,
+    void ReadNodesAndElements(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path, bool inAssembly);
+    void ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path);
+    void ReadElements(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path, bool inAssembly);
+    void ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path, bool inAssembly);
+    bool ReadConnectivity(mdf_Value& json, const fnd_Path& path, std::size_t numElements, int& width,
                           std::vector<int>& nodes);
-    bool ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path,
+    bool ReadScopedConnectivity(odiK_Mesh& mesh, const mdf_Value& json, const fnd_Path& path,
                                 std::size_t numElements, int& width, std::vector<int>& nodes);
-    int ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const mdf_Path& path);
+    int ReadScopedNode(odiK_Mesh& mesh, const mdf_Value& json, const fnd_Path& path);
     /// Calls `read(set, path, head)` for each set whose head is good.
     template <class Reader>
-    void ForEachSet(mdf_Value& json, const mdf_Path& path, const Reader& read);
-    void ReadSets(odiK_Mesh& mesh, mdf_Value& json, const mdf_Path& path);
-    bool ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const mdf_Path& path,
+    void ForEachSet(mdf_Value& json, const fnd_Path& path, const Reader& read);
+    void ReadSets(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path);
+    bool ReadSetHead(odiK_SetHead& head, const mdf_Value& json, const fnd_Path& path,
                      mdf_CapitalsCheck& capitals);
-    bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const mdf_Path& path,
+    bool ReadMembers(Members& members, res_SetTypeEnm type, mdf_Value& json, const fnd_Path& path,
                      std::size_t mostLabels);
     /// One entry of a set of the assembly; the members must outlive the input.
     bool ReadEntry(odiK_MemberInput& input, Members& members, res_SetTypeEnm type, mdf_Value& json,
-                   const mdf_Path& path);
-    bool ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json, const mdf_Path& path);
+                   const fnd_Path& path);
+    bool ReadFacets(std::vector<odiK_FacetInput>& facets, const mdf_Value& json, const fnd_Path& path);
     /// `most` is the largest number of labels that can be right, so that a wild range costs nothing.
-    bool ReadLabels(std::vector<int>& labels, mdf_Value& json, const mdf_Path& path, std::size_t most);
+    bool ReadLabels(std::vector<int>& labels, mdf_Value& json, const fnd_Path& path, std::size_t most);
 
     bool IsIncomplete(const odiK_Mesh* mesh) const { return incomplete_.count(mesh) != 0; }
 

@@ -1,6 +1,7 @@
 #ifndef QRX_MODEL_FILE_MDF_MODELFILE_H
 #define QRX_MODEL_FILE_MDF_MODELFILE_H
 
+#include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odb_Odb.h"
 
 #include <iosfwd>
@@ -12,27 +13,20 @@
 /// What model files say that they are.
 inline constexpr char mdf_kFormat[] = "qrx-model/1";
 
-/// Something to say about a model file. Syntax errors have a line and a column, both from 1; all else has a
-/// JSON pointer (RFC 6901), "" for the whole file, and line 0.
-struct mdf_Message {
-    bool isError = true;
-    std::string pointer;
-    long line = 0;
-    long column = 0;
-    std::string text;
-};
-
-/// Everything that was found in one file, in the order of reading. Errors beyond the fiftieth are not kept.
+/// Everything that was found in one file, in the order of reading. Errors of syntax have a line and a column.
+/// Errors beyond the fiftieth are not kept.
 struct mdf_Report {
     std::string fileName;
-    std::vector<mdf_Message> messages;
-    /// The file itself could not be read; the one message says why.
+    std::vector<fnd_Finding> findings;
+    /// The file itself could not be read; the one finding says why.
     bool unreadable = false;
 
     bool HasErrors() const;
     /// "model.json:3:14: error: text", or "model.json: error: /models/A: text".
-    std::string Line(const mdf_Message& message) const;
+    std::string Line(const fnd_Finding& finding) const;
 };
+/// The same of any file.
+std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding);
 
 /// Reads a model file, or its text, into a store. Null when there are errors; warnings alone don't hinder.
 /// The store's models are complete: every name is resolved and every status is known.

@@ -1,8 +1,6 @@
 #include "model_file/mdf_ModelReader.h"
 
-#include "model_file/checks/mdf_ConstraintChecks.h"
-#include "model_file/checks/mdf_InteractionChecks.h"
-#include "model_file/checks/mdf_MaterialChecks.h"
+#include "store_interface/model/odiK_ModelRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 namespace {
@@ -15,7 +13,7 @@ std::vector<std::string> ModelMembers(const odiK_Model& model) {
 
 } // namespace
 
-void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
+void mdf_ModelReader::Read(mdf_Value& json, const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
@@ -25,7 +23,7 @@ void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
     model_.SealInstances();
     for (const odiK_Repository& repository : odiK_Repositories()) {
         const mdf_Value* value = json.Find(repository.member);
-        const mdf_Path place(path, std::string_view(repository.member));
+        const fnd_Path place(path, std::string_view(repository.member));
         if (value == nullptr) continue;
         if (repository.IsInOrder()) {
             ReadSteps(*value, place);
@@ -35,30 +33,29 @@ void mdf_ModelReader::Read(mdf_Value& json, const mdf_Path& path) {
     }
     if (!model_.cyclicSymmetry.IsNull() &&
         model_.cyclicSymmetry.ConstGet().symmetryType == calC_SymmetryTypeEnm::NONE) {
-        diagnostics_.Warning(mdf_Path(path, "cyclicSymmetry"),
-                             "the sector definition is idle, since symmetryType is NONE");
+        diagnostics_.Add("idle-sector", fnd_Path(path, "cyclicSymmetry"),
+                         "the sector definition is idle, since symmetryType is NONE");
     }
     records_.References().Check();
-    mdf_CheckGasketOptions(model_, diagnostics_, path);
-    mdf_CheckEquationSystems(model_, diagnostics_, path);
-    mdf_CheckGeneralContact(model_, diagnostics_, path);
+    fnd_Below problems(diagnostics_, path);
+    odiK_CheckModelRules(model_, problems);
     tree_.CheckAttributes();
     Propagate(path);
     if (diagnostics_.NumErrors() > 0) return;
 
-    mdf_StoreProblems problems(diagnostics_, path);
     model_.CompleteTree(problems);
     model_.SetComplete();
 }
 
-bool mdf_ModelReader::CheckName(const std::string& name, const mdf_Path& path) {
-    const std::string problem = mdf_NameProblem(name);
-    if (!problem.empty()) diagnostics_.Error(path, "found " + problem);
-    return problem.empty();
+bool mdf_ModelReader::CheckName(const std::string& name, const fnd_Path& path) {
+    const fnd_NameProblem problem = fnd_ProblemOfName(name);
+    if (!problem.found.empty())
+        diagnostics_.Add("name-in-deck", path, "found " + problem.found, problem.expected);
+    return problem.found.empty();
 }
 
 void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Value& json,
-                                     const mdf_Path& path) {
+                                     const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, std::string("an object, each member ") + info.singular);
         return;
@@ -68,7 +65,7 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
     mdl_Repository& repository = info.In(model_);
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
-        const mdf_Path place(path, member.name);
+        const fnd_Path place(path, member.name);
         if (!CheckName(member.name, place)) continue;
         capitals.Enter(member.name, place, "name", diagnostics_);
         const std::unique_ptr<cls_Record> record =
@@ -80,37 +77,37 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
         const mdf_Value* states = info.IsPropagating() ? member.value.Find("states") : nullptr;
         if (states != nullptr) {
             records_.ReadStates(static_cast<kprC_PropagatingObject&>(*record), *states,
-                                mdf_Path(place, "states"));
+                                fnd_Path(place, "states"));
         }
         repository.InsertRecord(cow_String(member.name), *record);
     }
 }
 
-void mdf_ModelReader::ReadSteps(const mdf_Value& json, const mdf_Path& path) {
+void mdf_ModelReader::ReadSteps(const mdf_Value& json, const fnd_Path& path) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array of steps");
         return;
     }
     mdf_CapitalsCheck capitals;
-    for (std::size_t i = 0; i < json.Size(); ++i) ReadStep(json.Item(i), i == 0, mdf_Path(path, i), capitals);
+    for (std::size_t i = 0; i < json.Size(); ++i) ReadStep(json.Item(i), i == 0, fnd_Path(path, i), capitals);
 }
 
-void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const mdf_Path& path,
+void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const fnd_Path& path,
                                mdf_CapitalsCheck& capitals) {
-    const mdf_Path namePath(path, "name");
-    const mdf_Path classPath(path, "class");
+    const fnd_Path namePath(path, "name");
+    const fnd_Path classPath(path, "class");
     std::unique_ptr<cls_Record> record;
     if (json.IsObject() && json.Find("class") == nullptr) {
-        diagnostics_.Error(classPath, "found nothing, expected the class of the step");
+        diagnostics_.Add("missing-field", classPath, "found nothing", "the class of the step");
     } else {
         record = records_.NewVariant(kprC_Step::TypeId(), json, path);
     }
     if (!json.IsObject()) return;
     const mdf_Value* given = json.Find("name");
     if (given == nullptr || !given->IsString()) {
-        diagnostics_.Error(namePath, "found " +
-                                         (given == nullptr ? std::string("nothing") : mdf_Shown(*given)) +
-                                         ", expected the name of the step");
+        diagnostics_.Add("missing-field", namePath,
+                         "found " + (given == nullptr ? std::string("nothing") : mdf_Shown(*given)),
+                         "the name of the step");
         return;
     }
     const std::string& name = given->String();
@@ -122,35 +119,32 @@ void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const mdf_Pa
     if (!CheckName(name, namePath)) return;
     capitals.Enter(name, namePath, "step", diagnostics_);
     if (model_.steps.IsMember(cow_String(name))) {
-        diagnostics_.Error(namePath, "found a second step named " + mdf_Quoted(name) +
-                                         ", expected names that are unique");
+        diagnostics_.Add("duplicate-name", namePath, "found a second step named " + fnd_Quoted(name),
+                         "names that are unique");
         return;
     }
     const bool isInitial = record->DynTypeId() == kprC_InitialStep::TypeId();
     if (isInitial && !isFirst) {
-        diagnostics_.Error(classPath,
-                           "found a second kprC_InitialStep, expected it in the first place alone");
+        diagnostics_.Add("initial-step", classPath, "found a second kprC_InitialStep",
+                         "it in the first place alone");
     } else if (isFirst && !isInitial) {
-        diagnostics_.Error(classPath, "found " +
-                                          mdf_Quoted(cls_Classes().NameOf(record->DynTypeId()).View()) +
-                                          ", expected kprC_InitialStep as the first step");
+        diagnostics_.Add("initial-step", classPath,
+                         "found " + fnd_Quoted(cls_Classes().NameOf(record->DynTypeId()).View()),
+                         "kprC_InitialStep as the first step");
     }
     model_.steps.Append(cow_String(name), static_cast<const kprC_Step&>(*record));
 }
 
-void mdf_ModelReader::Propagate(const mdf_Path& path) {
+void mdf_ModelReader::Propagate(const fnd_Path& path) {
     for (const odiK_Repository& info : odiK_Repositories()) {
         if (!info.IsPropagating()) continue;
         mdl_Repository& repository = info.In(model_);
-        const mdf_Path container(path, std::string_view(info.member));
+        const fnd_Path container(path, std::string_view(info.member));
         for (const cow_String& name : repository.Keys()) {
             auto& object = static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name));
-            const mdf_Path place(container, name.View());
-            const mdf_Path states(place, "states");
-            for (const mdl_PropagationProblem& problem : object.Propagate(model_.steps)) {
-                diagnostics_.Error(mdf_Path(states, problem.stepName.View()),
-                                   "found " + std::string(problem.text.View()));
-            }
+            const fnd_Path place(container, name.View());
+            fnd_Below below(diagnostics_, place);
+            for (fnd_Finding& problem : object.Propagate(model_.steps)) below.Take(std::move(problem));
         }
     }
 }

@@ -11,14 +11,14 @@ public:
         : model_(model), diagnostics_(diagnostics), records_(model, diagnostics),
           tree_(model, records_, diagnostics) {}
 
-    void Read(mdf_Value& json, const mdf_Path& path);
+    void Read(mdf_Value& json, const fnd_Path& path);
 
 private:
-    void ReadRepository(const odiK_Repository& info, const mdf_Value& json, const mdf_Path& path);
-    void ReadSteps(const mdf_Value& json, const mdf_Path& path);
-    void ReadStep(const mdf_Value& json, bool isFirst, const mdf_Path& path, mdf_CapitalsCheck& capitals);
-    void Propagate(const mdf_Path& path);
-    bool CheckName(const std::string& name, const mdf_Path& path);
+    void ReadRepository(const odiK_Repository& info, const mdf_Value& json, const fnd_Path& path);
+    void ReadSteps(const mdf_Value& json, const fnd_Path& path);
+    void ReadStep(const mdf_Value& json, bool isFirst, const fnd_Path& path, mdf_CapitalsCheck& capitals);
+    void Propagate(const fnd_Path& path);
+    bool CheckName(const std::string& name, const fnd_Path& path);
 
     odiK_Model& model_;
     mdf_Diagnostics& diagnostics_;

@@ -68,7 +68,7 @@ bool WrittenAsInteger(std::string_view number) {
 /// Makes the tree from the library's events.
 class mdf_Builder {
 public:
-    mdf_Builder(Cursor& cursor, mdf_Value& root, std::vector<mdf_Error>& errors)
+    mdf_Builder(Cursor& cursor, mdf_Value& root, std::vector<fnd_Finding>& errors)
         : cursor_(cursor), root_(root), errors_(errors) {}
 
     bool null() { return Other(mdf_Value()); }
@@ -120,7 +120,7 @@ private:
 
     Cursor& cursor_;
     mdf_Value& root_;
-    std::vector<mdf_Error>& errors_;
+    std::vector<fnd_Finding>& errors_;
     /// The arrays and objects that are open, outermost first; the last member of an open object is the one
     /// whose value is being read.
     std::vector<mdf_Value> frames_;
@@ -289,17 +289,16 @@ bool mdf_Builder::end_object() {
         std::string pointer;
         for (const mdf_Value& frame : frames_) {
             if (frame.IsObject())
-                mdf_AppendPointer(pointer, frame.Members().back().name);
+                fnd_AppendPointer(pointer, frame.Members().back().name);
             else
-                mdf_AppendPointer(pointer, frame.Size());
+                fnd_AppendPointer(pointer, std::to_string(frame.Size()));
         }
         for (const std::string& name : repeated) {
             if (errors_.size() >= mdf_maxErrors) break;
-            mdf_Error& error = errors_.emplace_back();
-            error.pointer = pointer;
-            mdf_AppendPointer(error.pointer, name);
-            error.text =
-                "the member " + mdf_QuotedToken(name) + " stands more than once; expected names that differ";
+            fnd_Finding& error = errors_.emplace_back(fnd_Make(
+                "duplicate-member", pointer, "the member " + mdf_QuotedToken(name) + " stands more than once",
+                "names that differ"));
+            fnd_AppendPointer(error.place, name);
         }
     }
     return Other(std::move(object));
@@ -345,13 +344,12 @@ bool mdf_Builder::end_array() {
 
 void mdf_Builder::SyntaxError(std::size_t offset, std::string text) {
     const std::string_view before = Text().substr(0, offset);
-    mdf_Error& error = errors_.emplace_back();
+    fnd_Finding& error = errors_.emplace_back(fnd_Make("syntax", {}, std::move(text)));
     const std::size_t newline = before.rfind('\n');
     std::size_t lineBegin = newline == std::string_view::npos ? 0 : newline + 1;
     if (lineBegin == 0 && before.starts_with(byteOrderMark)) lineBegin = byteOrderMark.size();
     error.line = 1 + static_cast<long>(std::count(before.begin(), before.end(), '\n'));
     error.column = 1 + static_cast<long>(offset - lineBegin);
-    error.text = std::move(text);
 }
 
 void mdf_Builder::Note(Event event) {
@@ -436,31 +434,7 @@ bool mdf_Builder::parse_error(std::size_t, const std::string&, const nlohmann::d
     return false;
 }
 
-std::string mdf_Error::Message(std::string_view fileName) const {
-    std::string message(fileName);
-    if (line > 0) message.append(":").append(std::to_string(line)).append(":").append(std::to_string(column));
-    message += ": ";
-    if (!pointer.empty()) message += pointer + ": ";
-    return message + text;
-}
-
-void mdf_AppendPointer(std::string& pointer, std::string_view token) {
-    pointer += '/';
-    for (const char c : token) {
-        if (c == '~')
-            pointer += "~0";
-        else if (c == '/')
-            pointer += "~1";
-        else
-            pointer += c;
-    }
-}
-
-void mdf_AppendPointer(std::string& pointer, std::size_t index) {
-    pointer += '/' + std::to_string(index);
-}
-
-bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<mdf_Error>& errors) {
+bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors) {
     const std::size_t errorsBefore = errors.size();
     root = mdf_Value();
     Cursor cursor{text.data(), text.data(), text.data() + text.size()};
@@ -477,11 +451,11 @@ bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<mdf_Error>& e
     return errors.size() == errorsBefore;
 }
 
-bool mdf_ReadFile(const std::string& path, std::string& text, mdf_Error& error) {
+bool mdf_ReadFile(const std::string& path, std::string& text, fnd_Finding& error) {
     const auto fail = [&](int number) {
         text.clear();
-        error = mdf_Error();
-        error.text = std::string("the file can't be read: ") + std::generic_category().message(number);
+        error = fnd_Make("unreadable-file", {},
+                         std::string("the file can't be read: ") + std::generic_category().message(number));
         return false;
     };
     errno = 0;

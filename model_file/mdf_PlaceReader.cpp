@@ -10,7 +10,7 @@ std::string Text(const cow_String& text) {
 
 } // namespace
 
-bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const mdf_Path& path) {
+bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const fnd_Path& path) {
     if (json.IsNull()) {
         datum = {};
         return true;
@@ -19,21 +19,20 @@ bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, con
     for (const odiK_Datum& known : model_.Datums()) names.push_back(Text(known.name));
     if (json.IsString()) datum = model_.FindDatum(cow_String(json.String()));
     if (json.IsString() && (!datum.IsNullRef() || references_.IsWrong(json.String()))) return true;
-    diagnostics_.Expected(path, json,
-                          "the name of a datum, or null" +
-                              (json.IsString() ? mdf_DidYouMean(json.String(), names) : std::string()));
+    diagnostics_.Expected(path, json, "the name of a datum, or null",
+                          json.IsString() ? fnd_DidYouMean(json.String(), names) : std::string());
     return false;
 }
 
-void mdf_PlaceReader::ReportNoInstance(const std::string& name, const mdf_Path& path) {
+void mdf_PlaceReader::ReportNoInstance(const std::string& name, const fnd_Path& path) {
     if (references_.IsWrong(name)) return;
     std::vector<std::string> names;
     for (const auto& [known, entry] : model_.Instances()) names.push_back(Text(known));
-    diagnostics_.Error(path, "found instance " + mdf_Quoted(name) + ", expected the name of an instance" +
-                                 mdf_DidYouMean(name, names));
+    diagnostics_.Add("no-such-name", path, "found instance " + fnd_Quoted(name), "the name of an instance",
+                     fnd_DidYouMean(name, names));
 }
 
-bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const mdf_Path& path) {
+bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const fnd_Path& path) {
     const std::string& given = text.String();
     const std::size_t dot = given.find('.');
     if (dot == std::string::npos) {
@@ -48,7 +47,7 @@ bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const
     return true;
 }
 
-bool mdf_PlaceReader::ReadNames(Names& names, const mdf_Value& value, const mdf_Path& path) {
+bool mdf_PlaceReader::ReadNames(Names& names, const mdf_Value& value, const fnd_Path& path) {
     if (value.IsString()) return ReadDottedNames(names, value, path);
     if (!value.IsObject()) {
         diagnostics_.Expected(path, value, "\"SET\", \"INSTANCE.SET\", an object of both names, or null");
@@ -60,17 +59,17 @@ bool mdf_PlaceReader::ReadNames(Names& names, const mdf_Value& value, const mdf_
         const mdf_Value* name = value.Find(member);
         if (name == nullptr) continue;
         if (!name->IsString()) {
-            diagnostics_.Expected(mdf_Path(path, std::string_view(member)), *name, "a name");
+            diagnostics_.Expected(fnd_Path(path, std::string_view(member)), *name, "a name");
             return false;
         }
         *target = name->String();
     }
     if (value.Find("set") != nullptr) return true;
-    diagnostics_.Error(mdf_Path(path, "set"), "found nothing, expected the name of a set");
+    diagnostics_.Add("missing-field", fnd_Path(path, "set"), "found nothing", "the name of a set");
     return false;
 }
 
-rgnC_Region mdf_PlaceReader::ReadRegion(const mdf_Value& value, const mdf_Path& path) {
+rgnC_Region mdf_PlaceReader::ReadRegion(const mdf_Value& value, const fnd_Path& path) {
     Names names;
     if (value.IsNull() || !ReadNames(names, value, path)) return {};
     rgnC_Region region = model_.FindRegion(cow_String(names.instance), cow_String(names.set));
@@ -78,7 +77,7 @@ rgnC_Region mdf_PlaceReader::ReadRegion(const mdf_Value& value, const mdf_Path& 
     return region;
 }
 
-void mdf_PlaceReader::ReportNoSet(const Names& names, const mdf_Path& path) {
+void mdf_PlaceReader::ReportNoSet(const Names& names, const fnd_Path& path) {
     const odiK_Instance* owner = model_.FindInstance(cow_String(names.instance));
     if (!names.instance.empty() && owner == nullptr) {
         ReportNoInstance(names.instance, path);
@@ -91,8 +90,8 @@ void mdf_PlaceReader::ReportNoSet(const Names& names, const mdf_Path& path) {
     for (const auto& set : owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets()) {
         known.push_back(Text(set->name));
     }
-    diagnostics_.Error(path,
-                       "found set " + mdf_Quoted(names.set) + ", expected the name of a set of " +
-                           (owner == nullptr ? "the assembly" : "instance " + mdf_Quoted(names.instance)) +
-                           mdf_DidYouMean(names.set, known));
+    diagnostics_.Add("no-such-set", path, "found set " + fnd_Quoted(names.set),
+                     "the name of a set of " +
+                         (owner == nullptr ? "the assembly" : "instance " + fnd_Quoted(names.instance)),
+                     fnd_DidYouMean(names.set, known));
 }

@@ -9,10 +9,10 @@ public:
     mdf_PlaceReader(odiK_Model& model, const mdf_References& references, mdf_Diagnostics& diagnostics)
         : model_(model), references_(references), diagnostics_(diagnostics) {}
 
-    rgnC_Region ReadRegion(const mdf_Value& value, const mdf_Path& path);
-    bool ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const mdf_Path& path);
+    rgnC_Region ReadRegion(const mdf_Value& value, const fnd_Path& path);
+    bool ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const fnd_Path& path);
     /// Reports that there is no instance of the name.
-    void ReportNoInstance(const std::string& name, const mdf_Path& path);
+    void ReportNoInstance(const std::string& name, const fnd_Path& path);
 
 private:
     struct Names {
@@ -20,9 +20,9 @@ private:
         std::string set;
     };
 
-    bool ReadNames(Names& names, const mdf_Value& value, const mdf_Path& path);
-    bool ReadDottedNames(Names& names, const mdf_Value& text, const mdf_Path& path);
-    void ReportNoSet(const Names& names, const mdf_Path& path);
+    bool ReadNames(Names& names, const mdf_Value& value, const fnd_Path& path);
+    bool ReadDottedNames(Names& names, const mdf_Value& text, const fnd_Path& path);
+    void ReportNoSet(const Names& names, const fnd_Path& path);
 
     odiK_Model& model_;
     const mdf_References& references_;

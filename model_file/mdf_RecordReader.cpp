@@ -1,6 +1,6 @@
 #include "model_file/mdf_RecordReader.h"
 
-#include "model_file/checks/mdf_RecordChecks.h"
+#include "store_interface/findings/fnd_RecordRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
@@ -23,7 +23,7 @@ std::vector<std::string> WordsOf(const cls_Field& enumField) {
 
 } // namespace
 
-void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, const mdf_Path& path,
+void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, const fnd_Path& path,
                                   const std::vector<std::string>& others) {
     if (!object.IsObject()) {
         diagnostics_.Expected(path, object, "an object");
@@ -35,21 +35,21 @@ void mdf_RecordReader::ReadRecord(cls_Record& record, const mdf_Value& object, c
     for (const cls_Field& field : record.DynFields().All()) {
         if (field.notModelData || std::find(others.begin(), others.end(), field.name) != others.end())
             continue;
-        const bool taken = ReadField(record, field, object.Find(field.name), mdf_Path(path, field.name));
+        const bool taken = ReadField(record, field, object.Find(field.name), fnd_Path(path, field.name));
         if (!taken && field.type->Kind() == cls_FieldKind::Table) refusedTables.push_back(&field);
     }
     for (const cls_Field* field : refusedTables) {
-        const std::string hint = mdf_RecordChecks::All().TableHint(record, field->name);
-        if (!hint.empty()) diagnostics_.Error(mdf_Path(path, field->name), hint);
+        const std::string hint = fnd_RecordRules::All().TableHint(record, field->name);
+        if (!hint.empty()) diagnostics_.Add("table-columns", fnd_Path(path, field->name), hint);
     }
     for (const cls_Field& field : record.DynFields().All()) CompleteList(field, record, path);
     if (diagnostics_.NumErrors() != errorsBefore) return;
-    mdf_RecordCheck check(diagnostics_, path);
-    mdf_RecordChecks::All().Run(record, check);
+    fnd_RecordCheck check(diagnostics_, path);
+    fnd_RecordRules::All().Run(record, check);
 }
 
 bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, const mdf_Value* json,
-                                 const mdf_Path& path) {
+                                 const fnd_Path& path) {
     if (json != nullptr) {
         const bool mayBeUnset = cls_IsUnset(*field.type, field.In(record));
         if (!ReadValue(*field.type, field.In(record), *json, path, field, mayBeUnset)) return false;
@@ -62,14 +62,14 @@ bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, con
     const bool missing =
         json == nullptr || json->IsNull() || (isText && json->IsString() && json->String().empty());
     if (missing) {
-        diagnostics_.Error(path, "found nothing, expected " +
-                                     (field.wordsOnly ? mdf_OneOf(WordsOf(field)) : std::string(field.doc)));
+        diagnostics_.Add("missing-field", path, "found nothing",
+                         (field.wordsOnly ? fnd_OneOf(WordsOf(field)) : std::string(field.doc)));
     }
     return true;
 }
 
 std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const mdf_Value& object,
-                                                         const mdf_Path& path) {
+                                                         const fnd_Path& path) {
     if (!object.IsObject()) {
         diagnostics_.Expected(path, object, "an object");
         return nullptr;
@@ -79,11 +79,11 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     names.reserve(classes.size());
     for (const cls_ClassEntry* entry : classes) names.emplace_back(entry->info.name);
     const mdf_Value* name = object.Find("class");
-    const mdf_Path place(path, "class");
+    const fnd_Path place(path, "class");
     if (name == nullptr) {
         if (classes.size() == 1) return std::unique_ptr<cls_Record>(classes.front()->create());
-        diagnostics_.Error(place, "found nothing, expected " +
-                                      (names.empty() ? std::string("no object here") : mdf_OneOf(names)));
+        diagnostics_.Add("missing-field", place, "found nothing",
+                         (names.empty() ? std::string("no object here") : fnd_OneOf(names)));
         return nullptr;
     }
     if (!name->IsString()) {
@@ -93,14 +93,13 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     for (const cls_ClassEntry* entry : classes) {
         if (name->String() == entry->info.name) return std::unique_ptr<cls_Record>(entry->create());
     }
-    diagnostics_.Expected(place, *name,
-                          (names.empty() ? "no object here" : mdf_OneOf(names)) +
-                              mdf_DidYouMean(name->String(), names));
+    diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names)),
+                          fnd_DidYouMean(name->String(), names));
     return nullptr;
 }
 
 std::unique_ptr<cls_Record> mdf_RecordReader::ReadVariant(unsigned base, const mdf_Value& object,
-                                                          const mdf_Path& path,
+                                                          const fnd_Path& path,
                                                           const std::vector<std::string>& others) {
     std::unique_ptr<cls_Record> record = NewVariant(base, object, path);
     if (record == nullptr) return nullptr;
@@ -110,7 +109,7 @@ std::unique_ptr<cls_Record> mdf_RecordReader::ReadVariant(unsigned base, const m
     return record;
 }
 
-bool mdf_RecordReader::ReadText(cow_String& text, const mdf_Value& value, const mdf_Path& path) {
+bool mdf_RecordReader::ReadText(cow_String& text, const mdf_Value& value, const fnd_Path& path) {
     if (value.IsString()) {
         text = cow_String(value.String());
         return true;
@@ -123,7 +122,7 @@ bool mdf_RecordReader::ReadText(cow_String& text, const mdf_Value& value, const 
     for (std::size_t i = 0; i < value.Size(); ++i) {
         const mdf_Value line = value.Item(i);
         if (!line.IsString()) {
-            diagnostics_.Expected(mdf_Path(path, i), line, "a string");
+            diagnostics_.Expected(fnd_Path(path, i), line, "a string");
             return false;
         }
         joined.append(line.String()).append("\n");
@@ -133,7 +132,7 @@ bool mdf_RecordReader::ReadText(cow_String& text, const mdf_Value& value, const 
 }
 
 bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json,
-                                 const mdf_Path& path, const cls_Field& field, bool mayBeUnset) {
+                                 const fnd_Path& path, const cls_Field& field, bool mayBeUnset) {
     switch (type.Kind()) {
     case cls_FieldKind::Bool: return ReadBool(*static_cast<bool*>(value), json, path);
     case cls_FieldKind::Int: return ReadInt(*static_cast<int*>(value), json, path, field, mayBeUnset);
@@ -177,7 +176,7 @@ bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const m
     return false;
 }
 
-bool mdf_RecordReader::ReadBool(bool& value, const mdf_Value& json, const mdf_Path& path) {
+bool mdf_RecordReader::ReadBool(bool& value, const mdf_Value& json, const fnd_Path& path) {
     if (json.IsBool()) {
         value = json.Bool();
     } else {
@@ -186,7 +185,7 @@ bool mdf_RecordReader::ReadBool(bool& value, const mdf_Value& json, const mdf_Pa
     return json.IsBool();
 }
 
-bool mdf_RecordReader::ReadDouble(double& value, const mdf_Value& json, const mdf_Path& path,
+bool mdf_RecordReader::ReadDouble(double& value, const mdf_Value& json, const fnd_Path& path,
                                   bool mayBeUnset) {
     if (json.IsNumber()) {
         value = json.Real();
@@ -200,7 +199,7 @@ bool mdf_RecordReader::ReadDouble(double& value, const mdf_Value& json, const md
     return false;
 }
 
-bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, const mdf_Path& path,
+bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, const fnd_Path& path,
                                   const cls_Field& field) {
     if (field.verbatim) return ReadText(value, json, path);
     if (!field.words.empty()) return ReadWord(value, json, path, field);
@@ -212,9 +211,10 @@ bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, cons
                                                       : "the name of a " + kind);
         return false;
     }
-    const std::string problem = field.nameOf == nullptr ? std::string() : mdf_NameProblem(json.String());
-    if (!problem.empty()) {
-        diagnostics_.Error(path, "found " + problem);
+    const fnd_NameProblem problem =
+        field.nameOf == nullptr ? fnd_NameProblem() : fnd_ProblemOfName(json.String());
+    if (!problem.found.empty()) {
+        diagnostics_.Add("name-in-deck", path, "found " + problem.found, problem.expected);
         return false;
     }
     value = cow_String(json.String());
@@ -222,7 +222,7 @@ bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, cons
     return true;
 }
 
-bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const mdf_Path& path,
+bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const fnd_Path& path,
                                 const cls_Field& field) {
     for (const char* word : field.words) {
         if (!json.IsString() || !omu_EqualInAnyCapitals(json.String(), word)) continue;
@@ -230,12 +230,12 @@ bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const 
         return true;
     }
     const std::vector<std::string> words(field.words.begin(), field.words.end());
-    diagnostics_.Expected(path, json,
-                          mdf_OneOf(words) + (json.IsString() ? mdf_DidYouMean(json.String(), words) : ""));
+    diagnostics_.Expected(path, json, fnd_OneOf(words),
+                          json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }
 
-bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const mdf_Path& path,
+bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const fnd_Path& path,
                                const cls_Field& field, bool mayBeUnset) {
     if (json.IsNull() && mayBeUnset) {
         value = cls_UnsetInt;
@@ -247,7 +247,8 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const mdf_Path
             std::any_of(field.meanings.begin(), field.meanings.end(),
                         [&](const cls_IntMeaning& meaning) { return meaning.value == value; });
         if (!field.meanings.empty() && !listed) {
-            diagnostics_.Warning(path, "found " + std::to_string(value) + ", which has no meaning here");
+            diagnostics_.Add("no-such-meaning", path,
+                             "found " + std::to_string(value) + ", which has no meaning here");
         }
         return true;
     }
@@ -260,16 +261,14 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const mdf_Path
         }
     }
     std::string expected = mayBeUnset ? "an integer of 32 bits or null" : "an integer of 32 bits";
-    if (!words.empty()) {
-        expected += ", or " + mdf_OneOf(words);
-        if (json.IsString()) expected += mdf_DidYouMean(json.String(), words);
-    }
-    diagnostics_.Expected(path, json, expected);
+    if (!words.empty()) expected += ", or " + fnd_OneOf(words);
+    diagnostics_.Expected(path, json, expected,
+                          json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }
 
 bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf_Value& json,
-                                const mdf_Path& path, bool wordsOnly) {
+                                const fnd_Path& path, bool wordsOnly) {
     const omu_EnumTable& table = type.Table();
     const omu_EnumRow* row = nullptr;
     if (json.IsInt() && !wordsOnly) row = table.Row(json.Int());
@@ -284,13 +283,12 @@ bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf
         words.emplace_back(listed.name);
         shown.push_back(std::string(listed.name) + " (" + std::to_string(listed.value) + ")");
     }
-    diagnostics_.Expected(path, json,
-                          mdf_OneOf(wordsOnly ? words : shown) +
-                              (json.IsString() ? mdf_DidYouMean(json.String(), words) : std::string()));
+    diagnostics_.Expected(path, json, fnd_OneOf(wordsOnly ? words : shown),
+                          json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }
 
-bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const mdf_Path& path,
+bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const fnd_Path& path,
                                   bool singlePrecision) {
     if (!json.IsArray() || json.Size() != 3) {
         diagnostics_.Expected(path, json, "three numbers");
@@ -301,7 +299,7 @@ bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const
         const bool tooLarge =
             singlePrecision && item.IsNumber() && std::isinf(static_cast<float>(item.Real()));
         if (!item.IsNumber() || tooLarge) {
-            diagnostics_.Expected(mdf_Path(path, i), item, tooLarge ? kSinglePrecision : "a number");
+            diagnostics_.Expected(fnd_Path(path, i), item, tooLarge ? kSinglePrecision : "a number");
             return false;
         }
         xyz[i] = item.Real();
@@ -309,23 +307,23 @@ bool mdf_RecordReader::ReadTriple(double (&xyz)[3], const mdf_Value& json, const
     return true;
 }
 
-bool mdf_RecordReader::ReadSegment(gsl_ModelSegment& segment, const mdf_Value& json, const mdf_Path& path) {
+bool mdf_RecordReader::ReadSegment(gsl_ModelSegment& segment, const mdf_Value& json, const fnd_Path& path) {
     if (!json.IsArray() || json.Size() != 2) {
         diagnostics_.Expected(path, json, "two points");
         return false;
     }
     double start[3];
     double end[3];
-    if (!ReadTriple(start, json.Item(0), mdf_Path(path, std::size_t{0}), false) ||
-        !ReadTriple(end, json.Item(1), mdf_Path(path, std::size_t{1}), false)) {
+    if (!ReadTriple(start, json.Item(0), fnd_Path(path, std::size_t{0}), false) ||
+        !ReadTriple(end, json.Item(1), fnd_Path(path, std::size_t{1}), false)) {
         return false;
     }
     segment = gsl_ModelSegment({start[0], start[1], start[2]}, {end[0], end[1], end[2]});
     return true;
 }
 
-bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, const mdf_Path& path) {
-    const auto readPart = [&](double& part, const mdf_Value& number, const mdf_Path& place) {
+bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, const fnd_Path& path) {
+    const auto readPart = [&](double& part, const mdf_Value& number, const fnd_Path& place) {
         if (number.IsNumber()) {
             part = number.Real();
         } else {
@@ -335,8 +333,8 @@ bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, co
     };
     value = {};
     if (json.IsArray() && json.Size() == 2) {
-        const bool isRead = readPart(value.real, json.Item(0), mdf_Path(path, std::size_t{0}));
-        return readPart(value.imag, json.Item(1), mdf_Path(path, std::size_t{1})) && isRead;
+        const bool isRead = readPart(value.real, json.Item(0), fnd_Path(path, std::size_t{0}));
+        return readPart(value.imag, json.Item(1), fnd_Path(path, std::size_t{1})) && isRead;
     }
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "two numbers, or an object of \"form\", \"real\" and \"imag\"");
@@ -346,18 +344,18 @@ bool mdf_RecordReader::ReadComplex(omi_complex& value, const mdf_Value& json, co
     bool isRead = true;
     if (const mdf_Value* form = json.Find("form")) {
         const auto& type = static_cast<const cls_EnumType&>(cls_TypeOf<omi_complex::FormEnm>::Instance());
-        isRead = ReadEnum(type, &value.form, *form, mdf_Path(path, "form"), false);
+        isRead = ReadEnum(type, &value.form, *form, fnd_Path(path, "form"), false);
     }
     for (const auto& [name, part] : {std::pair("real", &value.real), std::pair("imag", &value.imag)}) {
         const mdf_Value* number = json.Find(name);
         if (number != nullptr)
-            isRead = readPart(*part, *number, mdf_Path(path, std::string_view(name))) && isRead;
+            isRead = readPart(*part, *number, fnd_Path(path, std::string_view(name))) && isRead;
     }
     return isRead;
 }
 
 bool mdf_RecordReader::ReadTable(const cls_TableType& type, void* value, const mdf_Value& json,
-                                 const mdf_Path& path) {
+                                 const fnd_Path& path) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array of rows of numbers");
         return false;
@@ -371,19 +369,19 @@ bool mdf_RecordReader::ReadTable(const cls_TableType& type, void* value, const m
     for (std::size_t i = 0; i < json.Size(); ++i) {
         const mdf_Value row = json.Item(i);
         if (row.IsArray() && row.Size() == columns) continue;
-        diagnostics_.Expected(mdf_Path(path, i), row,
+        diagnostics_.Expected(fnd_Path(path, i), row,
                               i == 0 ? "a row of numbers"
                                      : "a row of " + std::to_string(columns) + " numbers, as the first one");
         return false;
     }
     cow_2DArray<double> cells(static_cast<int>(json.Size()), static_cast<int>(columns));
     for (std::size_t i = 0; i < json.Size(); ++i) {
-        const mdf_Path rowPath(path, i);
+        const fnd_Path rowPath(path, i);
         const mdf_Value row = json.Item(i);
         for (std::size_t j = 0; j < columns; ++j) {
             const mdf_Value cell = row.Item(j);
             if (!cell.IsNumber()) {
-                diagnostics_.Expected(mdf_Path(rowPath, j), cell, "a number");
+                diagnostics_.Expected(fnd_Path(rowPath, j), cell, "a number");
                 return false;
             }
             cells.Put(static_cast<int>(i), static_cast<int>(j), cell.Real());
@@ -394,7 +392,7 @@ bool mdf_RecordReader::ReadTable(const cls_TableType& type, void* value, const m
 }
 
 bool mdf_RecordReader::ReadList(const cls_ListType& type, void* value, const mdf_Value& json,
-                                const mdf_Path& path, const cls_Field& field) {
+                                const fnd_Path& path, const cls_Field& field) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array");
         return false;
@@ -410,13 +408,13 @@ bool mdf_RecordReader::ReadList(const cls_ListType& type, void* value, const mdf
             *static_cast<double*>(item) = kNullItem;
             continue;
         }
-        ReadValue(type.ItemType(), item, json.Item(i), mdf_Path(path, i), field, false);
+        ReadValue(type.ItemType(), item, json.Item(i), fnd_Path(path, i), field, false);
     }
     return true;
 }
 
 // Runs when all fields are read, since the default items may depend on some of them.
-void mdf_RecordReader::CompleteList(const cls_Field& field, cls_Record& record, const mdf_Path& path) {
+void mdf_RecordReader::CompleteList(const cls_Field& field, cls_Record& record, const fnd_Path& path) {
     if (field.defaultItems == nullptr) return;
     const cow_List<double> defaults = field.defaultItems(record);
     auto& items = *static_cast<cow_List<double>*>(field.In(record));
@@ -429,15 +427,15 @@ void mdf_RecordReader::CompleteList(const cls_Field& field, cls_Record& record, 
     }
     for (int i = defaults.Length(); i < items.Length(); ++i) {
         if (!std::isnan(items.ConstGet(i))) continue;
-        const mdf_Path listPath(path, std::string_view(field.name));
-        diagnostics_.Error(mdf_Path(listPath, static_cast<std::size_t>(i)),
-                           "found null, expected a number: the list has defaults for the first " +
-                               std::to_string(defaults.Length()) + " items only");
+        const fnd_Path listPath(path, std::string_view(field.name));
+        diagnostics_.Add("wrong-value", fnd_Path(listPath, static_cast<std::size_t>(i)), "found null",
+                         "a number: the list has defaults for the first " +
+                             std::to_string(defaults.Length()) + " items only");
     }
 }
 
 bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_Value& json,
-                               const mdf_Path& path, const cls_Field& field) {
+                               const fnd_Path& path, const cls_Field& field) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return false;
@@ -445,11 +443,11 @@ bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_V
     type.Clear(value);
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
-        const mdf_Path place(path, member.name);
+        const fnd_Path place(path, member.name);
         if (field.refersTo == nullptr) {
-            const std::string problem = mdf_NameProblem(member.name);
-            if (!problem.empty()) {
-                diagnostics_.Error(place, "found " + problem);
+            const fnd_NameProblem problem = fnd_ProblemOfName(member.name);
+            if (!problem.found.empty()) {
+                diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
                 continue;
             }
             capitals.Enter(member.name, place, "name", diagnostics_);
@@ -463,7 +461,7 @@ bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_V
 }
 
 bool mdf_RecordReader::ReadHolder(const cls_HolderType& type, void* value, const mdf_Value& json,
-                                  const mdf_Path& path) {
+                                  const fnd_Path& path) {
     if (json.IsNull() && type.Kind() != cls_FieldKind::Record) {
         type.Set(value, nullptr);
         return true;
@@ -479,7 +477,7 @@ bool mdf_RecordReader::ReadHolder(const cls_HolderType& type, void* value, const
 }
 
 mdl_GivenEnm mdf_RecordReader::ReadAttribute(const cls_AttributeType& type, void* attribute,
-                                             const mdf_Value& json, const mdf_Path& path,
+                                             const mdf_Value& json, const fnd_Path& path,
                                              const cls_Field& field) {
     if (json.IsNull()) {
         type.SetState(attribute, static_cast<int>(mdl_PropAttributeStateEnm::CLEARED));
@@ -496,30 +494,30 @@ mdl_GivenEnm mdf_RecordReader::ReadAttribute(const cls_AttributeType& type, void
     mdl_PropAttributeStateEnm state = mdl_PropAttributeStateEnm::NEVER_SET;
     const auto& stateType =
         static_cast<const cls_EnumType&>(cls_TypeOf<mdl_PropAttributeStateEnm>::Instance());
-    if (!ReadEnum(stateType, &state, *json.Find("state"), mdf_Path(path, "state"), false))
+    if (!ReadEnum(stateType, &state, *json.Find("state"), fnd_Path(path, "state"), false))
         return mdl_GivenEnm::ABSENT;
     type.SetState(attribute, static_cast<int>(state));
     const mdf_Value* value = json.Find("value");
     if (value == nullptr) return mdl_GivenEnm::STATE_ONLY;
-    return ReadValue(type.ValueType(), type.WritableValue(attribute), *value, mdf_Path(path, "value"), field,
+    return ReadValue(type.ValueType(), type.WritableValue(attribute), *value, fnd_Path(path, "value"), field,
                      false)
                ? mdl_GivenEnm::AS_IT_STANDS
                : mdl_GivenEnm::ABSENT;
 }
 
 void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Value& states,
-                                  const mdf_Path& path) {
+                                  const fnd_Path& path) {
     if (!states.IsObject()) {
         diagnostics_.Expected(path, states, "an object of states by step");
         return;
     }
     const std::vector<std::string> steps = mdf_Names(model_.steps.Keys());
     for (const mdf_Member& member : states.Members()) {
-        const mdf_Path place(path, member.name);
+        const fnd_Path place(path, member.name);
         if (references_.IsWrong(member.name)) continue;
         if (!model_.steps.IsMember(cow_String(member.name))) {
-            diagnostics_.Error(place, "found " + mdf_Quoted(member.name) + ", expected the name of a step" +
-                                          mdf_DidYouMean(member.name, steps));
+            diagnostics_.Add("no-such-name", place, "found " + fnd_Quoted(member.name), "the name of a step",
+                             fnd_DidYouMean(member.name, steps));
             continue;
         }
         ReadState(object, member.name, member.value, place);
@@ -527,7 +525,7 @@ void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Valu
 }
 
 void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::string& stepName,
-                                 const mdf_Value& json, const mdf_Path& path) {
+                                 const mdf_Value& json, const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
@@ -538,17 +536,17 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
     const auto& fields = record.DynFields().All();
     mdf_CheckMembers(diagnostics_, json, mdf_MembersOf(record.DynFields(), {"deactivated", "status"}), path);
     if (const mdf_Value* deactivated = json.Find("deactivated"))
-        ReadBool(given.deactivated, *deactivated, mdf_Path(path, "deactivated"));
+        ReadBool(given.deactivated, *deactivated, fnd_Path(path, "deactivated"));
     if (const mdf_Value* status = json.Find("status")) {
         mdl_PropagationStatusEnm value = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
         const auto& type = static_cast<const cls_EnumType&>(cls_TypeOf<mdl_PropagationStatusEnm>::Instance());
-        if (ReadEnum(type, &value, *status, mdf_Path(path, "status"), false)) given.status = value;
+        if (ReadEnum(type, &value, *status, fnd_Path(path, "status"), false)) given.status = value;
     }
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const cls_Field& field = fields[i];
         const mdf_Value* member = field.notModelData ? nullptr : json.Find(field.name);
         if (member == nullptr) continue;
-        const mdf_Path place(path, field.name);
+        const fnd_Path place(path, field.name);
         void* value = field.In(record);
         if (field.type->Kind() == cls_FieldKind::Attribute) {
             given.marks[i] = ReadAttribute(static_cast<const cls_AttributeType&>(*field.type), value, *member,
@@ -567,6 +565,6 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
             given.marks[i] = mdl_GivenEnm::VALUE;
     }
     if (diagnostics_.NumErrors() != errorsBefore) return;
-    mdf_RecordCheck check(diagnostics_, path);
-    mdf_RecordChecks::All().Run(record, check);
+    fnd_RecordCheck check(diagnostics_, path);
+    fnd_RecordRules::All().Run(record, check);
 }

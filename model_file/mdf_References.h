@@ -12,7 +12,7 @@ public:
         : model_(model), diagnostics_(diagnostics) {}
 
     /// Takes the name that stands in the field, if fields like it refer to anything.
-    void Note(const cls_Field& field, const std::string& name, const mdf_Path& path);
+    void Note(const cls_Field& field, const std::string& name, const fnd_Path& path);
     /// Tells that an object of the name is given but wrong: what refers to it is not reported too.
     void NoteWrong(std::string_view name) { wrong_.emplace(name); }
     bool IsWrong(std::string_view name) const { return wrong_.count(name) != 0; }
@@ -21,15 +21,10 @@ public:
 
 private:
     struct Reference {
-        std::string kind;
+        const cls_Field* field;
         std::string name;
         std::string pointer;
-        const cls_ClassInfo* expectedClass; // null: any
     };
-
-    std::vector<std::string> NamesOfKind(const std::string& kind) const;
-    void CheckClass(const Reference& reference);
-    void ReportUnknown(const Reference& reference, const std::vector<std::string>& names);
 
     const odiK_Model& model_;
     mdf_Diagnostics& diagnostics_;

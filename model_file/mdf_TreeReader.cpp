@@ -3,10 +3,10 @@
 #include "model_file/mdf_Parser.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
-void mdf_TreeReader::ReadFields(cls_Record& frame, mdf_Value& json, const mdf_Path& path) {
+void mdf_TreeReader::ReadFields(cls_Record& frame, mdf_Value& json, const fnd_Path& path) {
     for (const cls_Field& field : frame.DynFields().All()) {
         mdf_Value* value = json.Find(field.name);
-        const mdf_Path place(path, std::string_view(field.name));
+        const fnd_Path place(path, std::string_view(field.name));
         if (field.type->Kind() != cls_FieldKind::Tree) {
             records_.ReadField(frame, field, value, place);
         } else if (value != nullptr) {
@@ -15,7 +15,7 @@ void mdf_TreeReader::ReadFields(cls_Record& frame, mdf_Value& json, const mdf_Pa
     }
 }
 
-void mdf_TreeReader::ReadFrame(cls_Record& frame, mdf_Value& json, const mdf_Path& path) {
+void mdf_TreeReader::ReadFrame(cls_Record& frame, mdf_Value& json, const fnd_Path& path) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");
         return;
@@ -24,9 +24,9 @@ void mdf_TreeReader::ReadFrame(cls_Record& frame, mdf_Value& json, const mdf_Pat
     ReadFields(frame, json, path);
 }
 
-void mdf_TreeReader::ReadTree(const cls_Field& field, void* place, mdf_Value& json, const mdf_Path& path) {
+void mdf_TreeReader::ReadTree(const cls_Field& field, void* place, mdf_Value& json, const fnd_Path& path) {
     const auto read = [&](auto reader) {
-        return [this, reader](const cow_String& name, mdf_Value& object, const mdf_Path& where) {
+        return [this, reader](const cow_String& name, mdf_Value& object, const fnd_Path& where) {
             (this->*reader)(name, object, where);
         };
     };
@@ -63,7 +63,7 @@ void mdf_TreeReader::ReadTree(const cls_Field& field, void* place, mdf_Value& js
 }
 
 template <class Reader>
-void mdf_TreeReader::ForEachNamed(mdf_Value& json, const mdf_Path& path, const char* thing,
+void mdf_TreeReader::ForEachNamed(mdf_Value& json, const fnd_Path& path, const char* thing,
                                   const Reader& read) {
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, std::string("an object of ") + thing + "s");
@@ -71,10 +71,10 @@ void mdf_TreeReader::ForEachNamed(mdf_Value& json, const mdf_Path& path, const c
     }
     mdf_CapitalsCheck capitals;
     for (mdf_Member& member : json.Members()) {
-        const mdf_Path place(path, member.name);
-        const std::string problem = mdf_NameProblem(member.name);
-        if (!problem.empty()) {
-            diagnostics_.Error(place, "found " + problem);
+        const fnd_Path place(path, member.name);
+        const fnd_NameProblem problem = fnd_ProblemOfName(member.name);
+        if (!problem.found.empty()) {
+            diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
             continue;
         }
         capitals.Enter(member.name, place, thing, diagnostics_);
@@ -82,12 +82,12 @@ void mdf_TreeReader::ForEachNamed(mdf_Value& json, const mdf_Path& path, const c
     }
 }
 
-void mdf_TreeReader::ReadPart(const cow_String& name, mdf_Value& json, const mdf_Path& path) {
+void mdf_TreeReader::ReadPart(const cow_String& name, mdf_Value& json, const fnd_Path& path) {
     // A part that is wrong inside is there all the same, so that its instances are not reported too.
     ReadFrame(model_.AddPart(name), json, path);
 }
 
-void mdf_TreeReader::ReadInstance(const cow_String& name, mdf_Value& json, const mdf_Path& path) {
+void mdf_TreeReader::ReadInstance(const cow_String& name, mdf_Value& json, const fnd_Path& path) {
     odiK_Instance instance;
     instance.name = name;
     ReadFrame(instance, json, path);
@@ -99,40 +99,39 @@ void mdf_TreeReader::ReadInstance(const cow_String& name, mdf_Value& json, const
     model_.AddEntry(std::move(instance));
 }
 
-void mdf_TreeReader::CheckPart(odiK_Instance& instance, const mdf_Value& json, const mdf_Path& path) {
-    const mdf_Path place(path, "part");
+void mdf_TreeReader::CheckPart(odiK_Instance& instance, const mdf_Value& json, const fnd_Path& path) {
+    const fnd_Path place(path, "part");
     if (instance.partName.IsEmpty()) {
         // One that is given was refused as a name.
         if (instance.isPartInstance && json.Find("part") == nullptr)
-            diagnostics_.Error(place, "found nothing, expected the name of a part");
+            diagnostics_.Add("missing-field", place, "found nothing", "the name of a part");
         return;
     }
     if (model_.Parts().count(instance.partName) != 0) return;
     std::vector<std::string> names;
     for (const auto& [name, part] : model_.Parts()) names.emplace_back(name.View());
     const std::string given(instance.partName.View());
-    diagnostics_.Error(place, "found " + mdf_Shown(mdf_Value(given)) + ", expected the name of a part" +
-                                  mdf_DidYouMean(given, names));
+    diagnostics_.Add("no-such-name", place, "found " + mdf_Shown(mdf_Value(given)), "the name of a part",
+                     fnd_DidYouMean(given, names));
     instance.partName = cow_String();
 }
 
 void mdf_TreeReader::ReadAttributeInputs(std::vector<odiK_AttributeInput>& inputs, unsigned type,
-                                         const mdf_Value& json, const mdf_Path& path) {
+                                         const mdf_Value& json, const fnd_Path& path) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array");
         return;
     }
     for (std::size_t i = 0; i < json.Size(); ++i) {
         const mdf_Value item = json.Item(i);
-        const mdf_Path place(path, i);
+        const fnd_Path place(path, i);
         const std::unique_ptr<cls_Record> record = records_.ReadVariant(type, item, place, {"region"});
         const mdf_Value* region = item.IsObject() ? item.Find("region") : nullptr;
         if (record == nullptr || region == nullptr || !region->IsString()) {
             if (record != nullptr) {
-                diagnostics_.Error(mdf_Path(place, "region"),
-                                   "found " +
-                                       (region == nullptr ? std::string("nothing") : mdf_Shown(*region)) +
-                                       ", expected the name of an element set of the mesh");
+                diagnostics_.Add("missing-field", fnd_Path(place, "region"),
+                                 "found " + (region == nullptr ? std::string("nothing") : mdf_Shown(*region)),
+                                 "the name of an element set of the mesh");
             }
             // Keeps the places of the others.
             inputs.emplace_back();
@@ -156,13 +155,11 @@ void mdf_TreeReader::CheckAttributeInputs(const std::vector<odiK_AttributeInput>
             if (mesh != nullptr) {
                 for (const auto& set : mesh->Sets()) names.emplace_back(set->name.View());
             }
-            diagnostics_.Error(place, "found " + mdf_Quoted(name) +
-                                          ", expected the name of a set of the mesh" +
-                                          mdf_DidYouMean(name, names));
+            diagnostics_.Add("no-such-set", place, "found " + fnd_Quoted(name),
+                             "the name of a set of the mesh", fnd_DidYouMean(name, names));
         } else if (mesh->Sets()[static_cast<std::size_t>(id)]->type != res_SetTypeEnm::ELEMENTS) {
-            diagnostics_.Error(place, "found " + mdf_Quoted(name) +
-                                          ", which is no element set, expected an element "
-                                          "set");
+            diagnostics_.Add("wrong-set-kind", place,
+                             "found " + fnd_Quoted(name) + ", which is no element set", "an element set");
         }
     }
 }
@@ -187,10 +184,10 @@ void mdf_TreeReader::CheckInstanceAttributes(odiK_Instance& instance, const std:
 
 void mdf_TreeReader::CheckAttributes() {
     std::string model("/models");
-    mdf_AppendPointer(model, model_.Name().View());
+    fnd_AppendPointer(model, model_.Name().View());
     for (const auto& [name, part] : model_.Parts()) {
         std::string pointer = model + "/parts";
-        mdf_AppendPointer(pointer, name.View());
+        fnd_AppendPointer(pointer, name.View());
         for (const cls_Field& field : odiK_Part::Fields().All()) {
             if (field.type != &cls_TreeType::Instance<cls_TreeEnm::Attributes>()) continue;
             CheckAttributeInputs(*static_cast<const std::vector<odiK_AttributeInput>*>(field.In(*part)),
@@ -199,26 +196,27 @@ void mdf_TreeReader::CheckAttributes() {
     }
     for (const auto& [name, instance] : model_.Instances()) {
         std::string pointer = model + "/assembly/instances";
-        mdf_AppendPointer(pointer, name.View());
+        fnd_AppendPointer(pointer, name.View());
         CheckInstanceAttributes(*instance, pointer);
     }
 }
 
 void mdf_TreeReader::ReadAttributes(ptoC_PartAttributeList& list, unsigned type, const mdf_Value& json,
-                                    const mdf_Path& path) {
+                                    const fnd_Path& path) {
     if (!json.IsArray()) {
         diagnostics_.Expected(path, json, "an array");
         return;
     }
     for (std::size_t i = 0; i < json.Size(); ++i) {
-        const mdf_Path place(path, i);
+        const fnd_Path place(path, i);
         const std::unique_ptr<cls_Record> record = records_.ReadVariant(type, json.Item(i), place);
         if (record == nullptr) continue;
         const auto& attribute = static_cast<const ptoC_PartAttribute&>(*record);
         if (attribute.region.HasValue() && attribute.region.FlagWord() != 2) {
-            diagnostics_.Error(mdf_Path(place, "region"),
-                               "found " + mdf_Quoted(attribute.region.SetName().View()) +
-                                   ", which is no element set, expected an element set");
+            diagnostics_.Add("wrong-set-kind", fnd_Path(place, "region"),
+                             "found " + fnd_Quoted(attribute.region.SetName().View()) +
+                                 ", which is no element set",
+                             "an element set");
         }
         // Orientations of connectors get names.
         if (const auto* orientation = nex_canDynamicCastPtr<ptoC_ConnectorOrientation>(record.get())) {

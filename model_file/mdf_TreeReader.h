@@ -12,23 +12,23 @@ public:
           meshes_(model, records, diagnostics) {}
 
     /// Reads the fields of an object of the frame, in the order of its table.
-    void ReadFields(cls_Record& frame, mdf_Value& json, const mdf_Path& path);
+    void ReadFields(cls_Record& frame, mdf_Value& json, const fnd_Path& path);
     /// Looks up the sets that the attributes of parts and instances lie on.
     void CheckAttributes();
 
 private:
-    void ReadFrame(cls_Record& frame, mdf_Value& json, const mdf_Path& path);
-    void ReadTree(const cls_Field& field, void* place, mdf_Value& json, const mdf_Path& path);
+    void ReadFrame(cls_Record& frame, mdf_Value& json, const fnd_Path& path);
+    void ReadTree(const cls_Field& field, void* place, mdf_Value& json, const fnd_Path& path);
     /// Calls `read(name, object, path)` for the members of an object, each of which is a named `thing`.
     template <class Reader>
-    void ForEachNamed(mdf_Value& json, const mdf_Path& path, const char* thing, const Reader& read);
-    void ReadPart(const cow_String& name, mdf_Value& json, const mdf_Path& path);
-    void ReadInstance(const cow_String& name, mdf_Value& json, const mdf_Path& path);
-    void CheckPart(odiK_Instance& instance, const mdf_Value& json, const mdf_Path& path);
+    void ForEachNamed(mdf_Value& json, const fnd_Path& path, const char* thing, const Reader& read);
+    void ReadPart(const cow_String& name, mdf_Value& json, const fnd_Path& path);
+    void ReadInstance(const cow_String& name, mdf_Value& json, const fnd_Path& path);
+    void CheckPart(odiK_Instance& instance, const mdf_Value& json, const fnd_Path& path);
     void ReadAttributeInputs(std::vector<odiK_AttributeInput>& inputs, unsigned type, const mdf_Value& json,
-                             const mdf_Path& path);
+                             const fnd_Path& path);
     void ReadAttributes(ptoC_PartAttributeList& list, unsigned type, const mdf_Value& json,
-                        const mdf_Path& path);
+                        const fnd_Path& path);
     void CheckAttributeInputs(const std::vector<odiK_AttributeInput>& inputs, const odiK_Mesh* mesh,
                               const std::string& pointer);
     void CheckInstanceAttributes(odiK_Instance& instance, const std::string& pointer);

@@ -1,16 +1,15 @@
 #include "tools/Commands.h"
 
 #include "deck/oif_Writer.h"
+#include "deck_checks/dck_Check.h"
+#include "deck_checks/dck_DeckCounts.h"
+#include "deck_checks/dck_LeftOut.h"
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
-#include "tools/DeckCounts.h"
 #include "tools/DeckFile.h"
-#include "tools/LeftOut.h"
-#include "tools/LoadChecks.h"
-#include "tools/ModelChecks.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
 #include "tools/VariableList.h"
@@ -85,29 +84,30 @@ std::string NameList(const std::vector<std::string>& names) {
 }
 
 void Summarise(const std::string& target, const DeckFile::Result& result, double seconds,
-               const std::vector<KindCount>& counts, const std::vector<LeftOut>& leftOut, RunReport& report) {
+               const std::vector<dck_KindCount>& counts, const std::vector<dck_LeftOut>& leftOut,
+               RunReport& report) {
     if (report.AsJson()) {
         ordered_json& written = report.Member("written");
         written = {{"target", target}, {"bytes", result.bytes}, {"seconds", seconds}};
         ordered_json& byKind = written["counts"] = ordered_json::object();
-        for (const KindCount& kind : counts) byKind[kind.key] = kind.count;
+        for (const dck_KindCount& kind : counts) byKind[kind.key] = kind.count;
         ordered_json& missing = written["leftOut"] = ordered_json::array();
-        for (const LeftOut& entry : leftOut) {
+        for (const dck_LeftOut& entry : leftOut) {
             missing.push_back(
                 {{"what", entry.what}, {"why", entry.why}, {"count", entry.count}, {"names", entry.names}});
         }
         return;
     }
     std::size_t width = 0;
-    for (const KindCount& kind : counts) width = std::max(width, Grouped(kind.count).size());
-    for (const LeftOut& entry : leftOut) width = std::max(width, Grouped(entry.count).size());
+    for (const dck_KindCount& kind : counts) width = std::max(width, Grouped(kind.count).size());
+    for (const dck_LeftOut& entry : leftOut) width = std::max(width, Grouped(entry.count).size());
     char time[32];
     std::snprintf(time, sizeof time, "%.2f s", seconds);
     report.Print(target + ": " + Grouped(result.bytes) + " bytes in " + time + "\n");
     if (!counts.empty()) report.Print("written:\n");
-    for (const KindCount& kind : counts) report.Print(CountLine(Grouped(kind.count), kind.name, width));
+    for (const dck_KindCount& kind : counts) report.Print(CountLine(Grouped(kind.count), kind.name, width));
     if (!leftOut.empty()) report.Print("left out, since a deck can't carry it:\n");
-    for (const LeftOut& entry : leftOut) {
+    for (const dck_LeftOut& entry : leftOut) {
         std::string text = std::string(entry.what) + " (" + entry.why + ")";
         if (!entry.names.empty()) text += ": " + NameList(entry.names);
         report.Print(CountLine(Grouped(entry.count), text, width));
@@ -172,18 +172,21 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
         return ExitCode::MODEL_IS_WRONG;
     }
     // Before the deck, so that nothing can fail once it stands.
-    const std::vector<KindCount> counts = CountsOfDeck(*model);
-    const std::vector<LeftOut> leftOut = LeftOutOf(odb, *model);
+    const std::vector<dck_KindCount> counts = dck_CountsOfDeck(*model);
+    const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(odb, *model);
 
     DeckFile deck(target);
     DeckFile::Result result;
+    fnd_List list;
     try {
+        dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
         const auto write = [&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); };
         if (!Replace(deck, write, result, report)) return ExitCode::FILE_SYSTEM_REFUSED;
     } catch (const QRXBasException& failure) {
         report.WriterError(failure.what(), failure.Context());
         return ExitCode::CANNOT_BE_EXPRESSED;
     }
+    for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
     Summarise(target, result, SecondsSince(start), counts, leftOut, report);
     return ExitCode::DONE;
 }
@@ -192,13 +195,9 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
     if (odb == nullptr) return code;
-    const char* name = odb_Odb::DefaultModelName();
-    std::vector<ModelFinding> findings = FindingsOf(*odb->FindModel(name));
-    for (ModelFinding& finding : LoadFindingsOf(odb->ddb().model(name)))
-        findings.push_back(std::move(finding));
-    for (const ModelFinding& finding : findings) {
-        report.Warning(model, std::string("/models/") + name + finding.place + ": " + finding.text);
-    }
+    fnd_List list;
+    dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
+    for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
     report.Print(model + ": no errors\n");
     return code;
 }
@@ -221,9 +220,9 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
 
 ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     std::string text;
-    mdf_Error unreadable;
+    fnd_Finding unreadable;
     if (!mdf_ReadFile(request.model, text, unreadable)) {
-        report.Error(request.model, unreadable.text);
+        report.Add(request.model, unreadable);
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     mdf_Report found;

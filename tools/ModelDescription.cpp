@@ -1,9 +1,9 @@
 #include "tools/ModelDescription.h"
 
+#include "deck_checks/dck_Text.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
-#include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <cstdio>

@@ -2,9 +2,9 @@
 
 #include "base/oif_ModelInfo.h"
 #include "conditions/oif_BoundaryConditionBuilder.h"
+#include "deck_checks/dck_Text.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
-#include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>

@@ -12,19 +12,15 @@ RunReport::RunReport(bool asJson) : asJson_(asJson) {
 }
 
 void RunReport::AddAll(const mdf_Report& report) {
-    for (const mdf_Message& message : report.messages) Add(report, message);
+    for (const fnd_Finding& finding : report.findings) Add(report.fileName, finding);
 }
 
 void RunReport::Error(const std::string& file, const std::string& text) {
-    mdf_Report report;
-    report.fileName = file;
-    Add(report, {true, "", 0, 0, text});
+    Add(file, fnd_Make("run-failed", {}, text));
 }
 
 void RunReport::Warning(const std::string& file, const std::string& text) {
-    mdf_Report report;
-    report.fileName = file;
-    Add(report, {false, "", 0, 0, text});
+    Add(file, fnd_Make("run-warning", {}, text));
 }
 
 void RunReport::WriterError(const std::string& text, const std::string& context) {
@@ -56,19 +52,23 @@ ExitCode RunReport::Finish(ExitCode code) {
     return code == ExitCode::DONE ? ExitCode::FILE_SYSTEM_REFUSED : code;
 }
 
-void RunReport::Add(const mdf_Report& report, const mdf_Message& message) {
+void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
     if (!asJson_) {
-        PutError(report.Line(message));
+        PutError(mdf_LineOf(file, finding));
         return;
     }
-    ordered_json entry = {{"severity", message.isError ? "error" : "warning"}, {"file", report.fileName}};
-    if (message.line > 0) {
-        entry["line"] = message.line;
-        entry["column"] = message.column;
+    ordered_json entry = {
+        {"severity", fnd_SeverityWord(finding.code->severity)}, {"code", finding.code->name}, {"file", file}};
+    if (finding.line > 0) {
+        entry["line"] = finding.line;
+        entry["column"] = finding.column;
     } else {
-        entry["pointer"] = message.pointer;
+        entry["pointer"] = finding.place;
     }
-    entry["text"] = message.text;
+    entry["text"] = finding.Text();
+    entry["found"] = finding.found;
+    if (!finding.expected.empty()) entry["expected"] = finding.expected;
+    if (!finding.hint.empty()) entry["hint"] = finding.hint;
     root_["messages"].push_back(entry);
 }
 

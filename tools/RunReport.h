@@ -25,6 +25,7 @@ public:
 
     bool AsJson() const { return asJson_; }
     void AddAll(const mdf_Report& report);
+    void Add(const std::string& file, const fnd_Finding& finding);
     void Error(const std::string& file, const std::string& text);
     void Warning(const std::string& file, const std::string& text);
     /// A text exactly as the deck writer raised it, and what was being written.
@@ -37,7 +38,6 @@ public:
     ExitCode Finish(ExitCode code);
 
 private:
-    void Add(const mdf_Report& report, const mdf_Message& message);
     static void PutError(const std::string& line);
 
     bool asJson_;

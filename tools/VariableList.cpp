@@ -1,9 +1,9 @@
 #include "tools/VariableList.h"
 
+#include "deck_checks/dck_Text.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 #include "store_interface/records/steps/kprC_Step.h"
-#include "tools/FindingText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>

@@ -29,6 +29,14 @@ std::string fnd_Finding::Text() const {
     return text;
 }
 
+const char* fnd_SeverityWord(fnd_Severity severity) {
+    switch (severity) {
+    case fnd_Severity::ERROR: return "error";
+    case fnd_Severity::WARNING: return "warning";
+    default: return "note";
+    }
+}
+
 void fnd_Raise::Take(fnd_Finding finding) {
     if (!finding.IsError()) return;
     const std::string text = finding.place.empty() ? finding.Text() : finding.place + ": " + finding.Text();

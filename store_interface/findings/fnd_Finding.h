@@ -7,7 +7,8 @@
 #include <string_view>
 #include <vector>
 
-/// A place in a model or its file, as a chain of tokens on the call stack; its text is made only for a finding.
+/// A place in a model or its file, as a chain of tokens on the call stack; its text is made only for a
+/// finding.
 class fnd_Path {
 public:
     fnd_Path() = default;
@@ -30,11 +31,11 @@ void fnd_AppendPointer(std::string& pointer, std::string_view token);
 struct fnd_Finding {
     const fnd_Code* code = nullptr;
     /// JSON pointer; "" for the whole.
-    std::string place;
-    std::string found;
+    std::string place = {};
+    std::string found = {};
     /// What would be right, where that can be said shortly.
-    std::string expected;
-    std::string hint;
+    std::string expected = {};
+    std::string hint = {};
     /// From 1; 0: unknown. Errors of syntax have them.
     long line = 0;
     long column = 0;
@@ -44,6 +45,14 @@ struct fnd_Finding {
     std::string Text() const;
 };
 
+inline fnd_Finding fnd_Make(fnd_CodeName code, std::string place, std::string found, std::string expected = {},
+                            std::string hint = {}) {
+    return {&code.Row(), std::move(place), std::move(found), std::move(expected), std::move(hint)};
+}
+
+/// "error", "warning" or "note".
+const char* fnd_SeverityWord(fnd_Severity severity);
+
 /// Takes findings.
 class fnd_Sink {
 public:
@@ -52,7 +61,7 @@ public:
 
     void Add(fnd_CodeName code, std::string place, std::string found, std::string expected = {},
              std::string hint = {}) {
-        Take({&code.Row(), std::move(place), std::move(found), std::move(expected), std::move(hint)});
+        Take(fnd_Make(code, std::move(place), std::move(found), std::move(expected), std::move(hint)));
     }
     void Add(fnd_CodeName code, const fnd_Path& place, std::string found, std::string expected = {},
              std::string hint = {}) {

@@ -31,20 +31,21 @@ private:
 };
 
 /// What records must satisfy beyond the types of their fields, by class. Model files are held against it
-/// record by record as they are read, stores by their check; a record with an error in a field isn't looked at.
+/// record by record as they are read, stores by their check; a record with an error in a field isn't looked
+/// at.
 class fnd_RecordRules {
 public:
     /// The rules of all families.
     static const fnd_RecordRules& All();
 
-    /// Adds `void Rule(const T& record, fnd_RecordCheck& check)` for all records of class T and of the classes
-    /// derived from it.
+    /// Adds `void Rule(const T& record, fnd_RecordCheck& check)` for all records of class T and of the
+    /// classes derived from it.
     template <auto Rule>
     void Add() {
         AddOf<Rule>(Rule);
     }
-    /// Adds `std::string Hint(const T& record, const char* field)`, which tells, when a table of such a record
-    /// can't be read, how many columns it needs; empty for nothing.
+    /// Adds `std::string Hint(const T& record, const char* field)`, which tells, when a table of such a
+    /// record can't be read, how many columns it needs; empty for nothing.
     template <auto Hint>
     void AddTableHint() {
         AddHintOf<Hint>(Hint);

@@ -7,7 +7,8 @@
 
 // Texts that findings are made of.
 
-/// In single quotes; control characters as \xNN, so that no text of a file acts on the terminal that shows it.
+/// In single quotes; control characters as \xNN, so that no text of a file acts on the terminal that shows
+/// it.
 std::string fnd_Quoted(std::string_view text);
 std::string fnd_Visible(std::string_view text);
 /// The shortest text that reads back as the number, with a point or an exponent.

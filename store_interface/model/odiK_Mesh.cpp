@@ -4,13 +4,6 @@
 
 #include <algorithm>
 
-void odiK_RaiseProblems::Error(const std::string& place, const std::string& text) {
-    const std::string message = place.empty() ? text : place + ": " + text;
-    nex_Raise(atr_String(std::string_view(message)));
-}
-
-void odiK_RaiseProblems::Warning(const std::string&, const std::string&) {}
-
 namespace {
 
 std::string Number(long long value) {
@@ -29,24 +22,23 @@ std::string Place(const char* array, std::size_t index) {
     return std::string("/") + array + "/" + std::to_string(index);
 }
 
-bool CheckLabels(const std::vector<int>& labels, odiK_Problems& problems) {
+bool CheckLabels(const std::vector<int>& labels, fnd_Sink& problems) {
     bool good = true;
     for (std::size_t i = 0; i < labels.size(); ++i) {
         if (labels[i] > 0) continue;
-        problems.Error(Place("labels", i), "found " + Number(labels[i]) + ", expected a positive label");
+        problems.Add("wrong-label", Place("labels", i), "found " + Number(labels[i]), "a positive label");
         good = false;
     }
     return good;
 }
 
 bool CheckConnectivity(const std::vector<int>& nodes, const std::vector<int>& labels, int nodesPerElement,
-                       odiK_Problems& problems) {
+                       fnd_Sink& problems) {
     if (nodesPerElement >= 0 && nodes.size() == labels.size() * static_cast<std::size_t>(nodesPerElement)) {
         return true;
     }
-    problems.Error("/connectivity", "found " + Count(nodes.size(), "node") + ", expected " +
-                                        Number(nodesPerElement) + " for each of " +
-                                        Count(labels.size(), "label"));
+    problems.Add("length-mismatch", "/connectivity", "found " + Count(nodes.size(), "node"),
+                 Number(nodesPerElement) + " for each of " + Count(labels.size(), "label"));
     return false;
 }
 
@@ -60,17 +52,19 @@ int odiK_NodeData::Label(int nodeIndex) const {
     return foreign[place].label;
 }
 
-void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates, odiK_Problems& problems) {
+void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates, fnd_Sink& problems) {
     if (coordinates.size() != 3 * labels.size()) {
-        problems.Error("/coordinates", "found " + Count(coordinates.size() / 3, "point") + " for " +
-                                           Count(labels.size(), "label") + ", expected one for each");
+        problems.Add("length-mismatch", "/coordinates",
+                     "found " + Count(coordinates.size() / 3, "point") + " for " +
+                         Count(labels.size(), "label"),
+                     "one for each");
         return;
     }
     if (!CheckLabels(labels, problems)) return;
     for (const int place : nodes_.index.Build(labels)) {
-        problems.Error(Place("labels", static_cast<std::size_t>(place)),
-                       "node label " + Number(labels[static_cast<std::size_t>(place)]) +
-                           " stands twice, expected labels that are unique in the mesh");
+        problems.Add("duplicate-label", Place("labels", static_cast<std::size_t>(place)),
+                     "node label " + Number(labels[static_cast<std::size_t>(place)]) + " stands twice",
+                     "labels that are unique in the mesh");
     }
     nodes_.labels = cow_List<int>(cow_ListConstruct(static_cast<int>(labels.size())));
     for (const int label : labels) nodes_.labels.Append(label);
@@ -78,7 +72,7 @@ void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates
 }
 
 void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     SetNodes(std::move(labels), std::move(coordinates), problems);
 }
 
@@ -89,16 +83,15 @@ int odiK_Mesh::AddForeignNode(const cow_String& instanceName, int label) {
 
 void odiK_Mesh::AddElements(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                             std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls,
-                            odiK_Problems& problems) {
+                            fnd_Sink& problems) {
     if (!CheckConnectivity(nodeLabels, labels, nodesPerElement, problems)) return;
     bool good = true;
     const auto width = static_cast<std::size_t>(nodesPerElement);
     for (std::size_t i = 0; i < nodeLabels.size(); ++i) {
         const int node = FindNode(nodeLabels[i]);
         if (node < 0) {
-            problems.Error(Place("connectivity", i / width) + "/" + std::to_string(i % width),
-                           "found node " + Number(nodeLabels[i]) +
-                               ", expected the label of a node of this mesh");
+            problems.Add("no-such-label", Place("connectivity", i / width) + "/" + std::to_string(i % width),
+                         "found node " + Number(nodeLabels[i]), "the label of a node of this mesh");
             good = false;
         }
         nodeLabels[i] = node;
@@ -110,13 +103,13 @@ void odiK_Mesh::AddElements(const cow_String& type, std::vector<int> labels, int
 
 void odiK_Mesh::AddElements(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                             std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     AddElements(type, std::move(labels), nodesPerElement, std::move(nodeLabels), controls, problems);
 }
 
 void odiK_Mesh::AddElementsByIndex(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                                    std::vector<int> nodeIndices, const bme_ElemCtrlParams& controls,
-                                   odiK_Problems& problems) {
+                                   fnd_Sink& problems) {
     if (!CheckConnectivity(nodeIndices, labels, nodesPerElement, problems)) return;
     if (!CheckLabels(labels, problems)) return;
     odiK_ElementClass added;
@@ -141,15 +134,15 @@ odiK_LabelIndex::Repetitions odiK_Mesh::IndexElements() const {
     return elementIndex_.Build(all);
 }
 
-void odiK_Mesh::FinishElements(odiK_Problems& problems) {
+void odiK_Mesh::FinishElements(fnd_Sink& problems) {
     std::size_t classIndex = 0;
     for (const int index : IndexElements()) {
         while (classes_[classIndex].firstElementIndex + classes_[classIndex].NumElements() <= index)
             ++classIndex;
         const auto place = static_cast<std::size_t>(index - classes_[classIndex].firstElementIndex);
-        problems.Error(Place("elements", classIndex) + Place("labels", place),
-                       "element label " + Number(classes_[classIndex].labels[place]) +
-                           " stands twice, expected labels that are unique in the mesh");
+        problems.Add("duplicate-label", Place("elements", classIndex) + Place("labels", place),
+                     "element label " + Number(classes_[classIndex].labels[place]) + " stands twice",
+                     "labels that are unique in the mesh");
     }
 }
 
@@ -170,10 +163,10 @@ int odiK_Mesh::FindSet(const cow_String& name) const {
     return place == setIndex_.end() ? -1 : place->second;
 }
 
-void odiK_Mesh::AddSet(const odiK_SetInput& input, odiK_Problems& problems) {
+void odiK_Mesh::AddSet(const odiK_SetInput& input, fnd_Sink& problems) {
     if (FindSet(input.name) >= 0) {
-        problems.Error("/name", "found a second set named " + Quoted(input.name.View()) +
-                                    ", expected names that are unique in the mesh");
+        problems.Add("duplicate-name", "/name", "found a second set named " + Quoted(input.name.View()),
+                     "names that are unique in the mesh");
         return;
     }
     auto set = cow_CountedHld<odiK_Set>(new odiK_Set());
@@ -186,24 +179,24 @@ void odiK_Mesh::AddSet(const odiK_SetInput& input, odiK_Problems& problems) {
 }
 
 void odiK_Mesh::AddNodeSet(const cow_String& name, const std::vector<int>& labels, bool internal) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     AddSet({name, res_SetTypeEnm::NODES, internal, labels, {}}, problems);
 }
 
 void odiK_Mesh::AddElementSet(const cow_String& name, const std::vector<int>& labels, bool internal) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     AddSet({name, res_SetTypeEnm::ELEMENTS, internal, labels, {}}, problems);
 }
 
 void odiK_Mesh::AddSurface(const cow_String& name, const std::vector<odiK_FacetInput>& facets,
                            bool internal) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     AddSet({name, res_SetTypeEnm::FACETS, internal, {}, facets}, problems);
 }
 
 void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
                               std::vector<rgnC_SubsetData>& subsets, const std::string& place,
-                              odiK_Problems& problems) const {
+                              fnd_Sink& problems) const {
     const bool facets = input.type == res_SetTypeEnm::FACETS;
     const bool nodes = input.type == res_SetTypeEnm::NODES;
     const std::size_t count = facets ? input.facets.size() : input.labels.size();
@@ -219,9 +212,9 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
         const int label = facets ? input.facets[i].elementLabel : input.labels[i];
         if (nodes) member.entry = FindNode(label);
         if (nodes ? member.entry < 0 : !FindElement(label, member.classIndex, member.entry)) {
-            problems.Error(place + (facets ? Place("facets", i) + "/0" : Place("labels", i)),
-                           "found " + Number(label) + ", expected the label of " +
-                               (nodes ? "a node" : "an element") + " of the mesh");
+            problems.Add("no-such-label", place + (facets ? Place("facets", i) + "/0" : Place("labels", i)),
+                         "found " + Number(label),
+                         std::string("the label of ") + (nodes ? "a node" : "an element") + " of the mesh");
             continue;
         }
         if (facets) {
@@ -229,10 +222,9 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
             const odiK_ElementClass& elements = classes_[static_cast<std::size_t>(member.classIndex)];
             member.facet = facet.face.empty() ? facet.id : odiK_FacetOfFace(elements.shape, facet.face);
             if (member.facet < 0 || !odiK_FacetFits(elements.shape, member.facet)) {
-                problems.Error(place + Place("facets", i) + "/1",
-                               "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)) +
-                                   ", expected a face of an element of type " +
-                                   std::string(elements.type.View()));
+                problems.Add("no-such-face", place + Place("facets", i) + "/1",
+                             "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)),
+                             "a face of an element of type " + std::string(elements.type.View()));
                 continue;
             }
         }

@@ -1,9 +1,9 @@
 #ifndef QRX_STORE_ODIK_MESH_H
 #define QRX_STORE_ODIK_MESH_H
 
+#include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/ddb_ElementShape.h"
 #include "store_interface/model/odiK_LabelIndex.h"
-#include "store_interface/model/odiK_Problems.h"
 #include "store_interface/records/part_attributes/bme_ElemCtrlParams.h"
 #include "store_interface/regions/rgnC_SetData.h"
 
@@ -70,25 +70,24 @@ public:
     int NumElements() const { return numElements_; }
 
     /// Sets the nodes: positive labels that do not repeat, three coordinates a label.
-    void SetNodes(std::vector<int> labels, std::vector<float> coordinates, odiK_Problems& problems);
+    void SetNodes(std::vector<int> labels, std::vector<float> coordinates, fnd_Sink& problems);
     void SetNodes(std::vector<int> labels, std::vector<float> coordinates);
     /// Adds a class: positive labels, and for each element a row of `nodesPerElement` node labels.
     void AddElements(const cow_String& type, std::vector<int> labels, int nodesPerElement,
-                     std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls,
-                     odiK_Problems& problems);
+                     std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls, fnd_Sink& problems);
     void AddElements(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                      std::vector<int> nodeLabels, const bme_ElemCtrlParams& controls = {});
     /// The same where the nodes are given by index, foreign ones included; for the assembly's mesh.
     void AddElementsByIndex(const cow_String& type, std::vector<int> labels, int nodesPerElement,
                             std::vector<int> nodeIndices, const bme_ElemCtrlParams& controls,
-                            odiK_Problems& problems);
+                            fnd_Sink& problems);
     /// The index of a node in an instance, for AddElementsByIndex.
     int AddForeignNode(const cow_String& instanceName, int label);
     /// Looks for element labels that stand twice in the mesh; to be called when all classes are there. The
     /// places begin with "/elements/<class>".
-    void FinishElements(odiK_Problems& problems);
+    void FinishElements(fnd_Sink& problems);
     /// Adds a set whose name is new in the mesh and whose members are there.
-    void AddSet(const odiK_SetInput& input, odiK_Problems& problems);
+    void AddSet(const odiK_SetInput& input, fnd_Sink& problems);
     void AddNodeSet(const cow_String& name, const std::vector<int>& labels, bool internal = false);
     void AddElementSet(const cow_String& name, const std::vector<int>& labels, bool internal = false);
     void AddSurface(const cow_String& name, const std::vector<odiK_FacetInput>& facets,
@@ -108,7 +107,7 @@ public:
     /// Appends the subsets that the members of the input give: one for nodes, for elements and facets one for
     /// each run of members of one class, in the order given. `place` is prefixed to the problems' places.
     void AppendSubsets(const odiK_SetInput& input, int meshIndex, std::vector<rgnC_SubsetData>& subsets,
-                       const std::string& place, odiK_Problems& problems) const;
+                       const std::string& place, fnd_Sink& problems) const;
 
 private:
     odiK_LabelIndex::Repetitions IndexElements() const;

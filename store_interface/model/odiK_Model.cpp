@@ -161,11 +161,11 @@ int odiK_Model::FindAssemblySet(const cow_String& name) const {
 }
 
 void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type, bool internal,
-                                std::span<const odiK_MemberInput> members, odiK_Problems& problems) {
+                                std::span<const odiK_MemberInput> members, fnd_Sink& problems) {
     SealInstances();
     if (FindAssemblySet(name) >= 0) {
-        problems.Error("/name", "found a second set named " + Quoted(name) +
-                                    ", expected names that are unique in the assembly");
+        problems.Add("duplicate-name", "/name", "found a second set named " + Quoted(name),
+                     "names that are unique in the assembly");
         return;
     }
     cow_CountedHld<odiK_Set> set(new odiK_Set());
@@ -177,8 +177,8 @@ void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type, boo
         const odiK_MemberInput& member = members[i];
         const odiK_Instance* instance = FindInstance(member.instanceName);
         if (!member.instanceName.IsEmpty() && instance == nullptr) {
-            problems.Error(place + "/instance",
-                           "found " + Quoted(member.instanceName) + ", expected the name of an instance");
+            problems.Add("no-such-name", place + "/instance", "found " + Quoted(member.instanceName),
+                         "the name of an instance");
             continue;
         }
         const cow_CountedHld<odiK_Mesh> mesh = instance == nullptr ? assemblyMesh_ : instance->Mesh();
@@ -193,7 +193,7 @@ void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type, boo
 
 void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type,
                                 std::span<const odiK_MemberInput> members, bool internal) {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     AddAssemblySet(name, type, internal, members, problems);
 }
 
@@ -224,7 +224,7 @@ rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String&
     return region;
 }
 
-void odiK_Model::CompleteTree(odiK_Problems& problems) {
+void odiK_Model::CompleteTree(fnd_Sink& problems) {
     SealInstances();
     for (const auto& entry : instances_) {
         const cow_String& name = entry.first;
@@ -240,10 +240,11 @@ void odiK_Model::CompleteTree(odiK_Problems& problems) {
                 mdl_ObjCow<ptoC_PartAttribute> record = inputs[i].record;
                 record.Get().region = FindRegion(name, inputs[i].setName);
                 if (!record.ConstGet().region.HasValue()) {
-                    problems.Error("/assembly/instances/" + std::string(name.View()) + "/" + member + "/" +
-                                       std::to_string(i) + "/region",
-                                   "found " + Quoted(inputs[i].setName) +
-                                       ", expected the name of a set of the instance's mesh");
+                    problems.Add("no-such-set",
+                                 "/assembly/instances/" + std::string(name.View()) + "/" + member + "/" +
+                                     std::to_string(i) + "/region",
+                                 "found " + Quoted(inputs[i].setName),
+                                 "the name of a set of the instance's mesh");
                 }
                 list.Append(record.ConstGet());
             }
@@ -258,7 +259,7 @@ void odiK_Model::CompleteTree(odiK_Problems& problems) {
 }
 
 void odiK_Model::Complete() {
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     for (const auto& [name, part] : parts_) {
         if (!part->mesh.IsNull()) part->mesh->FinishElements(problems);
     }

@@ -176,7 +176,7 @@ public:
     int FindAssemblySet(const cow_String& name) const;
     /// Adds a set of the assembly. Places of problems begin with "/members/<entry>".
     void AddAssemblySet(const cow_String& name, res_SetTypeEnm type, bool internal,
-                        std::span<const odiK_MemberInput> members, odiK_Problems& problems);
+                        std::span<const odiK_MemberInput> members, fnd_Sink& problems);
     void AddAssemblySet(const cow_String& name, res_SetTypeEnm type,
                         std::span<const odiK_MemberInput> members, bool internal = false);
 
@@ -191,7 +191,7 @@ public:
     /// read.
     void Complete();
     /// The same but for what lives across steps.
-    void CompleteTree(odiK_Problems& problems);
+    void CompleteTree(fnd_Sink& problems);
     /// Tells that all of it has been worked out.
     void SetComplete() { complete_ = true; }
     bool IsComplete() const { return complete_; }

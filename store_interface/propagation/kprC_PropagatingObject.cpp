@@ -8,6 +8,16 @@
 using Status = mdl_PropagationStatusEnm;
 using AttributeState = mdl_PropAttributeStateEnm;
 
+namespace {
+
+fnd_Finding Impossible(const cow_String& step, const char* found, const char* expected = "") {
+    fnd_Finding finding = fnd_Make("impossible-state", "/states", std::string("found ") + found, expected);
+    fnd_AppendPointer(finding.place, step.View());
+    return finding;
+}
+
+} // namespace
+
 const omu_EnumTable& omu_EnumTableOf(mdl_PropAttributeStateEnm) {
     static constexpr omu_EnumRow rows[] = {{0, "NEVER_SET", "NEVER_SET"},
                                            {1, "SET", "SET"},
@@ -108,7 +118,7 @@ const cls_FieldTable& kprC_PropagatingObject::Fields() {
 /// Walks the steps and keeps what one step hands to the next.
 class kprC_PropagatingObject::Engine {
 public:
-    Engine(const kprC_PropagatingObject& object, std::vector<mdl_PropagationProblem>& problems)
+    Engine(const kprC_PropagatingObject& object, std::vector<fnd_Finding>& problems)
         : object_(object), family_(object.Family()), problems_(problems) {}
 
     /// `given` is null where the user said nothing.
@@ -197,14 +207,14 @@ private:
         if (!chain.alive) return Status::CREATED;
         if (!condition) {
             return Refuse(step,
-                          "a state in a linear perturbation step, but it belongs to the base state there; "
-                          "expected no state");
+                          "a state in a linear perturbation step, but it belongs to the base state there",
+                          "no state");
         }
         return given->deactivated ? Status::DEACTIVATED_FROM_BASE_STATE : Status::MODIFIED_FROM_BASE_STATE;
     }
 
-    std::optional<Status> Refuse(const cow_String& step, const char* text) {
-        problems_.push_back({step, text});
+    std::optional<Status> Refuse(const cow_String& step, const char* found, const char* expected = "") {
+        problems_.push_back(Impossible(step, found, expected));
         return std::nullopt;
     }
 
@@ -330,15 +340,14 @@ private:
 
     const kprC_PropagatingObject& object_;
     mdl_PropagationFamilyEnm family_;
-    std::vector<mdl_PropagationProblem>& problems_;
+    std::vector<fnd_Finding>& problems_;
     Chain general_;
     Chain run_; // of consecutive perturbation steps; output requests only
     bool begun_ = false;
 };
 
 std::vector<kprC_PropagatingObject::StepResult>
-kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps,
-                                std::vector<mdl_PropagationProblem>& problems) const {
+kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps, std::vector<fnd_Finding>& problems) const {
     Engine engine(*this, problems);
     std::vector<StepResult> results;
     results.reserve(static_cast<std::size_t>(steps.Size()));
@@ -357,13 +366,13 @@ kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps,
             engine.Step(steps.NameAt(i), steps.StepAt(i), givenAt[static_cast<std::size_t>(i)]));
     }
     for (const cow_String& name : unknown) {
-        problems.push_back({name, "a state, but there is no step of that name"});
+        problems.push_back(Impossible(name, "a state, but there is no step of that name"));
     }
     return results;
 }
 
-void mdl_RaisePropagationProblem(const cow_String& object, const mdl_PropagationProblem& problem) {
-    const std::string text = "object '" + std::string(object.View()) + "', step '" +
-                             std::string(problem.stepName.View()) + "': " + std::string(problem.text.View());
+void mdl_RaisePropagationProblem(const cow_String& object, const fnd_Finding& problem) {
+    const std::string text =
+        "object '" + std::string(object.View()) + "', " + problem.place + ": " + problem.Text();
     nex_Raise(atr_String(std::string_view(text)));
 }

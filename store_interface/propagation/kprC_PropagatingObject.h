@@ -1,6 +1,7 @@
 #ifndef QRX_STORE_KPRC_PROPAGATINGOBJECT_H
 #define QRX_STORE_KPRC_PROPAGATINGOBJECT_H
 
+#include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/propagation/mdl_PropAttr.h"
 #include "store_interface/records/steps/kprC_StepContainer.h"
 
@@ -29,12 +30,6 @@ struct mdl_GivenState {
     std::optional<mdl_PropagationStatusEnm> status;
 
     bool IsGiven(const char* field) const;
-};
-
-/// A state that can't be: which step, and why.
-struct mdl_PropagationProblem {
-    cow_String stepName;
-    cow_String text;
 };
 
 /// What an object is in one step, worked out from what the user said in all steps.
@@ -73,7 +68,7 @@ public:
 
     /// Works out all steps; must run again after a change of states or steps. Gives the states that can't
     /// be, in step order, then those of unknown steps; they are treated as if nothing had been said.
-    virtual std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) = 0;
+    virtual std::vector<fnd_Finding> Propagate(const kprC_StepContainer& steps) = 0;
     /// The status in the step. An unknown step raises.
     virtual mdl_PropagationStatusEnm StatusIn(const cow_String& stepName) const = 0;
 
@@ -95,7 +90,7 @@ protected:
         mdl_ObjCow<cls_Record> state; // null: none
     };
     std::vector<StepResult> WorkOut(const kprC_StepContainer& steps,
-                                    std::vector<mdl_PropagationProblem>& problems) const;
+                                    std::vector<fnd_Finding>& problems) const;
     [[noreturn]] void RaiseNoSuchStep(const cow_String& stepName) const;
 
 private:
@@ -172,8 +167,8 @@ public:
         return {};
     }
 
-    std::vector<mdl_PropagationProblem> Propagate(const kprC_StepContainer& steps) override {
-        std::vector<mdl_PropagationProblem> problems;
+    std::vector<fnd_Finding> Propagate(const kprC_StepContainer& steps) override {
+        std::vector<fnd_Finding> problems;
         const auto results = this->WorkOut(steps, problems);
         mdl_ObjCow<S> none;
         auto shared = std::make_unique<States>(results.size());
@@ -236,8 +231,7 @@ public:
     using mdl_MapString2ObjCowIT<T>::mdl_MapString2ObjCowIT;
 };
 
-[[noreturn]] void mdl_RaisePropagationProblem(const cow_String& object,
-                                              const mdl_PropagationProblem& problem);
+[[noreturn]] void mdl_RaisePropagationProblem(const cow_String& object, const fnd_Finding& problem);
 
 template <class T>
 void kprC_PropagatingContainer<T>::Propagate(const kprC_StepContainer& steps) {

@@ -50,8 +50,8 @@ ConditionModel::ConditionModel(std::string_view steps, const std::string& member
                              (members.empty() ? "" : ", " + members) + "}}}";
     mdf_Report report;
     odb_ = mdf_ReadModelText(text, "test", report);
-    for (const mdf_Message& message : report.messages) {
-        EXPECT_FALSE(message.isError) << message.pointer << ": " << message.text << "\n" << text;
+    for (const fnd_Finding& finding : report.findings) {
+        EXPECT_FALSE(finding.IsError()) << finding.place << ": " << finding.Text() << "\n" << text;
     }
     if (odb_ == nullptr) throw std::logic_error("the model can't be read");
     info_ = std::make_unique<oif_ModelInfo>(odb_->ddb().model(odb_Odb::DefaultModelName()));

@@ -61,7 +61,7 @@ protected:
         part.mesh->AddElementSet("OWN", {5});
         store.model.AddInstance("I", "P");
         odiK_Mesh& mesh = store.model.AssemblyMesh();
-        odiK_RaiseProblems problems;
+        fnd_Raise problems;
         const int one = mesh.AddForeignNode("I", 1);
         const int two = mesh.AddForeignNode("I", 2);
         mesh.AddElementsByIndex("CONN3D2", {7, 8}, 2, {one, two, two, one}, {}, problems);

@@ -30,7 +30,7 @@ DeckRewriting Rewriting() {
 
 std::string ErrorsOf(const mdf_Report& report) {
     std::string lines;
-    for (const mdf_Message& message : report.messages) lines += report.Line(message) + "\n";
+    for (const fnd_Finding& finding : report.findings) lines += report.Line(finding) + "\n";
     return lines;
 }
 
@@ -168,7 +168,7 @@ TEST(ExamplePairs, Models_Read_RaiseNoMessage) {
     for (const std::string& pair : ExamplePairs()) {
         mdf_Report report;
         EXPECT_NE(mdf_ReadModelFile((ProjectFolder() / (pair + ".json")).string(), report), nullptr);
-        EXPECT_TRUE(report.messages.empty()) << pair << '\n' << ErrorsOf(report);
+        EXPECT_TRUE(report.findings.empty()) << pair << '\n' << ErrorsOf(report);
     }
 }
 

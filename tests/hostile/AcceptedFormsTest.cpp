@@ -12,8 +12,8 @@ using Lines = std::vector<std::string>;
 std::unique_ptr<odb_Odb> Store(const std::string& text) {
     mdf_Report report;
     auto odb = mdf_ReadModelText(text, "m.json", report);
-    for (const mdf_Message& message : report.messages) {
-        if (message.isError) ADD_FAILURE() << report.Line(message);
+    for (const fnd_Finding& finding : report.findings) {
+        if (finding.IsError()) ADD_FAILURE() << report.Line(finding);
     }
     if (odb == nullptr) throw std::runtime_error("no store");
     return odb;

@@ -18,7 +18,7 @@ TEST(HostileCorpus, FilesThatOnceDidHarm_AreReadOrRefusedWithAReason) {
         ASSERT_TRUE(mdf_WriteModelFile(*odb, first));
         mdf_Report again;
         const auto copy = mdf_ReadModelText(first.str(), "copy", again);
-        ASSERT_NE(copy, nullptr) << again.Line(again.messages.at(0));
+        ASSERT_NE(copy, nullptr) << again.Line(again.findings.at(0));
         std::ostringstream second;
         ASSERT_TRUE(mdf_WriteModelFile(*copy, second));
         EXPECT_EQ(first.str(), second.str());

@@ -7,19 +7,19 @@ std::vector<std::string> Findings(std::string_view text) {
     const auto odb = mdf_ReadModelText(text, "m.json", report);
     EXPECT_EQ(odb == nullptr, report.HasErrors());
     std::vector<std::string> findings;
-    for (const mdf_Message& message : report.messages) {
-        const std::string line = report.Line(message);
+    for (const fnd_Finding& each : report.findings) {
+        const std::string line = report.Line(each);
         // What the program prints begins with the file, the place in it and the kind.
         const std::string place =
-            message.line > 0 ? std::to_string(message.line) + ":" + std::to_string(message.column) + ":" : "";
-        const std::string head = "m.json:" + place + (message.isError ? " error: " : " warning: ");
+            each.line > 0 ? std::to_string(each.line) + ":" + std::to_string(each.column) + ":" : "";
+        const std::string head = "m.json:" + place + (each.IsError() ? " error: " : " warning: ");
         EXPECT_EQ(line.substr(0, head.size()), head);
         std::string finding = line.substr(head.size());
         constexpr std::string_view prefix = "/models/Default Model";
         if (finding.starts_with(prefix)) finding.replace(0, prefix.size(), "@");
         if (!place.empty()) finding.insert(0, place + " ");
-        if (message.pointer.empty() && place.empty()) finding.insert(0, ": ");
-        findings.push_back((message.isError ? "" : "warning ") + finding);
+        if (each.place.empty() && place.empty()) finding.insert(0, ": ");
+        findings.push_back((each.IsError() ? "" : "warning ") + finding);
     }
     return findings;
 }

@@ -55,7 +55,7 @@ const FindingCase frameCases[] = {
       "did you mean 'materials'?"}},
     {"TwiceTheSameMember",
      Model(R"("restartJob": "a", "restartJob": "b")"),
-     {"@/restartJob: the member 'restartJob' stands more than once; expected names that differ"}},
+     {"@/restartJob: the member 'restartJob' stands more than once, expected names that differ"}},
 
     {"DescriptionAsLines",
      Model(R"("description": ["a", "b"])"),

@@ -40,8 +40,8 @@ public:
             "assembly": {"instances": {"I": {"part": "P"}}}, )" +
                                      members + "}}}",
                                  "test", report);
-        for (const mdf_Message& message : report.messages) {
-            EXPECT_FALSE(message.isError) << message.pointer << ": " << message.text;
+        for (const fnd_Finding& finding : report.findings) {
+            EXPECT_FALSE(finding.IsError()) << finding.place << ": " << finding.Text();
         }
         if (odb_ == nullptr) throw std::logic_error("the model can't be read");
     }

@@ -1,5 +1,4 @@
 #include "hostile/Findings.h"
-#include "model_file/checks/mdf_MaterialChecks.h"
 
 namespace {
 
@@ -188,19 +187,6 @@ const FindingCase kCases[] = {
      Material(R"("acousticMedium": {"volumetricDragTable": [[1, 2]]})"),
      {"warning @/materials/M/acousticMedium/volumetricDragTable: volumetricDrag is false, so this will not "
       "stand in the deck"}},
-    {"GasketOptionsWithoutAGasketSection_AreWarnedOf",
-     Material(R"("membraneElastic": {}, "transShearElastic": {}, "density": {})"),
-     {"warning @/materials/M/transShearElastic: no gasket section names this material, so this will not "
-      "stand in the deck",
-      "warning @/materials/M/membraneElastic: no gasket section names this material, so this will not "
-      "stand in the deck"}},
-    {"OtherOptionsOfAGasket_AreWarnedOf",
-     Model(R"("materials": {"M": {"membraneElastic": {}, "density": {}, "creep": {}, "regularization": {}}},
-              "sections": {"S": {"class": "kseC_GasketSection", "materialName": "M"}})"),
-     {"warning @/materials/M/density: the material is a gasket behaviour, which has no such option, so this "
-      "will not stand in the deck",
-      "warning @/materials/M/regularization: the material is a gasket behaviour, which has no such option, "
-      "so this will not stand in the deck"}},
 };
 
 class MaterialChecks : public testing::TestWithParam<FindingCase> {};

@@ -128,7 +128,7 @@ void Fill(cls_Record& record) {
 
 std::string ErrorsOf(const mdf_Report& report) {
     std::string errors;
-    for (const mdf_Message& message : report.messages) errors += report.Line(message) + "\n";
+    for (const fnd_Finding& finding : report.findings) errors += report.Line(finding) + "\n";
     return errors;
 }
 

@@ -145,7 +145,7 @@ TEST(Element, SurfaceElements_AreLeftOutByTheirCapitals) {
 TEST(Element, NodeIndexOutsideTheLabels_Raises) {
     TestStore store;
     odiK_Part& part = store.AddPart("P", {1, 2});
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     part.mesh->AddElementsByIndex("T3D2", {1}, 2, {0, 5}, {}, problems);
     store.model.AddInstance("I", "P");
     EXPECT_EQ(Raised([&] { Written(oif_ElementFromMesh(store.Instance("I"), store.Info())); }),
@@ -184,7 +184,7 @@ TEST(AssemblyElement, Ends_ShowTheirInstance) {
     store.model.AddInstance("my inst", "P");
     odiK_Mesh& mesh = store.model.AssemblyMesh();
     mesh.SetNodes({9}, {0, 0, 0});
-    odiK_RaiseProblems problems;
+    fnd_Raise problems;
     const int first = mesh.AddForeignNode("I-1", 2);
     const int second = mesh.AddForeignNode("my inst", 1);
     mesh.AddElementsByIndex("CONN3D2", {3, 4}, 2, {first, second, 0, first}, {}, problems);

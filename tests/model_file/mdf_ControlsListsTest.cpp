@@ -15,7 +15,7 @@ std::string Written(const odb_Odb& odb) {
 std::unique_ptr<odb_Odb> Read(const std::string& text) {
     mdf_Report report;
     auto odb = mdf_ReadModelText(text, "m.json", report);
-    for (const mdf_Message& message : report.messages) ADD_FAILURE() << report.Line(message);
+    for (const fnd_Finding& finding : report.findings) ADD_FAILURE() << report.Line(finding);
     return odb;
 }
 

@@ -11,8 +11,8 @@ std::string Formatted(const std::string& members) {
     mdf_Report report;
     const auto odb = mdf_ReadModelText(
         R"({"format": "qrx-model/1", "models": {"Default Model": {)" + members + "}}}", "m.json", report);
-    for (const mdf_Message& message : report.messages) {
-        if (message.isError) ADD_FAILURE() << report.Line(message);
+    for (const fnd_Finding& finding : report.findings) {
+        if (finding.IsError()) ADD_FAILURE() << report.Line(finding);
     }
     if (odb == nullptr) return {};
     std::ostringstream out;

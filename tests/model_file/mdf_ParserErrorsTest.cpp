@@ -1,3 +1,4 @@
+#include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "support/TestFolder.h"
 
@@ -10,9 +11,17 @@
 
 namespace {
 
-std::vector<mdf_Error> ErrorsOf(std::string_view text) {
+std::string Line(const std::string& fileName, const fnd_Finding& error) {
+    const std::string line = mdf_LineOf(fileName, error);
+    const std::string severity = " error: ";
+    const std::size_t place = line.find(severity);
+    return place == std::string::npos ? line
+                                      : line.substr(0, place) + " " + line.substr(place + severity.size());
+}
+
+std::vector<fnd_Finding> ErrorsOf(std::string_view text) {
     mdf_Value root;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     EXPECT_FALSE(mdf_Parse(text, root, errors)) << text;
     return errors;
 }
@@ -118,17 +127,17 @@ const SyntaxCase syntaxCases[] = {
 } // namespace
 
 TEST_P(ModelFileSyntax, Document_WithAnErrorOfSyntax_TellsPositionFoundAndExpected) {
-    const std::vector<mdf_Error> errors = ErrorsOf(GetParam().text);
+    const std::vector<fnd_Finding> errors = ErrorsOf(GetParam().text);
     ASSERT_EQ(errors.size(), 1u);
-    EXPECT_EQ(errors[0].Message("f"), "f:" + GetParam().message);
-    EXPECT_EQ(errors[0].pointer, "");
+    EXPECT_EQ(Line("f", errors[0]), "f:" + GetParam().message);
+    EXPECT_EQ(errors[0].place, "");
 }
 
 INSTANTIATE_TEST_SUITE_P(Cases, ModelFileSyntax, testing::ValuesIn(syntaxCases), CaseName);
 
 TEST(ModelFileErrors, Syntax_AfterHalfTheDocument_LeavesNull) {
     mdf_Value root(3);
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     EXPECT_FALSE(mdf_Parse("{\"a\": [1, 2], \"b\"}", root, errors));
     EXPECT_TRUE(root.IsNull());
     EXPECT_FALSE(mdf_Parse(std::string_view("3 \0", 3), root, errors));
@@ -137,16 +146,16 @@ TEST(ModelFileErrors, Syntax_AfterHalfTheDocument_LeavesNull) {
 
 TEST(ModelFileErrors, Members_OfOneName_AreReportedByPointerAndTheFirstStays) {
     mdf_Value root;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     EXPECT_FALSE(
         mdf_Parse(R"({"a/b": [1, {"x~y": 1, "z": 2, "x~y": 3}], "a/b": 4, "c": 5, "a/b": 6})", root, errors));
     ASSERT_EQ(errors.size(), 3u);
-    EXPECT_EQ(errors[0].pointer, "/a~1b/1/x~0y");
+    EXPECT_EQ(errors[0].place, "/a~1b/1/x~0y");
     EXPECT_EQ(errors[0].line, 0);
-    EXPECT_EQ(errors[0].text, "the member 'x~y' stands more than once; expected names that differ");
-    EXPECT_EQ(errors[1].pointer, "/a~1b");
-    EXPECT_EQ(errors[2].Message("m.json"),
-              "m.json: /a~1b: the member 'a/b' stands more than once; expected names that differ");
+    EXPECT_EQ(errors[0].Text(), "the member 'x~y' stands more than once, expected names that differ");
+    EXPECT_EQ(errors[1].place, "/a~1b");
+    EXPECT_EQ(Line("m.json", errors[2]),
+              "m.json: /a~1b: the member 'a/b' stands more than once, expected names that differ");
     ASSERT_EQ(root.Size(), 2u);
     EXPECT_EQ(root.Find("a/b")->Items()[1].Find("x~y")->Int(), 1);
     EXPECT_EQ(root.Find("c")->Int(), 5);
@@ -156,10 +165,10 @@ TEST(ModelFileErrors, Members_RepeatedAmongMany_AreReportedAndTheOthersFound) {
     std::string text = "{";
     for (int i = 0; i < 100; ++i) text += "\"n" + std::to_string(i) + "\": " + std::to_string(i) + ", ";
     mdf_Value root;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     EXPECT_FALSE(mdf_Parse(text + "\"n50\": 0, \"last\": 1}", root, errors));
     ASSERT_EQ(errors.size(), 1u);
-    EXPECT_EQ(errors[0].pointer, "/n50");
+    EXPECT_EQ(errors[0].place, "/n50");
     EXPECT_EQ(root.Find("n50")->Int(), 50);
     EXPECT_EQ(root.Find("n99")->Int(), 99);
     EXPECT_EQ(root.Find("last")->Int(), 1);
@@ -173,9 +182,9 @@ TEST(ModelFileErrors, Members_RepeatedVeryOften_AreReportedUpToTheLimit) {
 
 TEST(ModelFileErrors, AppendPointer_WithTildeAndSlash_Escapes) {
     std::string pointer = "/a";
-    mdf_AppendPointer(pointer, "m~n/o");
-    mdf_AppendPointer(pointer, std::size_t{12});
-    mdf_AppendPointer(pointer, "");
+    fnd_AppendPointer(pointer, "m~n/o");
+    fnd_AppendPointer(pointer, "12");
+    fnd_AppendPointer(pointer, "");
     EXPECT_EQ(pointer, "/a/m~0n~1o/12/");
 }
 
@@ -185,7 +194,7 @@ TEST(ModelFileReadFile, Text_WithAnyBytes_ComesUnchanged) {
     const std::string written("a\r\n\0\xFF\x1A z", 9);
     std::ofstream(path, std::ios::binary) << written;
     std::string text = "old";
-    mdf_Error error;
+    fnd_Finding error;
     EXPECT_TRUE(mdf_ReadFile(path, text, error));
     EXPECT_EQ(text, written);
     std::ofstream(path, std::ios::binary | std::ios::trunc).flush();
@@ -195,15 +204,15 @@ TEST(ModelFileReadFile, Text_WithAnyBytes_ComesUnchanged) {
 
 TEST(ModelFileReadFile, Path_OfNoFile_IsAnErrorInTheSystemsWords) {
     std::string text;
-    mdf_Error error;
+    fnd_Finding error;
     EXPECT_FALSE(mdf_ReadFile(TestFolder().Path("no such file.json"), text, error));
-    EXPECT_EQ(error.text, "the file can't be read: No such file or directory");
+    EXPECT_EQ(error.Text(), "the file can't be read: No such file or directory");
 }
 
 TEST(ModelFileReadFile, Path_OfAFolder_IsAnErrorInTheSystemsWords) {
     std::string text;
-    mdf_Error error;
+    fnd_Finding error;
     EXPECT_FALSE(mdf_ReadFile(TestFolder().Path(), text, error));
-    EXPECT_EQ(error.text, "the file can't be read: Is a directory");
-    EXPECT_EQ(error.Message("x"), "x: the file can't be read: Is a directory");
+    EXPECT_EQ(error.Text(), "the file can't be read: Is a directory");
+    EXPECT_EQ(Line("x", error), "x: the file can't be read: Is a directory");
 }

@@ -14,9 +14,9 @@ namespace {
 
 mdf_Value Parsed(std::string_view text) {
     mdf_Value root;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     EXPECT_TRUE(mdf_Parse(text, root, errors)) << text;
-    for (const mdf_Error& error : errors) ADD_FAILURE() << error.Message("text");
+    for (const fnd_Finding& error : errors) ADD_FAILURE() << error.place << " " << error.Text();
     return root;
 }
 

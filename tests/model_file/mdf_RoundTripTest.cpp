@@ -141,7 +141,7 @@ TEST(ModelFileRoundTrip, AnyDocument_ParsedAndWritten_StaysTheSame) {
     EXPECT_TRUE(Holds([] {
         const Json json = AnyJson(4);
         mdf_Value value;
-        std::vector<mdf_Error> errors;
+        std::vector<fnd_Finding> errors;
         RC_ASSERT(mdf_Parse(json.dump(*rc::gen::inRange(-1, 3)), value, errors));
         RequireSame(json, value);
         std::ostringstream out;
@@ -166,7 +166,7 @@ TEST(ModelFileRoundTrip, AnyDocument_CutAnywhere_IsAnErrorOrTheSameAsTheLibrarys
         if (!text.empty() && *rc::gen::arbitrary<bool>())
             text[*rc::gen::inRange<std::size_t>(0, text.size())] = *rc::gen::arbitrary<char>();
         mdf_Value value;
-        std::vector<mdf_Error> errors;
+        std::vector<fnd_Finding> errors;
         const bool parsed = mdf_Parse(text, value, errors);
         RC_ASSERT(parsed == errors.empty());
         const Json json = Json::parse(text, nullptr, false, true);

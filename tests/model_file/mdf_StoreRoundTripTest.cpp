@@ -17,8 +17,8 @@ std::string Written(const odb_Odb& odb) {
 std::unique_ptr<odb_Odb> Read(const std::string& text) {
     mdf_Report report;
     auto odb = mdf_ReadModelText(text, "m.json", report);
-    for (const mdf_Message& message : report.messages) {
-        if (message.isError) ADD_FAILURE() << report.Line(message) << '\n' << text;
+    for (const fnd_Finding& finding : report.findings) {
+        if (finding.IsError()) ADD_FAILURE() << report.Line(finding) << '\n' << text;
     }
     return odb;
 }

@@ -109,7 +109,7 @@ TEST(ModelFileWriter, Reals_Always_HaveAFractionOrAnExponentAndReadBack) {
     EXPECT_EQ(RealText(std::numeric_limits<double>::denorm_min()), "5e-324\n");
     for (const double value : {9007199254740993.0, 4e9, 123456789012345680.0, 2.2250738585072014e-308}) {
         mdf_Value back;
-        std::vector<mdf_Error> errors;
+        std::vector<fnd_Finding> errors;
         ASSERT_TRUE(mdf_Parse(RealText(value), back, errors));
         EXPECT_EQ(back.Kind(), mdf_Kind::Real);
         EXPECT_FALSE(back.IsLargeInteger());
@@ -174,7 +174,7 @@ TEST(ModelFileWriter, Value_OfEveryForm_KeepsKindsAndRows) {
                              "  \"a\": [\n    null,\n    false\n  ]\n"
                              "}\n";
     mdf_Value value;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     ASSERT_TRUE(mdf_Parse(text, value, errors));
     EXPECT_EQ(Written([&](mdf_Writer& w) { w.Value(value); }), text);
 }
@@ -186,7 +186,7 @@ TEST(ModelFileLocale, NumbersReadAndWritten_UnderACommaLocale_HavePoints) {
     }
     if (set == nullptr) GTEST_SKIP() << "no locale with a decimal comma is installed";
     mdf_Value value;
-    std::vector<mdf_Error> errors;
+    std::vector<fnd_Finding> errors;
     const bool parsed = mdf_Parse("[1.5, 4000000000]", value, errors);
     const std::string written = parsed ? Written([&](mdf_Writer& w) { w.Value(value); }) : "";
     std::setlocale(LC_ALL, "C");

@@ -347,8 +347,9 @@ class Refusals(ProgramTest):
         self.assertEqual((run.returncode, run.errors), (3, ""))
         self.assertEqual(json.loads(run.output), {
             "exitCode": 3,
-            "messages": [{"severity": "error", "file": "job.inp", "pointer": "",
-                          "text": "a folder is in its place: Is a directory"}],
+            "messages": [{"severity": "error", "code": "run-failed", "file": "job.inp", "pointer": "",
+                          "text": "a folder is in its place: Is a directory",
+                          "found": "a folder is in its place: Is a directory"}],
         })
 
 
@@ -473,15 +474,15 @@ class OtherCommands(ProgramTest):
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
         run = self.run_program("check", "model.json")
         self.assertEqual((run.returncode, run.errors),
-                         (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
-                             "gasket section names this material, so this will not stand in the deck\n"
-                             "model.json: warning: /models/Default Model/materials/RING: no section uses the "
-                             "material\n"))
+                         (0, "model.json: warning: /models/Default Model/materials/RING: no section uses the "
+                             "material\n"
+                             "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
+                             "gasket section names this material, so this will not stand in the deck\n"))
         run = self.run_program("write", "model.json")
         self.assertRegex(run.output, r"left out, since a deck can't carry it:\n +1  gasket options \(no gasket "
                                      r"section names their materials\): RING membraneElastic\n$")
 
-    def test_Check_OfAGasketWithFurtherOptions_WarnsOfThem(self):
+    def test_Write_OfAGasketWithFurtherOptions_WarnsOfThem(self):
         self.put("model.json", changed(lambda model: model.update(
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}},
             sections={"S": {"class": "kseC_GasketSection", "materialName": "RING"}})))

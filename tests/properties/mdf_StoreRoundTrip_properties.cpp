@@ -145,7 +145,7 @@ void FillModel(odiK_Model& model) {
         odiK_Mesh& mesh = model.AssemblyMesh();
         const int first = mesh.AddForeignNode(name, labels.nodes.front());
         const int second = mesh.AddForeignNode(name, labels.nodes.back());
-        odiK_RaiseProblems problems;
+        fnd_Raise problems;
         mesh.AddElementsByIndex("CONN3D2", {mesh.NumElements() + 1}, 2, {first, second}, {}, problems);
     }
     const int sets = owners.empty() ? 0 : Upto(4);
@@ -176,8 +176,8 @@ RC_GTEST_PROP(mdf_ModelFile, AnyModel_WrittenReadAndWrittenAgain_StaysTheSame, (
     mdf_Report report;
     const auto copy = mdf_ReadModelText(first, "m.json", report);
     std::string errors;
-    for (const mdf_Message& message : report.messages) {
-        if (message.isError) errors += report.Line(message) + "\n";
+    for (const fnd_Finding& finding : report.findings) {
+        if (finding.IsError()) errors += report.Line(finding) + "\n";
     }
     RC_LOG() << first;
     RC_ASSERT(errors.empty());

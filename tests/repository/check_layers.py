@@ -9,7 +9,7 @@ import re
 import sys
 
 DECK_WRITER = "QRXZptIfwOif.m/src"
-CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER]
+CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks"]
 
 # What a layer may include besides its own headers.
 ALLOWED = {
@@ -17,6 +17,7 @@ ALLOWED = {
     "store_interface": ["foundation"],
     "keyword_layer": ["foundation", "store_interface"],
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
+    "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "model_file": ["foundation", "store_interface"],
     "tools": CORE + ["model_file"],
 }
@@ -25,6 +26,7 @@ ALLOWED = {
 ROOMS = {
     "store_interface": [
         ["records"],
+        ["findings"],
         ["regions"],
         ["records/amplitudes", "records/materials", "records/part_attributes", "records/sections",
          "records/steps"],

@@ -312,11 +312,13 @@ TEST(Mesh, SecondSetOfAName_IsRefused) {
     EXPECT_EQ(mesh.Sets().size(), 2U);
 }
 
-TEST(Problems, OfAProgram_RaiseErrorsAndPassWarnings) {
-    odiK_RaiseProblems problems;
-    EXPECT_EQ(Raised([&] { problems.Warning("/a", "text"); }), "nothing raised");
-    EXPECT_EQ(Raised([&] { problems.Error("/a", "text"); }), "/a: text");
-    EXPECT_EQ(Raised([&] { problems.Error("", "text"); }), "text");
+TEST(Findings, OfAProgramThatFillsAStore_RaiseErrorsAndPassWarnings) {
+    fnd_Raise problems;
+    EXPECT_EQ(Raised([&] { problems.Add("empty-set", "/a", "text"); }), "nothing raised");
+    EXPECT_EQ(
+        Raised([&] { problems.Add("wrong-label", "/a", "found 0", "a positive label", "count from 1"); }),
+        "/a: found 0, expected a positive label; count from 1");
+    EXPECT_EQ(Raised([&] { problems.Add("wrong-label", "", "text"); }), "text");
 }
 
 } // namespace

@@ -372,7 +372,7 @@ TEST(Store, ModelThatCannotBeCompleted_RaisesWhenItIsAskedFor) {
     force.Give("S0").deactivated = true;
     model.loads.Insert("L", force);
     EXPECT_EQ(Raised([&] { store.ddb().model("M"); }),
-              "object 'L', step 'S0': deactivated, but it is not active there");
+              "object 'L', /states/S0: found deactivated, but it is not active there");
 }
 
 } // namespace

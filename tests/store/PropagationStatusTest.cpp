@@ -42,7 +42,7 @@ struct History {
 
 struct Outcome {
     Ints statuses;
-    Strings problems; // "step: text"
+    Strings problems; // "place: text"
 };
 
 Outcome Propagated(char family, const char* kinds, const char* given) {
@@ -53,8 +53,7 @@ Outcome Propagated(char family, const char* kinds, const char* given) {
     }
     Outcome outcome;
     for (const auto& problem : object->Propagate(steps)) {
-        outcome.problems.push_back(std::string(problem.stepName.View()) + ": " +
-                                   std::string(problem.text.View()));
+        outcome.problems.push_back(problem.place + ": " + problem.Text());
     }
     outcome.statuses = StatusesOf(family, *object, steps);
     return outcome;
@@ -147,22 +146,22 @@ struct Refusal {
 };
 
 TEST(PropagationStatus, StateThatCannotBe_IsNotedAndTreatedAsNotGiven) {
-    const std::string dead = "deactivated, but it is not active there";
-    const std::string base = "a state in a linear perturbation step, but it belongs to the base state there; "
+    const std::string dead = "found deactivated, but it is not active there";
+    const std::string base = "found a state in a linear perturbation step, but it belongs to the base state there, "
                              "expected no state";
     std::vector<Refusal> refusals;
     for (const char family : {'B', 'L', 'F', 'I', 'M', 'O'}) {
-        refusals.push_back({family, "IG", "d.", {0, 0}, {"S0: " + dead}});
-        refusals.push_back({family, "IGG", ".d.", {0, 0, 0}, {"S1: " + dead}});
-        refusals.push_back({family, "IGP", "..d", {0, 0, 0}, {"S2: " + dead}});
+        refusals.push_back({family, "IG", "d.", {0, 0}, {"/states/S0: " + dead}});
+        refusals.push_back({family, "IGG", ".d.", {0, 0, 0}, {"/states/S1: " + dead}});
+        refusals.push_back({family, "IGP", "..d", {0, 0, 0}, {"/states/S2: " + dead}});
     }
     for (const char family : {'L', 'F', 'I', 'M'}) {
-        refusals.push_back({family, "IGPG", ".ss.", {0, 1, 8, 2}, {"S2: " + base}});
-        refusals.push_back({family, "IGPG", ".sd.", {0, 1, 8, 2}, {"S2: " + base}});
+        refusals.push_back({family, "IGPG", ".ss.", {0, 1, 8, 2}, {"/states/S2: " + base}});
+        refusals.push_back({family, "IGPG", ".sd.", {0, 1, 8, 2}, {"/states/S2: " + base}});
     }
-    refusals.push_back({'B', "IGGG", "sdd.", {1, 4, 5, 5}, {"S2: " + dead}});
-    refusals.push_back({'O', "IGPG", ".sd.", {0, 1, 6, 2}, {"S2: " + dead}});
-    refusals.push_back({'L', "IGPB", "dsss", {0, 1, 8, 8}, {"S0: " + dead, "S2: " + base, "S3: " + base}});
+    refusals.push_back({'B', "IGGG", "sdd.", {1, 4, 5, 5}, {"/states/S2: " + dead}});
+    refusals.push_back({'O', "IGPG", ".sd.", {0, 1, 6, 2}, {"/states/S2: " + dead}});
+    refusals.push_back({'L', "IGPB", "dsss", {0, 1, 8, 8}, {"/states/S0: " + dead, "/states/S2: " + base, "/states/S3: " + base}});
     for (const Refusal& refusal : refusals) {
         SCOPED_TRACE(std::string(1, refusal.family) + " " + refusal.steps + " " + refusal.given);
         const Outcome outcome = Propagated(refusal.family, refusal.steps, refusal.given);
@@ -177,8 +176,8 @@ TEST(PropagationStatus, StateForAnUnknownStep_IsAProblem) {
     force.Give("Nowhere");
     const auto problems = force.Propagate(StepsOf("IG"));
     ASSERT_EQ(problems.size(), 1U);
-    EXPECT_EQ(problems[0].stepName, "Nowhere");
-    EXPECT_EQ(problems[0].text, "a state, but there is no step of that name");
+    EXPECT_EQ(problems[0].place, "/states/Nowhere");
+    EXPECT_EQ(problems[0].Text(), "found a state, but there is no step of that name");
     EXPECT_EQ(force.Status("S1"), Status::CREATED);
 }
 
@@ -326,7 +325,7 @@ TEST(PropagationStatus, ContainerWithABadState_RaisesWithObjectAndStep) {
     loads.Insert("A", good);
     loads.Insert("B", bad);
     EXPECT_EQ(Raised([&] { loads.Propagate(StepsOf("IG")); }),
-              "object 'B', step 'S1': deactivated, but it is not active there");
+              "object 'B', /states/S1: found deactivated, but it is not active there");
 }
 
 } // namespace

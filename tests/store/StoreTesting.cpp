@@ -1,11 +1,7 @@
 #include "store/StoreTesting.h"
 
-void CollectedProblems::Error(const std::string& place, const std::string& text) {
-    all.push_back(place + ": " + text);
-}
-
-void CollectedProblems::Warning(const std::string& place, const std::string& text) {
-    all.push_back("warning " + place + ": " + text);
+void CollectedProblems::Take(fnd_Finding finding) {
+    all.push_back((finding.IsError() ? "" : "warning ") + finding.place + ": " + finding.Text());
 }
 
 std::vector<std::string> Texts(const cow_List<cow_String>& list) {

@@ -1,11 +1,10 @@
 #ifndef QRX_TESTS_STORE_STORETESTING_H
 #define QRX_TESTS_STORE_STORETESTING_H
 
-#include "store_interface/model/odiK_Problems.h"
-
 #include "foundation/cow_List.h"
 #include "foundation/cow_String.h"
 #include "foundation/nex_Exception.h"
+#include "store_interface/findings/fnd_Finding.h"
 
 #include <string>
 #include <vector>
@@ -22,10 +21,9 @@ std::string Raised(Action action) {
 }
 
 /// Keeps the problems as "place: text", warnings with "warning " in front.
-class CollectedProblems : public odiK_Problems {
+class CollectedProblems final : public fnd_Sink {
 public:
-    void Error(const std::string& place, const std::string& text) override;
-    void Warning(const std::string& place, const std::string& text) override;
+    void Take(fnd_Finding finding) override;
 
     std::vector<std::string> all;
 };

@@ -1,0 +1,21 @@
+#ifndef QRX_DCK_CHECK_H
+#define QRX_DCK_CHECK_H
+
+#include "foundation/cow_String.h"
+#include "store_interface/findings/fnd_Finding.h"
+
+class odb_Odb;
+
+/// Everything that can be said of the model "Default Model" of a store before its deck is written, whether
+/// the store was filled in memory or from a file: errors that a model file would be refused for, and warnings
+/// of what the deck can't say, what writing raises, what no step writes. Places are JSON pointers into the
+/// model file that the store would make. Raises when the model can't be completed or isn't there.
+std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
+
+/// The part that a reader of a model file has said already: names, references, fields that a record can't do
+/// without, and the rules of single records and of the model.
+void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
+/// The part that only the deck writer's rules tell. To be asked of a model without errors.
+void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
+
+#endif

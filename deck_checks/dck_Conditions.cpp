@@ -1,0 +1,72 @@
+#include "conditions/oif_BCTable.h"
+#include "conditions/oif_BoundaryConditionBuilder.h"
+#include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Text.h"
+#include "store_interface/model/odiK_Model.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/conditions/kbcC_MotionBCs.h"
+
+#include <optional>
+#include <set>
+
+namespace {
+
+/// The names of the model's element sets, as lists of sets refer to them.
+std::set<std::string> ElementSetsOf(const odiK_Model& model) {
+    std::set<std::string> names;
+    const auto add = [&names](const std::string& prefix, const auto& sets) {
+        for (const auto& set : sets) {
+            if (set->type == res_SetTypeEnm::ELEMENTS) names.insert(prefix + Text(set->name));
+        }
+    };
+    add("", model.AssemblySets());
+    for (const auto& [name, instance] : model.Instances()) {
+        const auto mesh = instance->Mesh();
+        if (!mesh.IsNull()) add(Text(name) + ".", mesh->Sets());
+    }
+    return names;
+}
+
+void FindOnRegion(const kbcC_BC& bc, const std::string& place, fnd_Sink& sink) {
+    const oif_RegionKind expected = oif_FindBCRow(bc.DynTypeId())->region;
+    if (!bc.region.HasValue()) {
+        sink.Add("no-region", place, "the condition has no region, so its lines name no set");
+    } else if (bc.region.FlagWord() != static_cast<int>(expected)) {
+        const bool ofConnectors = expected == oif_RegionKind::ELEMENTS;
+        sink.Add("wrong-region", place + "/region",
+                 "found " + Quoted(bc.region.SetName()) + ", which is " + KindOf(bc.region) +
+                     "; the condition acts on " + (ofConnectors ? "connector elements" : "nodes"));
+    }
+}
+
+} // namespace
+
+void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
+    const oif_BCOpStatus status =
+        oif_BoundaryConditionBuilder::OpStatusOf(model.boundaryConditions, model.loads, model.steps);
+    std::optional<std::set<std::string>> elementSets;
+    for (const auto& [name, bc] : model.boundaryConditions) {
+        if (bc.suppressed) continue;
+        const std::string place = Place("boundaryConditions", name);
+        FindOnRegion(bc, place, sink);
+        if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
+            if (!elementSets) elementSets = ElementSetsOf(model);
+            if (motion->connectors.IsEmpty()) {
+                sink.Add("no-connectors", place + "/connectors",
+                         "the condition names no connectors, so no element set carries its name");
+            }
+            for (int i = 0; i < motion->connectors.Length(); ++i) {
+                if (elementSets->count(Text(motion->connectors[i])) != 0) continue;
+                sink.Add("no-such-element-set", place + "/connectors/" + std::to_string(i),
+                         "found " + Quoted(motion->connectors[i]) + ", which is no element set");
+            }
+        }
+        bool written = false;
+        for (const auto& [stepName, step] : model.steps) {
+            for (const auto& at : oif_BCOpStatus::Places(step, name, bc.Status(stepName))) {
+                written = written || status.Writes(bc, stepName, at.IsLoadCase());
+            }
+        }
+        if (!written) sink.Add("never-written", place, "no step writes the condition");
+    }
+}

@@ -1,0 +1,252 @@
+#include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Text.h"
+#include "store_interface/model/odiK_Model.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/sections/kseC_BeamSection.h"
+#include "store_interface/records/sections/kseC_PointSection.h"
+#include "store_interface/records/sections/kseC_ShellSections.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
+
+#include <algorithm>
+#include <map>
+#include <set>
+#include <string_view>
+
+namespace {
+
+std::string Elements(int count) {
+    return std::to_string(count) + (count == 1 ? " element" : " elements");
+}
+
+/// Collects the texts of all fields of a record, and of the records in it, that name objects of the kind.
+void CollectNames(const cls_FieldType& type, const void* value, const cls_Field& field, std::string_view kind,
+                  std::set<std::string>& names) {
+    switch (type.Kind()) {
+    case cls_FieldKind::String:
+        if (field.refersTo != nullptr && field.refersTo == kind) {
+            names.insert(Text(*static_cast<const cow_String*>(value)));
+        }
+        break;
+    case cls_FieldKind::List: {
+        const auto& list = static_cast<const cls_ListType&>(type);
+        for (int i = 0; i < list.Length(value); ++i) {
+            CollectNames(list.ItemType(), list.Item(value, i), field, kind, names);
+        }
+        break;
+    }
+    case cls_FieldKind::Record:
+    case cls_FieldKind::Optional:
+    case cls_FieldKind::Variant: {
+        const cls_Record* record = static_cast<const cls_HolderType&>(type).Get(value);
+        if (record == nullptr) break;
+        for (const cls_Field& each : record->DynFields().All()) {
+            CollectNames(*each.type, each.In(*record), each, kind, names);
+        }
+        break;
+    }
+    default: break;
+    }
+}
+
+void FindIdleMaterials(const odiK_Model& model, fnd_Sink& sink) {
+    std::set<std::string> used;
+    for (mdl_RepositoryIT it(model.sections); !it.IsDone(); it.Next()) {
+        const cls_Record& section = it.CurrentRecord();
+        for (const cls_Field& field : section.DynFields().All()) {
+            CollectNames(*field.type, field.In(section), field, "material", used);
+        }
+    }
+    for (mdl_RepositoryIT it(model.materials); !it.IsDone(); it.Next()) {
+        if (used.count(Text(it.CurrentKey())) != 0) continue;
+        sink.Add("idle-material", Place("materials", it.CurrentKey()), "no section uses the material");
+    }
+}
+
+/// The sections that elements of a kind can take, by the beginnings of their type labels.
+struct ElementFamily {
+    std::string_view beginning;
+    unsigned (*sections[2])();
+};
+
+constexpr ElementFamily kFamilies[] = {
+    {"B2", {kseC_BeamSection::TypeId}},
+    {"B3", {kseC_BeamSection::TypeId}},
+    {"PIPE", {kseC_BeamSection::TypeId}},
+    {"ELBOW", {kseC_BeamSection::TypeId}},
+    {"FRAME", {kseC_BeamSection::TypeId}},
+    {"T2D", {kseC_TrussSection::TypeId, kseC_SolidSection::TypeId}},
+    {"T3D", {kseC_TrussSection::TypeId, kseC_SolidSection::TypeId}},
+    {"S3", {kseC_ShellSection::TypeId}},
+    {"S4", {kseC_ShellSection::TypeId}},
+    {"S8", {kseC_ShellSection::TypeId}},
+    {"S9", {kseC_ShellSection::TypeId}},
+    {"STRI", {kseC_ShellSection::TypeId}},
+    {"DS", {kseC_ShellSection::TypeId}},
+    {"SAX", {kseC_ShellSection::TypeId}},
+    {"DSAX", {kseC_ShellSection::TypeId}},
+    {"SC", {kseC_ShellSection::TypeId}},
+    {"M3D", {kseC_MembraneSection::TypeId}},
+    {"MAX", {kseC_MembraneSection::TypeId}},
+    {"MGAX", {kseC_MembraneSection::TypeId}},
+    {"GK", {kseC_GasketSection::TypeId}},
+    {"MASS", {kseC_PointSection::TypeId}},
+    {"ROTARYI", {kseC_PointSection::TypeId}},
+    {"C3D", {kseC_SolidSection::TypeId}},
+    {"CPE", {kseC_SolidSection::TypeId}},
+    {"CPS", {kseC_SolidSection::TypeId}},
+    {"CAX", {kseC_SolidSection::TypeId}},
+    {"CGAX", {kseC_SolidSection::TypeId}},
+    {"DC1D", {kseC_SolidSection::TypeId}},
+    {"DC2D", {kseC_SolidSection::TypeId}},
+    {"DC3D", {kseC_SolidSection::TypeId}},
+    {"DCAX", {kseC_SolidSection::TypeId}},
+    {"AC2D", {kseC_SolidSection::TypeId}},
+    {"AC3D", {kseC_SolidSection::TypeId}},
+    {"ACAX", {kseC_SolidSection::TypeId}},
+};
+
+/// Elements that have no section of their own: rigid ones, and connectors, whose section is the assembly's.
+constexpr std::string_view kWithoutSection[] = {"R2D", "R3D", "RAX", "RB", "CONN"};
+
+bool BeginsWith(const cow_String& label, std::string_view beginning) {
+    return label.View().size() >= beginning.size() &&
+           omu_EqualInAnyCapitals(label.View().substr(0, beginning.size()), beginning);
+}
+
+const ElementFamily* FamilyOf(const cow_String& label) {
+    const ElementFamily* found = nullptr;
+    for (const ElementFamily& family : kFamilies) {
+        if (BeginsWith(label, family.beginning) &&
+            (found == nullptr || family.beginning.size() > found->beginning.size())) {
+            found = &family;
+        }
+    }
+    return found;
+}
+
+bool NeedsSection(const cow_String& label) {
+    // Surface elements are not written at all.
+    if (label.View().find("SURF") != std::string_view::npos) return false;
+    return std::none_of(std::begin(kWithoutSection), std::end(kWithoutSection),
+                        [&](std::string_view beginning) { return BeginsWith(label, beginning); });
+}
+
+bool CanTake(const cow_String& label, unsigned section) {
+    const ElementFamily* family = FamilyOf(label);
+    // Of other elements nothing is known.
+    if (family == nullptr) return true;
+    return std::any_of(std::begin(family->sections), std::end(family->sections), [&](unsigned (*id)()) {
+        return id != nullptr && cls_Classes().InheritanceCheck(section, id());
+    });
+}
+
+/// The sections of the elements of one mesh, as the assignments in their order give them.
+void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
+                const std::vector<odiK_AttributeInput>& assignments, const std::string& place,
+                fnd_Sink& sink) {
+    std::vector<const cls_Record*> sectionOf(static_cast<std::size_t>(mesh.NumElements()), nullptr);
+    std::map<const cls_Record*, cow_String> names;
+    for (const odiK_AttributeInput& input : assignments) {
+        const auto& assignment = static_cast<const ptoC_SectionAssignment&>(input.record.ConstGet());
+        const cls_Record* section = model.sections.FindRecord(assignment.sectionName);
+        const int set = mesh.FindSet(input.setName);
+        if (section == nullptr || set < 0) continue;
+        names[section] = assignment.sectionName;
+        for (const rgnC_SubsetData& subset : mesh.Sets()[static_cast<std::size_t>(set)]->subsets) {
+            if (subset.ClassIndex() < 0) continue;
+            const int first = mesh.Classes()[static_cast<std::size_t>(subset.ClassIndex())].firstElementIndex;
+            for (int i = 0; i < subset.subset.Length(); ++i) {
+                sectionOf[static_cast<std::size_t>(first + subset.subset[i])] = section;
+            }
+        }
+    }
+
+    int without = 0;
+    for (const odiK_ElementClass& elements : mesh.Classes()) {
+        std::map<cow_String, std::pair<const cls_Record*, int>> misfits;
+        for (int i = 0; i < elements.NumElements(); ++i) {
+            const cls_Record* section = sectionOf[static_cast<std::size_t>(elements.firstElementIndex + i)];
+            if (section == nullptr) {
+                if (NeedsSection(elements.type)) ++without;
+            } else if (!CanTake(elements.type, section->DynTypeId())) {
+                const auto misfit = misfits.try_emplace(names[section], section, 0).first;
+                ++misfit->second.second;
+            }
+        }
+        for (const auto& [name, misfit] : misfits) {
+            const auto& [section, count] = misfit;
+            sink.Add("wrong-section", place,
+                     Elements(count) + " of type " + Quoted(elements.type) + " can't take the section " +
+                         Quoted(name) + " (" + Text(cls_Classes().NameOf(section->DynTypeId())) + ")");
+        }
+    }
+    if (without > 0) {
+        sink.Add("no-section", place, Elements(without) + (without == 1 ? " has" : " have") + " no section");
+    }
+}
+
+void FindSectionsOfMeshes(const odiK_Model& model, fnd_Sink& sink) {
+    std::set<cow_String> shownParts;
+    for (const auto& [name, instance] : model.Instances()) {
+        if (!instance->isPartInstance) continue;
+        const auto mesh = instance->Mesh();
+        if (mesh.IsNull() || instance->part.IsNull()) continue;
+        const bool isOwn = !instance->ownMesh.IsNull() || instance->ownSectionAssignments.has_value();
+        // Instances that only show their part have its findings.
+        if (!isOwn && !shownParts.insert(instance->partName).second) continue;
+        FindInMesh(model, *mesh,
+                   instance->ownSectionAssignments ? *instance->ownSectionAssignments
+                                                   : instance->part->attributes.sectionAssignments,
+                   isOwn ? "/assembly" + Place("instances", name) : Place("parts", instance->partName), sink);
+    }
+}
+
+constexpr std::string_view kGasketOptions[] = {"membraneElastic", "thicknessBehavior", "transShearElastic"};
+constexpr std::string_view kOptionsBeside[] = {"creep", "depvar", "expansion", "userOutputVariables"};
+
+std::vector<std::string_view> OptionsOf(const kmaC_Material& material) {
+    std::vector<std::string_view> names;
+    for (const cls_Field& field : material.DynFields().All()) {
+        const auto& type = static_cast<const cls_HolderType&>(*field.type);
+        if (type.Get(field.In(material)) != nullptr) names.emplace_back(field.name);
+    }
+    return names;
+}
+
+} // namespace
+
+std::vector<dck_IdleOption> dck_IdleGasketOptions(const odiK_Model& model) {
+    const auto isIn = [](const auto& names, std::string_view name) {
+        return std::ranges::find(names, name) != std::end(names);
+    };
+    std::set<cow_String> gaskets;
+    for (const auto& [name, section] : model.sections) {
+        const auto* gasket = nex_canDynamicCastPtr<kseC_GasketSection>(&section);
+        if (gasket != nullptr) gaskets.insert(gasket->materialName);
+    }
+    std::vector<dck_IdleOption> idle;
+    for (const auto& [name, material] : model.materials) {
+        const std::vector<std::string_view> options = OptionsOf(material);
+        const bool isGasket = gaskets.count(name) != 0 && std::ranges::any_of(options, [&](auto option) {
+                                  return isIn(kGasketOptions, option);
+                              });
+        for (const std::string_view option : options) {
+            const bool ofGaskets = isIn(kGasketOptions, option);
+            const bool isIdle = isGasket ? !ofGaskets && !isIn(kOptionsBeside, option) : ofGaskets;
+            if (isIdle) idle.push_back({name, option, isGasket});
+        }
+    }
+    return idle;
+}
+
+void dck_CheckSections(const odiK_Model& model, fnd_Sink& sink) {
+    FindSectionsOfMeshes(model, sink);
+    FindIdleMaterials(model, sink);
+    for (const dck_IdleOption& idle : dck_IdleGasketOptions(model)) {
+        sink.Add("not-in-deck", Place("materials", idle.material).append("/").append(idle.option),
+                 idle.ofGasket
+                     ? "the material is a gasket behaviour, which has no such option, so this will not "
+                       "stand in the deck"
+                     : "no gasket section names this material, so this will not stand in the deck");
+    }
+}

@@ -1,0 +1,73 @@
+#include "deck_checks/dck_Check.h"
+
+#include "store_interface/model/odb_Odb.h"
+#include "store_interface/records/amplitudes/kamC_Amplitude.h"
+#include "store_interface/records/conditions/kloC_Loads.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
+#include "support/DeckTest.h"
+
+#include <set>
+
+namespace {
+
+using Texts = std::vector<std::string>;
+
+/// "code place: text" of each finding of a store.
+Texts Found(const odb_Odb& odb) {
+    Texts found;
+    const std::string root = "/models/Default Model";
+    for (const fnd_Finding& finding : dck_Check(odb)) {
+        EXPECT_EQ(finding.place.substr(0, root.size()), root);
+        found.push_back(std::string(finding.code->name) + " " + finding.place.substr(root.size()) + ": " +
+                        finding.Text());
+    }
+    return found;
+}
+
+} // namespace
+
+TEST(Check, EmptyStore_HasNothingToSay) {
+    TestStore store;
+    EXPECT_EQ(Found(store.odb), Texts{});
+}
+
+TEST(Check, StoreFilledInMemory_IsHeldAgainstTheRulesOfModelFiles) {
+    TestStore store;
+    store.model.steps.Append("Initial", kprC_InitialStep());
+    kprC_StaticStep step;
+    step.initialInc = 2.0;
+    step.maxInc = 5.0;
+    store.model.steps.Append("Pull", step);
+    kseC_HomogenousSolidSection section;
+    section.materialName = "Stell";
+    store.model.sections.Insert("Solid", section);
+    store.model.materials.Insert("Steel", kmaC_Material());
+    kamC_Tabular amplitude;
+    amplitude.table = cow_2DArray<double>(1, 3);
+    store.model.amplitudes.Insert("a \"name\"", amplitude);
+    EXPECT_EQ(
+        Found(store.odb),
+        (Texts{
+            "no-such-name /sections/Solid/materialName: found 'Stell', expected the name of a material; did "
+            "you mean 'Steel'?",
+            "name-in-deck /amplitudes/a \"name\": found a name with a double quote, expected a name that can "
+            "stand in a deck",
+            "table-columns /amplitudes/a \"name\"/table: found rows of 3, expected rows of 2: time, value",
+            "step-times /steps/1/initialInc: found 2.0, expected timePeriod (1.0) or less"}));
+}
+
+TEST(Check, StoreWithoutErrors_IsToldWhatItsDeckLeavesOut) {
+    TestStore store;
+    store.model.steps.Append("Initial", kprC_InitialStep());
+    store.model.materials.Insert("Steel", kmaC_Material());
+    EXPECT_EQ(Found(store.odb), Texts{"idle-material /materials/Steel: no section uses the material"});
+}
+
+TEST(Check, Codes_EachNamedOnce_HaveAMeaning) {
+    std::set<std::string_view> names;
+    for (const fnd_Code& code : fnd_Codes) {
+        EXPECT_TRUE(names.insert(code.name).second) << code.name;
+        EXPECT_NE(code.meaning[0], '\0') << code.name;
+    }
+}

@@ -1,0 +1,165 @@
+#include "deck_checks/FindingsTest.h"
+
+namespace {
+
+/// A part P with four elements of the type, of which the set SOME holds the first three, and two instances.
+std::string Part(const std::string& type, const std::string& attributes) {
+    return R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
+        "elements": [{"type": ")" +
+           type + R"(", "labels": [1, 2, 3, 4], "connectivity": [[1, 2], [1, 2], [1, 2], [1, 2]]}],
+        "sets": [{"name": "SOME", "kind": "element", "labels": [1, 2, 3]}, {"name": "ALL", "kind": "element", "labels": [1, 2, 3, 4]}]})" +
+           attributes + R"(}}, "assembly": {"instances": {"A": {"part": "P"}, "B": {"part": "P"}}})";
+}
+
+const std::string kSteel = R"("materials": {"Steel": {}},)";
+const std::string kSolid =
+    R"("sections": {"S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)";
+const std::string kOnAll = R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "S"}])";
+
+} // namespace
+
+TEST(ModelChecks, ElementsWithoutASection_AreCountedOnceForAllInstancesOfAPart) {
+    EXPECT_EQ(DeckFindings(Part("C3D8", "")), Texts{"/parts/P: 4 elements have no section"});
+    EXPECT_EQ(
+        DeckFindings(kSteel + kSolid +
+                     Part("C3D8", R"(, "sectionAssignments": [{"region": "SOME", "sectionName": "S"}])")),
+        Texts{"/parts/P: 1 element has no section"});
+}
+
+TEST(ModelChecks, WholeModel_HasNothingToSay) {
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("C3D8", kOnAll)), Texts{});
+}
+
+TEST(ModelChecks, RigidSurfaceAndConnectorElements_NeedNoSection) {
+    EXPECT_EQ(DeckFindings(Part("R3D4", "")), Texts{});
+    EXPECT_EQ(DeckFindings(Part("SURF3D4", "")), Texts{});
+    EXPECT_EQ(DeckFindings(Part("CONN3D2", "")), Texts{});
+}
+
+TEST(ModelChecks, ElementTypeThatCannotTakeTheSection_IsNamed) {
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("S4R", kOnAll)),
+              Texts{"/parts/P: 4 elements of type 'S4R' can't take the section 'S' "
+                    "(kseC_HomogenousSolidSection)"});
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("b31", kOnAll)),
+              Texts{"/parts/P: 4 elements of type 'b31' can't take the section 'S' "
+                    "(kseC_HomogenousSolidSection)"});
+}
+
+TEST(ModelChecks, TrussElements_TakeSolidAndTrussSections) {
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("T3D2", kOnAll)), Texts{});
+    EXPECT_EQ(DeckFindings(kSteel +
+                           R"("sections": {"S": {"class": "kseC_TrussSection", "materialName": "Steel"}},)" +
+                           Part("T3D2", kOnAll)),
+              Texts{});
+}
+
+TEST(ModelChecks, UnknownElementType_TakesAnySection) {
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("SPRINGA", kOnAll)), Texts{});
+}
+
+TEST(ModelChecks, LaterAssignment_DecidesWhichSectionAnElementHas) {
+    EXPECT_EQ(DeckFindings(kSteel + R"("sections": {
+                 "Shell": {"class": "kseC_HomogenousShellSection", "materialName": "Steel"},
+                 "Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)" +
+                           Part("S4", R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"},
+                                                              {"region": "SOME", "sectionName": "Shell"}])")),
+              Texts{"/parts/P: 1 element of type 'S4' can't take the section 'Solid' "
+                    "(kseC_HomogenousSolidSection)"});
+}
+
+TEST(ModelChecks, MaterialThatNoSectionUses_IsNamed) {
+    EXPECT_EQ(DeckFindings(R"("materials": {"a/b": {}, "Bars": {}, "Ply": {}, "Steel": {}},
+        "sections": {
+          "S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"},
+          "C": {"class": "kseC_CompositeShellSection", "layers": [{"materialName": "Ply"}],
+                "rebars": {"layers": [{"name": "L", "materialName": "Bars"}]}}})"),
+              Texts{"/materials/a~1b: no section uses the material"});
+}
+
+TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
+    EXPECT_EQ(DeckFindings(kSteel + kSolid + R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
+        "elements": [{"type": "MASS", "labels": [1], "connectivity": [[1]]}],
+        "sets": [{"name": "ALL", "kind": "element", "labels": [1]}]}}},
+        "assembly": {"instances": {"A": {"part": "P"},
+          "B": {"part": "P", "sectionAssignments": [{"region": "ALL", "sectionName": "S"}]}}})"),
+              (Texts{"/parts/P: 1 element has no section",
+                     "/assembly/instances/B: 1 element of type 'MASS' can't take the section 'S' "
+                     "(kseC_HomogenousSolidSection)"}));
+}
+
+namespace {
+
+/// Findings on a condition "B", or on conditions given whole, on a mesh that needs no section.
+Texts ConditionDeckFindings(const std::string& conditions, const std::string& loadCases = "") {
+    const std::string mesh = R"("parts": {"P": {"mesh": {
+        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
+        "elements": [{"type": "CONN3D2", "labels": [1], "connectivity": [[1, 2]]}],
+        "sets": [{"name": "N", "kind": "node", "labels": [1]}, {"name": "E", "kind": "element", "labels": [1]},
+                 {"name": "S", "kind": "surface", "facets": [[1, "END1"]]}]}}},
+        "assembly": {"instances": {"A": {"part": "P"}}})";
+    return DeckFindings(mesh + R"(, "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
+        {"name": "Linear", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {)" +
+                        loadCases + R"(}}], "boundaryConditions": {)" + conditions + "}");
+}
+
+const std::string kPlace = "/boundaryConditions/";
+
+} // namespace
+
+TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
+    EXPECT_EQ(
+        ConditionDeckFindings(R"(
+        "element": {"class": "kbcC_DisplacementBC", "region": "A.E", "states": {"Initial": {"u1": 0}}},
+        "none": {"class": "kbcC_TypeBC", "states": {"Initial": {"typeName": 0}}},
+        "right": {"class": "kbcC_PorePressureBC", "region": "A.N", "states": {"Initial": {"magnitude": 0}}},
+        "suppressed": {"class": "kbcC_TypeBC", "region": "A.E", "suppressed": true},
+        "surface": {"class": "kbcC_SubmodelBC", "region": "A.S", "states": {"Initial": {"dofs": [1]}}})"),
+        (Texts{kPlace + "element/region: found 'E', which is an element set; the condition acts on nodes",
+               kPlace + "none: the condition has no region, so its lines name no set",
+               kPlace + "surface/region: found 'S', which is a surface; the condition acts on nodes"}));
+}
+
+TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
+    EXPECT_EQ(
+        ConditionDeckFindings(R"(
+        "nodes": {"class": "kbcC_ConnVelocityBC", "region": "A.N", "connectors": ["A.E", "A.N"],
+                  "states": {"Initial": {"v1": 0}}},
+        "nothing": {"class": "kbcC_ConnVelocityBC", "region": "A.E", "states": {"Initial": {"v1": 0}}},
+        "right": {"class": "kbcC_ConnDisplacementBC", "region": "A.E", "connectors": ["A.E"],
+                  "states": {"Initial": {"u1": 0}}})"),
+        (Texts{kPlace +
+                   "nodes/region: found 'N', which is a node set; the condition acts on connector elements",
+               kPlace + "nodes/connectors/1: found 'A.N', which is no element set",
+               kPlace + "nothing/connectors: the condition names no connectors, so no element set carries "
+                        "its name"}));
+}
+
+TEST(ModelChecks, ConditionThatNoStepWrites_IsTold) {
+    EXPECT_EQ(ConditionDeckFindings(R"(
+        "left out": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "taken": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "without states": {"class": "kbcC_TypeBC", "region": "A.N"})",
+                                    R"("case": {"bcs": {"taken": 1}})"),
+              (Texts{kPlace + "left out: no step writes the condition",
+                     kPlace + "without states: no step writes the condition"}));
+}
+
+TEST(MaterialChecks, GasketOptionsWithoutAGasketSection_AreNamed) {
+    const Texts found =
+        DeckFindings(R"("materials": {"M": {"transShearElastic": {}, "membraneElastic": {}}})");
+    const std::string left = ": no gasket section names this material, so this will not stand in the deck";
+    EXPECT_EQ(found, (Texts{"/materials/M: no section uses the material",
+                            "/materials/M/transShearElastic" + left, "/materials/M/membraneElastic" + left}));
+}
+
+TEST(MaterialChecks, OtherOptionsOfAGasket_AreNamed) {
+    const Texts found = DeckFindings(
+        R"("materials": {"M": {"membraneElastic": {}, "density": {}, "creep": {}, "regularization": {}}},
+           "sections": {"S": {"class": "kseC_GasketSection", "materialName": "M"}})");
+    const std::string left =
+        ": the material is a gasket behaviour, which has no such option, so this will not stand "
+        "in the deck";
+    EXPECT_EQ(found, (Texts{"/materials/M/density" + left, "/materials/M/regularization" + left}));
+}
