@@ -57,9 +57,9 @@ void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, Distribution di
     oif_KeywordLine line(stream, style_.keyword);
     if (opNew_) line.Text(", op=NEW");
     if (!amplitude_.IsEmpty()) line.Text(", amplitude=").Text(qkw_QuorixName(amplitude_, false));
-    line.ValueIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
-        .WordIf(fixed, "fixed")
-        .WordIf(distributionType == Distribution::USER_DEFINED, "user");
+    line.BreakingIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
+        .BreakingIf(fixed, "fixed")
+        .BreakingIf(distributionType == Distribution::USER_DEFINED, "user");
     WriteLastParameters(stream);
     if (lineBreak) stream.LineBreak();
 }

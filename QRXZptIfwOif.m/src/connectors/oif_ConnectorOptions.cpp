@@ -38,16 +38,16 @@ void WriteRegularization(oif_KeywordLine& line, const Options& group) {
     const kbeC_ConnectorOptions& options = group.ConstGet();
     if (!options.useBehaviorRegularization) {
         if (options.regularize) {
-            line.Word("regularize=ON")
-                .Value("rtol=", options.useBehaviorRtol ? kbeC_ConnectorOptions::regularizationDef()
-                                                        : options.regularization);
+            line.Breaking("regularize=ON")
+                .Breaking("rtol=", options.useBehaviorRtol ? kbeC_ConnectorOptions::regularizationDef()
+                                                           : options.regularization);
         } else {
-            line.Word("regularize=OFF");
+            line.Breaking("regularize=OFF");
         }
     }
     if (!options.useBehaviorExtrapolation) {
         const bool isLinear = options.extrapolation == kbeC_ConnectorOptions::ExtrapolationEnm::LINEAR;
-        line.Word(isLinear ? "extrapolation=LINEAR" : "extrapolation=CONSTANT");
+        line.Breaking(isLinear ? "extrapolation=LINEAR" : "extrapolation=CONSTANT");
     }
 }
 
@@ -56,10 +56,11 @@ void WriteOptions(oif_KeywordLine& line, const Options& group) {
     WriteRegularization(line, group);
     const kbeC_ConnectorOptions& options = group.ConstGet();
     if (!options.useBehaviorRateFactor) {
-        line.ValueUnless("rate filter factor=", options.rateFactor, kbeC_ConnectorOptions::rateFactorDef());
+        line.BreakingUnless("rate filter factor=", options.rateFactor,
+                            kbeC_ConnectorOptions::rateFactorDef());
     }
-    line.WordIf(options.interpolation == kbeC_ConnectorOptions::InterpolationEnm::LOGARITHMIC,
-                "rate interpolation=LOGARITHMIC");
+    line.BreakingIf(options.interpolation == kbeC_ConnectorOptions::InterpolationEnm::LOGARITHMIC,
+                    "rate interpolation=LOGARITHMIC");
 }
 
 void WriteOptionsAndEnd(utl_Stream& stream, const Options& group) {
@@ -288,11 +289,11 @@ void oif_ConnectorFriction::Write(utl_Stream& stream) const {
     }
     oif_KeywordLine line(stream, "");
     line.Dependencies(option_.dependencies)
-        .WordIf(option_.independentKind == Friction::IndependentKindEnm::POSITION,
-                "independent components=POSITION")
-        .WordIf(option_.independentKind == Friction::IndependentKindEnm::CONSTITUTIVE_MOTION,
-                "independent components=CONSTITUTIVE MOTION")
-        .ValueUnless("stick stiffness=", option_.stickStiffness, Friction::stickStiffnessDef());
+        .BreakingIf(option_.independentKind == Friction::IndependentKindEnm::POSITION,
+                    "independent components=POSITION")
+        .BreakingIf(option_.independentKind == Friction::IndependentKindEnm::CONSTITUTIVE_MOTION,
+                    "independent components=CONSTITUTIVE MOTION")
+        .BreakingUnless("stick stiffness=", option_.stickStiffness, Friction::stickStiffnessDef());
     WriteRegularization(line, option_.options);
     line.End();
     if (isUserDefined && option_.independentKind != Friction::IndependentKindEnm::NONE) {
@@ -401,9 +402,9 @@ void oif_ConnectorDamage::Write(utl_Stream& stream) const {
     ForEachComponent(option_.components, option_.initiationPotentials, [&](const cow_String& component) {
         stream << "*Connector Damage Initiation" << component;
         oif_KeywordLine line(stream, "");
-        line.WordIf(option_.criterion == Criterion::MOTION, "criterion=Motion")
-            .WordIf(option_.criterion == Criterion::PLASTIC_MOTION, "criterion=Plastic Motion")
-            .ValueUnless("dependencies=", option_.initiationDependencies, 0);
+        line.BreakingIf(option_.criterion == Criterion::MOTION, "criterion=Motion")
+            .BreakingIf(option_.criterion == Criterion::PLASTIC_MOTION, "criterion=Plastic Motion")
+            .BreakingUnless("dependencies=", option_.initiationDependencies, 0);
         WriteOptions(line, option_.initiationOptions);
         line.End();
         oif_MaterialTable table = oif_DependentTable(option_.initiationTable, option_.initiationDependencies,
@@ -431,11 +432,12 @@ void oif_ConnectorDamage::WriteEvolution(utl_Stream& stream) const {
     oif_KeywordLine line(stream, "");
     if (softens) {
         const bool isExponential = option_.softening == Damage::SofteningEnm::EXPONENTIAL;
-        line.Word("softening=").Text(isExponential ? "Exponential" : "Tabular");
+        line.Breaking("softening=").Text(isExponential ? "Exponential" : "Tabular");
     }
-    line.WordIf(option_.useAffected, "affected components")
-        .WordIf(option_.degradation == Damage::DegradationEnm::MULTIPLICATIVE, "degradation=Multiplicative")
-        .ValueUnless("dependencies=", option_.evolutionDependencies, 0);
+    line.BreakingIf(option_.useAffected, "affected components")
+        .BreakingIf(option_.degradation == Damage::DegradationEnm::MULTIPLICATIVE,
+                    "degradation=Multiplicative")
+        .BreakingUnless("dependencies=", option_.evolutionDependencies, 0);
     WriteOptions(line, option_.evolutionOptions);
     line.End();
     if (option_.useAffected) WriteIntegers(stream, option_.affectedComponents);

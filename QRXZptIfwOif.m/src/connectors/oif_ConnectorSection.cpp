@@ -95,11 +95,11 @@ void oif_ConnectorBehavior::Write(utl_Stream& stream) const {
     stream << "*Connector Behavior, name=" << qkw_QuorixName(name_, false);
     oif_KeywordLine line(stream, integrationExplicit_ ? ", integration=EXPLICIT" : "");
     if (!regularize_) {
-        line.Word("regularize=OFF");
+        line.Breaking("regularize=OFF");
     } else if (!useBehaviorRegularization_) {
-        line.ValueUnless("rtol=", regularization_, kseC_ConnectorSection::regularizationDef());
+        line.BreakingUnless("rtol=", regularization_, kseC_ConnectorSection::regularizationDef());
     }
-    line.WordIf(extrapolationLinear_, "extrapolation=LINEAR").End();
+    line.BreakingIf(extrapolationLinear_, "extrapolation=LINEAR").End();
 }
 
 void oif_ConnectorConstitutiveReference::Write(utl_Stream& stream) const {

@@ -109,11 +109,11 @@ void oif_RigidBody::Write(utl_Stream& stream) const {
     stream << "*Rigid Body, ref node=" << refNode_;
     if (!elset_.IsEmpty()) stream << ", elset=" << elset_;
     oif_KeywordLine(stream, "")
-        .ValueUnless("pin nset=", pinNset_, cow_String())
-        .ValueUnless("tie nset=", tieNset_, cow_String())
-        .ValueUnless("analytical surface=", analyticalSurface_, cow_String())
-        .WordIf(centerOfMass_, "position=CENTER OF MASS")
-        .WordIf(isothermal_, "isothermal=YES")
+        .BreakingUnless("pin nset=", pinNset_, cow_String())
+        .BreakingUnless("tie nset=", tieNset_, cow_String())
+        .BreakingUnless("analytical surface=", analyticalSurface_, cow_String())
+        .BreakingIf(centerOfMass_, "position=CENTER OF MASS")
+        .BreakingIf(isothermal_, "isothermal=YES")
         .End();
 }
 

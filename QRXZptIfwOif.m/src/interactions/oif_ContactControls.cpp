@@ -8,9 +8,10 @@ namespace {
 
 void WriteStabilization(utl_Stream& stream, oif_KeywordLine& line, const kinC_StdContactControls& controls) {
     if (controls.stabilization == 0) return;
-    line.Word("stabilize");
+    line.Breaking("stabilize");
     if (controls.stabilization == 1) line.Text("=").Text(controls.dampCoef);
-    line.ValueUnless("tangent fraction=", controls.tangFraction, kinC_StdContactControls::tangFractionDef());
+    line.BreakingUnless("tangent fraction=", controls.tangFraction,
+                        kinC_StdContactControls::tangFractionDef());
     const bool hasZeroDamping = controls.zeroDampingChoice == 1;
     if (controls.stabilization != 2 && controls.zeroDampingClearance == 0.0 && !hasZeroDamping) return;
     stream << endl;
@@ -49,13 +50,13 @@ void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContac
                           controls.warpCutoff != Controls::warpCutoffDef()};
     // The line may not break ahead of the first one.
     if (given[0]) line.Text(", fastlocaltrk=").Text(controls.fastLocalTrk ? "YES" : "NO");
-    line.ValueIf(given[1], "globtrkinc=", controls.globTrkInc)
-        .ValueIf(given[2], "scale penalty=", controls.scalePenalty)
-        .ValueIf(given[3], "warp check period=", controls.warpCheckPeriod)
-        .ValueIf(given[4], "warp cut off=", controls.warpCutoff);
+    line.BreakingIf(given[1], "globtrkinc=", controls.globTrkInc)
+        .BreakingIf(given[2], "scale penalty=", controls.scalePenalty)
+        .BreakingIf(given[3], "warp check period=", controls.warpCheckPeriod)
+        .BreakingIf(given[4], "warp cut off=", controls.warpCutoff);
     // What isn't given goes back to its default.
     const bool all = given[0] && given[1] && given[2] && given[3] && given[4];
-    line.WordIf(!all, "reset").End();
+    line.BreakingIf(!all, "reset").End();
 }
 
 void oif_ContactControls::WriteStandard(utl_Stream& stream, const kinC_StdContactControls& controls) const {
@@ -74,16 +75,16 @@ void oif_ContactControls::WriteStandard(utl_Stream& stream, const kinC_StdContac
         stream << ", relativePenetrationTolerance=" << controls.relativePenetrationTolerance;
     }
     oif_KeywordLine line(stream, "");
-    line.ValueUnless("stiffnessScaleFactor=", controls.stiffnessScaleFactor,
-                     Controls::stiffnessScaleFactorDef())
-        .ValueIf(controls.limitSlideDistance, "slideDistance=", controls.slideDistance)
-        .WordIf(controls.delayedFrictionOnset != 0, "frictionOnset=DELAYED");
+    line.BreakingUnless("stiffnessScaleFactor=", controls.stiffnessScaleFactor,
+                        Controls::stiffnessScaleFactorDef())
+        .BreakingIf(controls.limitSlideDistance, "slideDistance=", controls.slideDistance)
+        .BreakingIf(controls.delayedFrictionOnset != 0, "frictionOnset=DELAYED");
     if (controls.automaticTolerances) {
-        line.Word("automaticTolerances");
+        line.Breaking("automaticTolerances");
     } else {
-        line.ValueUnless("maxchp=", controls.maxchp, Controls::maxchpDef())
-            .ValueUnless("perrmx=", controls.perrmx, Controls::perrmxDef())
-            .ValueUnless("uerrmx=", controls.uerrmx, Controls::uerrmxDef());
+        line.BreakingUnless("maxchp=", controls.maxchp, Controls::maxchpDef())
+            .BreakingUnless("perrmx=", controls.perrmx, Controls::perrmxDef())
+            .BreakingUnless("uerrmx=", controls.uerrmx, Controls::uerrmxDef());
     }
     WriteStabilization(stream, line, controls);
     line.End();

@@ -96,22 +96,22 @@ void oif_ContactPair::WriteStandard(utl_Stream& stream,
     const bool surfaceToSurface = contact.formulation == 1;
     oif_KeywordLine line(stream, "*Contact Pair, interaction=");
     line.Text(qkw_QuorixName(contact.ConstGetState(step_).InteractionProperty.ConstGet(), false))
-        .WordIf(smallSliding, "small sliding")
-        .ValueIf(!smallSliding && contact.limitSlideDistance, "slide distance=", contact.slideDistance)
-        .WordIf(surfaceToSurface, "type=SURFACE TO SURFACE")
-        .WordIf(!contact.thickness && (surfaceToSurface || smallSliding), "no thickness")
-        .ValueIf(!contact.autoHcrit, "hcrit=", contact.hcrit)
-        .ValueUnless("smooth=", contact.smooth, Contact::smoothDef())
-        .ValueUnless("extension zone=", contact.extensionZone, Contact::extensionZoneDef())
-        .ValueIf(!contact.geometricCorrection.IsEmpty(),
-                 "geometric correction=", oif_SetName::QuoteIfNeeded(contact.geometricCorrection));
+        .BreakingIf(smallSliding, "small sliding")
+        .BreakingIf(!smallSliding && contact.limitSlideDistance, "slide distance=", contact.slideDistance)
+        .BreakingIf(surfaceToSurface, "type=SURFACE TO SURFACE")
+        .BreakingIf(!contact.thickness && (surfaceToSurface || smallSliding), "no thickness")
+        .BreakingIf(!contact.autoHcrit, "hcrit=", contact.hcrit)
+        .BreakingUnless("smooth=", contact.smooth, Contact::smoothDef())
+        .BreakingUnless("extension zone=", contact.extensionZone, Contact::extensionZoneDef())
+        .BreakingIf(!contact.geometricCorrection.IsEmpty(),
+                    "geometric correction=", oif_SetName::QuoteIfNeeded(contact.geometricCorrection));
     switch (contact.adjust) {
     case kinC_StdAdjustEnm::NONE: break;
-    case kinC_StdAdjustEnm::ZERO: line.Word("adjust=0.0"); break;
-    case kinC_StdAdjustEnm::TOLERANCE: line.Value("adjust=", contact.adjustTolerance); break;
-    case kinC_StdAdjustEnm::SET: line.Value("adjust=", adjustSetName_); break;
+    case kinC_StdAdjustEnm::ZERO: line.Breaking("adjust=0.0"); break;
+    case kinC_StdAdjustEnm::TOLERANCE: line.Breaking("adjust=", contact.adjustTolerance); break;
+    case kinC_StdAdjustEnm::SET: line.Breaking("adjust=", adjustSetName_); break;
     }
-    line.WordIf(contact.tied, "tied").ValueIf(cpset_, "cpset=", qkw_QuorixName(name_, false)).End();
+    line.BreakingIf(contact.tied, "tied").BreakingIf(cpset_, "cpset=", qkw_QuorixName(name_, false)).End();
     stream << slave_ << ", " << master_ << endl;
 }
 

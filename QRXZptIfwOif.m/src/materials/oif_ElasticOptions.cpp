@@ -7,7 +7,7 @@ namespace {
 template <class R>
 void WriteTestData(utl_Stream& stream, const char* keyword, const R& option) {
     oif_OptionLine(stream, keyword)
-        .ValueUnless("smooth=", option.smoothing, option.smoothingDef())
+        .BreakingUnless("smooth=", option.smoothing, option.smoothingDef())
         .Dependencies(option.dependencies)
         .End();
     oif_MaterialTable table = oif_PlainTable(option.table);
@@ -55,8 +55,8 @@ void WriteTests(utl_Stream& stream, const kmaC_Hyperelastic& option) {
 }
 
 void WriteTolerances(oif_OptionLine& line, const kmaC_Viscoelastic& option) {
-    line.ValueUnless("errtol=", option.errtol, option.errtolDef())
-        .ValueUnless("nmax=", option.nmax, option.nmaxDef());
+    line.BreakingUnless("errtol=", option.errtol, option.errtolDef())
+        .BreakingUnless("nmax=", option.nmax, option.nmaxDef());
 }
 
 } // namespace
@@ -75,8 +75,8 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Uniaxi
 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_VolumetricTestData& option) {
     oif_OptionLine(stream, keyword)
-        .ValueUnless("volinf=", option.volinf, option.volinfDef())
-        .ValueUnless("smooth=", option.smoothing, option.smoothingDef())
+        .BreakingUnless("volinf=", option.volinf, option.volinfDef())
+        .BreakingUnless("smooth=", option.smoothing, option.smoothingDef())
         .Dependencies(option.dependencies)
         .End();
     stream << oif_DependentTable(option);
@@ -87,9 +87,9 @@ void oif_WriteElasticity(utl_Stream& stream, const kmaC_Elastic& option, bool ha
     oif_OptionLine line(stream, "*Elastic");
     line.Dependencies(option.dependencies);
     if (option.type == Type::ENGINEERING_CONSTANTS) {
-        line.Word("type=ENGINEERING CONSTANTS");
+        line.Breaking("type=ENGINEERING CONSTANTS");
     } else {
-        line.ValueUnless("type=", option.type, option.typeDef());
+        line.BreakingUnless("type=", option.type, option.typeDef());
     }
     if (hasViscoelastic) line.Moduli(option.longTermModuli);
     line.End();
@@ -102,25 +102,25 @@ void oif_WriteElasticity(utl_Stream& stream, const kmaC_Elastic& option, bool ha
 void oif_WriteElasticity(utl_Stream& stream, const kmaC_Hyperelastic& option, bool hasViscoelastic) {
     using Type = kmaC_Hyperelastic::TypeEnm;
     oif_OptionLine line(stream, "*Hyperelastic");
-    if (HasOrder(option.type)) line.ValueUnless("n=", option.n, option.nDef());
+    if (HasOrder(option.type)) line.BreakingUnless("n=", option.n, option.nDef());
     // The polynomial is what a solver takes where no potential is named.
-    if (option.type != Type::POLYNOMIAL) line.Word(PotentialWord(option.type));
-    if (option.testData && option.type != Type::MARLOW) line.Word("test data input");
+    if (option.type != Type::POLYNOMIAL) line.Breaking(PotentialWord(option.type));
+    if (option.testData && option.type != Type::MARLOW) line.Breaking("test data input");
     if (option.type == Type::USER) {
-        line.Word(option.compressible ? "type=COMPRESSIBLE" : "type=INCOMPRESSIBLE");
+        line.Breaking(option.compressible ? "type=COMPRESSIBLE" : "type=INCOMPRESSIBLE");
     }
     if (option.type == Type::VAN_DER_WAALS && option.testData) {
-        line.ValueUnless("beta=", option.beta, option.betaDef());
+        line.BreakingUnless("beta=", option.beta, option.betaDef());
     }
     if (option.type == Type::USER) {
-        line.ValueUnless("properties=", option.properties, option.propertiesDef());
+        line.BreakingUnless("properties=", option.properties, option.propertiesDef());
     }
     if (hasViscoelastic || !option.hysteresis.IsNull()) {
         line.Moduli(option.moduliTimeScale == kmaC_Hyperelastic::ModuliTimeScaleEnm::LONG_TERM);
     }
     if (option.testData && option.type != Type::UNKNOWN &&
         option.volumetricResponse == kmaC_Hyperelastic::VolumetricResponseEnm::POISSON_RATIO) {
-        line.Value("poisson=", option.poisson);
+        line.Breaking("poisson=", option.poisson);
     }
     line.End();
     if (option.testData) {
@@ -133,9 +133,9 @@ void oif_WriteElasticity(utl_Stream& stream, const kmaC_Hyperelastic& option, bo
 
 void oif_WriteElasticity(utl_Stream& stream, const kmaC_Hyperfoam& option, bool hasViscoelastic) {
     oif_OptionLine line(stream, "*Hyperfoam");
-    line.ValueUnless("n=", option.n, option.nDef())
-        .ValueUnless("poisson=", option.poisson, option.poissonDef())
-        .WordIf(option.testData, "testdata");
+    line.BreakingUnless("n=", option.n, option.nDef())
+        .BreakingUnless("poisson=", option.poisson, option.poissonDef())
+        .BreakingIf(option.testData, "testdata");
     if (hasViscoelastic) line.Moduli(option.longTermModuli);
     line.End();
     if (option.testData) {

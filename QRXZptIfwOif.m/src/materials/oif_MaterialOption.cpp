@@ -54,12 +54,12 @@ constexpr Row Special(const char* keyword) {
 }
 
 constexpr auto kDirection = [](auto& line, const auto& o) { line.Direction(o.type); };
-constexpr auto kLaw = [](auto& line, const auto& o) { line.ValueUnless("law=", o.law, o.lawDef()); };
-constexpr auto kType = [](auto& line, const auto& o) { line.ValueUnless("type=", o.type, o.typeDef()); };
+constexpr auto kLaw = [](auto& line, const auto& o) { line.BreakingUnless("law=", o.law, o.lawDef()); };
+constexpr auto kType = [](auto& line, const auto& o) { line.BreakingUnless("type=", o.type, o.typeDef()); };
 constexpr auto kHardening = [](auto& line, const auto& o) {
-    line.ValueUnless("hardening=", o.hardening, o.hardeningDef());
+    line.BreakingUnless("hardening=", o.hardening, o.hardeningDef());
 };
-constexpr auto kZero = [](auto& line, const auto& o) { line.ValueUnless("zero=", o.zero, o.zeroDef()); };
+constexpr auto kZero = [](auto& line, const auto& o) { line.BreakingUnless("zero=", o.zero, o.zeroDef()); };
 /// Without rates, what follows keeps its place behind a blank column.
 constexpr auto kRateColumn = [](auto& table, const auto& o) {
     if (!o.rateGiven) oif_KeepDependentColumns(table, o);
@@ -97,12 +97,12 @@ constexpr Row kRows[] = {
     Option<kmaC_CapCreepCohesion>("*Cap Creep",
                                   [](auto& line, const auto& o) {
                                       kLaw(line, o);
-                                      line.Word("mechanism=COHESION");
+                                      line.Breaking("mechanism=COHESION");
                                   }),
     Option<kmaC_CapCreepConsolidation>("*Cap Creep",
                                        [](auto& line, const auto& o) {
                                            kLaw(line, o);
-                                           line.Word("mechanism=CONSOLIDATION");
+                                           line.Breaking("mechanism=CONSOLIDATION");
                                        }),
     Option<kmaC_CapHardening>("*Cap Hardening"),
     Option<kmaC_CapPlasticity, &kmaC_CapPlasticity::capCreepCohesion,
@@ -115,15 +115,15 @@ constexpr Row kRows[] = {
     Special<kmaC_ClayPlasticity>("*Clay Plasticity"),
     Option<kmaC_CombinedTestData>("*Combined Test Data",
                                   [](auto& line, const auto& o) {
-                                      line.ValueUnless("shrinf=", o.shrinf, o.shrinfDef())
-                                          .ValueUnless("volinf=", o.volinf, o.volinfDef());
+                                      line.BreakingUnless("shrinf=", o.shrinf, o.shrinfDef())
+                                          .BreakingUnless("volinf=", o.volinf, o.volinfDef());
                                   }),
     Option<kmaC_Concrete, &kmaC_Concrete::failureRatios, &kmaC_Concrete::shearRetention,
            &kmaC_Concrete::tensionStiffening>("*Concrete"),
     Option<kmaC_ConcreteCompressionDamage>("*Concrete Compression Damage",
                                            [](auto& line, const auto& o) {
-                                               line.ValueUnless("tension recovery=", o.tensionRecovery,
-                                                                o.tensionRecoveryDef());
+                                               line.BreakingUnless("tension recovery=", o.tensionRecovery,
+                                                                   o.tensionRecoveryDef());
                                            }),
     Option<kmaC_ConcreteCompressionHardening>("*Concrete Compression Hardening", kNothing, kRateColumn),
     Option<kmaC_ConcreteDamagedPlasticity, &kmaC_ConcreteDamagedPlasticity::concreteCompressionHardening,
@@ -133,8 +133,8 @@ constexpr Row kRows[] = {
     Option<kmaC_ConcreteTensionDamage>("*Concrete Tension Damage",
                                        [](auto& line, const auto& o) {
                                            kType(line, o);
-                                           line.ValueUnless("compression recovery=", o.compressionRecovery,
-                                                            o.compressionRecoveryDef());
+                                           line.BreakingUnless("compression recovery=", o.compressionRecovery,
+                                                               o.compressionRecoveryDef());
                                        }),
     Option<kmaC_ConcreteTensionStiffening>("*Concrete Tension Stiffening", kType, kRateColumn),
     Option<kmaC_Conductivity>("*Conductivity", kDirection),
@@ -143,25 +143,25 @@ constexpr Row kRows[] = {
         "*Creep",
         [](auto& line, const auto& o) {
             if (o.law == kmaC_Creep::LawEnm::HYPERBOLIC_SINE) {
-                line.Word("law=HYPERB");
+                line.Breaking("law=HYPERB");
             } else {
                 kLaw(line, o);
             }
         }),
     Option<kmaC_CycledPlastic>("*Cycled Plastic"),
-    Option<kmaC_CyclicHardening>("*Cyclic Hardening",
-                                 [](auto& line, const auto& o) { line.WordIf(o.parameters, "parameters"); }),
+    Option<kmaC_CyclicHardening>(
+        "*Cyclic Hardening", [](auto& line, const auto& o) { line.BreakingIf(o.parameters, "parameters"); }),
     Option<kmaC_Damping>("*Damping",
                          [](auto& line, const auto& o) {
-                             line.ValueUnless("alpha=", o.alpha, o.alphaDef())
-                                 .ValueUnless("beta=", o.beta, o.betaDef())
-                                 .ValueUnless("composite=", o.composite, o.compositeDef());
+                             line.BreakingUnless("alpha=", o.alpha, o.alphaDef())
+                                 .BreakingUnless("beta=", o.beta, o.betaDef())
+                                 .BreakingUnless("composite=", o.composite, o.compositeDef());
                          }),
     Option<kmaC_DeformationPlasticity>("*Deformation Plasticity"),
     Option<kmaC_Density>("*Density"),
     Option<kmaC_Depvar>(
         "*Depvar",
-        [](auto& line, const auto& o) { line.ValueUnless("delete=", o.deleteVar, o.deleteVarDef()); },
+        [](auto& line, const auto& o) { line.BreakingUnless("delete=", o.deleteVar, o.deleteVarDef()); },
         kCountLine),
     Option<kmaC_DetonationPoint>("*DetonationPoint"),
     Option<kmaC_Dielectric>("*Dielectric", kDirection),
@@ -176,7 +176,7 @@ constexpr Row kRows[] = {
     Special<kmaC_DruckerPragerHardening>("*Drucker Prager Hardening"),
     Option<kmaC_ElectricalConductivity>("*Electrical Conductivity", kDirection),
     Option<kmaC_Eos, &kmaC_Eos::detonationPoint>(
-        "*Eos", [](auto& line, const auto& o) { line.Value("type=", o.type); },
+        "*Eos", [](auto& line, const auto& o) { line.Breaking("type=", o.type); },
         [](auto& table, const auto& o) {
             if (o.type == kmaC_Eos::TypeEnm::JWL) table.InsertEmptyColumn(o.table.NumColumns() - 1);
         }),
@@ -193,15 +193,16 @@ constexpr Row kRows[] = {
     Option<kmaC_FluidBulkModulus>("*Fluid Bulk Modulus"),
     Option<kmaC_FluidDensity>("*Fluid Density",
                               [](auto& line, const auto& o) {
-                                  line.ValueUnless("temperature=", o.temperature, o.temperatureDef())
-                                      .ValueUnless("pressure=", o.pressure, o.pressureDef());
+                                  line.BreakingUnless("temperature=", o.temperature, o.temperatureDef())
+                                      .BreakingUnless("pressure=", o.pressure, o.pressureDef());
                               }),
     Option<kmaC_FluidExpansion>("*Fluid Expansion", kZero),
     Option<kmaC_Foam, &kmaC_Foam::foamHardening, &kmaC_Foam::rateDependent>("*Crushable Foam", kHardening),
     Option<kmaC_FoamHardening>("*Crushable Foam Hardening"),
     Option<kmaC_Gel>("*Gel"),
     Option<kmaC_HeatGeneration>("*Heat Generation"),
-    Option<kmaC_Hypoelastic>("*Hypoelastic", [](auto& line, const auto& o) { line.WordIf(o.user, "user"); }),
+    Option<kmaC_Hypoelastic>("*Hypoelastic",
+                             [](auto& line, const auto& o) { line.BreakingIf(o.user, "user"); }),
     Option<kmaC_Hysteresis>("*Hysteresis"),
     Option<kmaC_InelasticHeatFraction>("*Inelastic Heat Fraction", kNothing, kFractionLine),
     Option<kmaC_JointShearRetention>("*ShearRetention"),
@@ -216,10 +217,10 @@ constexpr Row kRows[] = {
                                                     [](auto& line, const auto& o) {
                                                         // The blank ahead of the equals sign belongs to both
                                                         // names.
-                                                        line.ValueUnless("deviatoric Eccentricity =",
-                                                                         o.deviatoricEccentricity,
-                                                                         o.deviatoricEccentricityDef())
-                                                            .ValueUnless(
+                                                        line.BreakingUnless("deviatoric Eccentricity =",
+                                                                            o.deviatoricEccentricity,
+                                                                            o.deviatoricEccentricityDef())
+                                                            .BreakingUnless(
                                                                 "eccentricity =", o.meridionalEccentricity,
                                                                 o.meridionalEccentricityDef());
                                                     }),
@@ -227,21 +228,21 @@ constexpr Row kRows[] = {
     Option<kmaC_MoistureSwelling, &kmaC_MoistureSwelling::ratios>("*Moisture Swelling"),
     Option<kmaC_Ornl>("*Ornl",
                       [](auto& line, const auto& o) {
-                          line.ValueUnless("a=", o.a, o.aDef())
-                              .ValueUnless("h=", o.h, o.hDef())
-                              .WordIf(o.reset, "reset");
+                          line.BreakingUnless("a=", o.a, o.aDef())
+                              .BreakingUnless("h=", o.h, o.hDef())
+                              .BreakingIf(o.reset, "reset");
                       }),
     Option<kmaC_Permeability, &kmaC_Permeability::saturationDependence,
            &kmaC_Permeability::velocityDependence>("*Permeability",
                                                    [](auto& line, const auto& o) {
-                                                       line.Value("specific=", o.specificWeight);
+                                                       line.Breaking("specific=", o.specificWeight);
                                                        kType(line, o);
                                                    }),
     Option<kmaC_Piezoelectric>("*Piezoelectric",
                                [](auto& line, const auto& o) {
                                    if (o.type == o.typeDef()) return;
                                    // Any number but 0 leaves the parameter without a word.
-                                   line.Word("type=");
+                                   line.Breaking("type=");
                                    if (o.type == kmaC_Piezoelectric::TypeEnm::STRAIN) line.Text("E");
                                }),
     Special<kmaC_PlanarTestData>("*Planar Test Data"),
@@ -250,7 +251,7 @@ constexpr Row kRows[] = {
     Option<kmaC_PorousBulkModuli>("*Porous Bulk Moduli"),
     Option<kmaC_PorousElastic>(
         "*Porous Elastic",
-        [](auto& line, const auto& o) { line.ValueUnless("shear=", o.shear, o.shearDef()); }),
+        [](auto& line, const auto& o) { line.BreakingUnless("shear=", o.shear, o.shearDef()); }),
     Option<kmaC_PorousFailureCriteria>("*Porous Failure Criteria", kNothing,
                                        [](auto& stream, const auto& o) {
                                            stream.Print(o.failureFraction, 12, 6);
@@ -261,17 +262,17 @@ constexpr Row kRows[] = {
     Option<kmaC_PorousMetalPlasticity, &kmaC_PorousMetalPlasticity::porousFailureCriteria,
            &kmaC_PorousMetalPlasticity::voidNucleation>("*Porous Metal Plasticity",
                                                         [](auto& line, const auto& o) {
-                                                            line.ValueUnless(
+                                                            line.BreakingUnless(
                                                                 "relative density=", o.relativeDensity,
                                                                 o.relativeDensityDef());
                                                         }),
     Option<kmaC_Potential>("*Potential"),
-    Option<kmaC_PressureEffect>("*Kappa", [](auto& line, const auto&) { line.Word("type=PRESS"); }),
+    Option<kmaC_PressureEffect>("*Kappa", [](auto& line, const auto&) { line.Breaking("type=PRESS"); }),
     Option<kmaC_RateDependent>("*Rate Dependent",
                                [](auto& line, const auto& o) {
                                    using Type = kmaC_RateDependent::TypeEnm;
-                                   line.WordIf(o.type == Type::YIELD_RATIO, "type=YIELD RATIO")
-                                       .WordIf(o.type == Type::JOHNSON_COOK, "type=JOHNSON COOK");
+                                   line.BreakingIf(o.type == Type::YIELD_RATIO, "type=YIELD RATIO")
+                                       .BreakingIf(o.type == Type::JOHNSON_COOK, "type=JOHNSON COOK");
                                }),
     Option<kmaC_Ratios>("*Ratios"),
     Option<kmaC_SaturationDependence>("*Permeability, Type=SATURATION"),
@@ -279,7 +280,7 @@ constexpr Row kRows[] = {
     Option<kmaC_ShearRetention>("*Shear Retention"),
     Option<kmaC_ShearTestData>(
         "*Shear Test Data",
-        [](auto& line, const auto& o) { line.ValueUnless("shrinf=", o.shrinf, o.shrinfDef()); }),
+        [](auto& line, const auto& o) { line.BreakingUnless("shrinf=", o.shrinf, o.shrinfDef()); }),
     Option<kmaC_SimpleShearTestData>("*Simple Shear Test Data"),
     Option<kmaC_Solubility>("*Solubility"),
     Option<kmaC_SoretEffect>("*Kappa"),
@@ -292,13 +293,14 @@ constexpr Row kRows[] = {
     Special<kmaC_TransShearElastic>("*Gasket elasticity"),
     Option<kmaC_TriaxialTestData>("*Triaxial Test Data",
                                   [](auto& line, const auto& o) {
-                                      line.ValueUnless("a=", o.a, o.aDef())
-                                          .ValueUnless("b=", o.b, o.bDef())
-                                          .ValueUnless("pt=", o.pt, o.ptDef());
+                                      line.BreakingUnless("a=", o.a, o.aDef())
+                                          .BreakingUnless("b=", o.b, o.bDef())
+                                          .BreakingUnless("pt=", o.pt, o.ptDef());
                                   }),
-    Option<kmaC_Trs>(
-        "*Trs",
-        [](auto& line, const auto& o) { line.ValueUnless("definition=", o.definition, o.definitionDef()); }),
+    Option<kmaC_Trs>("*Trs",
+                     [](auto& line, const auto& o) {
+                         line.BreakingUnless("definition=", o.definition, o.definitionDef());
+                     }),
     Special<kmaC_UniaxialTestData>("*Uniaxial Test Data"),
     Option<kmaC_UserDefinedField>("*User Defined Field"),
     Special<kmaC_UserMaterial>("*User Material"),
@@ -309,7 +311,7 @@ constexpr Row kRows[] = {
                          [](auto& line, const auto& o) {
                              using Law = kmaC_Viscous::LawEnm;
                              if (o.law == Law::STRAIN) return;
-                             line.Word(o.law == Law::TIME ? "law=TIME" : "law=USER");
+                             line.Breaking(o.law == Law::TIME ? "law=TIME" : "law=USER");
                          }),
     Option<kmaC_VoidNucleation>("*Void Nucleation"),
     Special<kmaC_VolumetricTestData>("*Volumetric Test Data"),

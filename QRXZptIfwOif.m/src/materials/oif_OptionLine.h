@@ -11,9 +11,10 @@ public:
     /// 1 is orthotropic, 2 anisotropic.
     template <class E>
     void Direction(E type) {
-        WordIf(static_cast<int>(type) == 1, "type=ORTHO").WordIf(static_cast<int>(type) == 2, "type=ANISO");
+        BreakingIf(static_cast<int>(type) == 1, "type=ORTHO")
+            .BreakingIf(static_cast<int>(type) == 2, "type=ANISO");
     }
-    void Moduli(bool longTerm) { Word(longTerm ? "moduli=LONG TERM" : "moduli=INSTANTANEOUS"); }
+    void Moduli(bool longTerm) { Breaking(longTerm ? "moduli=LONG TERM" : "moduli=INSTANTANEOUS"); }
 };
 
 #endif

@@ -4,15 +4,15 @@ namespace {
 
 /// "dependencies=" of gasket options: any number but zero.
 void GasketDependencies(oif_OptionLine& line, int dependencies) {
-    line.ValueUnless("dependencies=", dependencies, 0);
+    line.BreakingUnless("dependencies=", dependencies, 0);
 }
 
 void WriteConstants(utl_Stream& stream, const kmaC_UserMaterial& option, const cow_List<double>& constants,
                     const char* type) {
     oif_OptionLine line(stream, "*User Material");
-    line.Value("constants=", constants.Length());
-    if (type != nullptr) line.Word(type);
-    line.WordIf(option.unsymm, "unsymm").End();
+    line.Breaking("constants=", constants.Length());
+    if (type != nullptr) line.Breaking(type);
+    line.BreakingIf(option.unsymm, "unsymm").End();
     stream << oif_TableOfOneRow([&](int i) { return constants[i]; }, constants.Length());
 }
 
@@ -37,12 +37,12 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Acoust
 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Sorption& option) {
     oif_OptionLine(stream, keyword)
-        .ValueUnless("law=", option.lawAbsorption, option.lawAbsorptionDef())
+        .BreakingUnless("law=", option.lawAbsorption, option.lawAbsorptionDef())
         .End();
     stream << oif_PlainTable(option.absorptionTable);
     if (!option.exsorption) return;
     oif_OptionLine(stream, "*Sorption, type=Exsorption")
-        .ValueUnless("law=", option.lawExsorption, option.lawExsorptionDef())
+        .BreakingUnless("law=", option.lawExsorption, option.lawExsorptionDef())
         .End();
     stream << oif_PlainTable(option.exsorptionTable);
     if (option.scanning == option.scanningDef()) return;
@@ -66,14 +66,14 @@ void oif_WriteSpecial(utl_Stream& stream, const char*, const kmaC_UserMaterial& 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_MembraneElastic& option) {
     oif_OptionLine line(stream, keyword);
     GasketDependencies(line, option.dependencies);
-    line.Word("component=MEMBRANE").End();
+    line.Breaking("component=MEMBRANE").End();
     stream << oif_PlainTable(option.table);
 }
 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_TransShearElastic& option) {
     oif_OptionLine line(stream, keyword);
     GasketDependencies(line, option.dependencies);
-    line.WordIf(option.variableUnits == kmaC_TransShearElastic::VariableUnitsEnm::FORCE, "variable=FORCE")
+    line.BreakingIf(option.variableUnits == kmaC_TransShearElastic::VariableUnitsEnm::FORCE, "variable=FORCE")
         .End();
     stream << oif_PlainTable(option.table);
 }
@@ -81,15 +81,15 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_TransS
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_ThicknessBehavior& option) {
     oif_OptionLine line(stream, keyword);
     GasketDependencies(line, option.dependencies);
-    line.ValueUnless("tensile stiffness factor=", option.tensileStiffnessFactor,
-                     option.tensileStiffnessFactorDef())
-        .WordIf(option.type != option.typeDef(), "type=DAMAGE")
-        .ValueUnless("variable=", option.variableUnits, option.variableUnitsDef());
+    line.BreakingUnless("tensile stiffness factor=", option.tensileStiffnessFactor,
+                        option.tensileStiffnessFactorDef())
+        .BreakingIf(option.type != option.typeDef(), "type=DAMAGE")
+        .BreakingUnless("variable=", option.variableUnits, option.variableUnitsDef());
     // One number, named after what it says of the onset.
     if (option.yieldOnsetMethod != option.yieldOnsetMethodDef()) {
-        line.Value("yield onset=", option.yieldOnset);
+        line.Breaking("yield onset=", option.yieldOnset);
     } else {
-        line.ValueUnless("slope drop=", option.yieldOnset, option.yieldOnsetDef());
+        line.BreakingUnless("slope drop=", option.yieldOnset, option.yieldOnsetDef());
     }
     line.End();
     stream << oif_PlainTable(option.table);
@@ -97,8 +97,8 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Thickn
         oif_OptionLine unloading(stream, "*Gasket Thickness Behavior, direction=UNLOADING");
         GasketDependencies(unloading, option.unloadingDependencies);
         // Unloading is told as damage whatever the loading block says.
-        unloading.Word("type=DAMAGE")
-            .ValueUnless("variable=", option.variableUnits, option.variableUnitsDef())
+        unloading.Breaking("type=DAMAGE")
+            .BreakingUnless("variable=", option.variableUnits, option.variableUnitsDef())
             .End();
         stream << oif_PlainTable(option.unloadingTable);
     }

@@ -37,16 +37,16 @@ void WriteHardening(utl_Stream& stream, const char* keyword, const kmaC_Plastic&
     oif_OptionLine line(stream, keyword);
     line.Dependencies(option.dependencies);
     if (option.hardening == Hardening::JOHNSON_COOK) {
-        line.Word("hardening=JOHNSON COOK");
+        line.Breaking("hardening=JOHNSON COOK");
     } else {
-        line.ValueUnless("hardening=", option.hardening, option.hardeningDef());
+        line.BreakingUnless("hardening=", option.hardening, option.hardeningDef());
     }
-    line.ValueUnless("datatype=", option.dataType, option.dataTypeDef());
-    if (option.dataType == DataType::PARAMETERS) line.Value("numbackstress=", option.numBackstresses);
+    line.BreakingUnless("datatype=", option.dataType, option.dataTypeDef());
+    if (option.dataType == DataType::PARAMETERS) line.Breaking("numbackstress=", option.numBackstresses);
     if (option.hardening == Hardening::USER) {
         // One property a row in the record, all in one row in the deck.
         const int count = option.table.NumRows();
-        line.Value("properties=", count).End();
+        line.Breaking("properties=", count).End();
         stream << oif_TableOfOneRow([&](int row) { return option.table.ConstGet(row, 0); }, count);
         return;
     }
@@ -84,13 +84,13 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Drucke
             oif_OptionLine line(stream, keyword);
             line.Dependencies(option.dependencies).Text(", rate=");
             stream << rate;
-            line.ValueUnless("type=", option.type, option.typeDef()).End();
+            line.BreakingUnless("type=", option.type, option.typeDef()).End();
         });
         return;
     }
     oif_OptionLine(stream, keyword)
         .Dependencies(option.dependencies)
-        .ValueUnless("type=", option.type, option.typeDef())
+        .BreakingUnless("type=", option.type, option.typeDef())
         .End();
     stream << oif_DependentTable(option);
 }
@@ -99,10 +99,10 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Drucke
     using Criterion = kmaC_DruckerPrager::ShearCriterionEnm;
     oif_OptionLine(stream, keyword)
         .Dependencies(option.dependencies)
-        .ValueUnless("eccentricity=", option.eccentricity, option.eccentricityDef())
-        .WordIf(option.shearCriterion == Criterion::HYPERBOLIC, "shearcriterion=HYPERBOLIC")
-        .WordIf(option.shearCriterion == Criterion::EXPONENTIAL, "shearcriterion=EXPONENT FORM")
-        .WordIf(option.testData, "testdata")
+        .BreakingUnless("eccentricity=", option.eccentricity, option.eccentricityDef())
+        .BreakingIf(option.shearCriterion == Criterion::HYPERBOLIC, "shearcriterion=HYPERBOLIC")
+        .BreakingIf(option.shearCriterion == Criterion::EXPONENTIAL, "shearcriterion=EXPONENT FORM")
+        .BreakingIf(option.testData, "testdata")
         .End();
     oif_MaterialTable table(option.table, option.dependencies, option.temperatureDependency);
     if (option.shearCriterion == Criterion::EXPONENTIAL && option.testData) {
@@ -122,8 +122,8 @@ void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Drucke
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_ClayPlasticity& option) {
     oif_OptionLine(stream, keyword)
         .Dependencies(option.dependencies)
-        .ValueUnless("hardening=", option.hardening, option.hardeningDef())
-        .ValueUnless("intercept=", option.intercept, option.interceptDef())
+        .BreakingUnless("hardening=", option.hardening, option.hardeningDef())
+        .BreakingUnless("intercept=", option.intercept, option.interceptDef())
         .End();
     // Tabular hardening has no first constant; its place is left open in the first row, and only there.
     if (option.hardening == kmaC_ClayPlasticity::HardeningEnm::TABULAR && option.table.NumRows() > 0) {

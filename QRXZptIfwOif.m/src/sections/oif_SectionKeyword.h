@@ -20,11 +20,11 @@ protected:
     const kseC_Section& Section() const { return section_.ConstGet(); }
     const cow_String& OrientationName() const { return orientationName_; }
     void WriteControls(oif_KeywordLine& line) const {
-        line.ValueIf(!controlsName_.IsEmpty(), "controls=", controlsName_);
+        line.BreakingIf(!controlsName_.IsEmpty(), "controls=", controlsName_);
     }
     /// Of the orientation and the controls.
     void WriteNames(oif_KeywordLine& line) const {
-        line.ValueIf(!orientationName_.IsEmpty(), "orientation=", orientationName_);
+        line.BreakingIf(!orientationName_.IsEmpty(), "orientation=", orientationName_);
         WriteControls(line);
     }
 

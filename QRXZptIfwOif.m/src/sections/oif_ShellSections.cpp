@@ -47,7 +47,7 @@ void oif_ShellSection::WriteHomogeneous(utl_Stream& stream, const kseC_Homogenou
     oif_KeywordLine line = KeywordLine(stream, shell);
     WriteNames(line);
     WriteTemperature(line, shell);
-    line.Value("material=", Printed(shell.materialName));
+    line.Breaking("material=", Printed(shell.materialName));
     WriteOptions(line, shell);
     line.End();
     stream << shell.thickness << ", ";
@@ -58,7 +58,7 @@ void oif_ShellSection::WriteHomogeneous(utl_Stream& stream, const kseC_Homogenou
 
 void oif_ShellSection::WriteComposite(utl_Stream& stream, const kseC_CompositeShellSection& shell) const {
     oif_KeywordLine line = KeywordLine(stream, shell);
-    line.Word("composite");
+    line.Breaking("composite");
     WriteNames(line);
     WriteTemperature(line, shell);
     WriteOptions(line, shell);
@@ -74,7 +74,7 @@ void oif_ShellSection::WriteUser(utl_Stream& stream, const kseC_UserShellSection
     oif_KeywordLine line(stream, kGeneral);
     line.Text(SetName());
     WriteControls(line);
-    line.WordIf(!shell.symmetric, "unsymm");
+    line.BreakingIf(!shell.symmetric, "unsymm");
 }
 
 oif_KeywordLine oif_ShellSection::KeywordLine(utl_Stream& stream,
@@ -85,18 +85,18 @@ oif_KeywordLine oif_ShellSection::KeywordLine(utl_Stream& stream,
 }
 
 void oif_ShellSection::WriteTemperature(oif_KeywordLine& line, const kseC_GeometryShellSection& shell) {
-    line.ValueIf(shell.temperatureMode == kseC_GeometryShellSection::TemperatureModeEnm::POINTWISE,
-                 "temperature=", shell.temperaturePoints);
+    line.BreakingIf(shell.temperatureMode == kseC_GeometryShellSection::TemperatureModeEnm::POINTWISE,
+                    "temperature=", shell.temperaturePoints);
 }
 
 void oif_ShellSection::WriteOptions(oif_KeywordLine& line, const kseC_GeometryShellSection& shell) const {
     const bool hasModulus = shell.thicknessModulus != shell.thicknessModulusDef();
-    line.ValueUnless("section integration=", shell.integrationRule, shell.integrationRuleDef())
-        .ValueIf(shell.poissonDefinition != shell.poissonDefinitionDef(), "poisson=", shell.poisson)
-        .ValueIf(hasModulus && shell.thicknessModulus > 0.0, "thickness modulus=", shell.thicknessModulus)
-        .ValueIf(offset_ != 0.0, "offset=", offset_)
+    line.BreakingUnless("section integration=", shell.integrationRule, shell.integrationRuleDef())
+        .BreakingIf(shell.poissonDefinition != shell.poissonDefinitionDef(), "poisson=", shell.poisson)
+        .BreakingIf(hasModulus && shell.thicknessModulus > 0.0, "thickness modulus=", shell.thicknessModulus)
+        .BreakingIf(offset_ != 0.0, "offset=", offset_)
         // Also for a modulus that isn't positive and so isn't written.
-        .WordIf(hasModulus && !OrientationName().IsEmpty(), "stack direction=ORIENTATION");
+        .BreakingIf(hasModulus && !OrientationName().IsEmpty(), "stack direction=ORIENTATION");
 }
 
 void oif_ShellSection::WriteRebars(utl_Stream& stream, const kseC_GeometryShellSection& shell) {
@@ -109,9 +109,9 @@ void oif_ShellGeneralSection::Write(utl_Stream& stream) const {
     oif_KeywordLine line(stream, kGeneral);
     line.Text(SetName());
     WriteNames(line);
-    line.WordIf(!shell.symmetric, "unsymm")
+    line.BreakingIf(!shell.symmetric, "unsymm")
         // Wanted this way round: only an offset of zero is written.
-        .ValueIf(offset_ == 0.0, "offset=", offset_);
+        .BreakingIf(offset_ == 0.0, "offset=", offset_);
     RaiseUnimplemented();
 }
 
@@ -126,8 +126,8 @@ void oif_RebarLayer::Write(utl_Stream& stream) const {
     }
     if (hasCommon) {
         oif_KeywordLine(stream, "*Rebar Layer")
-            .WordIf(IsAngular(), "angular spacing")
-            .ValueIf(!orientationName_.IsEmpty(), "orientation=", Printed(orientationName_))
+            .BreakingIf(IsAngular(), "angular spacing")
+            .BreakingIf(!orientationName_.IsEmpty(), "orientation=", Printed(orientationName_))
             .End();
         for (int i = 0; i < rebars_.layers.Length(); ++i) {
             if (rebars_.layers[i].orientationName.IsEmpty()) WriteLayer(stream, rebars_.layers[i]);
@@ -137,7 +137,7 @@ void oif_RebarLayer::Write(utl_Stream& stream) const {
         const kseC_RebarLayer& layer = rebars_.layers[i];
         if (layer.orientationName.IsEmpty()) continue;
         oif_KeywordLine(stream, "*Rebar Layer")
-            .WordIf(IsAngular(), "angular spacing")
+            .BreakingIf(IsAngular(), "angular spacing")
             .Text(", orientation=")
             .Text(Printed(layer.orientationName))
             .End();

@@ -12,7 +12,7 @@ using Material = qkw_QuorixName;
 void WriteTruss(utl_Stream& stream, const cow_String& setName, const kseC_TrussSection& truss) {
     oif_KeywordLine(stream, "*Solid Section, elset=")
         .Text(setName)
-        .Value("material=", Material(truss.materialName, false))
+        .Breaking("material=", Material(truss.materialName, false))
         .End();
     stream << truss.area << "," << endl;
 }
@@ -44,7 +44,7 @@ void oif_SolidSection::Write(utl_Stream& stream) const {
     }
     const bool isComposite = section.DynTypeId() == kseC_CompositeSolidSection::TypeId();
     oif_KeywordLine line(stream, "*Solid Section, elset=");
-    line.Text(SetName()).WordIf(isComposite, "composite");
+    line.Text(SetName()).BreakingIf(isComposite, "composite");
     WriteNames(line);
     if (isComposite) {
         line.End();
@@ -55,16 +55,17 @@ void oif_SolidSection::Write(utl_Stream& stream) const {
         nex_Raise("Unknown solid section type");
     }
     const auto& solid = nex_canDynamicCastRef<kseC_HomogenousSolidSection>(section, NEX_HERE);
-    line.Value("material=", Material(solid.materialName, false)).End();
+    line.Breaking("material=", Material(solid.materialName, false)).End();
     stream << solid.thickness << "," << endl;
 }
 
 void oif_MembraneSection::Write(utl_Stream& stream) const {
     const auto& membrane = nex_canDynamicCastRef<kseC_MembraneSection>(Section(), NEX_HERE);
     oif_KeywordLine line(stream, "*Membrane Section, elset=");
-    line.Text(SetName()).Value("material=", Material(membrane.materialName, false));
+    line.Text(SetName()).Breaking("material=", Material(membrane.materialName, false));
     WriteNames(line);
-    line.ValueIf(membrane.poissonDefinition != membrane.poissonDefinitionDef(), "poisson=", membrane.poisson)
+    line.BreakingIf(membrane.poissonDefinition != membrane.poissonDefinitionDef(),
+                    "poisson=", membrane.poisson)
         .End();
     stream << membrane.thickness << "," << endl;
 }
