@@ -122,8 +122,8 @@ bool IsHeldByItsLength(const kloC_Load& load, const kprC_StepContainer& steps) {
 }
 
 void FindOnLoads(const oif_ModelInfo& info, Findings& findings) {
-    const auto& loads = info.View().Loads();
-    const kprC_StepContainer& steps = info.View().Steps();
+    const auto& loads = info.Model().Loads();
+    const kprC_StepContainer& steps = info.Model().Steps();
     bool canBeWritten = true;
     for (kprC_PropagatingContainerIT<kloC_Load> it(loads); !it.IsDone(); it.Next()) {
         const kloC_Load& load = it.CurrentValue();
@@ -160,8 +160,8 @@ void FindOnLoads(const oif_ModelInfo& info, Findings& findings) {
 }
 
 void FindOnFields(const oif_ModelInfo& info, Findings& findings) {
-    const auto& fields = info.View().Fields();
-    const kprC_StepContainer& steps = info.View().Steps();
+    const auto& fields = info.Model().Fields();
+    const kprC_StepContainer& steps = info.Model().Steps();
     oif_FieldOpStatus status;
     status.Configure(fields, steps.Keys());
     for (kprC_PropagatingContainerIT<kpfC_Field> it(fields); !it.IsDone(); it.Next()) {

@@ -57,7 +57,7 @@ void oif_InstanceBuilder::Build() {
 }
 
 void oif_InstanceBuilder::CreateInstances() {
-    if (!Info().V6Format()) return;
+    if (!ModelInfo().V6Format()) return;
     ForEachPartInstance([&](const cow_String& key, const ddb_PartInstance& instance) {
         AddInstanceDefinition(key, oif_Instance(instance));
     });
@@ -72,7 +72,7 @@ void oif_InstanceBuilder::CreateMesh() {
 }
 
 void oif_InstanceBuilder::CreateConnectors() {
-    const odiK_Assembly& assembly = Info().View().Assembly();
+    const odiK_Assembly& assembly = Model().Assembly();
     const ptoC_PartAttributeList& orientations = assembly.ConstGetConnectorOrientation();
     const auto orientationOf = [&](const rgnC_Region& region) {
         for (int i = 0; i < orientations.Size(); ++i) {
@@ -96,7 +96,7 @@ void oif_InstanceBuilder::CreateConnectors() {
         // Sections of other kinds belong to the instances.
         if (anySection.DynTypeId() != kseC_ConnectorSection::TypeId()) continue;
         if (setName.InstanceName().IsEmpty()) {
-            AddAssemblyDefinition(oif_AssemblyElement(region, printed, Info()));
+            AddAssemblyDefinition(oif_AssemblyElement(region, printed, ModelInfo()));
         }
         const auto& section = nex_canDynamicCastRef<kseC_ConnectorSection>(anySection, NEX_HERE);
         AddAssemblyDefinition(

@@ -5,7 +5,7 @@
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 void oif_ConstraintBuilder::Build() {
-    const ddb_ModelSectorDefinition& sector = Store().modelSectorForCyclicSymmetry();
+    const ddb_ModelSectorDefinition& sector = Model().Model().modelSectorForCyclicSymmetry();
     const bool cyclicModel = sector.GetSymmetryType() == calC_SymmetryTypeEnm::CYCLIC;
     if (cyclicModel) {
         if (ModelInfo().AnalysisProduct() == kprC_AnalysisProductEnm::EXPLICIT) {
@@ -31,7 +31,7 @@ void oif_ConstraintBuilder::AddConstraint(const cow_String& name, const kcoC_Con
     if (type == kcoC_Equation::TypeId()) {
         AddAssemblyDefinition(oif_Equation(name, constraint));
     } else if (type == odiK_Tie::TypeId()) {
-        const bool cyclic = cyclicModel && Store().hasCyclicSymmetry(name);
+        const bool cyclic = cyclicModel && Model().Model().hasCyclicSymmetry(name);
         if (cyclic && ModelInfo().AnalysisProduct() == kprC_AnalysisProductEnm::EXPLICIT) {
             nex_Raise("Cyclic symmetry - invalid parameter for *Tie for /Explicit.");
         }
