@@ -13,7 +13,9 @@ public:
     qkw_BuilderComponent* Copy() const override { return new T(static_cast<const T&>(*this)); }
 
 protected:
-    oif_ModelInfo& ModelInfo() const { return static_cast<oif_ModelInfo&>(qkw_BuilderComponent::ModelInfo()); }
+    oif_ModelInfo& ModelInfo() const {
+        return static_cast<oif_ModelInfo&>(qkw_BuilderComponent::ModelInfo());
+    }
     const oif_Model& Model() const { return static_cast<const oif_Model&>(qkw_BuilderComponent::Model()); }
 
     /// Calls `visit(key, instance)` for each part instance of the assembly, in the order of the deck.
