@@ -1,3 +1,4 @@
+#include "constraints/oif_ConstraintRow.h"
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 #include "store_interface/model/ddb_Model.h"
@@ -7,78 +8,31 @@
 
 namespace {
 
-// As rgnC_Region::FlagWord() gives them.
-constexpr int kNodeSet = 1;
-constexpr int kElementSet = 2;
-constexpr int kSurface = 8;
-
-const char* Wanted(int kinds) {
-    switch (kinds) {
-    case kNodeSet: return "a node set";
-    case kElementSet: return "an element set";
-    case kSurface: return "a surface";
+const char* Wanted(oif_RegionKind kind) {
+    switch (kind) {
+    case oif_RegionKind::NODES: return "a node set";
+    case oif_RegionKind::ELEMENTS: return "an element set";
+    case oif_RegionKind::SURFACE: return "a surface";
     default: return "a surface or a node set";
     }
 }
 
-/// A region of a constraint, and the kinds that it may be of.
-struct RegionRule {
-    unsigned typeId;
-    const char* member;
-    const rgnC_Region& (*region)(const kcoC_Constraint& constraint);
-    int kinds;
-    bool isNeeded;
-};
-
-template <auto Member, class C>
-const rgnC_Region& RegionOf(const kcoC_Constraint& constraint) {
-    return static_cast<const C&>(constraint).*Member;
-}
-
-template <auto Member, class C>
-RegionRule Rule(const char* member, int kinds, bool isNeeded = true) {
-    return {C::TypeId(), member, RegionOf<Member, C>, kinds, isNeeded};
-}
-
-const std::vector<RegionRule>& RegionRules() {
-    using Tie = kcoC_Tie;
-    using Coupling = kcoC_Coupling;
-    using Body = kcoC_RigidBody;
-    using Embedded = kcoC_EmbeddedRegion;
-    using Edge = kcoC_ShellSolidCoupling;
-    static const std::vector<RegionRule> rules{
-        Rule<&Tie::master, Tie>("/master", kSurface | kNodeSet),
-        Rule<&Tie::slave, Tie>("/slave", kSurface | kNodeSet),
-        Rule<&Coupling::surface, Coupling>("/surface", kSurface | kNodeSet),
-        Rule<&Coupling::refNode, Coupling>("/refNode", kNodeSet),
-        Rule<&Body::refNode, Body>("/refNode", kNodeSet),
-        Rule<&Body::elements, Body>("/elements", kElementSet, false),
-        Rule<&Body::tieNodes, Body>("/tieNodes", kNodeSet, false),
-        Rule<&Body::pinNodes, Body>("/pinNodes", kNodeSet, false),
-        Rule<&Body::surface, Body>("/surface", kSurface, false),
-        Rule<&Embedded::host, Embedded>("/host", kElementSet),
-        Rule<&Embedded::embedded, Embedded>("/embedded", kElementSet),
-        Rule<&Edge::shellEdge, Edge>("/shellEdge", kSurface),
-        Rule<&Edge::solidFace, Edge>("/solidFace", kSurface),
-    };
-    return rules;
-}
-
 void FindOnRegions(const kcoC_Constraint& constraint, const std::string& place, fnd_Sink& sink) {
-    const cls_ClassRegistrar& classes = cls_Classes();
-    for (const RegionRule& rule : RegionRules()) {
-        if (!classes.InheritanceCheck(constraint.DynTypeId(), rule.typeId)) continue;
+    const oif_ConstraintRow* row = oif_FindConstraintRow(constraint.DynTypeId());
+    if (row == nullptr) return;
+    for (const auto& rule : row->regions) {
         const rgnC_Region& region = rule.region(constraint);
+        const std::string member = place + "/" + rule.member;
         if (!region.HasValue()) {
             if (rule.isNeeded) {
-                sink.Add("no-region", place + rule.member,
+                sink.Add("no-region", member,
                          std::string("there is none; the deck will name nothing where it needs ") +
-                             Wanted(rule.kinds));
+                             Wanted(rule.kind));
             }
-        } else if ((region.FlagWord() & rule.kinds) == 0) {
-            sink.Add("wrong-region", place + rule.member,
+        } else if (!oif_IsOfKind(region, rule.kind)) {
+            sink.Add("wrong-region", member,
                      Quoted(region.SetName()) + " is " + KindOf(region) + ", and the constraint needs " +
-                         Wanted(rule.kinds));
+                         Wanted(rule.kind));
         }
     }
 }
@@ -100,11 +54,10 @@ void dck_CheckConstraints(const odiK_Model& model, fnd_Sink& sink) {
     if (cyclicModel && ddb_DdbStepContainer::AnalysisProductOf(model.steps, model.analysisProduct) ==
                            kprC_AnalysisProductEnm::EXPLICIT) {
         sink.Add("cannot-be-written", "/cyclicSymmetry",
-                 "writing fails with \"Cyclic symmetry is not valid for Explicit.\"");
+                 std::string("writing fails with \"") + oif_kCyclicModelError + "\"");
     }
-    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(model.constraints); !it.IsDone(); it.Next()) {
-        const kcoC_Constraint& constraint = it.CurrentValue();
-        const std::string place = Place("constraints", it.CurrentKey());
+    for (const auto& [name, constraint] : model.constraints) {
+        const std::string place = Place("constraints", name);
         FindOnRegions(constraint, place, sink);
         const auto* equation = nex_canDynamicCastPtr<kcoC_Equation>(&constraint);
         if (equation != nullptr) FindOnEquation(*equation, place, sink);

@@ -1,5 +1,8 @@
+#include "conditions/oif_OpStatus.h"
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
+#include "interactions/oif_CavityHistory.h"
+#include "interactions/oif_InteractionRow.h"
 #include "store_interface/model/ddb_Model.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -14,55 +17,13 @@ namespace {
 
 using Status = mdl_PropagationStatusEnm;
 
-// As rgnC_Region::FlagWord() gives them.
-constexpr int kNodeSet = 1;
-constexpr int kSurface = 8;
-constexpr int kEither = kNodeSet | kSurface;
-
-/// A region of the interactions of a class and of those derived from it, and the kinds that it may be of.
-struct RegionRule {
-    unsigned (*typeId)();
-    const char* member;
-    const rgnC_Region& (*region)(const kinC_Interaction& interaction);
-    int kinds;
-};
-
-#define QRX_REGION(Class, member, kinds)                                                                     \
-    RegionRule {                                                                                             \
-        Class::TypeId, "/" #member,                                                                          \
-            [](const kinC_Interaction& interaction) -> const rgnC_Region& {                                  \
-                return static_cast<const Class&>(interaction).member;                                        \
-            },                                                                                               \
-            kinds                                                                                            \
-    }
-
-// The rules of the first class that fits hold.
-constexpr RegionRule kRegionRules[] = {
-    QRX_REGION(kinC_SurfaceToSurfaceContact, master, kSurface),
-    QRX_REGION(kinC_SurfaceToSurfaceContact, slave, kEither),
-    QRX_REGION(kinC_SelfContact, surface, kEither),
-    QRX_REGION(kinC_ConcFilmCondition, surface, kNodeSet),
-    QRX_REGION(kinC_FilmCondition, surface, kSurface),
-    QRX_REGION(kinC_ConcRadiationToAmbient, surface, kNodeSet),
-    QRX_REGION(kinC_RadiationToAmbient, surface, kSurface),
-    QRX_REGION(kinC_AcousticImpedance, surface, kSurface),
-    QRX_REGION(kinC_IncidentWave, source, kNodeSet),
-    QRX_REGION(kinC_IncidentWave, standoff, kNodeSet),
-    QRX_REGION(kinC_IncidentWave, surface, kSurface),
-};
-
-#undef QRX_REGION
-
-bool IsOneOf(unsigned typeId, std::initializer_list<unsigned> ids) {
-    return std::find(ids.begin(), ids.end(), typeId) != ids.end();
-}
-
 /// What is found at one interaction.
 class Check {
 public:
     Check(const odiK_Model& model, const std::string& place, const kinC_Interaction& interaction,
           fnd_Sink& sink)
-        : model_(model), place_(place), interaction_(interaction), sink_(sink) {}
+        : model_(model), place_(place), interaction_(interaction), sink_(sink),
+          row_(oif_FindInteractionRow(interaction.DynTypeId())) {}
 
     void Run() {
         CheckFailures();
@@ -88,31 +49,28 @@ private:
     bool IsBegun() const { return !interaction_.CreateStepName().IsEmpty(); }
 
     void CheckFailures() {
-        if (IsOneOf(interaction_.DynTypeId(),
-                    {kinC_ConcFilmCondition::TypeId(), kinC_AcousticImpedance::TypeId(),
-                     kinC_IncidentWave::TypeId()}) &&
-            model_.steps.Size() > 1) {
+        if (model_.steps.Size() > 1 && row_ != nullptr && row_->saying != oif_Saying::NEVER &&
+            oif_FindInteractionFamily(interaction_.DynTypeId()) == nullptr) {
             Add("cannot-be-written", "",
-                "writing fails with \"\"Unimplemented interaction->statusKey conversion\" == 0\": no deck "
-                "with an analysis step can have the interaction");
+                std::string("writing fails with \"") + oif_InteractionOpStatus::NoFamily +
+                    "\": no deck with an analysis step can have the interaction");
         }
         if (interaction_.DynTypeId() != kinC_CavityRadiation::TypeId()) return;
         ForEachAnalysisStep([&](const cow_String& step) {
-            if (interaction_.GetPropStatus(step) <= Status::INSTANCE_NOT_APPLICABLE) return;
+            if (!oif_RaisesForCavity(interaction_.GetPropStatus(step))) return;
             Add("cannot-be-written", "",
-                "writing fails with \"Error in cavity radiation history status.\": the cavity radiates in "
-                "step " +
-                    Quoted(step) + ", which builds on its base state");
+                std::string("writing fails with \"") + oif_kCavityStatusError +
+                    "\": the cavity radiates in step " + Quoted(step) + ", which builds on its base state");
         });
     }
 
-    void CheckRegion(const std::string& member, const rgnC_Region& region, int kinds) {
-        const std::string needed = kinds == kNodeSet   ? "a node set"
-                                   : kinds == kSurface ? "a surface"
-                                                       : "a surface or a node set";
+    void CheckRegion(const std::string& member, const rgnC_Region& region, oif_RegionKind kind) {
+        const std::string needed = kind == oif_RegionKind::NODES     ? "a node set"
+                                   : kind == oif_RegionKind::SURFACE ? "a surface"
+                                                                     : "a surface or a node set";
         if (!region.HasValue()) {
             Add("no-region", member, "found nothing, needed is " + needed);
-        } else if ((region.FlagWord() & kinds) == 0) {
+        } else if (!oif_IsOfKind(region, kind)) {
             Add("wrong-region", member,
                 "found " + Quoted(region.SetName()) + ", which is " + KindOf(region) + "; needed is " +
                     needed);
@@ -120,16 +78,14 @@ private:
     }
 
     void CheckRegions() {
-        const RegionRule* first = nullptr;
-        for (const RegionRule& rule : kRegionRules) {
-            if (!cls_Classes().InheritanceCheck(interaction_.DynTypeId(), rule.typeId())) continue;
-            if (first == nullptr) first = &rule;
-            if (rule.typeId() == first->typeId())
-                CheckRegion(rule.member, rule.region(interaction_), rule.kinds);
+        if (row_ != nullptr) {
+            for (const auto& rule : row_->regions) {
+                CheckRegion(std::string("/") + rule.member, rule.region(interaction_), rule.kind);
+            }
         }
         if (const auto* cavity = nex_canDynamicCastPtr<kinC_CavityRadiation>(&interaction_)) {
             for (int i = 0; i < cavity->surfaces.Length(); ++i) {
-                CheckRegion("/surfaces/" + std::to_string(i), cavity->surfaces[i], kSurface);
+                CheckRegion("/surfaces/" + std::to_string(i), cavity->surfaces[i], oif_RegionKind::SURFACE);
             }
         }
     }
@@ -138,8 +94,7 @@ private:
         const bool isExplicitJob =
             ddb_DdbStepContainer::AnalysisProductOf(model_.steps, model_.analysisProduct) !=
             kprC_AnalysisProductEnm::IMPLICIT;
-        const bool isExplicitPair = IsOneOf(
-            pair.DynTypeId(), {kinC_SurfaceToSurfaceContactXpl::TypeId(), kinC_SelfContactXpl::TypeId()});
+        const bool isExplicitPair = row_->solver == oif_ContactSolver::EXPLICIT;
         if (isExplicitJob != isExplicitPair) {
             Add("wrong-solver", "",
                 isExplicitPair ? "contact of the explicit solver in a job for the implicit one"
@@ -179,13 +134,14 @@ private:
     std::string place_;
     const kinC_Interaction& interaction_;
     fnd_Sink& sink_;
+    const oif_InteractionRow* row_; // null for a class that decks don't know
 };
 
 } // namespace
 
 void dck_CheckInteractions(const odiK_Model& model, fnd_Sink& sink) {
-    for (kprC_PropagatingContainerIT<kinC_Interaction> it(model.interactions); !it.IsDone(); it.Next()) {
-        if (it.CurrentValue().suppressed) continue;
-        Check(model, Place("interactions", it.CurrentKey()), it.CurrentValue(), sink).Run();
+    for (const auto& [name, interaction] : model.interactions) {
+        if (interaction.suppressed) continue;
+        Check(model, Place("interactions", name), interaction, sink).Run();
     }
 }

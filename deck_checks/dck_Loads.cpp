@@ -74,8 +74,8 @@ std::string CannotCarry(const char* failure) {
 }
 
 void FindOnLoads(const oif_ModelInfo& info, fnd_Sink& sink) {
-    const auto& loads = info.View().Loads();
-    const kprC_StepContainer& steps = info.View().Steps();
+    const auto& loads = info.Model().Loads();
+    const kprC_StepContainer& steps = info.Model().Steps();
     bool canBeWritten = true;
     for (const auto& [name, load] : loads) {
         if (load.suppressed || oif_FindLoadRow(load.DynTypeId()) != nullptr) continue;
@@ -109,8 +109,8 @@ void FindOnLoads(const oif_ModelInfo& info, fnd_Sink& sink) {
 }
 
 void FindOnFields(const oif_ModelInfo& info, fnd_Sink& sink) {
-    const auto& fields = info.View().Fields();
-    const kprC_StepContainer& steps = info.View().Steps();
+    const auto& fields = info.Model().Fields();
+    const kprC_StepContainer& steps = info.Model().Steps();
     oif_FieldOpStatus status;
     status.Configure(fields, steps.Keys());
     for (const auto& [name, field] : fields) {

@@ -50,7 +50,7 @@ Keywords KeywordCopies(oif_ModelInfo& modelInfo) {
     components.erase(components.begin() + 1);
     components.insert(components.begin() + 6, std::move(material));
 
-    const oif_Model& model = modelInfo.View();
+    const oif_Model& model = modelInfo.Model();
     deck.push_back(std::make_unique<oif_RawKeyword>("**\n** PARTS\n**\n"));
     for (auto it = model.Parts().createIterator(); !it.isDone(); it.next()) {
         AppendSection(deck, components, [&](auto& from) { return from.PartDefinition(it.currentKey()); });

@@ -13,23 +13,23 @@ const std::string kNames =
 /// The keyword of the interaction C in Step-1, or in Step-2, where it ends.
 template <class Keyword>
 std::string Step(const std::string& className, const std::string& members, const std::string& state,
-                 bool notNew = true, const std::string& procedure = "HeatTransfer",
+                 oif_Op op = oif_Op::MODIFY, const std::string& procedure = "HeatTransfer",
                  const cow_String& step = "Step-1") {
     InteractionModel model(kNames + StepsOf({procedure, procedure}) + ", " +
                            Interactions(className, R"("surface": "I.MASTER", )" + members +
                                                        R"("states": {"Step-1": {)" + state +
                                                        R"(}, "Step-2": {"deactivated": true}})"));
-    return Written(Keyword(model.Interaction(), step, notNew, "I.SET"));
+    return Written(Keyword(model.Interaction(), step, op, "I.SET"));
 }
 
-std::string Sfilm(const std::string& members, const std::string& state, bool notNew = true,
+std::string Sfilm(const std::string& members, const std::string& state, oif_Op op = oif_Op::MODIFY,
                   const cow_String& step = "Step-1") {
-    return Step<oif_Sfilm>("FilmCondition", members, state, notNew, "HeatTransfer", step);
+    return Step<oif_Sfilm>("FilmCondition", members, state, op, "HeatTransfer", step);
 }
 
-std::string Cfilm(const std::string& members, const std::string& state, bool notNew = true,
+std::string Cfilm(const std::string& members, const std::string& state, oif_Op op = oif_Op::MODIFY,
                   const std::string& procedure = "HeatTransfer", const cow_String& step = "Step-1") {
-    return Step<oif_Cfilm>("ConcFilmCondition", members, state, notNew, procedure, step);
+    return Step<oif_Cfilm>("ConcFilmCondition", members, state, op, procedure, step);
 }
 
 const std::string kFilm = R"("sinkTemperature": 20, "filmCoeff": 0.5, "filmProperty": "F 1")";
@@ -65,13 +65,13 @@ TEST(Sfilm, OfTheUsersCode_HasNoAmplitude) {
 }
 
 TEST(Sfilm, New_HasItsParameterLast) {
-    EXPECT_EQ(Sfilm("", kFilm + R"(, "amplitude": "B")", false),
+    EXPECT_EQ(Sfilm("", kFilm + R"(, "amplitude": "B")", oif_Op::NEW),
               "*Sfilm, amplitude=B, op=NEW\nI.SET, F, 20., 0.5\n");
 }
 
 TEST(Sfilm, Ended_IsTheKeywordLineAlone) {
-    EXPECT_EQ(Sfilm("", kFilm + kAmplitudes, false, "Step-2"), "*Sfilm, op=NEW\n");
-    EXPECT_EQ(Sfilm("", kFilm + kAmplitudes, true, "Step-2"), "*Sfilm\n");
+    EXPECT_EQ(Sfilm("", kFilm + kAmplitudes, oif_Op::NEW, "Step-2"), "*Sfilm, op=NEW\n");
+    EXPECT_EQ(Sfilm("", kFilm + kAmplitudes, oif_Op::MODIFY, "Step-2"), "*Sfilm\n");
 }
 
 TEST(Cfilm, LineBelowItsLimit_DoesNotBreak) {
@@ -83,7 +83,7 @@ TEST(Cfilm, LineBelowItsLimit_DoesNotBreak) {
         Interactions("ConcFilmCondition", R"("surface": "I.NODES", "states": {"Step-1": {"amplitude": ")" +
                                               a + R"(", "filmAmplitude": ")" + b + R"("}})"));
     // 98 bytes ahead of the second parameter, so it stays on the line.
-    EXPECT_EQ(Written(oif_Cfilm(model.Interaction(), "Step-1", true, "I.NODES")),
+    EXPECT_EQ(Written(oif_Cfilm(model.Interaction(), "Step-1", oif_Op::MODIFY, "I.NODES")),
               "*Cfilm, amplitude=" + a + ", film amplitude=" + b + "\nI.NODES, 1., 0., 0.\n");
 }
 
@@ -94,48 +94,48 @@ TEST(Cfilm, Line_HasAreaSinkAndCoefficientOrProperty) {
 }
 
 TEST(Cfilm, OfTheUsersCode_SaysSo) {
-    EXPECT_EQ(Cfilm(R"("definition": 2, )", kFilm + kAmplitudes, false),
+    EXPECT_EQ(Cfilm(R"("definition": 2, )", kFilm + kAmplitudes, oif_Op::NEW),
               "*Cfilm, user, op=NEW\nI.SET, 1., 20., 0.5\n");
 }
 
 TEST(Cfilm, RegionType_IsOfExplicitProcedures) {
-    EXPECT_EQ(Cfilm(R"("regionType": 1, )", kFilm, true, "TempDisplacementDynamics"),
+    EXPECT_EQ(Cfilm(R"("regionType": 1, )", kFilm, oif_Op::MODIFY, "TempDisplacementDynamics"),
               "*Cfilm, region type=SLIDING\nI.SET, 1., 20., 0.5\n");
-    EXPECT_EQ(
-        Cfilm(R"("regionType": 2, )", kFilm + R"(, "amplitude": "B")", true, "TempDisplacementDynamics"),
-        "*Cfilm, amplitude=B, region type=EULERIAN\nI.SET, 1., 20., 0.5\n");
-    EXPECT_EQ(Cfilm(R"("regionType": 5, )", kFilm, true, "TempDisplacementDynamics"),
+    EXPECT_EQ(Cfilm(R"("regionType": 2, )", kFilm + R"(, "amplitude": "B")", oif_Op::MODIFY,
+                    "TempDisplacementDynamics"),
+              "*Cfilm, amplitude=B, region type=EULERIAN\nI.SET, 1., 20., 0.5\n");
+    EXPECT_EQ(Cfilm(R"("regionType": 5, )", kFilm, oif_Op::MODIFY, "TempDisplacementDynamics"),
               "*Cfilm\nI.SET, 1., 20., 0.5\n");
     EXPECT_EQ(Cfilm(R"("regionType": 2, )", kFilm), "*Cfilm\nI.SET, 1., 20., 0.5\n");
 }
 
 TEST(Cfilm, Ended_IsTheKeywordLineAlone) {
-    EXPECT_EQ(Cfilm(R"("definition": 2, )", kFilm, false, "TempDisplacementDynamics", "Step-2"),
+    EXPECT_EQ(Cfilm(R"("definition": 2, )", kFilm, oif_Op::NEW, "TempDisplacementDynamics", "Step-2"),
               "*Cfilm, op=NEW\n");
 }
 
 TEST(Sradiate, Line_HasTemperatureAndEmissivity) {
-    const auto text = [](const std::string& state, bool notNew, const cow_String& step) {
-        return Step<oif_Sradiate>("RadiationToAmbient", "", state, notNew, "HeatTransfer", step);
+    const auto text = [](const std::string& state, oif_Op op, const cow_String& step) {
+        return Step<oif_Sradiate>("RadiationToAmbient", "", state, op, "HeatTransfer", step);
     };
-    EXPECT_EQ(text(R"("ambientTemperature": 20, "emissivity": 0.75)", true, "Step-1"),
+    EXPECT_EQ(text(R"("ambientTemperature": 20, "emissivity": 0.75)", oif_Op::MODIFY, "Step-1"),
               "*Sradiate\nI.SET, R, 20., 0.75\n");
-    EXPECT_EQ(text(R"("amplitude": "A 1")", false, "Step-1"),
+    EXPECT_EQ(text(R"("amplitude": "A 1")", oif_Op::NEW, "Step-1"),
               "*Sradiate, amplitude=\"A 1\", op=NEW\nI.SET, R, 0., 0.\n");
-    EXPECT_EQ(text(R"("amplitude": "A 1")", false, "Step-2"), "*Sradiate, op=NEW\n");
+    EXPECT_EQ(text(R"("amplitude": "A 1")", oif_Op::NEW, "Step-2"), "*Sradiate, op=NEW\n");
 }
 
 TEST(Cradiate, Line_HasTheAreaFirst) {
-    const auto text = [](const std::string& members, bool notNew, const std::string& procedure,
+    const auto text = [](const std::string& members, oif_Op op, const std::string& procedure,
                          const cow_String& step) {
         return Step<oif_Cradiate>("ConcRadiationToAmbient", members,
-                                  R"("ambientTemperature": 20, "emissivity": 0.75, "nodalArea": 2)", notNew,
+                                  R"("ambientTemperature": 20, "emissivity": 0.75, "nodalArea": 2)", op,
                                   procedure, step);
     };
-    EXPECT_EQ(text("", true, "HeatTransfer", "Step-1"), "*Cradiate\nI.SET, 2., 20., 0.75\n");
-    EXPECT_EQ(text(R"("regionType": 2, )", false, "TempDisplacementDynamics", "Step-1"),
+    EXPECT_EQ(text("", oif_Op::MODIFY, "HeatTransfer", "Step-1"), "*Cradiate\nI.SET, 2., 20., 0.75\n");
+    EXPECT_EQ(text(R"("regionType": 2, )", oif_Op::NEW, "TempDisplacementDynamics", "Step-1"),
               "*Cradiate, region type=EULERIAN, op=NEW\nI.SET, 2., 20., 0.75\n");
-    EXPECT_EQ(text(R"("regionType": 2, )", false, "TempDisplacementDynamics", "Step-2"),
+    EXPECT_EQ(text(R"("regionType": 2, )", oif_Op::NEW, "TempDisplacementDynamics", "Step-2"),
               "*Cradiate, op=NEW\n");
 }
 

@@ -4,6 +4,8 @@
 #include "interactions/oif_InteractionBuilder.h"
 #include "model_file/mdf_ModelFile.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/interactions/kinC_Contact.h"
+#include "store_interface/records/interactions/kinC_ContactControls.h"
 #include "support/DeckTest.h"
 
 /// The members "steps" of a model: an initial step, and these behind it, each its class without "kprC_" and

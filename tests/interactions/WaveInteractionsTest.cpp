@@ -9,12 +9,13 @@ const std::string kNames =
        "interactionProperties": {"Z 1": {"class": "kinC_AcousticImpedanceProp"},
                                  "W": {"class": "kinC_IncidentWaveProperty"}}, )";
 
-std::string Impedance(const std::string& members, bool notNew = true, const cow_String& step = "Step-1") {
+std::string Impedance(const std::string& members, oif_Op op = oif_Op::MODIFY,
+                      const cow_String& step = "Step-1") {
     InteractionModel model(kNames + StaticSteps(2) + ", " +
                            Interactions("AcousticImpedance", R"("surface": "I.MASTER", )" + members +
                                                                  R"("states": {"Step-1": {"property": "Z 1"},
                                                           "Step-2": {"deactivated": true}})"));
-    return Written(oif_AcousticImpedance(model.Interaction(), step, notNew, "I.SET"));
+    return Written(oif_AcousticImpedance(model.Interaction(), step, op, "I.SET"));
 }
 
 std::string Wave(const std::string& members, const cow_String& step = "Step-1") {
@@ -40,7 +41,7 @@ const std::string kEllipse = R"("nonreflecting": 1, "semiAxisA": 4, "semiAxisB":
 
 TEST(AcousticImpedance, ByAProperty_NamesIt) {
     EXPECT_EQ(Impedance(""), "*Simpedance, property=\"Z 1\"\nI.SET\n");
-    EXPECT_EQ(Impedance("", false), "*Simpedance, property=\"Z 1\", op=NEW\nI.SET\n");
+    EXPECT_EQ(Impedance("", oif_Op::NEW), "*Simpedance, property=\"Z 1\", op=NEW\nI.SET\n");
 }
 
 TEST(AcousticImpedance, Nonreflecting_HasItsShapeAndFigures) {
@@ -57,7 +58,7 @@ TEST(AcousticImpedance, Nonreflecting_HasItsShapeAndFigures) {
 TEST(AcousticImpedance, Ellipse_HasAxesCentreAndDirectionOfItsLength) {
     EXPECT_EQ(Impedance(kEllipse + R"("boundaryType": 4, )"),
               "*Simpedance, nonreflecting=ELLIPTICAL\nI.SET, 4., 0.5, 1., 2., 3., 0., 0., 5.\n");
-    EXPECT_EQ(Impedance(kEllipse + R"("boundaryType": 5, )", false),
+    EXPECT_EQ(Impedance(kEllipse + R"("boundaryType": 5, )", oif_Op::NEW),
               "*Simpedance, nonreflecting=PROLATE SPHEROIDAL, op=NEW\n"
               "I.SET, 4., 0.5, 1., 2., 3., 0., 0., 5.\n");
 }
@@ -73,8 +74,8 @@ TEST(AcousticImpedance, NonreflectingOtherThanOne_NamesTheShapeWithoutFigures_Wa
 }
 
 TEST(AcousticImpedance, Ended_IsTheKeywordLineAlone) {
-    EXPECT_EQ(Impedance("", false, "Step-2"), "*Simpedance, op=NEW\n");
-    EXPECT_EQ(Impedance("", true, "Step-2"), "*Simpedance\n");
+    EXPECT_EQ(Impedance("", oif_Op::NEW, "Step-2"), "*Simpedance, op=NEW\n");
+    EXPECT_EQ(Impedance("", oif_Op::MODIFY, "Step-2"), "*Simpedance\n");
 }
 
 TEST(AcousticImpedanceProp, Impedance_SaysSoAndNeverTellsItsDependencies_Wanted) {

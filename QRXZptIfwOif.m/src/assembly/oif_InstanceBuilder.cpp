@@ -1,9 +1,9 @@
 #include "assembly/oif_InstanceBuilder.h"
 
 #include "base/oif_DataLines.h"
-#include "connectors/oif_ConnectorOptions.h"
+#include "base/oif_KeywordLine.h"
+#include "connectors/oif_ConnectorBehaviorRow.h"
 #include "connectors/oif_ConnectorSection.h"
-#include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 #include "mesh/oif_SetName.h"
@@ -32,8 +32,10 @@ oif_Instance::oif_Instance(const ddb_PartInstance& instance)
 }
 
 void oif_Instance::Write(utl_Stream& stream) const {
-    stream << "*Instance, name=" << qkw_QuorixName(name_, false)
-           << ", part=" << qkw_QuorixName(partName_, false) << endl;
+    oif_KeywordLine(stream, "*Instance")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .Fixed(", part=", qkw_QuorixName(partName_, false))
+        .End();
     const gsl_Vector translation = placement_.GetTranslation();
     gsl_Point point;
     gsl_Vector axis;
@@ -58,7 +60,7 @@ void oif_InstanceBuilder::Build() {
 }
 
 void oif_InstanceBuilder::CreateInstances() {
-    if (!Info().V6Format()) return;
+    if (!ModelInfo().V6Format()) return;
     ForEachPartInstance([&](const cow_String& key, const ddb_PartInstance& instance) {
         AddInstanceDefinition(key, oif_Instance(instance));
     });
@@ -73,74 +75,36 @@ void oif_InstanceBuilder::CreateMesh() {
 }
 
 void oif_InstanceBuilder::CreateConnectors() {
-    const odiK_Assembly& assembly = Info().View().Assembly();
+    const odiK_Assembly& assembly = Model().Assembly();
     const ptoC_PartAttributeList& orientations = assembly.ConstGetConnectorOrientation();
     const auto orientationOf = [&](const rgnC_Region& region) {
-        for (int i = 0; i < orientations.Size(); ++i) {
-            if (!(orientations.ConstGet(i).RegionRef() == region)) continue;
-            return nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientations.ConstGet(i), NEX_HERE);
+        for (const ptoC_PartAttribute& orientation : orientations) {
+            if (!(orientation.RegionRef() == region)) continue;
+            return nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientation, NEX_HERE);
         }
         return ptoC_ConnectorOrientation();
     };
     std::set<cow_String> sectionsDone;
-    const ptoC_PartAttributeList& assignments = assembly.ConstGetSectionAssignment();
-    for (int i = 0; i < assignments.Size(); ++i) {
-        const auto& assignment =
-            nex_canDynamicCastRef<ptoC_SectionAssignment>(assignments.ConstGet(i), NEX_HERE);
+    for (const ptoC_PartAttribute& attribute : assembly.ConstGetSectionAssignment()) {
+        const auto& assignment = nex_canDynamicCastRef<ptoC_SectionAssignment>(attribute, NEX_HERE);
         const cow_String& name = assignment.SectionName();
         const nex_Context context("section assignment of the assembly", name);
         const rgnC_Region& region = assignment.RegionRef();
         const oif_SetName setName(region, ModelInfo());
         const cow_String printed = setName.UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
         if (!Model().Sections().IsMember(name)) continue;
-        const kseC_Section& anySection = Model().Sections().ConstGet(name);
+        const auto* section =
+            nex_canDynamicCastPtr<kseC_ConnectorSection>(&Model().Sections().ConstGet(name));
         // Sections of other kinds belong to the instances.
-        if (anySection.DynTypeId() != kseC_ConnectorSection::TypeId()) continue;
+        if (section == nullptr) continue;
         if (setName.InstanceName().IsEmpty()) {
-            AddAssemblyDefinition(oif_AssemblyElement(region, printed, Info()));
+            AddAssemblyDefinition(oif_AssemblyElement(region, printed, ModelInfo()));
         }
-        const auto& section = nex_canDynamicCastRef<kseC_ConnectorSection>(anySection, NEX_HERE);
         AddAssemblyDefinition(
-            oif_NewConnectorSection(name, printed, section, orientationOf(region), ModelInfo()));
-        if (sectionsDone.insert(name).second) CreateConnectorBehaviors(name, section);
-    }
-}
-
-void oif_InstanceBuilder::CreateConnectorBehaviors(const cow_String& name,
-                                                   const kseC_ConnectorSection& section) {
-    if (kseC_Utils::IsConnectorSectionEmpty(section)) return;
-    AddModelDefinition(oif_ConnectorBehavior(name, section.regularize, section.useBehaviorRegularization,
-                                             section.regularization, section.extrapolationLinear,
-                                             section.integrationExplicit));
-    AddModelDefinition(oif_ConnectorConstitutiveReference(section));
-    oif_DerivedComponents derived;
-    const auto addWithDerived = [&](const auto& keyword) {
-        keyword.GetDerivedComponents(derived);
-        AddModelDefinition(keyword);
-    };
-    for (int i = 0; i < section.options.Length(); ++i) {
-        const kbeC_ConnectorBehaviorOption& option = section.options[i].ConstGet();
-        const unsigned type = option.DynTypeId();
-        if (type == kbeC_ConnectorElasticity::TypeId()) {
-            AddModelDefinition(oif_ConnectorElasticity(static_cast<const kbeC_ConnectorElasticity&>(option)));
-        } else if (type == kbeC_ConnectorDamping::TypeId()) {
-            AddModelDefinition(oif_ConnectorDamping(static_cast<const kbeC_ConnectorDamping&>(option)));
-        } else if (type == kbeC_ConnectorStop::TypeId()) {
-            AddModelDefinition(oif_ConnectorStop(static_cast<const kbeC_ConnectorStop&>(option)));
-        } else if (type == kbeC_ConnectorLock::TypeId()) {
-            AddModelDefinition(oif_ConnectorLock(static_cast<const kbeC_ConnectorLock&>(option)));
-        } else if (type == kbeC_ConnectorFailure::TypeId()) {
-            AddModelDefinition(oif_ConnectorFailure(static_cast<const kbeC_ConnectorFailure&>(option)));
-        } else if (type == kbeC_ConnectorFriction::TypeId()) {
-            addWithDerived(
-                oif_ConnectorFriction(static_cast<const kbeC_ConnectorFriction&>(option), ModelInfo(), i));
-        } else if (type == kbeC_ConnectorPlasticity::TypeId()) {
-            addWithDerived(oif_ConnectorPlasticity(static_cast<const kbeC_ConnectorPlasticity&>(option), i));
-        } else if (type == kbeC_ConnectorDamage::TypeId()) {
-            addWithDerived(oif_ConnectorDamage(static_cast<const kbeC_ConnectorDamage&>(option), i));
+            oif_NewConnectorSection(name, printed, *section, orientationOf(region), ModelInfo()));
+        if (!sectionsDone.insert(name).second) continue;
+        for (const qkw_KeywordHandle& keyword : oif_ConnectorBehaviorKeywords(name, *section, ModelInfo())) {
+            AddModelDefinition(keyword.ConstGet());
         }
-    }
-    for (mdl_MapString2ObjCowIT<kbeC_DerivedComponent> it(derived); !it.IsDone(); it.Next()) {
-        AddModelDefinition(oif_DerivedComponent(it.CurrentKey(), it.CurrentValue()));
     }
 }

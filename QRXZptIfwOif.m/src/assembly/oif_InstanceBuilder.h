@@ -31,8 +31,6 @@ private:
     void CreateInstances();
     void CreateMesh();
     void CreateConnectors();
-    /// The behaviour, its options in order, and behind them all derived components that they refer to.
-    void CreateConnectorBehaviors(const cow_String& name, const kseC_ConnectorSection& section);
 };
 
 #endif

@@ -9,7 +9,7 @@ void oif_Part::Write(utl_Stream& stream) const {
 }
 
 void oif_PartBuilder::Build() {
-    if (!Info().V6Format()) return;
+    if (!ModelInfo().V6Format()) return;
     std::set<cow_String> known;
     for (int i = 0; i < partsWritten_.Length(); ++i) known.insert(partsWritten_[i]);
     ForEachPartInstance([&](const cow_String&, const ddb_PartInstance& instance) {

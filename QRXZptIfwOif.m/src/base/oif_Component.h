@@ -4,7 +4,8 @@
 #include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_BuilderComponent.h"
 
-/// Base of the component class T: copying, and access to the store behind the model view.
+/// Base of the component class T: copying, and the model and the run information in the form that they have
+/// over the store.
 template <class T>
 class oif_ComponentOf : public qkw_BuilderComponent {
 public:
@@ -12,16 +13,16 @@ public:
     qkw_BuilderComponent* Copy() const override { return new T(static_cast<const T&>(*this)); }
 
 protected:
-    oif_ModelInfo& Info() const { return static_cast<oif_ModelInfo&>(ModelInfo()); }
-    const ddb_Model& Store() const { return Info().DdbModel(); }
+    oif_ModelInfo& ModelInfo() const {
+        return static_cast<oif_ModelInfo&>(qkw_BuilderComponent::ModelInfo());
+    }
+    const oif_Model& Model() const { return static_cast<const oif_Model&>(qkw_BuilderComponent::Model()); }
 
     /// Calls `visit(key, instance)` for each part instance of the assembly, in the order of the deck.
     template <class Visitor>
     void ForEachPartInstance(const Visitor& visit) const {
-        for (ddb_InstanceContainerIT it = Store().rootAssembly().instance().createIterator(); !it.isDone();
-             it.next()) {
-            const ddb_BaseInstance instance = it.currentValue();
-            if (instance.IsPartInstance()) visit(it.currentKey(), ddb_PartInstance(instance));
+        for (const auto& [key, instance] : Model().Instances()) {
+            if (instance.IsPartInstance()) visit(key, ddb_PartInstance(instance));
         }
     }
 };

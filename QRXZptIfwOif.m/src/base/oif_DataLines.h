@@ -1,6 +1,7 @@
 #ifndef QRX_OIF_DATALINES_H
 #define QRX_OIF_DATALINES_H
 
+#include "foundation/cow_2DArray.h"
 #include "foundation/utl_Stream.h"
 
 #include <initializer_list>
@@ -41,5 +42,19 @@ private:
     int perLine_;
     int onLine_ = 0;
 };
+
+/// The table's numbers, row by row, `counts` of them on each line; what it doesn't have is left out.
+inline void oif_PrintCells(utl_Stream& stream, const cow_2DArray<double>& table,
+                           std::initializer_list<int> counts) {
+    const int available = table.NumRows() * table.NumColumns();
+    int next = 0;
+    for (const int count : counts) {
+        oif_DataLines line(stream, count);
+        for (int i = 0; i < count && next < available; ++i, ++next) {
+            line.Add(table.ConstGet(next / table.NumColumns(), next % table.NumColumns()));
+        }
+        line.End();
+    }
+}
 
 #endif

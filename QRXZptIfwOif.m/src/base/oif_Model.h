@@ -11,9 +11,10 @@ public:
     oif_Model(const ddb_Model& model, const cow_String& name);
 
     const ddb_Model& Model() const { return ddbModel_; }
+    ddb_Assembly RootAssembly() const { return ddbModel_.rootAssembly(); }
     ddb_PartContainer Parts() const;
     ddb_InstanceContainer Instances() const;
-    /// The assembly-level object with the assembly's attribute lists.
+    /// The object with the assembly's attribute lists.
     const odiK_Assembly& Assembly() const { return ddbModel_.Object("rootAssembly"); }
 
     const mdl_MapString2ObjCow<kadC_AdptMeshCtrl>& AdaptiveMeshControls() const override;

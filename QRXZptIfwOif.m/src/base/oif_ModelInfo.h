@@ -27,8 +27,7 @@ public:
     /// Whether a step behind the first is explicit.
     virtual bool ExplicitJob() const { return explicitJob_; }
 
-    const ddb_Model& DdbModel() const { return model_; }
-    const oif_Model& View() const { return static_cast<const oif_Model&>(Model()); }
+    const oif_Model& Model() const { return static_cast<const oif_Model&>(qkw_ModelInfo::Model()); }
 
 protected:
     /// The other format; decks are never written in it.

@@ -1,21 +1,13 @@
 #ifndef QRX_OIF_CLASSROW_H
 #define QRX_OIF_CLASSROW_H
 
+#include "base/oif_ClassRows.h"
+#include "base/oif_RegionRule.h"
 #include "keyword_layer/qkw_Keyword.h"
 
 #include <algorithm>
 #include <span>
 #include <type_traits>
-
-/// What the lines of a condition have to name. Those that name no set, or may go without, take anything.
-enum class oif_RegionKind : int { ANY = 0, NODES = 1, ELEMENTS = 2, SURFACE = 8 };
-
-/// The row of a class in the table of its family; null if it has none.
-template <class Row>
-const Row* oif_FindRow(std::span<const Row> rows, unsigned typeId) {
-    const auto row = std::ranges::find(rows, typeId, &Row::typeId);
-    return row == rows.end() ? nullptr : &*row;
-}
 
 /// How many families the rows are of.
 template <class Row>

@@ -258,7 +258,7 @@ int oif_FieldOpStatus::Key(unsigned int typeId) const {
 }
 
 const oif_InteractionFamily* oif_FindInteractionFamily(unsigned typeId) {
-    const auto* row = oif_FindRow(std::span<const InteractionRow>(kInteractions), typeId);
+    const auto* row = oif_FindRow(kInteractions, typeId);
     return row == nullptr ? nullptr : &row->family;
 }
 

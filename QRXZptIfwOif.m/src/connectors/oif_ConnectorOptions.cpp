@@ -1,5 +1,6 @@
 #include "connectors/oif_ConnectorOptions.h"
 
+#include "base/oif_DataLines.h"
 #include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
@@ -12,10 +13,7 @@ namespace {
 constexpr int kComponents = 6;
 
 bool Contains(const cow_List<int>& list, int item) {
-    for (int i = 0; i < list.Length(); ++i) {
-        if (list[i] == item) return true;
-    }
-    return false;
+    return std::find(list.begin(), list.end(), item) != list.end();
 }
 
 void WriteIntegers(utl_Stream& stream, const cow_List<int>& values) {
@@ -26,9 +24,8 @@ void WriteIntegers(utl_Stream& stream, const cow_List<int>& values) {
     stream.LineBreak();
 }
 
-/// Parameters that bring their comma and never break the line.
-void WriteDependencies(utl_Stream& stream, int count) {
-    if (count != 0) stream << ", dependencies=" << count;
+void AddDependencies(oif_KeywordLine& line, int count) {
+    line.FixedUnless(", dependencies=", count, 0);
 }
 
 using Options = mdl_ObjCow<kbeC_ConnectorOptions>;
@@ -61,12 +58,6 @@ void WriteOptions(oif_KeywordLine& line, const Options& group) {
     }
     line.BreakingIf(options.interpolation == kbeC_ConnectorOptions::InterpolationEnm::LOGARITHMIC,
                     "rate interpolation=LOGARITHMIC");
-}
-
-void WriteOptionsAndEnd(utl_Stream& stream, const Options& group) {
-    oif_KeywordLine line(stream, "");
-    WriteOptions(line, group);
-    line.End();
 }
 
 template <class R>
@@ -116,17 +107,16 @@ void WriteSpring(utl_Stream& stream, const R& option) {
     if (isLinear && !isUncoupled) {
         // The coupling on positions has no linear form.
         if (option.coupling != Coupling::COUPLED) return;
-        stream << Texts::keyword;
-        WriteDependencies(stream, option.dependencies);
-        WriteOptionsAndEnd(stream, option.options);
+        oif_KeywordLine line(stream, Texts::keyword);
+        AddDependencies(line, option.dependencies);
+        WriteOptions(line, option.options);
+        line.End();
         WidenToMatrix(table, option.components);
         stream << table;
         if (option.temperatureDependency || option.dependencies != 0) return;
         // Empty lines stand for the rest of the matrix.
         int largest = 0;
-        for (int i = 0; i < option.components.Length(); ++i) {
-            largest = std::max(largest, option.components[i]);
-        }
+        for (const int component : option.components) largest = std::max(largest, component);
         if (largest < 6) stream.LineBreak();
         if (largest < 4) stream.LineBreak();
         return;
@@ -135,15 +125,13 @@ void WriteSpring(utl_Stream& stream, const R& option) {
     if (isLinear && !option.frequencyDependency) oif_KeepDependentColumns(table, option);
     const int count = option.components.Length();
     for (int i = 0; i < count; ++i) {
-        stream << Texts::keyword << (isLinear ? ", component=" : ", nonlinear, component=")
-               << option.components[i];
-        WriteDependencies(stream, option.dependencies);
-        if (!isUncoupled) {
-            stream << (option.coupling == Coupling::COUPLED_POSITION
-                           ? ", independent components=POSITION"
-                           : ", independent components=CONSTITUTIVE MOTION");
-        }
-        WriteOptionsAndEnd(stream, option.options);
+        oif_KeywordLine line(stream, Texts::keyword);
+        line.FixedIf(!isLinear, ", nonlinear").Fixed(", component=", option.components[i]);
+        AddDependencies(line, option.dependencies);
+        line.FixedIf(!isUncoupled, ", independent components=",
+                     option.coupling == Coupling::COUPLED_POSITION ? "POSITION" : "CONSTITUTIVE MOTION");
+        WriteOptions(line, option.options);
+        line.End();
         if (!isUncoupled) WriteIntegers(stream, option.independentComponents);
         if (isLinear || !isUncoupled) {
             table.SkipColumns(ColumnsOfOthers(i, count, !isLinear && Texts::skipsMotions));
@@ -157,10 +145,11 @@ void WriteSpring(utl_Stream& stream, const R& option) {
 void WriteBounds(utl_Stream& stream, const char* keyword, const cow_List<int>& components,
                  std::initializer_list<double> values, const char* parameter = "", int other = cls_UnsetInt) {
     if (std::all_of(values.begin(), values.end(), [](double v) { return v == cls_UnsetDouble; })) return;
-    for (int i = 0; i < components.Length(); ++i) {
-        stream << keyword << ", component=" << components[i];
-        if (other != cls_UnsetInt) stream << parameter << other;
-        stream.LineBreak();
+    for (const int component : components) {
+        oif_KeywordLine(stream, keyword)
+            .Fixed(", component=", component)
+            .FixedUnless(parameter, other, cls_UnsetInt)
+            .End();
         const char* separator = "";
         for (const double value : values) {
             stream << separator;
@@ -205,13 +194,10 @@ void WritePotential(utl_Stream& stream, const Potentials& terms, OperatorEnm ope
                     const GeneratedNames& names) {
     if (terms.Length() == 0) return;
     const bool isMaximum = operatorType == OperatorEnm::MAXIMUM;
-    stream << "*Connector Potential";
-    if (isMaximum) {
-        stream << ", operator=MAX";
-    } else if (exponent != 2.0) {
-        stream << ", exponent=" << exponent;
-    }
-    stream << endl;
+    oif_KeywordLine(stream, "*Connector Potential")
+        .FixedIf(isMaximum, ", operator=MAX")
+        .FixedIf(!isMaximum && exponent != 2.0, ", exponent=", exponent)
+        .End();
     for (int i = 0; i < terms.Length(); ++i) {
         const kbeC_ConnectorPotential& term = terms[i];
         if (term.useDerived != 0) {
@@ -230,21 +216,24 @@ void WritePotential(utl_Stream& stream, const Potentials& terms, OperatorEnm ope
     }
 }
 
-/// Calls `write(component)` for each component with its parameter; once, without any, when a potential
+/// Calls `write(line)` for each component with a line that names it; once, without any, when a potential
 /// couples them or there is none.
 template <class Writer>
-void ForEachComponent(const cow_List<int>& components, const Potentials& potential, const Writer& write) {
-    const int passes = potential.Length() > 0 ? 0 : components.Length();
-    for (int i = 0; i < passes; ++i) write(cow_String(", component=") + cow_String(components[i]));
-    if (passes == 0) write(cow_String());
+void ForEachComponent(utl_Stream& stream, const char* keyword, const cow_List<int>& components,
+                      const Potentials& potential, const Writer& write) {
+    if (potential.IsEmpty()) {
+        for (const int component : components) {
+            write(oif_KeywordLine(stream, keyword).Fixed(", component=", component));
+        }
+    }
+    if (!potential.IsEmpty() || components.IsEmpty()) write(oif_KeywordLine(stream, keyword));
 }
 
 } // namespace
 
 void oif_WriteConnectorOption(utl_Stream& stream, const kbeC_ConnectorElasticity& option) {
     if (option.behavior == kbeC_ConnectorElasticity::BehaviorEnm::RIGID) {
-        stream << "*Connector Elasticity, rigid";
-        stream.LineBreak();
+        oif_KeywordLine(stream, "*Connector Elasticity").Fixed(", rigid").End();
         WriteIntegers(stream, option.components);
         return;
     }
@@ -274,20 +263,18 @@ void oif_WriteConnectorOption(utl_Stream& stream, const kbeC_ConnectorFailure& o
 void oif_ConnectorFriction::Write(utl_Stream& stream) const {
     using Friction = kbeC_ConnectorFriction;
     const bool isUserDefined = option_.formulation == Friction::FormulationEnm::USER_DEFINED;
-    stream << "*Connector Friction";
+    oif_KeywordLine line(stream, "*Connector Friction");
     if (isUserDefined) {
-        if (option_.component != cls_UnsetInt && option_.component > 0) {
-            stream << ", component=" << option_.component;
-        }
+        line.FixedIf(option_.component != cls_UnsetInt && option_.component > 0,
+                     ", component=", option_.component);
         if (option_.contactForceType == Friction::ContactForceTypeEnm::DERIVED_COMPONENT) {
-            stream << ", contact force=" << GeneratedNames(index_, kContactForce).Plain();
-        } else if (option_.contactForceComponent != cls_UnsetInt) {
-            stream << ", contact force=" << option_.contactForceComponent;
+            line.Fixed(", contact force=", GeneratedNames(index_, kContactForce).Plain());
+        } else {
+            line.FixedUnless(", contact force=", option_.contactForceComponent, cls_UnsetInt);
         }
     } else {
-        stream << ", predefined";
+        line.Fixed(", predefined");
     }
-    oif_KeywordLine line(stream, "");
     line.Dependencies(option_.dependencies)
         .BreakingIf(option_.independentKind == Friction::IndependentKindEnm::POSITION,
                     "independent components=POSITION")
@@ -314,20 +301,18 @@ void oif_ConnectorFriction::Write(utl_Stream& stream) const {
 void oif_ConnectorFriction::WriteTangentialBehavior(utl_Stream& stream) const {
     using Tangential = kbeC_TangentialBehavior;
     const Tangential& tangential = option_.tangentialBehavior.ConstGet();
-    stream << "*Friction";
+    oif_KeywordLine line(stream, "*Friction");
     if (product_ == kprC_AnalysisProductEnm::IMPLICIT) {
         if (tangential.slipToleranceType == Tangential::SlipToleranceTypeEnm::ABSOLUTE) {
-            stream << ", elastic slip=" << tangential.elasticSlip;
-        } else if (tangential.fraction != Tangential::fractionDef()) {
-            stream << ", slip tolerance=" << tangential.fraction;
+            line.Fixed(", elastic slip=", tangential.elasticSlip);
+        } else {
+            line.FixedUnless(", slip tolerance=", tangential.fraction, Tangential::fractionDef());
         }
     }
     if (tangential.formulation == Tangential::FormulationEnm::TABLE) {
-        if (tangential.dependencies > 0) stream << ", dependencies=" << tangential.dependencies;
-        if (tangential.shearStressLimit != Tangential::shearStressLimitDef()) {
-            stream << ", taumax=" << tangential.shearStressLimit;
-        }
-        stream << endl;
+        line.FixedIf(tangential.dependencies > 0, ", dependencies=", tangential.dependencies)
+            .FixedUnless(", taumax=", tangential.shearStressLimit, Tangential::shearStressLimitDef())
+            .End();
         oif_MaterialTable table(tangential.table, tangential.dependencies, tangential.temperatureDependency);
         if (!tangential.slipRateDependency) table.InsertEmptyColumn(1);
         if (!tangential.pressureDependency) table.InsertEmptyColumn(2);
@@ -336,24 +321,11 @@ void oif_ConnectorFriction::WriteTangentialBehavior(utl_Stream& stream) const {
         return;
     }
     const bool hasTestData = tangential.testData == 1;
-    stream << ", exponential decay" << (hasTestData ? ", test data" : "") << endl;
-    const int columns = tangential.table.NumColumns();
-    const int count = columns * tangential.table.NumRows();
-    int next = 0;
-    const auto line = [&](int length) {
-        if (next >= count) return;
-        for (int i = 0; i < length && next < count; ++i, ++next) {
-            if (i > 0) stream << ", ";
-            stream << tangential.table.ConstGet(next / columns, next % columns);
-        }
-        stream << endl;
-    };
+    line.Fixed(", exponential decay").FixedIf(hasTestData, ", test data").End();
     if (hasTestData) {
-        line(1);
-        line(2);
-        line(1);
+        oif_PrintCells(stream, tangential.table, {1, 2, 1});
     } else {
-        line(3);
+        oif_PrintCells(stream, tangential.table, {3});
     }
 }
 
@@ -367,14 +339,15 @@ void oif_ConnectorFriction::GetDerivedComponents(oif_DerivedComponents& componen
 
 void oif_ConnectorPlasticity::Write(utl_Stream& stream) const {
     using Plasticity = kbeC_ConnectorPlasticity;
-    ForEachComponent(option_.components, option_.potentials, [&](const cow_String& component) {
-        stream << "*Connector Plasticity" << component;
-        stream.LineBreak();
+    const auto write = [&](oif_KeywordLine line) {
+        line.End();
         if (option_.isotropicHardening) {
             const bool isLaw = option_.isotropicType == Plasticity::IsotropicTypeEnm::EXPONENTIAL_LAW;
-            stream << "*Connector Hardening, definition=" << (isLaw ? "Exponential Law" : "Tabular");
-            WriteDependencies(stream, option_.isotropicDependencies);
-            WriteOptionsAndEnd(stream, option_.isotropicOptions);
+            oif_KeywordLine hardening(stream, "*Connector Hardening");
+            hardening.Fixed(", definition=", isLaw ? "Exponential Law" : "Tabular");
+            AddDependencies(hardening, option_.isotropicDependencies);
+            WriteOptions(hardening, option_.isotropicOptions);
+            hardening.End();
             stream << oif_DependentTable(option_.isotropicTable, option_.isotropicDependencies,
                                          option_.isotropicTemperatureDependency);
         }
@@ -382,13 +355,16 @@ void oif_ConnectorPlasticity::Write(utl_Stream& stream) const {
             const char* definition = "Stabilized";
             if (option_.kinematicType == Plasticity::KinematicTypeEnm::HALF_CYCLE) definition = "Half Cycle";
             if (option_.kinematicType == Plasticity::KinematicTypeEnm::PARAMETERS) definition = "Parameters";
-            stream << "*Connector Hardening, type=Kinematic, definition=" << definition;
-            WriteDependencies(stream, option_.kinematicDependencies);
-            WriteOptionsAndEnd(stream, option_.kinematicOptions);
+            oif_KeywordLine hardening(stream, "*Connector Hardening");
+            hardening.Fixed(", type=Kinematic").Fixed(", definition=", definition);
+            AddDependencies(hardening, option_.kinematicDependencies);
+            WriteOptions(hardening, option_.kinematicOptions);
+            hardening.End();
             stream << oif_DependentTable(option_.kinematicTable, option_.kinematicDependencies,
                                          option_.kinematicTemperatureDependency);
         }
-    });
+    };
+    ForEachComponent(stream, "*Connector Plasticity", option_.components, option_.potentials, write);
     WritePotential(stream, option_.potentials, option_.potentialOperator, option_.forcePotentialExponent,
                    {index_, kForcePotential});
 }
@@ -399,9 +375,7 @@ void oif_ConnectorPlasticity::GetDerivedComponents(oif_DerivedComponents& compon
 
 void oif_ConnectorDamage::Write(utl_Stream& stream) const {
     using Criterion = kbeC_ConnectorDamage::CriterionEnm;
-    ForEachComponent(option_.components, option_.initiationPotentials, [&](const cow_String& component) {
-        stream << "*Connector Damage Initiation" << component;
-        oif_KeywordLine line(stream, "");
+    const auto write = [&](oif_KeywordLine line) {
         line.BreakingIf(option_.criterion == Criterion::MOTION, "criterion=Motion")
             .BreakingIf(option_.criterion == Criterion::PLASTIC_MOTION, "criterion=Plastic Motion")
             .BreakingUnless("dependencies=", option_.initiationDependencies, 0);
@@ -419,7 +393,9 @@ void oif_ConnectorDamage::Write(utl_Stream& stream) const {
         WritePotential(stream, option_.initiationPotentials, option_.initiationPotentialOperator,
                        option_.initiationPotentialExponent, {index_, kInitiationPotential});
         if (option_.evolution) WriteEvolution(stream);
-    });
+    };
+    ForEachComponent(stream, "*Connector Damage Initiation", option_.components, option_.initiationPotentials,
+                     write);
 }
 
 void oif_ConnectorDamage::WriteEvolution(utl_Stream& stream) const {
@@ -428,8 +404,8 @@ void oif_ConnectorDamage::WriteEvolution(utl_Stream& stream) const {
     const bool softens = !isEnergy && option_.softening != Damage::SofteningEnm::LINEAR;
     const bool hasMix =
         option_.criterion == Damage::CriterionEnm::PLASTIC_MOTION && option_.modeMixDependency;
-    stream << "*Connector Damage Evolution, type=" << (isEnergy ? "Energy" : "Motion");
-    oif_KeywordLine line(stream, "");
+    oif_KeywordLine line(stream, "*Connector Damage Evolution");
+    line.Fixed(", type=", isEnergy ? "Energy" : "Motion");
     if (softens) {
         const bool isExponential = option_.softening == Damage::SofteningEnm::EXPONENTIAL;
         line.Breaking("softening=").Text(isExponential ? "Exponential" : "Tabular");
@@ -458,29 +434,24 @@ void oif_ConnectorDamage::GetDerivedComponents(oif_DerivedComponents& components
 
 void oif_DerivedComponent::Write(utl_Stream& stream) const {
     using Term = kbeC_CDCTerm;
-    for (int i = 0; i < component_.terms.Length(); ++i) {
-        const Term& term = component_.terms[i];
-        stream << "*Connector Derived Component, name=" << qkw_QuorixName(name_, false);
-        stream.OptionalLineBreak();
+    for (const Term& term : component_.terms) {
         // Unlike elsewhere the line may break ahead of the comma of what follows.
-        const auto parameter = [&](bool isThere, const char* text) {
-            if (!isThere) return;
-            stream << text;
-            stream.OptionalLineBreak();
-        };
-        parameter(term.sign == Term::SignEnm::NEGATIVE, ", sign=NEGATIVE");
-        parameter(term.operatorType == Term::OperatorEnm::SUM, ", operator=SUM");
-        parameter(term.operatorType == Term::OperatorEnm::MACAULEY_SUM, ", operator=MACAULEY SUM");
-        if (term.dependencies > 0) {
-            stream << ", dependencies=" << term.dependencies;
-            stream.OptionalLineBreak();
+        oif_KeywordLine line(stream, "*Connector Derived Component");
+        line.Fixed(", name=", qkw_QuorixName(name_, false)).MayBreak();
+        if (term.sign == Term::SignEnm::NEGATIVE) line.Fixed(", sign=NEGATIVE").MayBreak();
+        if (term.operatorType == Term::OperatorEnm::SUM) line.Fixed(", operator=SUM").MayBreak();
+        if (term.operatorType == Term::OperatorEnm::MACAULEY_SUM) {
+            line.Fixed(", operator=MACAULEY SUM").MayBreak();
         }
-        if (term.independentGiven) {
-            parameter(term.independentKind == Term::IndependentKindEnm::POSITION, ", independent components");
-            parameter(term.independentKind == Term::IndependentKindEnm::CONSTITUTIVE_MOTION,
-                      ", independent components=CONSTITUTIVE MOTION");
+        if (term.dependencies > 0) line.Fixed(", dependencies=", term.dependencies).MayBreak();
+        if (term.independentGiven && term.independentKind == Term::IndependentKindEnm::POSITION) {
+            line.Fixed(", independent components").MayBreak();
         }
-        WriteOptionsAndEnd(stream, term.options);
+        if (term.independentGiven && term.independentKind == Term::IndependentKindEnm::CONSTITUTIVE_MOTION) {
+            line.Fixed(", independent components=CONSTITUTIVE MOTION").MayBreak();
+        }
+        WriteOptions(line, term.options);
+        line.End();
         WriteIntegers(stream, term.components);
         stream << oif_DependentTable(term);
     }

@@ -61,11 +61,11 @@ oif_NewConnectorSection::oif_NewConnectorSection(const cow_String& behaviorName,
       orientations_(Orientations(orientation, modelInfo)) {}
 
 void oif_NewConnectorSection::Write(utl_Stream& stream) const {
-    stream << "*Connector Section, elset=" << setName_;
-    if (!kseC_Utils::IsConnectorSectionEmpty(section_)) {
-        stream << ", behavior=" << qkw_QuorixName(behaviorName_, false);
-    }
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Connector Section")
+        .Fixed(", elset=", setName_)
+        .FixedIf(!kseC_Utils::IsConnectorSectionEmpty(section_),
+                 ", behavior=", qkw_QuorixName(behaviorName_, false))
+        .End();
     stream << cow_String(ConnectionTypes(section_));
     stream.LineBreak();
     const bool hasOrientations = !orientations_.IsEmpty();
@@ -92,8 +92,9 @@ void oif_NewConnectorSection::Write(utl_Stream& stream) const {
 }
 
 void oif_ConnectorBehavior::Write(utl_Stream& stream) const {
-    stream << "*Connector Behavior, name=" << qkw_QuorixName(name_, false);
-    oif_KeywordLine line(stream, integrationExplicit_ ? ", integration=EXPLICIT" : "");
+    oif_KeywordLine line(stream, "*Connector Behavior");
+    line.Fixed(", name=", qkw_QuorixName(name_, false))
+        .FixedIf(integrationExplicit_, ", integration=EXPLICIT");
     if (!regularize_) {
         line.Breaking("regularize=OFF");
     } else if (!useBehaviorRegularization_) {
@@ -106,8 +107,7 @@ void oif_ConnectorConstitutiveReference::Write(utl_Stream& stream) const {
     bool isEmpty = true;
     for (int i = 0; i < values_.Length(); ++i) isEmpty = isEmpty && values_[i] == -cls_UnsetDouble;
     if (isEmpty) return;
-    stream << "*Connector Constitutive Reference";
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Connector Constitutive Reference").End();
     for (int i = 0; i < values_.Length(); ++i) {
         if (i > 0) stream << ", ";
         if (values_[i] != -cls_UnsetDouble) stream << values_[i];

@@ -5,25 +5,6 @@
 
 namespace {
 
-/// Parameters behind which, unlike elsewhere, the line may break: the next one's comma opens a new line.
-class BrokenBehind {
-public:
-    explicit BrokenBehind(utl_Stream& stream) : stream_(stream) {}
-    BrokenBehind& Word(bool given, const char* word) {
-        if (given) stream_ << word;
-        if (given) stream_.OptionalLineBreak();
-        return *this;
-    }
-    BrokenBehind& Value(bool given, const char* parameter, double value) {
-        if (given) stream_ << parameter << value;
-        if (given) stream_.OptionalLineBreak();
-        return *this;
-    }
-
-private:
-    utl_Stream& stream_;
-};
-
 void WriteDegreesOfFreedom(utl_Stream& stream, const kcoC_Coupling& coupling) {
     const bool isTied[] = {coupling.u1, coupling.u2, coupling.u3, coupling.ur1, coupling.ur2, coupling.ur3};
     // No line at all stands for all of them.
@@ -51,22 +32,25 @@ oif_Tie::oif_Tie(const cow_String& name, const kcoC_Tie& tie, const qkw_ModelInf
       slave_(oif_SurfaceName(tie.slave, modelInfo)), record_(tie), cyclic_(cyclic) {}
 
 void oif_Tie::Write(utl_Stream& stream) const {
-    stream << "*Tie, name=" << qkw_QuorixName(name_, false);
+    oif_KeywordLine line(stream, "*Tie");
+    line.Fixed(", name=", qkw_QuorixName(name_, false));
     if (record_.IsNull()) {
-        if (tolerance_ > 0.0) stream << ", position tolerance=" << tolerance_;
+        line.FixedIf(tolerance_ > 0.0, ", position tolerance=", tolerance_);
     } else {
+        // Unlike elsewhere, the line may break behind a parameter: the next one's comma opens a new line.
         const kcoC_Tie& tie = record_.ConstGet();
-        stream << (tie.adjust ? ", adjust=yes" : ", adjust=no");
-        BrokenBehind(stream)
-            .Value(tie.positionToleranceMethod == 1, ", position tolerance=", tie.positionTolerance)
-            .Word(!tie.tieRotations, ", no rotation")
-            .Value(tie.constraintRatioMethod == 1, ", constraint ratio=", tie.constraintRatio)
-            .Word(cyclic_, ", cyclic symmetry");
-        if (tie.type == 1) stream << ", type=NODE TO SURFACE";
-        if (tie.type == 2) stream << ", type=SURFACE TO SURFACE";
-        BrokenBehind(stream).Word(!tie.thickness, ", no thickness");
+        line.Fixed(tie.adjust ? ", adjust=yes" : ", adjust=no");
+        if (tie.positionToleranceMethod == 1) {
+            line.Fixed(", position tolerance=", tie.positionTolerance).MayBreak();
+        }
+        if (!tie.tieRotations) line.Fixed(", no rotation").MayBreak();
+        if (tie.constraintRatioMethod == 1) line.Fixed(", constraint ratio=", tie.constraintRatio).MayBreak();
+        if (cyclic_) line.Fixed(", cyclic symmetry").MayBreak();
+        line.FixedIf(tie.type == 1, ", type=NODE TO SURFACE");
+        line.FixedIf(tie.type == 2, ", type=SURFACE TO SURFACE");
+        if (!tie.thickness) line.Fixed(", no thickness").MayBreak();
     }
-    stream.LineBreak();
+    line.End();
     stream << slave_ << ", " << master_;
     stream.LineBreak();
 }
@@ -80,35 +64,34 @@ oif_Coupling::oif_Coupling(const cow_String& name, const kcoC_Coupling& coupling
 }
 
 void oif_Coupling::Write(utl_Stream& stream) const {
-    stream << "*Coupling, constraint name=" << qkw_QuorixName(name_, false);
+    oif_KeywordLine line(stream, "*Coupling");
+    line.Fixed(", constraint name=", qkw_QuorixName(name_, false));
     if (!hasRecord_) return;
-    stream << ", ref node=" << qkw_QuorixName(refNode_, false)
-           << ", surface=" << qkw_QuorixName(surface_, false);
-    if (influenceRadius_ != kcoC_Coupling::influenceRadiusDef()) {
-        stream << ", influence radius=" << influenceRadius_;
-    }
-    if (!orientation_.IsEmpty()) stream << ", orientation=" << orientation_;
-    stream.LineBreak();
+    line.Fixed(", ref node=", qkw_QuorixName(refNode_, false))
+        .Fixed(", surface=", qkw_QuorixName(surface_, false))
+        .FixedUnless(", influence radius=", influenceRadius_, kcoC_Coupling::influenceRadiusDef())
+        .FixedUnless(", orientation=", orientation_, cow_String())
+        .End();
 }
 
 void oif_Kinematic::Write(utl_Stream& stream) const {
-    stream << "*Kinematic";
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Kinematic").End();
     WriteDegreesOfFreedom(stream, coupling_);
 }
 
 void oif_Distributing::Write(utl_Stream& stream) const {
     static constexpr const char* methods[] = {"UNIFORM", "LINEAR", "QUADRATIC", "CUBIC"};
     const int method = coupling_.weightingMethod;
-    stream << "*Distributing, weighting method=" << (method >= 0 && method < 4 ? methods[method] : "");
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Distributing")
+        .Fixed(", weighting method=", method >= 0 && method < 4 ? methods[method] : "")
+        .End();
     WriteDegreesOfFreedom(stream, coupling_);
 }
 
 void oif_RigidBody::Write(utl_Stream& stream) const {
-    stream << "*Rigid Body, ref node=" << refNode_;
-    if (!elset_.IsEmpty()) stream << ", elset=" << elset_;
-    oif_KeywordLine(stream, "")
+    oif_KeywordLine(stream, "*Rigid Body")
+        .Fixed(", ref node=", refNode_)
+        .FixedUnless(", elset=", elset_, cow_String())
         .BreakingUnless("pin nset=", pinNset_, cow_String())
         .BreakingUnless("tie nset=", tieNset_, cow_String())
         .BreakingUnless("analytical surface=", analyticalSurface_, cow_String())
@@ -124,15 +107,14 @@ oif_EmbeddedRegion::oif_EmbeddedRegion(const cow_String& name, const kcoC_Embedd
                          region.absoluteTolerance, region.weightFactorTolerance, modelInfo) {}
 
 void oif_EmbeddedRegion::Write(utl_Stream& stream) const {
-    stream << "*Embedded Element, host elset=" << host_;
-    if (absoluteTolerance_ != 0.0) stream << ", absolute exterior tolerance=" << absoluteTolerance_;
-    if (fractionalTolerance_ != kcoC_EmbeddedRegion::fractionalToleranceDef()) {
-        stream << ", exterior tolerance=" << fractionalTolerance_;
-    }
-    if (weightFactorTolerance_ != kcoC_EmbeddedRegion::weightFactorToleranceDef()) {
-        stream << ", roundoff tolerance=" << weightFactorTolerance_;
-    }
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Embedded Element")
+        .Fixed(", host elset=", host_)
+        .FixedUnless(", absolute exterior tolerance=", absoluteTolerance_, 0.0)
+        .FixedUnless(", exterior tolerance=", fractionalTolerance_,
+                     kcoC_EmbeddedRegion::fractionalToleranceDef())
+        .FixedUnless(", roundoff tolerance=", weightFactorTolerance_,
+                     kcoC_EmbeddedRegion::weightFactorToleranceDef())
+        .End();
     stream << embedded_;
     stream.LineBreak();
 }
@@ -141,12 +123,10 @@ oif_Equation::oif_Equation(const cow_String& name, const kcoC_Constraint& constr
     : name_(name), terms_(nex_canDynamicCastRef<kcoC_Equation>(constraint, NEX_HERE).terms) {}
 
 void oif_Equation::Write(utl_Stream& stream) const {
-    stream << "*Equation";
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Equation").End();
     stream << terms_.Length();
     stream.LineBreak();
-    for (int i = 0; i < terms_.Length(); ++i) {
-        const kcoC_EquationTerm& term = terms_[i];
+    for (const kcoC_EquationTerm& term : terms_) {
         stream << qkw_QuorixName(term.setName, false) << ", " << term.dof << ", " << term.coefficient;
         stream.LineBreak();
     }
@@ -159,18 +139,21 @@ oif_ShellSolidCoupling::oif_ShellSolidCoupling(const cow_String& name,
       solidFace_(oif_SurfaceName(coupling.solidFace, modelInfo)), record_(coupling) {}
 
 void oif_ShellSolidCoupling::Write(utl_Stream& stream) const {
-    stream << "*Shell to Solid Coupling, constraint name=" << qkw_QuorixName(name_, false);
-    BrokenBehind(stream)
-        .Value(record_.positionToleranceMethod == 1, ", position tolerance=", record_.positionTolerance)
-        .Value(record_.influenceDistanceMethod == 1, ", influence distance=", record_.influenceDistance);
-    stream.LineBreak();
+    oif_KeywordLine line(stream, "*Shell to Solid Coupling");
+    line.Fixed(", constraint name=", qkw_QuorixName(name_, false));
+    if (record_.positionToleranceMethod == 1) {
+        line.Fixed(", position tolerance=", record_.positionTolerance).MayBreak();
+    }
+    if (record_.influenceDistanceMethod == 1) {
+        line.Fixed(", influence distance=", record_.influenceDistance).MayBreak();
+    }
+    line.End();
     stream << shellEdge_ << ", " << solidFace_;
     stream.LineBreak();
 }
 
 void oif_CyclicSymmetryModel::Write(utl_Stream& stream) const {
-    stream << "*Cyclic Symmetry Model, n=" << numberOfSectors_;
-    stream.LineBreak();
+    oif_KeywordLine(stream, "*Cyclic Symmetry Model").Fixed(", n=", numberOfSectors_).End();
     WritePoint(stream, start_);
     stream << ", ";
     WritePoint(stream, end_);

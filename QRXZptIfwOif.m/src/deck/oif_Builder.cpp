@@ -14,7 +14,7 @@ oif_Builder::oif_Builder(oif_ModelInfo& modelInfo)
       transform_(modelInfo), boundaryCondition_(modelInfo), step_(modelInfo), load_(modelInfo),
       field_(modelInfo), interaction_(modelInfo), constraint_(modelInfo), outputRequest_(modelInfo),
       part_(modelInfo), partAttributes_(modelInfo), region_(modelInfo), final_(modelInfo),
-      v6Format_(modelInfo.V6Format()), model_(&modelInfo.View()) {}
+      v6Format_(modelInfo.V6Format()), model_(&modelInfo.Model()) {}
 
 bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     qio_CurrentSystem().remove(fileName.CStr());

@@ -5,7 +5,7 @@
 #include <set>
 
 void oif_FinalBuilder::Build() {
-    const ddb_PartContainer parts = Store().part();
+    const ddb_PartContainer parts = Model().Model().part();
     std::set<cow_String> partsDone;
     ForEachPartInstance([&](const cow_String& key, const ddb_PartInstance& instance) {
         const cow_String& partName = instance.partName();
@@ -14,11 +14,11 @@ void oif_FinalBuilder::Build() {
             AddPartDefinition(partName, oif_RawKeyword("*End Part"));
         }
         AddInstanceDefinition(key, oif_RawKeyword(instance.solverInput()));
-        if (Info().V6Format()) AddInstanceDefinition(key, oif_RawKeyword("*End Instance"));
+        if (ModelInfo().V6Format()) AddInstanceDefinition(key, oif_RawKeyword("*End Instance"));
     });
-    AddAssemblyDefinition(oif_RawKeyword(Store().rootAssembly().solverInput()));
-    if (Info().V6Format()) AddAssemblyDefinition(oif_RawKeyword("*End Assembly"));
-    AddModelDefinition(oif_RawKeyword(Store().solverInput()));
+    AddAssemblyDefinition(oif_RawKeyword(Model().RootAssembly().solverInput()));
+    if (ModelInfo().V6Format()) AddAssemblyDefinition(oif_RawKeyword("*End Assembly"));
+    AddModelDefinition(oif_RawKeyword(Model().Model().solverInput()));
 
     int count = 0;
     for (kprC_StepContainerIT it(Model().Steps()); !it.IsDone(); it.Next(), ++count) {

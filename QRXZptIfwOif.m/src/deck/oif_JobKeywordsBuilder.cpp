@@ -3,6 +3,6 @@
 #include "base/oif_Comment.h"
 
 void oif_JobKeywordsBuilder::Build() {
-    const cow_String text = Store().topLevelSolverInput();
+    const cow_String text = Model().Model().topLevelSolverInput();
     if (!text.IsEmpty()) AddModelDefinition(oif_FileHeader(text));
 }

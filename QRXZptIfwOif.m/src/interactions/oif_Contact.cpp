@@ -1,5 +1,6 @@
 #include "interactions/oif_Contact.h"
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -49,7 +50,7 @@ template <class V, class WriteLine>
 void WriteLines(utl_Stream& stream, const char* keyword, const oif_SurfacePairLines<V>& lines,
                 const WriteLine& writeLine) {
     if (lines.empty()) return;
-    stream << keyword << endl;
+    oif_KeywordLine(stream, keyword).End();
     for (const auto& line : lines) {
         writeLine(line);
         stream << endl;
@@ -121,16 +122,16 @@ oif_Contact::oif_Contact(const cow_String&, const mdl_ObjCow<kinC_Interaction>& 
 }
 
 void oif_Contact::Write(utl_Stream& stream) const {
-    stream << "*Contact, op=NEW" << endl;
+    oif_KeywordLine(stream, "*Contact").Op(oif_Op::NEW).End();
     WriteDomains(stream, true);
     WriteDomains(stream, false);
-    for (int i = 0; i < assignments_.Length(); ++i) assignments_[i].ConstGet().Write(stream);
+    for (const qkw_KeywordHandle& assignment : assignments_) assignment.ConstGet().Write(stream);
 }
 
 void oif_Contact::WriteDomains(utl_Stream& stream, bool inclusions) const {
     const char* keyword = inclusions ? "*Contact Inclusions" : "*Contact Exclusions";
     if (inclusions && wholeModel_) {
-        stream << keyword << ", ALL EXTERIOR" << endl;
+        oif_KeywordLine(stream, keyword).Fixed(", ALL EXTERIOR").End();
         return;
     }
     WriteLines(stream, keyword, inclusions ? inclusions_ : exclusions_,

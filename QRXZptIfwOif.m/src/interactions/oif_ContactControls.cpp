@@ -2,7 +2,7 @@
 
 #include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
-#include "mesh/oif_SetName.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
 
 namespace {
 
@@ -29,19 +29,19 @@ void WriteStabilization(utl_Stream& stream, oif_KeywordLine& line, const kinC_St
 void oif_ContactControls::Write(utl_Stream& stream) const {
     if (isNew_ && reset_) return;
     const kinC_ContactControls& controls = controls_.ConstGet();
-    if (controls.DynTypeId() == kinC_ExpContactControls::TypeId()) {
-        WriteExplicit(stream, static_cast<const kinC_ExpContactControls&>(controls));
+    if (const auto* explicitControls = nex_canDynamicCastPtr<kinC_ExpContactControls>(&controls)) {
+        WriteExplicit(stream, *explicitControls);
     } else {
-        WriteStandard(stream, static_cast<const kinC_StdContactControls&>(controls));
+        WriteStandard(stream, nex_canDynamicCastRef<kinC_StdContactControls>(controls, NEX_HERE));
     }
 }
 
 void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContactControls& controls) const {
     using Controls = kinC_ExpContactControls;
-    oif_KeywordLine line(stream, "*Contact Controls, cpset=");
-    line.Text(qkw_QuorixName(name_, false).Printable());
+    oif_KeywordLine line(stream, "*Contact Controls");
+    line.Fixed(", cpset=", qkw_QuorixName(name_, false));
     if (reset_) {
-        line.Text(", reset").End();
+        line.Fixed(", reset").End();
         return;
     }
     const bool given[] = {controls.fastLocalTrk != Controls::fastLocalTrkDef(), controls.globTrkChoice != 0,
@@ -49,8 +49,8 @@ void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContac
                           controls.warpCheckPeriod != Controls::warpCheckPeriodDef(),
                           controls.warpCutoff != Controls::warpCutoffDef()};
     // The line may not break ahead of the first one.
-    if (given[0]) line.Text(", fastlocaltrk=").Text(controls.fastLocalTrk ? "YES" : "NO");
-    line.BreakingIf(given[1], "globtrkinc=", controls.globTrkInc)
+    line.FixedIf(given[0], ", fastlocaltrk=", controls.fastLocalTrk ? "YES" : "NO")
+        .BreakingIf(given[1], "globtrkinc=", controls.globTrkInc)
         .BreakingIf(given[2], "scale penalty=", controls.scalePenalty)
         .BreakingIf(given[3], "warp check period=", controls.warpCheckPeriod)
         .BreakingIf(given[4], "warp cut off=", controls.warpCutoff);
@@ -61,20 +61,21 @@ void oif_ContactControls::WriteExplicit(utl_Stream& stream, const kinC_ExpContac
 
 void oif_ContactControls::WriteStandard(utl_Stream& stream, const kinC_StdContactControls& controls) const {
     using Controls = kinC_StdContactControls;
-    const auto begin = [&] { stream << "*Contact Controls, master=" << master_ << ", slave=" << slave_; };
-    if (!isNew_) {
-        begin();
-        // Former controls end on a line of their own before others begin.
-        stream << ", reset" << endl;
-    }
+    const auto begun = [&] {
+        return oif_KeywordLine(stream, "*Contact Controls")
+            .Fixed(", master=", master_)
+            .Fixed(", slave=", slave_);
+    };
+    // Former controls end on a line of their own before others begin.
+    if (!isNew_) begun().Fixed(", reset").End();
     if (reset_ || controls.IsDefault()) return;
-    begin();
+    oif_KeywordLine line = begun();
     if (controls.relativeTolerance == 0) {
-        stream << ", absolutePenetrationTolerance=" << controls.absolutePenetrationTolerance;
-    } else if (controls.relativePenetrationTolerance != Controls::relativePenetrationToleranceDef()) {
-        stream << ", relativePenetrationTolerance=" << controls.relativePenetrationTolerance;
+        line.Fixed(", absolutePenetrationTolerance=", controls.absolutePenetrationTolerance);
+    } else {
+        line.FixedUnless(", relativePenetrationTolerance=", controls.relativePenetrationTolerance,
+                         Controls::relativePenetrationToleranceDef());
     }
-    oif_KeywordLine line(stream, "");
     line.BreakingUnless("stiffnessScaleFactor=", controls.stiffnessScaleFactor,
                         Controls::stiffnessScaleFactorDef())
         .BreakingIf(controls.limitSlideDistance, "slideDistance=", controls.slideDistance)

@@ -1,8 +1,13 @@
 #ifndef QRX_OIF_CONTACTCONTROLS_H
 #define QRX_OIF_CONTACTCONTROLS_H
 
-#include "keyword_layer/qkw_Keyword.h"
+#include "base/oif_Comment.h"
 #include "store_interface/records/interactions/kinC_ContactControls.h"
+
+/// The comment ahead of the controls of a contact.
+inline oif_Comment oif_ContactControlsComment(const cow_String& name) {
+    return oif_Comment(cow_String("Contact Controls for Interaction: ") + name);
+}
 
 /// Controls of one contact, of the implicit solver by its surfaces, of the explicit solver by its set of
 /// contact pairs:

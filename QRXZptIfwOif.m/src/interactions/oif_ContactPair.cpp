@@ -1,11 +1,11 @@
 #include "interactions/oif_ContactPair.h"
 
 #include "base/oif_KeywordLine.h"
+#include "interactions/oif_InteractionRow.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/constraints/kcoC_Constraints.h"
-#include "store_interface/records/interactions/kinC_CyclicSymmetry.h"
 
 #include <limits>
 
@@ -16,11 +16,15 @@ const char* MechanicalConstraintWord(int constraint) {
     return constraint == 0 ? "KINEMATIC" : constraint == 1 ? "PENALTY" : "";
 }
 
-/// ", interaction=" and ", mechanical constraint=".
+qkw_QuorixName PropertyName(const kinC_ContactPairState& state) {
+    return {state.InteractionProperty.ConstGet(), false};
+}
+
 template <class Contact>
-void WriteExplicitPair(utl_Stream& stream, const Contact& contact, const kinC_ContactPairState& state) {
-    stream << ", interaction=" << qkw_QuorixName(state.InteractionProperty.ConstGet(), false)
-           << ", mechanical constraint=" << MechanicalConstraintWord(contact.mechanicalConstraint);
+oif_KeywordLine& AddExplicitPair(oif_KeywordLine& line, const Contact& contact,
+                                 const kinC_ContactPairState& state) {
+    return line.Fixed(", interaction=", PropertyName(state))
+        .Fixed(", mechanical constraint=", MechanicalConstraintWord(contact.mechanicalConstraint));
 }
 
 } // namespace
@@ -62,40 +66,26 @@ void oif_ContactPair::Write(utl_Stream& stream) const {
         return;
     }
     const kinC_Interaction& interaction = interaction_.ConstGet();
-    switch (interaction.DynTypeId()) {
-    case kinC_SurfaceToSurfaceContactStd::Class.Id():
-        WriteStandard(stream, static_cast<const kinC_SurfaceToSurfaceContactStd&>(interaction));
-        break;
-    case kinC_SurfaceToSurfaceContactXpl::Class.Id():
-        WriteExplicit(stream, static_cast<const kinC_SurfaceToSurfaceContactXpl&>(interaction));
-        break;
-    case kinC_SelfContactStd::Class.Id():
-        WriteStandardSelf(stream, static_cast<const kinC_SelfContactStd&>(interaction));
-        break;
-    case kinC_SelfContactXpl::Class.Id():
-        WriteExplicitSelf(stream, static_cast<const kinC_SelfContactXpl&>(interaction));
-        break;
-    case kinC_ElasticFoundation::Class.Id(): break;
-    default: nex_Raise("Unimplemented interaction print");
-    }
+    const oif_InteractionRow* row = oif_FindInteractionRow(interaction.DynTypeId());
+    if (row == nullptr || row->pair == nullptr) nex_Raise("Unimplemented interaction print");
+    row->pair(stream, *this, interaction);
 }
 
 void oif_ContactPair::WriteTied(utl_Stream& stream) const {
-    stream << "*Contact Pair, tied";
-    if (adjust_) stream << ", adjust=" << *adjust_;
+    oif_KeywordLine line(stream, "*Contact Pair, tied");
+    if (adjust_) line.Fixed(", adjust=", *adjust_);
     // The name of the interaction goes out bare.
-    stream << ", interaction=_" << name_;
-    WriteCpset(stream);
-    stream << endl << slave_ << ", " << master_ << endl;
+    line.Fixed(", interaction=_", name_);
+    AddCpset(line).End();
+    stream << slave_ << ", " << master_ << endl;
 }
 
-void oif_ContactPair::WriteStandard(utl_Stream& stream,
-                                    const kinC_SurfaceToSurfaceContactStd& contact) const {
+void oif_ContactPair::WritePair(utl_Stream& stream, const kinC_SurfaceToSurfaceContactStd& contact) const {
     using Contact = kinC_SurfaceToSurfaceContactStd;
     const bool smallSliding = contact.sliding == 0;
     const bool surfaceToSurface = contact.formulation == 1;
-    oif_KeywordLine line(stream, "*Contact Pair, interaction=");
-    line.Text(qkw_QuorixName(contact.ConstGetState(step_).InteractionProperty.ConstGet(), false))
+    oif_KeywordLine line(stream, "*Contact Pair");
+    line.Fixed(", interaction=", PropertyName(contact.ConstGetState(step_)))
         .BreakingIf(smallSliding, "small sliding")
         .BreakingIf(!smallSliding && contact.limitSlideDistance, "slide distance=", contact.slideDistance)
         .BreakingIf(surfaceToSurface, "type=SURFACE TO SURFACE")
@@ -115,56 +105,51 @@ void oif_ContactPair::WriteStandard(utl_Stream& stream,
     stream << slave_ << ", " << master_ << endl;
 }
 
-void oif_ContactPair::WriteExplicit(utl_Stream& stream,
-                                    const kinC_SurfaceToSurfaceContactXpl& contact) const {
+void oif_ContactPair::WritePair(utl_Stream& stream, const kinC_SurfaceToSurfaceContactXpl& contact) const {
     const auto& state = contact.ConstGetState(step_);
-    stream << "*Contact Pair";
+    oif_KeywordLine line(stream, "*Contact Pair");
     if (state.opDelete) {
-        stream << ", op=DELETE";
+        line.Fixed(", op=DELETE");
     } else {
-        WriteExplicitPair(stream, contact, state);
-        if (contact.weightingChoice == 1) stream << ", weight=" << contact.weight;
-        if (contact.sliding == 0) stream << ", small sliding";
+        AddExplicitPair(line, contact, state)
+            .FixedIf(contact.weightingChoice == 1, ", weight=", contact.weight)
+            .FixedIf(contact.sliding == 0, ", small sliding");
     }
-    WriteCpset(stream);
-    stream << endl << slave_ << ", " << master_ << endl;
+    AddCpset(line).End();
+    stream << slave_ << ", " << master_ << endl;
 }
 
-void oif_ContactPair::WriteStandardSelf(utl_Stream& stream, const kinC_SelfContactStd& contact) const {
-    stream << "*Contact Pair, interaction="
-           << qkw_QuorixName(contact.ConstGetState(step_).InteractionProperty.ConstGet(), false);
-    WriteCpset(stream);
+void oif_ContactPair::WritePair(utl_Stream& stream, const kinC_SelfContactStd& contact) const {
+    oif_KeywordLine line(stream, "*Contact Pair");
+    line.Fixed(", interaction=", PropertyName(contact.ConstGetState(step_)));
+    AddCpset(line);
     // Lines break behind a parameter here, not behind the comma ahead of it.
     if (contact.smooth != kinC_SelfContactStd::smoothDef()) {
-        stream << ", smooth=" << contact.smooth;
-        stream.OptionalLineBreak();
+        line.Fixed(", smooth=", contact.smooth).MayBreak();
     }
     if (contact.formulation == 1) {
-        stream << ", type=SURFACE TO SURFACE";
-        stream.OptionalLineBreak();
-        if (!contact.thickness) {
-            stream << ", no thickness";
-            stream.OptionalLineBreak();
-        }
+        line.Fixed(", type=SURFACE TO SURFACE").MayBreak();
+        if (!contact.thickness) line.Fixed(", no thickness").MayBreak();
     }
-    stream << endl << slave_ << "," << endl;
+    line.End();
+    stream << slave_ << "," << endl;
 }
 
-void oif_ContactPair::WriteExplicitSelf(utl_Stream& stream, const kinC_SelfContactXpl& contact) const {
+void oif_ContactPair::WritePair(utl_Stream& stream, const kinC_SelfContactXpl& contact) const {
     const auto& state = contact.ConstGetState(step_);
-    stream << "*Contact Pair";
+    oif_KeywordLine line(stream, "*Contact Pair");
     if (state.opDelete) {
         // Unlike a pair of two surfaces, without the set of contact pairs.
-        stream << ", op=DELETE";
+        line.Fixed(", op=DELETE");
     } else {
-        WriteExplicitPair(stream, contact, state);
-        WriteCpset(stream);
+        AddCpset(AddExplicitPair(line, contact, state));
     }
-    stream << endl << slave_ << "," << endl;
+    line.End();
+    stream << slave_ << "," << endl;
 }
 
-void oif_ContactPair::WriteCpset(utl_Stream& stream) const {
-    if (cpset_) stream << ", cpset=" << qkw_QuorixName(name_, false);
+oif_KeywordLine& oif_ContactPair::AddCpset(oif_KeywordLine& line) const {
+    return line.FixedIf(cpset_, ", cpset=", qkw_QuorixName(name_, false));
 }
 
 oif_ModelChange::oif_ModelChange(const cow_String&, const mdl_ObjCow<kinC_Interaction>& interaction,
@@ -173,14 +158,13 @@ oif_ModelChange::oif_ModelChange(const cow_String&, const mdl_ObjCow<kinC_Intera
 
 void oif_ModelChange::Write(utl_Stream& stream) const {
     const kinC_Interaction& interaction = interaction_.ConstGet();
-    stream << "*Model Change, type=CONTACT PAIR";
-    const unsigned type = interaction.DynTypeId();
-    const bool isSelf = type == kinC_SelfContactStd::TypeId();
-    if (!isSelf && type != kinC_SurfaceToSurfaceContactStd::TypeId()) {
+    oif_KeywordLine line(stream, "*Model Change, type=CONTACT PAIR");
+    if (oif_SolverOf(interaction) != oif_ContactSolver::IMPLICIT) {
         nex_Raise("No *Model Change for this interaction.");
     }
+    const bool isSelf = nex_canDynamicCastPtr<kinC_SelfContact>(&interaction) != nullptr;
     const bool remove = remove_ || interaction.GetPropStatus(step_) == mdl_PropagationStatusEnm::DEACTIVATED;
-    stream << (remove ? ", remove" : ", add") << endl;
+    line.Fixed(remove ? ", remove" : ", add").End();
     // A surface with itself: the comma and the blank stay.
     stream << slave_ << ", " << (isSelf ? cow_String() : master_) << endl;
 }
@@ -200,13 +184,10 @@ void oif_ContactInterference::Write(utl_Stream& stream) const {
     if (state == nullptr || IsEmpty()) return;
     const kinC_InterferenceTypeEnm type = state->interferenceType.ConstGet();
     const bool shrink = type == kinC_InterferenceTypeEnm::SHRINK_FIT;
-    const cow_String& amplitude = state->amplitude.ConstGet();
-    stream << "*Contact Interference";
-    if (type == kinC_InterferenceTypeEnm::UNIFORM_FIT && !amplitude.IsEmpty()) {
-        stream << ", amplitude=" << qkw_QuorixName(amplitude, false);
-    }
-    if (shrink) stream << ", shrink";
-    stream << endl << slave_ << ", " << master_;
+    oif_KeywordLine line(stream, "*Contact Interference");
+    if (type == kinC_InterferenceTypeEnm::UNIFORM_FIT) line.Amplitude(state->amplitude.ConstGet());
+    line.FixedIf(shrink, ", shrink").End();
+    stream << slave_ << ", " << master_;
     if (!shrink) {
         // The comma and the blank stand without a direction too.
         stream << ", " << state->interferenceValue.ConstGet() << ", ";
@@ -222,21 +203,22 @@ void oif_Clearance::Write(utl_Stream& stream) const {
     if (contact_.IsNull()) return;
     const kinC_SurfaceToSurfaceContact& contact = contact_.ConstGet();
     if (contact.ClearanceType() == kinC_ClearanceTypeEnm::NONE) return;
-    stream << "*Clearance";
-    if (contact.DynTypeId() == kinC_SurfaceToSurfaceContactStd::TypeId()) {
-        stream << ", master=" << master_ << ", slave=" << slave_;
-    } else if (contact.DynTypeId() == kinC_SurfaceToSurfaceContactXpl::TypeId()) {
-        stream << ", cpset=" << qkw_QuorixName(cpset_, false);
+    oif_KeywordLine line(stream, "*Clearance");
+    switch (oif_SolverOf(contact)) {
+    case oif_ContactSolver::NONE: break;
+    case oif_ContactSolver::IMPLICIT: line.Fixed(", master=", master_).Fixed(", slave=", slave_); break;
+    case oif_ContactSolver::EXPLICIT: line.Fixed(", cpset=", qkw_QuorixName(cpset_, false)); break;
     }
     if (contact.ClearanceType() == kinC_ClearanceTypeEnm::SINGLE_VALUE) {
-        stream << ", value=" << contact.initialClearance << endl;
+        line.Fixed(", value=", contact.initialClearance).End();
     } else {
+        line.Fixed(", bolt").Fixed(", tabular").End();
         WriteBolt(stream, contact);
     }
 }
 
 void oif_Clearance::WriteBolt(utl_Stream& stream, const kinC_SurfaceToSurfaceContact& contact) const {
-    stream << ", bolt, tabular" << endl << contact.halfThreadAngle << ", " << contact.pitch;
+    stream << contact.halfThreadAngle << ", " << contact.pitch;
     for (const double diameter : {contact.majorBoltDiameter, contact.meanBoltDiameter}) {
         stream << ", ";
         if (diameter != cls_UnsetDouble) stream << diameter;

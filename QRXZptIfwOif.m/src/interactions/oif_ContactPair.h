@@ -8,6 +8,7 @@
 #include <optional>
 
 class kcoC_Tie;
+class oif_KeywordLine;
 
 /// What the keywords about one contact hold: its record, the step that they look at, and the names of its
 /// surfaces; a contact of a surface with itself has the one name twice.
@@ -47,14 +48,20 @@ public:
     oif_ContactPair(const cow_String& name, const rgnC_Region& second, const rgnC_Region& first,
                     double adjust, const qkw_ModelInfo& modelInfo);
     void Write(utl_Stream& stream) const override;
+    /// Writes `keyword` in the form of contacts of class R; for the rows of the classes.
+    template <class R>
+    static void WriteAs(utl_Stream& stream, const oif_ContactPair& keyword,
+                        const kinC_Interaction& interaction) {
+        keyword.WritePair(stream, static_cast<const R&>(interaction));
+    }
 
 private:
     void WriteTied(utl_Stream& stream) const;
-    void WriteStandard(utl_Stream& stream, const kinC_SurfaceToSurfaceContactStd& contact) const;
-    void WriteExplicit(utl_Stream& stream, const kinC_SurfaceToSurfaceContactXpl& contact) const;
-    void WriteStandardSelf(utl_Stream& stream, const kinC_SelfContactStd& contact) const;
-    void WriteExplicitSelf(utl_Stream& stream, const kinC_SelfContactXpl& contact) const;
-    void WriteCpset(utl_Stream& stream) const;
+    void WritePair(utl_Stream& stream, const kinC_SurfaceToSurfaceContactStd& contact) const;
+    void WritePair(utl_Stream& stream, const kinC_SurfaceToSurfaceContactXpl& contact) const;
+    void WritePair(utl_Stream& stream, const kinC_SelfContactStd& contact) const;
+    void WritePair(utl_Stream& stream, const kinC_SelfContactXpl& contact) const;
+    oif_KeywordLine& AddCpset(oif_KeywordLine& line) const;
 
     cow_String name_;
     bool cpset_ = false;

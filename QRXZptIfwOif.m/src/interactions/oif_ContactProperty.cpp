@@ -1,9 +1,9 @@
 #include "interactions/oif_ContactProperty.h"
 
 #include "base/oif_DataLines.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
-#include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 namespace {
@@ -26,27 +26,14 @@ oif_MaterialTable Columns(const Table& table) {
     return {table, 0, false};
 }
 
-/// The table's numbers, row by row, `counts` of them on each line; what it doesn't have is left out.
-void WriteNumbers(utl_Stream& stream, const Table& table, std::initializer_list<int> counts) {
-    const int available = table.NumRows() * table.NumColumns();
-    int next = 0;
-    for (const int count : counts) {
-        oif_DataLines line(stream, count);
-        for (int i = 0; i < count && next < available; ++i, ++next) {
-            line.Add(table.ConstGet(next / table.NumColumns(), next % table.NumColumns()));
-        }
-        line.End();
-    }
-}
-
 } // namespace
 
 void oif_SurfaceInteraction::Write(utl_Stream& stream) const {
-    stream << "*Surface Interaction, name=" << qkw_QuorixName(name_, false);
-    if (product_ == kprC_AnalysisProductEnm::EXPLICIT && padThickness_ != cls_UnsetDouble) {
-        stream << ", pad thickness=" << padThickness_;
-    }
-    stream << endl;
+    oif_KeywordLine(stream, "*Surface Interaction")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .FixedIf(product_ == kprC_AnalysisProductEnm::EXPLICIT && padThickness_ != cls_UnsetDouble,
+                 ", pad thickness=", padThickness_)
+        .End();
     if (product_ == kprC_AnalysisProductEnm::IMPLICIT) stream << contactArea_ << "," << endl;
 }
 
@@ -57,45 +44,41 @@ const kinC_ContactProperty* oif_ContactPropertyKeyword::ContactProperty() const 
 void oif_Friction::Write(utl_Stream& stream) const {
     if (ContactProperty() == nullptr) nex_Raise("Unimplemented *Friction print");
     const auto* friction = Behavior<&kinC_ContactProperty::tangentialBehavior>();
-    stream << "*Friction";
+    oif_KeywordLine line(stream, "*Friction");
     if (friction == nullptr || friction->formulation == FRICTIONLESS) {
-        stream << endl << 0.0 << "," << endl;
+        line.End();
+        stream << 0.0 << "," << endl;
         return;
     }
-    WriteParameters(stream, *friction);
-    stream << endl;
+    AddParameters(line, *friction);
+    line.End();
     WriteData(stream, *friction);
 }
 
-void oif_Friction::WriteParameters(utl_Stream& stream, const kinC_TangentialBehavior& friction) const {
+void oif_Friction::AddParameters(oif_KeywordLine& line, const kinC_TangentialBehavior& friction) const {
     const bool penalty = friction.formulation == PENALTY;
     const bool decay = friction.formulation == EXPONENTIAL_DECAY;
     const bool lagrange = friction.formulation == LAGRANGE;
     const bool user = friction.formulation == USER;
     const bool limitsSlip = penalty || decay;
-    if (IsImplicit() && limitsSlip && friction.maximumElasticSlip == 1) {
-        stream << ", elastic slip=" << friction.elasticSlip;
-    }
-    if (IsImplicit() && lagrange) stream << ", lagrange";
-    if (friction.formulation == ROUGH) stream << ", rough";
-    if (IsImplicit() && limitsSlip && friction.maximumElasticSlip == 0) {
-        stream << ", slip tolerance=" << friction.slipTolerance;
-    }
-    if (user) stream << ", user";
-    if (IsImplicit() && (penalty || lagrange) && friction.directionality == 2) stream << ", anisotropic";
-    if ((penalty || (IsImplicit() && lagrange)) && friction.dependencies > 0) {
-        stream << ", dependencies=" << friction.dependencies;
-    }
-    if (user) stream << ", depvar=" << friction.nStateDependentVars;
-    if (decay) stream << ", exponential decay";
-    if (user && friction.useProperties) stream << ", properties=" << friction.table.NumRows();
-    if (IsExplicit() && limitsSlip && friction.elasticSlipStiffness != cls_UnsetDouble) {
-        stream << ", shear traction slope=" << friction.elasticSlipStiffness;
-    }
-    if ((penalty || lagrange) && friction.shearStressLimit != cls_UnsetDouble) {
-        stream << ", taumax=" << friction.shearStressLimit;
-    }
-    if (decay && friction.exponentialDecayDefinition == 1) stream << ", test data";
+    line.FixedIf(IsImplicit() && limitsSlip && friction.maximumElasticSlip == 1,
+                 ", elastic slip=", friction.elasticSlip)
+        .FixedIf(IsImplicit() && lagrange, ", lagrange")
+        .FixedIf(friction.formulation == ROUGH, ", rough")
+        .FixedIf(IsImplicit() && limitsSlip && friction.maximumElasticSlip == 0,
+                 ", slip tolerance=", friction.slipTolerance)
+        .FixedIf(user, ", user")
+        .FixedIf(IsImplicit() && (penalty || lagrange) && friction.directionality == 2, ", anisotropic")
+        .FixedIf((penalty || (IsImplicit() && lagrange)) && friction.dependencies > 0,
+                 ", dependencies=", friction.dependencies)
+        .FixedIf(user, ", depvar=", friction.nStateDependentVars)
+        .FixedIf(decay, ", exponential decay")
+        .FixedIf(user && friction.useProperties, ", properties=", friction.table.NumRows())
+        .FixedIf(IsExplicit() && limitsSlip && friction.elasticSlipStiffness != cls_UnsetDouble,
+                 ", shear traction slope=", friction.elasticSlipStiffness)
+        .FixedIf((penalty || lagrange) && friction.shearStressLimit != cls_UnsetDouble,
+                 ", taumax=", friction.shearStressLimit)
+        .FixedIf(decay && friction.exponentialDecayDefinition == 1, ", test data");
 }
 
 void oif_Friction::WriteData(utl_Stream& stream, const kinC_TangentialBehavior& friction) const {
@@ -111,9 +94,9 @@ void oif_Friction::WriteData(utl_Stream& stream, const kinC_TangentialBehavior& 
         stream << columns;
     } else if (friction.formulation == EXPONENTIAL_DECAY) {
         if (friction.exponentialDecayDefinition == 1) {
-            WriteNumbers(stream, table, {1, 2, 1});
+            oif_PrintCells(stream, table, {1, 2, 1});
         } else if (friction.exponentialDecayDefinition == 0) {
-            WriteNumbers(stream, table, {3});
+            oif_PrintCells(stream, table, {3});
         }
     } else if (friction.formulation == USER && friction.useProperties) {
         Table row(table.IsEmpty() ? 0 : 1, table.NumRows());
@@ -123,7 +106,9 @@ void oif_Friction::WriteData(utl_Stream& stream, const kinC_TangentialBehavior& 
 }
 
 void oif_ChangeFriction::Write(utl_Stream& stream) const {
-    stream << "*Change Friction, interaction=" << qkw_QuorixName(propertyName_, false) << endl;
+    oif_KeywordLine(stream, "*Change Friction")
+        .Fixed(", interaction=", qkw_QuorixName(propertyName_, false))
+        .End();
 }
 
 void oif_SurfaceBehavior::Write(utl_Stream& stream) const {
@@ -133,14 +118,14 @@ void oif_SurfaceBehavior::Write(utl_Stream& stream) const {
     static constexpr const char* relations[] = {"HARD", "EXPONENTIAL", "LINEAR", "TABULAR", "SCALE FACTOR"};
     const int relation = behavior->pressureOverclosure;
     const int method = behavior->constraintEnforcementMethod;
-    stream << "*Surface Behavior";
-    if (relation == HARD && behavior->allowSeparation == 0) stream << ", no separation";
+    oif_KeywordLine line(stream, "*Surface Behavior");
+    line.FixedIf(relation == HARD && behavior->allowSeparation == 0, ", no separation");
     if (method >= 1 && method <= 3) {
-        stream << methods[method - 1];
+        line.Fixed(methods[method - 1]);
     } else if (relation >= HARD && relation <= SCALE_FACTOR) {
-        stream << ", pressure-overclosure=" << relations[relation];
+        line.Fixed(", pressure-overclosure=", relations[relation]);
     }
-    stream << endl;
+    line.End();
 
     const double stiffness = behavior->contactStiffness;
     const double scale = behavior->contactStiffnessScaleFactor;
@@ -184,9 +169,11 @@ void oif_ContactDamping::Write(utl_Stream& stream) const {
     const double atZero = CellOrZero(damping->table, 0, 0);
     const double second = CellOrZero(damping->table, 1, 1);
     if (atZero == 0.0 && (damping->definition == 0 || second == 0.0)) return;
-    stream << "*Contact Damping, definition=" << (IsImplicit() ? "DAMPING COEFFICIENT" : "CRITICAL DAMPING");
-    if (IsExplicit()) stream << ", tangent fraction=" << damping->tangentFraction;
-    stream << endl << atZero << ", ";
+    oif_KeywordLine(stream, "*Contact Damping")
+        .Fixed(", definition=", IsImplicit() ? "DAMPING COEFFICIENT" : "CRITICAL DAMPING")
+        .FixedIf(IsExplicit(), ", tangent fraction=", damping->tangentFraction)
+        .End();
+    stream << atZero << ", ";
     double clearance = 0.0;
     double start = 0.0;
     if (damping->definition == 1) {
@@ -206,12 +193,11 @@ void oif_GapConductance::Write(utl_Stream& stream) const {
     if (conductance->definition != 0) return;
     const auto write = [&](const char* keyword, const Table& values, int dependencies, bool byTemperature,
                            bool byMassFlowRate) {
-        stream << keyword;
-        if (dependencies > 0) stream << ", dependencies=" << dependencies;
+        oif_KeywordLine(stream, keyword).FixedIf(dependencies > 0, ", dependencies=", dependencies).End();
         oif_MaterialTable table = Columns(values);
         if (!byTemperature) table.InsertEmptyColumn(2);
         if (!byMassFlowRate) table.InsertEmptyColumn(3);
-        stream << endl << table;
+        stream << table;
     };
     if (conductance->clearanceDependency) {
         write("*Gap Conductance", conductance->clearanceTable, conductance->dependencies,

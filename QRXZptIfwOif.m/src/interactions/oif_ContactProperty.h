@@ -1,6 +1,7 @@
 #ifndef QRX_OIF_CONTACTPROPERTY_H
 #define QRX_OIF_CONTACTPROPERTY_H
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 #include "store_interface/records/interactions/kinC_ContactProperty.h"
@@ -62,7 +63,7 @@ public:
     void Write(utl_Stream& stream) const override;
 
 private:
-    void WriteParameters(utl_Stream& stream, const kinC_TangentialBehavior& friction) const;
+    void AddParameters(oif_KeywordLine& line, const kinC_TangentialBehavior& friction) const;
     void WriteData(utl_Stream& stream, const kinC_TangentialBehavior& friction) const;
 };
 

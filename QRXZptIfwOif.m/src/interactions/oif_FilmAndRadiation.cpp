@@ -14,28 +14,38 @@ constexpr double kNoRange = 3.4028234663852886e38;
 
 cow_List<cow_String> SurfaceNames(const cow_List<rgnC_Region>& regions, const qkw_ModelInfo& modelInfo) {
     cow_List<cow_String> names;
-    for (int i = 0; i < regions.Length(); ++i) names.Append(oif_SurfaceName(regions[i], modelInfo));
+    for (const rgnC_Region& region : regions) names.Append(oif_SurfaceName(region, modelInfo));
     return names;
 }
 
 void WriteSurfaces(utl_Stream& stream, const cow_List<cow_String>& names) {
-    for (int i = 0; i < names.Length(); ++i) stream << names[i] << endl;
+    for (const cow_String& name : names) stream << name << endl;
+}
+
+const char* BlockingWord(kinC_CavityRadiationBlockingEnm blocking) {
+    switch (blocking) {
+    case kinC_CavityRadiationBlockingEnm::ALL: return "ALL";
+    case kinC_CavityRadiationBlockingEnm::NONE: return "NO";
+    // With its blank.
+    case kinC_CavityRadiationBlockingEnm::PARTIAL: return "PARTIAL ";
+    }
+    return "";
 }
 
 } // namespace
 
-void oif_FilmInteraction::WriteFilmAmplitudes(utl_Stream& stream) const {
+void oif_FilmInteraction::AddFilmAmplitudes(oif_KeywordLine& line) const {
     const auto& film = Record<kinC_FilmCondition>();
     const auto& state = film.ConstGetState(Step());
     // A film of the user's code has neither.
-    if (film.definition != USER) WriteNamed(stream, ", amplitude=", state.amplitude.ConstGet());
+    if (film.definition != USER) AddNamed(line, ", amplitude=", state.amplitude.ConstGet());
     if (film.definition == EMBEDDED) {
-        WriteNamed(stream, ", film amplitude=", state.filmAmplitude.ConstGet());
+        AddNamed(line, ", film amplitude=", state.filmAmplitude.ConstGet());
     }
 }
 
-void oif_Sfilm::WriteParameters(utl_Stream& stream) const {
-    WriteFilmAmplitudes(stream);
+void oif_Sfilm::AddParameters(oif_KeywordLine& line) const {
+    AddFilmAmplitudes(line);
 }
 
 void oif_Sfilm::WriteData(utl_Stream& stream) const {
@@ -57,14 +67,11 @@ void oif_Sfilm::WriteData(utl_Stream& stream) const {
     }
 }
 
-void oif_Cfilm::WriteParameters(utl_Stream& stream) const {
+void oif_Cfilm::AddParameters(oif_KeywordLine& line) const {
     const auto& film = Record<kinC_ConcFilmCondition>();
-    WriteFilmAmplitudes(stream);
-    WriteRegionType(stream, film.regionType);
-    if (film.definition == USER) {
-        stream.OptionalLineBreak();
-        stream << ", user";
-    }
+    AddFilmAmplitudes(line);
+    AddRegionType(line, film.regionType);
+    if (film.definition == USER) line.MayBreak().Fixed(", user");
 }
 
 void oif_Cfilm::WriteData(utl_Stream& stream) const {
@@ -79,9 +86,9 @@ void oif_Cfilm::WriteData(utl_Stream& stream) const {
     }
 }
 
-void oif_Sradiate::WriteParameters(utl_Stream& stream) const {
-    WriteNamed(stream,
-               ", amplitude=", Record<kinC_RadiationToAmbient>().ConstGetState(Step()).amplitude.ConstGet());
+void oif_Sradiate::AddParameters(oif_KeywordLine& line) const {
+    AddNamed(line,
+             ", amplitude=", Record<kinC_RadiationToAmbient>().ConstGetState(Step()).amplitude.ConstGet());
 }
 
 void oif_Sradiate::WriteData(utl_Stream& stream) const {
@@ -90,10 +97,10 @@ void oif_Sradiate::WriteData(utl_Stream& stream) const {
            << state.emissivity.ConstGet();
 }
 
-void oif_Cradiate::WriteParameters(utl_Stream& stream) const {
+void oif_Cradiate::AddParameters(oif_KeywordLine& line) const {
     const auto& radiation = Record<kinC_ConcRadiationToAmbient>();
-    WriteNamed(stream, ", amplitude=", radiation.ConstGetState(Step()).amplitude.ConstGet());
-    WriteRegionType(stream, radiation.regionType);
+    AddNamed(line, ", amplitude=", radiation.ConstGetState(Step()).amplitude.ConstGet());
+    AddRegionType(line, radiation.regionType);
 }
 
 void oif_Cradiate::WriteData(utl_Stream& stream) const {
@@ -106,10 +113,11 @@ oif_FilmProperty::oif_FilmProperty(const cow_String& name, const kinC_Interactio
     : name_(name), property_(nex_canDynamicCastRef<kinC_FilmConditionProp>(property, NEX_HERE)) {}
 
 void oif_FilmProperty::Write(utl_Stream& stream) const {
-    stream << "*Film Property, name=" << qkw_QuorixName(name_, false);
-    stream.OptionalLineBreak();
-    if (property_.dependencies != 0) stream << ", dependencies=" << property_.dependencies;
-    stream << endl;
+    oif_KeywordLine(stream, "*Film Property")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .MayBreak()
+        .FixedUnless(", dependencies=", property_.dependencies, 0)
+        .End();
     const cow_2DArray<double>& table = property_.table;
     for (int row = 0; row < table.NumRows(); ++row) {
         oif_DataLines line(stream, 8);
@@ -131,9 +139,10 @@ oif_CavityDefinition::oif_CavityDefinition(const cow_String& name, const kinC_In
 }
 
 void oif_CavityDefinition::Write(utl_Stream& stream) const {
-    stream << "*Cavity Definition, name=" << qkw_QuorixName(name_, false);
-    if (ambientTemp_ != kinC_CavityRadiation::ambientTempDef()) stream << ", ambient temp=" << ambientTemp_;
-    stream << endl;
+    oif_KeywordLine(stream, "*Cavity Definition")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .FixedUnless(", ambient temp=", ambientTemp_, kinC_CavityRadiation::ambientTempDef())
+        .End();
     WriteSurfaces(stream, surfaces_);
 }
 
@@ -143,21 +152,17 @@ oif_RadiationViewfactor::oif_RadiationViewfactor(const cow_String& name, const k
       blockingSurfaces_(SurfaceNames(state_.blockingSurfaces.ConstGet(), modelInfo)) {}
 
 void oif_RadiationViewfactor::Write(utl_Stream& stream) const {
-    stream << "*Radiation Viewfactor, cavity=" << qkw_QuorixName(name_, false);
+    oif_KeywordLine line(stream, "*Radiation Viewfactor");
+    line.Fixed(", cavity=", qkw_QuorixName(name_, false));
     if (off_) {
-        stream << ", off" << endl;
+        line.Fixed(", off").End();
         return;
     }
     const kinC_CavityRadiationBlockingEnm blocking = state_.blocking.ConstGet();
-    stream << ", blocking=";
-    switch (blocking) {
-    case kinC_CavityRadiationBlockingEnm::ALL: stream << "ALL"; break;
-    case kinC_CavityRadiationBlockingEnm::NONE: stream << "NO"; break;
-    // With its blank.
-    case kinC_CavityRadiationBlockingEnm::PARTIAL: stream << "PARTIAL "; break;
-    }
-    if (state_.range.ConstGet() != kNoRange) stream << ", range=" << state_.range.ConstGet();
-    stream << ", reflection=" << (state_.reflection.ConstGet() ? "YES" : "NO")
-           << ", vtol=" << state_.vtol.ConstGet() << endl;
+    line.Fixed(", blocking=", BlockingWord(blocking))
+        .FixedUnless(", range=", state_.range.ConstGet(), kNoRange)
+        .Fixed(", reflection=", state_.reflection.ConstGet() ? "YES" : "NO")
+        .Fixed(", vtol=", state_.vtol.ConstGet())
+        .End();
     if (blocking == kinC_CavityRadiationBlockingEnm::PARTIAL) WriteSurfaces(stream, blockingSurfaces_);
 }

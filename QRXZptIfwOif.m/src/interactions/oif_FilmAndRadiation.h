@@ -9,7 +9,7 @@
 class oif_FilmInteraction : public oif_StepInteraction {
 protected:
     using oif_StepInteraction::oif_StepInteraction;
-    void WriteFilmAmplitudes(utl_Stream& stream) const;
+    void AddFilmAmplitudes(oif_KeywordLine& line) const;
 };
 
 /// Convection at a surface:
@@ -21,7 +21,7 @@ public:
 
 private:
     const char* Keyword() const override { return "*Sfilm"; }
-    void WriteParameters(utl_Stream& stream) const override;
+    void AddParameters(oif_KeywordLine& line) const override;
     void WriteData(utl_Stream& stream) const override;
 };
 
@@ -34,7 +34,7 @@ public:
 
 private:
     const char* Keyword() const override { return "*Cfilm"; }
-    void WriteParameters(utl_Stream& stream) const override;
+    void AddParameters(oif_KeywordLine& line) const override;
     void WriteData(utl_Stream& stream) const override;
 };
 
@@ -47,7 +47,7 @@ public:
 
 private:
     const char* Keyword() const override { return "*Sradiate"; }
-    void WriteParameters(utl_Stream& stream) const override;
+    void AddParameters(oif_KeywordLine& line) const override;
     void WriteData(utl_Stream& stream) const override;
 };
 
@@ -60,7 +60,7 @@ public:
 
 private:
     const char* Keyword() const override { return "*Cradiate"; }
-    void WriteParameters(utl_Stream& stream) const override;
+    void AddParameters(oif_KeywordLine& line) const override;
     void WriteData(utl_Stream& stream) const override;
 };
 

@@ -6,24 +6,21 @@
 
 void oif_StepInteraction::Write(utl_Stream& stream) const {
     const bool ended = interaction_.ConstGet().GetPropStatus(step_) == mdl_PropagationStatusEnm::DEACTIVATED;
-    stream << Keyword();
-    if (!ended) WriteParameters(stream);
-    if (!notNew_) stream << ", op=NEW";
-    stream << endl;
+    oif_KeywordLine line(stream, Keyword());
+    if (!ended) AddParameters(line);
+    line.Op(op_).End();
     if (ended) return;
     WriteData(stream);
     stream << endl;
 }
 
-void oif_StepInteraction::WriteNamed(utl_Stream& stream, const char* parameter, const cow_String& name) {
-    if (name.IsEmpty()) return;
-    stream.OptionalLineBreak();
-    stream << parameter << qkw_QuorixName(name, false);
+void oif_StepInteraction::AddNamed(oif_KeywordLine& line, const char* parameter, const cow_String& name) {
+    if (!name.IsEmpty()) line.MayBreak().Fixed(parameter, qkw_QuorixName(name, false));
 }
 
-void oif_StepInteraction::WriteRegionType(utl_Stream& stream, int regionType) const {
+void oif_StepInteraction::AddRegionType(oif_KeywordLine& line, int regionType) const {
     if (!kprC_IsExplicit(interaction_.ConstGet().ConstGetStateQuad(step_).procedureType)) return;
-    stream.OptionalLineBreak();
-    if (regionType == 1) stream << ", region type=SLIDING";
-    if (regionType == 2) stream << ", region type=EULERIAN";
+    line.MayBreak()
+        .FixedIf(regionType == 1, ", region type=SLIDING")
+        .FixedIf(regionType == 2, ", region type=EULERIAN");
 }

@@ -17,16 +17,16 @@ void WriteNumbers(utl_Stream& stream, std::initializer_list<double> values) {
 
 } // namespace
 
-void oif_AcousticImpedance::WriteParameters(utl_Stream& stream) const {
+void oif_AcousticImpedance::AddParameters(oif_KeywordLine& line) const {
     const auto& impedance = Record<kinC_AcousticImpedance>();
     if (impedance.nonreflecting != 0) {
         const int type = impedance.boundaryType;
         const bool isKnown = type >= 0 && type < static_cast<int>(std::size(kBoundaryTypes));
-        stream << ", nonreflecting=" << (isKnown ? kBoundaryTypes[type] : "");
+        line.Fixed(", nonreflecting=", isKnown ? kBoundaryTypes[type] : "");
     } else {
-        stream << ", property=" << qkw_QuorixName(impedance.ConstGetState(Step()).property.ConstGet(), false);
+        line.Fixed(", property=", qkw_QuorixName(impedance.ConstGetState(Step()).property.ConstGet(), false));
     }
-    stream.OptionalLineBreak();
+    line.MayBreak();
 }
 
 void oif_AcousticImpedance::WriteData(utl_Stream& stream) const {
@@ -53,10 +53,12 @@ oif_AcousticImpedanceProp::oif_AcousticImpedanceProp(const cow_String& name,
     : name_(name), property_(nex_canDynamicCastRef<kinC_AcousticImpedanceProp>(property, NEX_HERE)) {}
 
 void oif_AcousticImpedanceProp::Write(utl_Stream& stream) const {
-    stream << "*Impedance Property, name=" << qkw_QuorixName(name_, false);
-    stream.OptionalLineBreak();
-    if (!property_.admittance) stream << ", data=IMPEDANCE";
-    stream << endl << oif_MaterialTable(property_.table, 0, property_.dependencies != 0);
+    oif_KeywordLine(stream, "*Impedance Property")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .MayBreak()
+        .FixedIf(!property_.admittance, ", data=IMPEDANCE")
+        .End();
+    stream << oif_MaterialTable(property_.table, 0, property_.dependencies != 0);
 }
 
 oif_IncidentWave::oif_IncidentWave(const kinC_Interaction& interaction, const cow_String& step,
@@ -67,15 +69,14 @@ oif_IncidentWave::oif_IncidentWave(const kinC_Interaction& interaction, const co
 
 void oif_IncidentWave::Write(utl_Stream& stream) const {
     if (wave_.GetPropStatus(step_) != mdl_PropagationStatusEnm::CREATED) return;
-    stream << "*Incident wave interaction";
+    oif_KeywordLine line(stream, "*Incident wave interaction");
     switch (wave_.waveType) {
-    case 0: stream << ", pressure amplitude=" << qkw_QuorixName(wave_.amplitude, false); break;
-    case 1: stream << ", acceleration amplitude=" << qkw_QuorixName(wave_.amplitude, false); break;
-    default: stream << ", UNDEX"; break;
+    case 0: line.Fixed(", pressure amplitude=", qkw_QuorixName(wave_.amplitude, false)); break;
+    case 1: line.Fixed(", acceleration amplitude=", qkw_QuorixName(wave_.amplitude, false)); break;
+    default: line.Fixed(", UNDEX"); break;
     }
-    stream.OptionalLineBreak();
-    stream << ", property=" << qkw_QuorixName(wave_.property, false) << endl
-           << surfaceName_ << ", " << sourceName_ << ", " << standoffName_ << ", " << wave_.magnitude << endl;
+    line.MayBreak().Fixed(", property=", qkw_QuorixName(wave_.property, false)).End();
+    stream << surfaceName_ << ", " << sourceName_ << ", " << standoffName_ << ", " << wave_.magnitude << endl;
 }
 
 oif_IncidentWaveProperty::oif_IncidentWaveProperty(const cow_String& name,
@@ -84,10 +85,12 @@ oif_IncidentWaveProperty::oif_IncidentWaveProperty(const cow_String& name,
       depth_(property_.initialDepth) {}
 
 void oif_IncidentWaveProperty::Write(utl_Stream& stream) const {
-    stream << "*Incident Wave Interaction Property, name=" << qkw_QuorixName(name_, false);
-    stream.OptionalLineBreak();
-    if (property_.shape == 1) stream << ", type=SPHERE";
-    stream << endl << property_.speed << ", " << property_.density;
+    oif_KeywordLine(stream, "*Incident Wave Interaction Property")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .MayBreak()
+        .FixedIf(property_.shape == 1, ", type=SPHERE")
+        .End();
+    stream << property_.speed << ", " << property_.density;
     if (property_.bubbleModel == DECAY) {
         WriteNumbers(stream, {property_.decayA, property_.decayB, property_.decayC});
     }

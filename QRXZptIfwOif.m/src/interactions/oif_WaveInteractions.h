@@ -15,7 +15,7 @@ public:
 
 private:
     const char* Keyword() const override { return "*Simpedance"; }
-    void WriteParameters(utl_Stream& stream) const override;
+    void AddParameters(oif_KeywordLine& line) const override;
     void WriteData(utl_Stream& stream) const override;
 };
 

@@ -170,7 +170,7 @@ void oif_AssemblyElement::Write(utl_Stream& stream) const {
     const rgnC_SetData& set = region_.ConstSet().Data();
     for (int s = 0; s < set.NumSubSets(); ++s) {
         const rgnC_SubsetData subset = set.SubSet(s);
-        const ddb_Mesh mesh = modelInfo_->DdbModel().mesh(subset.MeshIndex());
+        const ddb_Mesh mesh = modelInfo_->Model().Model().mesh(subset.MeshIndex());
         const ddb_ScopedNodeData nodes(mesh.nodeData());
         const ddb_ElementClass elements = mesh.elementData().elementClass(subset.ClassIndex());
         const int numNodes = elements.numNodesPerElement();

@@ -26,7 +26,7 @@ void oif_RegionBuilder::CreateInstanceRegions(const ddb_PartInstance& instance) 
 }
 
 void oif_RegionBuilder::CreateAssemblyRegions() {
-    const ddb_Assembly assembly = Store().rootAssembly();
+    const ddb_Assembly assembly = Model().RootAssembly();
     // Surfaces stand behind all node and element sets.
     for (ddb_SetListIT it = assembly.set().createIterator(); !it.isDone(); it.next()) {
         const rgnC_SetData setData = it.currentItem().set();

@@ -171,7 +171,7 @@ cow_String oif_OutputRequestBuilder::GetMonitorSetName(const kprC_AnalysisStep& 
     if (step.monitor.IsNull()) return {};
     const rgnC_Region& region = step.monitor.ConstGet().region;
     if (region.SetName().IsEmpty()) return {};
-    return oif_RegionName(region, Info());
+    return oif_RegionName(region, ModelInfo());
 }
 
 bool oif_OutputRequestBuilder::RefersToSomething(const korC_Output& output) const {
@@ -389,7 +389,7 @@ oif_OutputRequestBuilder::Traits oif_OutputRequestBuilder::TraitsOf(const Reques
     traits.pre = request.variablesType == korC_VariablesTypeEnm::PRESELECT;
     traits.all = request.variablesType == korC_VariablesTypeEnm::ALL;
     traits.whole = traits.domain == Domain::WHOLE_MODEL;
-    if (traits.domain == Domain::SET) traits.setName = oif_RegionName(request.region, Info());
+    if (traits.domain == Domain::SET) traits.setName = oif_RegionName(request.region, ModelInfo());
     if (traits.domain == Domain::INTERACTION) traits.setName = GetInteractionSetName(request.interactions);
     traits.hasSurface = traits.domain == Domain::CONTACT_SURFACE && !GetSurfaceName(request.region).IsEmpty();
     return traits;
@@ -544,7 +544,7 @@ void oif_OutputRequestBuilder::AddContactOutput(const Request& request, const Ch
     }
     AddStepDefinition(place.stepName,
                       oif_ContactOutput(request, place.stepType, traits.pre, traits.all, master, slave, cpset,
-                                        oif_RegionName(request.region, Info()), !channel.IsField()));
+                                        oif_RegionName(request.region, ModelInfo()), !channel.IsField()));
 }
 
 void oif_OutputRequestBuilder::AddRadiationOutput(const Request& request, const Place& place,
@@ -581,5 +581,5 @@ const cls_Record* oif_OutputRequestBuilder::GetSpring(const cow_String&) {
 }
 
 cow_String oif_OutputRequestBuilder::GetSurfaceName(const rgnC_Region& region) const {
-    return oif_SurfaceName(region, Info());
+    return oif_SurfaceName(region, ModelInfo());
 }

@@ -174,7 +174,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
             text = text + ", (Material Orientation:" + NameInComment(orientation.RegionRef()) + ")";
             if (!orientation.datum.IsNullRef()) {
                 group.orientationName = cow_String("Ori-") + cow_String(index + 1);
-                if (!Info().V6Format()) {
+                if (!ModelInfo().V6Format()) {
                     group.orientationName =
                         qkw_QuorixName(instance.name(), false).Printable() + "_" + group.orientationName;
                 }
@@ -197,7 +197,7 @@ void oif_PartAttributesBuilder::CreateMaterialOrientation(const ddb_PartInstance
         if (writtenOrientations_[i] == name) return;
     }
     writtenOrientations_.Append(name);
-    AddInstanceDefinition(instance.name(), oif_Orientation(Store(), orientation, name, gsl_Matrix()));
+    AddInstanceDefinition(instance.name(), oif_Orientation(Model().Model(), orientation, name, gsl_Matrix()));
 }
 
 void oif_PartAttributesBuilder::CreateSection(const ddb_PartInstance& instance, const cow_String& name,
@@ -327,7 +327,7 @@ void oif_PartAttributesBuilder::CreateElementControls() {
 }
 
 bme_ElemLibrary oif_PartAttributesBuilder::ElemLibrary() const {
-    switch (Info().AnalysisProduct()) {
+    switch (ModelInfo().AnalysisProduct()) {
     case kprC_AnalysisProductEnm::IMPLICIT: return bme_ElemLibrary::STANDARD;
     case kprC_AnalysisProductEnm::EXPLICIT: return bme_ElemLibrary::EXPLICIT;
     default: return bme_ElemLibrary::NONE;

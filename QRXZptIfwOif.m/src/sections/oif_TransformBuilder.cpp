@@ -48,7 +48,7 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         for (int i = 0; i < equation->terms.Length(); ++i) {
             const kcoC_EquationTerm& term = equation->terms[i];
             if (term.csys.Id() <= 0) continue;
-            append(dtmC_DatumRef(term.csys.Id()), Store().rootAssembly().nset(term.setName).Region());
+            append(dtmC_DatumRef(term.csys.Id()), Model().RootAssembly().nset(term.setName).Region());
         }
     }
 }
@@ -72,12 +72,12 @@ void oif_TransformBuilder::WriteTransforms() {
         const cow_String name = ConstGetDatumName(system.datum);
         const nex_Context context("transform", name);
         AddAssemblyDefinition(oif_Nset(name, system.members));
-        AddAssemblyDefinition(oif_Transform(Store(), system.datum, name));
+        AddAssemblyDefinition(oif_Transform(Model().Model(), system.datum, name));
     }
 }
 
 void oif_TransformBuilder::WriteConnectorOrientations() {
-    const ptoC_PartAttributeList& orientations = Info().View().Assembly().ConstGetConnectorOrientation();
+    const ptoC_PartAttributeList& orientations = Model().Assembly().ConstGetConnectorOrientation();
     for (int i = 0; i < orientations.Size(); ++i) {
         const auto& ends =
             nex_canDynamicCastRef<ptoC_ConnectorOrientation>(orientations.ConstGet(i), NEX_HERE);
@@ -114,7 +114,7 @@ void oif_TransformBuilder::WriteOrientation(const dtmC_DatumRef& datum, double a
     }
     orientationNames_.Append(name);
     const nex_Context context("orientation", name);
-    AddAssemblyDefinition(oif_Orientation(Store(), datum, name, true, angle, axis));
+    AddAssemblyDefinition(oif_Orientation(Model().Model(), datum, name, true, angle, axis));
 }
 
 cow_String oif_TransformBuilder::ConstGetDatumName(const dtmC_DatumRef& datum) const {

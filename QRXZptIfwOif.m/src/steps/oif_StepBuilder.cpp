@@ -12,7 +12,7 @@
 
 void oif_StepBuilder::Build() {
     // An explicit job starts with large displacements on.
-    bool nlgeomInherited = Info().AnalysisProduct() == kprC_AnalysisProductEnm::EXPLICIT;
+    bool nlgeomInherited = ModelInfo().AnalysisProduct() == kprC_AnalysisProductEnm::EXPLICIT;
     unsigned previousProcedure = 0;
     const kprC_StepContainer& steps = Model().Steps();
     kprC_StepContainerIT it(steps);
@@ -43,7 +43,7 @@ void oif_StepBuilder::AddProcedure(const cow_String& stepName, const kprC_Analys
     case kprC_AnnealStep::Class.Id(): add(oif_Anneal(step)); break;
     case kprC_BuckleStep::Class.Id(): add(oif_Buckle(step)); break;
     case kprC_CoupledTempDisplacementStep::Class.Id():
-        add(oif_CoupledTempDisplacement(step, Info().V6Format()), oif_SolutionTechnique(step));
+        add(oif_CoupledTempDisplacement(step, ModelInfo().V6Format()), oif_SolutionTechnique(step));
         break;
     case kprC_CoupledThermalElectricStep::Class.Id():
         add(oif_CoupledThermalElectric(step), oif_SolutionTechnique(step));
@@ -89,7 +89,7 @@ void oif_StepBuilder::AddProcedure(const cow_String& stepName, const kprC_Analys
         break;
     }
     case kprC_ViscoStep::Class.Id():
-        add(oif_Visco(step, Info().V6Format()), oif_SolutionTechnique(step));
+        add(oif_Visco(step, ModelInfo().V6Format()), oif_SolutionTechnique(step));
         break;
     case kprC_TempDisplacementDynamicsStep::Class.Id():
         add(oif_DynamicTempDisplacement(step, ModelInfo()), oif_BulkViscosity(step));
@@ -145,5 +145,5 @@ void oif_StepBuilder::AddLoadCases(const cow_String& stepName, const kprC_Analys
 }
 
 cow_String oif_StepBuilder::AssemblySetName(const rgnC_Region& region) const {
-    return oif_RegionName(region, Info());
+    return oif_RegionName(region, ModelInfo());
 }
