@@ -43,6 +43,6 @@ else()
 endif()
 
 run(${CMAKE_COMMAND} -E chdir ${WORK_DIR} ${program})
-if(NOT output STREQUAL "consumer.inp: 278 bytes\n")
+if(NOT output STREQUAL "/models/Default Model/parts/ROD: 1 element has no section [no-section]\nconsumer.inp: 278 bytes\n")
     message(FATAL_ERROR "the consumer wrote:\n${output}")
 endif()

@@ -1,4 +1,5 @@
 #include "deck/oif_Writer.h"
+#include "deck_checks/dck_Check.h"
 #include "foundation/qio_Device.h"
 #include "store_interface/model/odb_Odb.h"
 
@@ -12,6 +13,9 @@ int main() {
     part.mesh->SetNodes({1, 2}, {0.0F, 0.0F, 0.0F, 100.0F, 0.0F, 0.0F});
     part.mesh->AddElements("T3D2", {1}, 2, {1, 2});
     model.AddInstance("ROD-1", "ROD");
+    for (const fnd_Finding& finding : dck_Check(odb)) {
+        std::printf("%s: %s [%s]\n", finding.place.c_str(), finding.Text().c_str(), finding.code->name.data());
+    }
     oif_Writer(odb).WriteInputFile("consumer");
     // The deck's length by hand: banners, part, assembly, instance, two nodes and one element.
     std::printf("consumer.inp: %lld bytes\n", qio_LastReport().bytes);
