@@ -15,7 +15,7 @@ namespace {
 TEST(InteractionRows, EveryClassHasOne) {
     std::set<unsigned> ids;
     for (const oif_InteractionRow& row : oif_InteractionRows()) {
-        EXPECT_TRUE(ids.insert(row.typeId).second) << cls_Classes().NameOf(row.typeId);
+        EXPECT_TRUE(ids.insert(row.typeId).second) << cls_Classes().NameOf(row.typeId).View();
         EXPECT_EQ(oif_FindInteractionRow(row.typeId), &row);
     }
     const auto classes = cls_Classes().ConcreteClasses(kinC_Interaction::TypeId());
@@ -30,11 +30,11 @@ TEST(InteractionRows, AClassHasAHistoryOrIsSaidByStepsOrIsSilent) {
                                     kinC_CyclicSymmetry::TypeId()};
     for (const oif_InteractionRow& row : oif_InteractionRows()) {
         const int ways = (row.history != nullptr ? 1 : 0) + (row.make != nullptr ? 1 : 0);
-        EXPECT_EQ(ways, silent.count(row.typeId) == 1 ? 0 : 1) << cls_Classes().NameOf(row.typeId);
-        EXPECT_EQ(row.make != nullptr, row.saying != oif_Saying::NEVER) << cls_Classes().NameOf(row.typeId);
+        EXPECT_EQ(ways, silent.count(row.typeId) == 1 ? 0 : 1) << cls_Classes().NameOf(row.typeId).View();
+        EXPECT_EQ(row.make != nullptr, row.saying != oif_Saying::NEVER) << cls_Classes().NameOf(row.typeId).View();
         EXPECT_EQ(row.solver != oif_ContactSolver::NONE,
                   cls_Classes().InheritanceCheck(row.typeId, kinC_ContactPair::TypeId()))
-            << cls_Classes().NameOf(row.typeId);
+            << cls_Classes().NameOf(row.typeId).View();
     }
 }
 
@@ -58,7 +58,7 @@ TEST(InteractionRows, RegionsAreThoseOfTheRecord) {
 TEST(InteractionPropertyRows, EveryClassHasOne) {
     std::set<unsigned> ids;
     for (const oif_InteractionPropertyRow& row : oif_InteractionPropertyRows()) {
-        EXPECT_TRUE(ids.insert(row.typeId).second) << cls_Classes().NameOf(row.typeId);
+        EXPECT_TRUE(ids.insert(row.typeId).second) << cls_Classes().NameOf(row.typeId).View();
     }
     const std::set<unsigned> silent{kinC_IncidentWaveProperty::TypeId(), kinC_ActuatorSensorProp::TypeId()};
     const auto classes = cls_Classes().ConcreteClasses(kinC_InteractionProperty::TypeId());

@@ -5,7 +5,7 @@
 #include "mesh/oif_SetName.h"
 #include "output/oif_Output.h"
 #include "steps/oif_StepControls.h"
-#include "steps/oif_StepExtras.h"
+#include "steps/oif_StepRequests.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 #include "store_interface/records/interactions/kinC_Contact.h"

@@ -5,6 +5,9 @@
 #include "steps/oif_Procedure.h"
 #include "store_interface/records/steps/kprC_DynamicSteps.h"
 
+#include <optional>
+#include <utility>
+
 /// *Dynamic,alpha=A,adiabatic,haftol=H,initial=NO
 /// initial,period,min,max
 /// without blanks behind the commas, unlike all others.
@@ -42,12 +45,16 @@ private:
 /// for the two explicit procedures; for any other step it writes nothing.
 class oif_BulkViscosity final : public qkw_KeywordOf<oif_BulkViscosity> {
 public:
-    /// The step must outlive the keyword.
-    explicit oif_BulkViscosity(const kprC_AnalysisStep& step) : step_(&step) {}
+    template <class Step>
+    explicit oif_BulkViscosity(const Step& step) {
+        if constexpr (requires { step.linearBulkViscosity; }) {
+            values_ = {step.linearBulkViscosity, step.quadraticBulkViscosity};
+        }
+    }
     void Write(utl_Stream& stream) const override;
 
 private:
-    const kprC_AnalysisStep* step_;
+    std::optional<std::pair<double, double>> values_; ///< linear and quadratic
 };
 
 /// *Dynamic, subspace, vectors=N

@@ -1,7 +1,7 @@
 #include "steps/oif_ModalProcedures.h"
 
 #include "mesh/oif_SetName.h"
-#include "store_interface/records/steps/kprC_StaticSteps.h"
+#include "store_interface/records/steps/kprC_Predicates.h"
 
 #include <utility>
 
@@ -17,8 +17,7 @@ constexpr int kPointsForBias = 4;
 /// One line for each frequency range, with `ending` behind it.
 template <class Row>
 void WriteRanges(utl_Stream& stream, const cow_List<Row>& ranges, const char* ending = "") {
-    for (int i = 0; i < ranges.Length(); ++i) {
-        const Row& range = ranges[i];
+    for (const Row& range : ranges) {
         stream << range.lower << ", " << range.upper << ", " << range.points << ", ";
         if (range.points >= kPointsForBias) stream << range.bias;
         stream << ending << endl;
@@ -37,13 +36,13 @@ void WriteRangesWithScale(utl_Stream& stream, const Step& step) {
 }
 
 template <class Step>
-void WriteScaleAndInterval(utl_Stream& stream, const Step& step) {
-    if (IsLinear(step)) stream << ", frequency scale=LINEAR";
-    if (!step.subdivideUsingEigenfrequencies) stream << ", interval=RANGE";
+void AddScaleAndInterval(oif_KeywordLine& line, const Step& step) {
+    line.FixedIf(IsLinear(step), ", frequency scale=LINEAR")
+        .FixedIf(!step.subdivideUsingEigenfrequencies, ", interval=RANGE");
 }
 
-void WriteFrictionDamping(utl_Stream& stream, bool frictionDamping) {
-    stream << ", friction damping=" << oif_YesOrNo(frictionDamping);
+void AddFrictionDamping(oif_KeywordLine& line, bool frictionDamping) {
+    line.Fixed(", friction damping=", oif_YesOrNo(frictionDamping));
 }
 
 /// Null for a number outside the enumeration.
@@ -92,32 +91,31 @@ const char* oif_Frequency::EigensolverText() const {
 }
 
 void oif_Frequency::Write(utl_Stream& stream) const {
-    stream << "*Frequency" << EigensolverText();
+    oif_KeywordLine line(stream, "*Frequency");
+    line.Fixed(EigensolverText());
     if (step_.eigensolver == Eigensolver::LANCZOS) {
-        stream << (step_.sim ? ", sim" : ", sim=NO");
-        if (step_.sim && !step_.dampingProjection) stream << ", damping projection=off";
-        stream << CouplingText(step_.acousticCoupling);
+        line.Fixed(step_.sim ? ", sim" : ", sim=NO")
+            .FixedIf(step_.sim && !step_.dampingProjection, ", damping projection=off")
+            .Fixed(CouplingText(step_.acousticCoupling));
     }
-    stream << (step_.normalization == kprC_FrequencyStep::NormalizationEnm::DISPLACEMENT
-                   ? ", normalization=displacement"
-                   : ", normalization=mass");
-    // The blanks around the equals sign are part of the text.
-    if (step_.propertyEvaluationFrequency != cls_UnsetDouble)
-        stream << ", property evaluation = " << step_.propertyEvaluationFrequency;
-    if (step_.residualModes &&
-        (step_.eigensolver == Eigensolver::LANCZOS || step_.eigensolver == Eigensolver::AMS))
-        stream << ", residual modes";
-    if (step_.eigensolver == Eigensolver::AMS) WriteAmsParameters(stream);
-    stream << endl;
+    const bool isDisplacement = step_.normalization == kprC_FrequencyStep::NormalizationEnm::DISPLACEMENT;
+    line.Fixed(isDisplacement ? ", normalization=displacement" : ", normalization=mass")
+        // The blanks around the equals sign are part of the text.
+        .FixedUnless(", property evaluation = ", step_.propertyEvaluationFrequency, cls_UnsetDouble)
+        .FixedIf(step_.residualModes &&
+                     (step_.eigensolver == Eigensolver::LANCZOS || step_.eigensolver == Eigensolver::AMS),
+                 ", residual modes");
+    if (step_.eigensolver == Eigensolver::AMS) AddAmsParameters(line);
+    line.End();
     WriteData(stream);
 }
 
-void oif_Frequency::WriteAmsParameters(utl_Stream& stream) const {
+void oif_Frequency::AddAmsParameters(oif_KeywordLine& line) const {
     // Coupling that is on is said for Lanczos only.
-    if (step_.acousticCoupling != AcousticCoupling::ON) stream << CouplingText(step_.acousticCoupling);
-    if (!step_.dampingProjection) stream << ", damping projection=off";
+    line.FixedIf(step_.acousticCoupling != AcousticCoupling::ON, CouplingText(step_.acousticCoupling))
+        .FixedIf(!step_.dampingProjection, ", damping projection=off");
     if (step_.nsetRegion.SetName().IsEmpty()) return;
-    stream << ", nset=" << oif_RegionName(step_.nsetRegion, *modelInfo_);
+    line.Fixed(", nset=", oif_RegionName(step_.nsetRegion, *modelInfo_));
 }
 
 void oif_Frequency::WriteData(utl_Stream& stream) const {
@@ -155,9 +153,9 @@ void oif_Frequency::WriteAmsData(utl_Stream& stream) const {
 }
 
 void oif_ComplexFrequency::Write(utl_Stream& stream) const {
-    stream << "*Complex Frequency";
-    WriteFrictionDamping(stream, step_.frictionDamping);
-    stream << endl;
+    oif_KeywordLine line(stream, "*Complex Frequency");
+    AddFrictionDamping(line, step_.frictionDamping);
+    line.End();
     oif_WriteItems(stream, step_.numEigen, step_.minEigen);
     stream << ", ";
     if (step_.maxEigen < kComplexMaxEigenDefault || step_.minEigen != cls_UnsetDouble)
@@ -168,26 +166,25 @@ void oif_ComplexFrequency::Write(utl_Stream& stream) const {
 }
 
 void oif_ModalDynamics::Write(utl_Stream& stream) const {
-    const bool canContinue = previousProcedure_ == kprC_StaticLinearPerturbationStep::TypeId() ||
-                             previousProcedure_ == kprC_ModalDynamicsStep::TypeId();
-    stream << "*Modal dynamic, continue=" << oif_YesOrNo(step_.continueAnalysis && canContinue) << endl
-           << step_.timeIncrement << ", " << step_.timePeriod << endl;
+    const bool continues = step_.continueAnalysis && kprC_CanBeContinued(previousProcedure_);
+    oif_KeywordLine(stream, "*Modal dynamic").Fixed(", continue=", oif_YesOrNo(continues)).End();
+    stream << step_.timeIncrement << ", " << step_.timePeriod << endl;
 }
 
 void oif_RandomResponse::Write(utl_Stream& stream) const {
-    stream << "*Random Response" << endl;
+    oif_KeywordLine(stream, "*Random Response").End();
     WriteRangesWithScale(stream, step_);
 }
 
 void oif_ResponseSpectrum::Write(utl_Stream& stream) const {
     using Comp = kprC_ResponseSpectrumStep::CompEnm;
-    stream << "*Response spectrum";
-    if (step_.comp == Comp::ALGEBRAIC) stream << ", comp=ALGEBRAIC";
-    if (step_.comp == Comp::SRSS) stream << ", comp=SRSS";
-    stream << ", sum=";
-    stream << SumText(step_.sum) << endl;
-    for (int i = 0; i < step_.components.Length(); ++i) {
-        const kprC_ResponseSpectrumComponent& component = step_.components[i];
+    oif_KeywordLine(stream, "*Response spectrum")
+        .FixedIf(step_.comp == Comp::ALGEBRAIC, ", comp=ALGEBRAIC")
+        .FixedIf(step_.comp == Comp::SRSS, ", comp=SRSS")
+        .Fixed(", sum=")
+        .Text(SumText(step_.sum))
+        .End();
+    for (const kprC_ResponseSpectrumComponent& component : step_.components) {
         // No blank behind the first comma.
         stream << component.spectrumName << "," << component.x << ", " << component.y << ", " << component.z
                << ", " << component.scale << endl;
@@ -195,28 +192,30 @@ void oif_ResponseSpectrum::Write(utl_Stream& stream) const {
 }
 
 void oif_SteadyStateDirect::Write(utl_Stream& stream) const {
-    stream << "*Steady State Dynamics" << (step_.complex ? ", direct" : ", direct=REAL ONLY");
-    if (step_.subdivideUsingEigenfrequencies) stream << ", interval=EIGENFREQUENCY";
-    stream << endl;
+    oif_KeywordLine(stream, "*Steady State Dynamics")
+        .Fixed(step_.complex ? ", direct" : ", direct=REAL ONLY")
+        .FixedIf(step_.subdivideUsingEigenfrequencies, ", interval=EIGENFREQUENCY")
+        .End();
     WriteRangesWithScale(stream, step_);
 }
 
 void oif_SteadyStateModal::Write(utl_Stream& stream) const {
-    stream << "*Steady State Dynamics";
-    WriteScaleAndInterval(stream, step_);
-    stream << endl;
+    oif_KeywordLine line(stream, "*Steady State Dynamics");
+    AddScaleAndInterval(line, step_);
+    line.End();
     WriteRanges(stream, step_.frequencies);
 }
 
 void oif_SteadyStateSubspace::Write(utl_Stream& stream) const {
-    stream << "*Steady State Dynamics, subspace projection" << ProjectionText(step_.projection);
+    oif_KeywordLine line(stream, "*Steady State Dynamics");
+    line.Fixed(", subspace projection", ProjectionText(step_.projection));
     if (step_.projection == kprC_SteadyStateSubspaceStep::ProjectionEnm::PROPERTY_CHANGE) {
-        stream << ", damping change=" << step_.dampingChange
-               << ", stiffness change=" << step_.stiffnessChange;
+        line.Fixed(", damping change=", step_.dampingChange)
+            .Fixed(", stiffness change=", step_.stiffnessChange);
     }
-    if (!step_.complex) stream << ", real only";
-    WriteScaleAndInterval(stream, step_);
-    WriteFrictionDamping(stream, step_.frictionDamping);
-    stream << endl;
+    line.FixedIf(!step_.complex, ", real only");
+    AddScaleAndInterval(line, step_);
+    AddFrictionDamping(line, step_.frictionDamping);
+    line.End();
     WriteRanges(stream, step_.frequencies);
 }

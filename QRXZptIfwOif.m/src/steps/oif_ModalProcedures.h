@@ -21,7 +21,7 @@ public:
 
 private:
     const char* EigensolverText() const;
-    void WriteAmsParameters(utl_Stream& stream) const;
+    void AddAmsParameters(oif_KeywordLine& line) const;
     void WriteData(utl_Stream& stream) const;
     void WriteAmsData(utl_Stream& stream) const;
 

@@ -1,6 +1,7 @@
 #ifndef QRX_OIF_PROCEDURE_H
 #define QRX_OIF_PROCEDURE_H
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_Step.h"
@@ -41,11 +42,11 @@ void oif_WriteItems(utl_Stream& stream, First first, Others... others) {
 
 /// ", stabilize=M" for method 1, ", stabilize, factor=M" for method 2, nothing for others. All enumerations
 /// of stabilization methods share these numbers.
-void oif_WriteStabilization(utl_Stream& stream, int method, double magnitude);
+void oif_AddStabilization(oif_KeywordLine& line, int method, double magnitude);
 
 template <class Step>
-void oif_WriteStabilization(utl_Stream& stream, const Step& step) {
-    oif_WriteStabilization(stream, static_cast<int>(step.stabilizationMethod), step.stabilizationMagnitude);
+void oif_AddStabilization(oif_KeywordLine& line, const Step& step) {
+    oif_AddStabilization(line, static_cast<int>(step.stabilizationMethod), step.stabilizationMagnitude);
 }
 
 /// Whether the increments are chosen by the solver, within bounds.

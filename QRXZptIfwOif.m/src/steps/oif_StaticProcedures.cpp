@@ -6,36 +6,29 @@ constexpr double kMaxArcIncDefault = 1e36;
 
 /// "*Static" with the parameters that plain and arc length steps have in common.
 template <class Step>
-void WriteStatic(utl_Stream& stream, const Step& step) {
-    stream << "*Static";
-    if (step.adiabatic) stream << ", adiabatic";
-    if (step.timeIncrementationMethod == Step::TimeIncrementationEnm::DIRECT)
-        stream << ", " << oif_DirectText(step);
-    if (!step.fullyPlastic.IsEmpty()) {
-        stream.OptionalLineBreak();
-        stream << ", fully plastic=" << step.fullyPlastic;
-    }
+oif_KeywordLine StaticLine(utl_Stream& stream, const Step& step) {
+    oif_KeywordLine line(stream, "*Static");
+    line.FixedIf(step.adiabatic, ", adiabatic")
+        .FixedIf(step.timeIncrementationMethod == Step::TimeIncrementationEnm::DIRECT, ", ",
+                 oif_DirectText(step));
+    if (!step.fullyPlastic.IsEmpty()) line.MayBreak().Fixed(", fully plastic=", step.fullyPlastic);
+    return line;
 }
 
 } // namespace
 
 void oif_Static::Write(utl_Stream& stream) const {
-    WriteStatic(stream, step_);
-    oif_WriteStabilization(stream, step_);
-    stream.LineBreak();
+    oif_KeywordLine line = StaticLine(stream, step_);
+    oif_AddStabilization(line, step_);
+    line.End();
     oif_WriteIncrements(stream, step_);
     stream << endl;
 }
 
 void oif_StaticRiks::Write(utl_Stream& stream) const {
-    WriteStatic(stream, step_);
-    if (step_.longTerm) {
-        stream.OptionalLineBreak();
-        stream << ", long term";
-    }
-    stream.OptionalLineBreak();
-    stream << ", riks";
-    stream.LineBreak();
+    oif_KeywordLine line = StaticLine(stream, step_);
+    if (step_.longTerm) line.MayBreak().Fixed(", long term");
+    line.MayBreak().Fixed(", riks").End();
     stream << step_.initialArcInc << ", " << step_.totalArc << ", ";
     if (oif_IsAutomatic(step_)) {
         stream << step_.minArcInc << ", ";
@@ -52,38 +45,32 @@ void oif_StaticRiks::Write(utl_Stream& stream) const {
 }
 
 void oif_StaticLinearPerturbation::Write(utl_Stream& stream) const {
-    stream << "*Static" << endl;
+    oif_KeywordLine(stream, "*Static").End();
 }
 
 void oif_Geostatic::Write(utl_Stream& stream) const {
-    stream << "*Geostatic" << endl;
+    oif_KeywordLine(stream, "*Geostatic").End();
 }
 
 void oif_Soils::Write(utl_Stream& stream) const {
     const bool automatic = oif_IsAutomatic(step_);
-    stream << "*Soils";
+    oif_KeywordLine line(stream, "*Soils");
     if (step_.response == kprC_SoilsStep::ResponseEnm::TRANSIENT) {
-        stream << ", consolidation" << (step_.end == cls_UnsetDouble ? ", end=PERIOD" : ", end=SS");
+        line.Fixed(", consolidation").Fixed(step_.end == cls_UnsetDouble ? ", end=PERIOD" : ", end=SS");
     }
     if (automatic) {
-        stream.OptionalLineBreak();
+        line.MayBreak();
         if (step_.utol > 0.0) {
-            stream << ", utol=" << step_.utol;
+            line.Fixed(", utol=", step_.utol);
         } else {
             // The solver wants a tolerance; this one is a text, not a real.
-            stream << ", utol=1.0";
+            line.Fixed(", utol=1.0");
         }
-        if (step_.creep && step_.cetol > 0.0) {
-            stream.OptionalLineBreak();
-            stream << ", cetol=" << step_.cetol;
-        }
+        if (step_.creep && step_.cetol > 0.0) line.MayBreak().Fixed(", cetol=", step_.cetol);
     }
-    if (!step_.creep) {
-        stream.OptionalLineBreak();
-        stream << ", creep=none";
-    }
-    oif_WriteStabilization(stream, step_);
-    stream.LineBreak();
+    if (!step_.creep) line.MayBreak().Fixed(", creep=none");
+    oif_AddStabilization(line, step_);
+    line.End();
     oif_WriteIncrements(stream, step_);
     stream << (automatic ? ", " : ", ,");
     oif_WriteWhenSet(stream, step_.end);
@@ -91,28 +78,25 @@ void oif_Soils::Write(utl_Stream& stream) const {
 }
 
 void oif_Visco::Write(utl_Stream& stream) const {
-    stream << "*Visco";
-    if (oif_IsAutomatic(step_)) stream << ", cetol=" << step_.cetol;
-    if (step_.creepIntegration == kprC_ViscoStep::CreepIntegrationEnm::EXPLICIT)
-        stream << (v6Format_ ? ", creep=explicit" : ", explicit");
-    oif_WriteStabilization(stream, step_);
-    stream << endl;
+    oif_KeywordLine line(stream, "*Visco");
+    line.FixedIf(oif_IsAutomatic(step_), ", cetol=", step_.cetol)
+        .FixedIf(step_.creepIntegration == kprC_ViscoStep::CreepIntegrationEnm::EXPLICIT,
+                 v6Format_ ? ", creep=explicit" : ", explicit");
+    oif_AddStabilization(line, step_);
+    line.End();
     oif_WriteIncrements(stream, step_);
     stream << endl;
 }
 
 void oif_Anneal::Write(utl_Stream& stream) const {
-    stream << "*Anneal";
-    if (step_.refTemp != cls_UnsetDouble) stream << ", temperature=" << step_.refTemp;
-    stream << endl;
+    oif_KeywordLine(stream, "*Anneal").FixedUnless(", temperature=", step_.refTemp, cls_UnsetDouble).End();
 }
 
 void oif_Buckle::Write(utl_Stream& stream) const {
     const bool lanczos = step_.eigensolver == kprC_BuckleStep::EigensolverEnm::LANCZOS;
-    stream << "*Buckle";
     // In lower case, unlike *Frequency.
-    if (lanczos) stream << ", eigensolver=lanczos";
-    stream << endl << step_.numEigen << ", ";
+    oif_KeywordLine(stream, "*Buckle").FixedIf(lanczos, ", eigensolver=lanczos").End();
+    stream << step_.numEigen << ", ";
     if (lanczos) {
         oif_WriteWhenSet(stream, step_.minEigen);
         stream << ", ";

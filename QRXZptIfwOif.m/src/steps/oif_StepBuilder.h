@@ -12,12 +12,7 @@ public:
 
 private:
     void AddProcedure(const cow_String& stepName, const kprC_AnalysisStep& step, unsigned previousProcedure);
-    template <class Step>
-    void AddMassScaling(const cow_String& stepName, const Step& step);
-    template <class Step>
-    void AddModalDamping(const cow_String& stepName, const Step& step);
     void AddLoadCases(const cow_String& stepName, const kprC_AnalysisStep& step);
-    cow_String AssemblySetName(const rgnC_Region& region) const;
 };
 
 #endif

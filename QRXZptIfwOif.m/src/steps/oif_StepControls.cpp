@@ -1,7 +1,8 @@
 #include "steps/oif_StepControls.h"
 
+#include "base/oif_KeywordLine.h"
 #include "foundation/num_Truncated.h"
-#include "store_interface/records/steps/kprC_ThermalSteps.h"
+#include "steps/oif_ProcedureRow.h"
 
 #include <algorithm>
 
@@ -32,19 +33,21 @@ bool DifferFrom(int first, const cow_List<double>& values, const cow_List<double
 void oif_Controls::Write(utl_Stream& stream) const {
     const kprC_PrimaryControls& controls = Record();
     if (controls.useDefault) return;
-    stream << "*Controls, reset" << endl;
+    oif_KeywordLine(stream, "*Controls").Fixed(", reset").End();
     if (!controls.resetOnly) WriteBlocks(stream);
 }
 
 void oif_Controls::WritePrimaryControls(utl_Stream& stream,
                                         const kprC_PrimaryControls& primaryControls) const {
-    if (primaryControls.discontinuous) stream << "*Controls, analysis=discontinuous" << endl;
+    if (primaryControls.discontinuous) {
+        oif_KeywordLine(stream, "*Controls").Fixed(", analysis=discontinuous").End();
+    }
 
     const cow_List<double>& time = primaryControls.timeIncrementation;
     const cow_List<double> timeDef =
         kprC_PrimaryControls::timeIncrementationDef(primaryControls.discontinuous);
     if (DifferFrom(0, time, timeDef)) {
-        stream << "*Controls, parameters=time incrementation" << endl;
+        oif_KeywordLine(stream, "*Controls").Fixed(", parameters=time incrementation").End();
         for (int i = 0; i < kIntegerEntries; ++i) {
             if (i > 0) stream << ", ";
             if (IsWritten(time, timeDef, i)) stream << num_Truncated(time[i]);
@@ -56,23 +59,21 @@ void oif_Controls::WritePrimaryControls(utl_Stream& stream,
         stream << endl;
     }
 
-    const auto block = [&](const char* heading, const cow_List<double>& values,
+    const auto block = [&](const char* parameters, const cow_List<double>& values,
                            const cow_List<double>& defaults) {
         if (!DifferFrom(0, values, defaults)) return;
-        stream << heading << endl;
+        oif_KeywordLine(stream, "*Controls").Fixed(", parameters=", parameters).End();
         PrintControlsData(stream, values, defaults, 0, values.Length() - 1, -1, false);
         stream << endl;
     };
-    block("*Controls, parameters=constraints", primaryControls.constraints,
-          kprC_PrimaryControls::constraintsDef());
-    block("*Controls, parameters=line search", primaryControls.lineSearch,
-          kprC_PrimaryControls::lineSearchDef());
+    block("constraints", primaryControls.constraints, kprC_PrimaryControls::constraintsDef());
+    block("line search", primaryControls.lineSearch, kprC_PrimaryControls::lineSearchDef());
 }
 
 void oif_Controls::WriteFieldControls(utl_Stream& stream, const char* field, const cow_List<double>& values,
                                       const cow_List<double>& defaults) const {
     if (!DifferFrom(0, values, defaults)) return;
-    stream << "*Controls, parameters=field, field=" << field << endl;
+    oif_KeywordLine(stream, "*Controls").Fixed(", parameters=field").Fixed(", field=", field).End();
     PrintFieldData(stream, values, defaults);
 }
 
@@ -134,9 +135,9 @@ void oif_MassDiffusionControls::WriteBlocks(utl_Stream& stream) const {
 
 void oif_SolverControls::Write(utl_Stream& stream) const {
     if (controls_.useDefault) return;
-    stream << "*Solver Controls, reset" << endl;
+    oif_KeywordLine(stream, "*Solver Controls").Fixed(", reset").End();
     if (controls_.resetOnly) return;
-    stream << "*Solver Controls" << endl;
+    oif_KeywordLine(stream, "*Solver Controls").End();
     if (controls_.relativeTolerance != 0.0) stream << controls_.relativeTolerance;
     stream << ", ";
     if (controls_.maxIterations != 0) stream << controls_.maxIterations;
@@ -144,13 +145,10 @@ void oif_SolverControls::Write(utl_Stream& stream) const {
 }
 
 void oif_SolutionTechnique::Write(utl_Stream& stream) const {
-    const unsigned type = step_->DynTypeId();
-    if (type != kprC_CoupledTempDisplacementStep::TypeId() &&
-        type != kprC_CoupledThermalElectricStep::TypeId()) {
-        // The other steps have a technique too, and it is never written.
-        return;
-    }
+    const oif_ProcedureRow* row = oif_FindProcedureRow(step_->DynTypeId());
+    // The other steps have a technique too, and it is never written.
+    if (row == nullptr || !row->saysTechnique) return;
     if (step_->SolutionTechnique() == kprC_Step::SolutionTechniqueEnm::SEPARATED) {
-        stream << "*Solution Technique, type=SEPARATED" << endl;
+        oif_KeywordLine(stream, "*Solution Technique").Fixed(", type=SEPARATED").End();
     }
 }

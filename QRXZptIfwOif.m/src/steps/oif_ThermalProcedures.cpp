@@ -3,34 +3,29 @@
 namespace {
 
 constexpr double kMxdemDefault = 0.1;
+
 template <class Step>
 bool IsSteady(const Step& step) {
     return step.response == Step::ResponseEnm::STEADY_STATE;
 }
 
 /// What ends a transient step: its period, or a rate of change, which is absent at the value `none`.
-void WriteEnd(utl_Stream& stream, double rate, double none) {
-    stream << (rate == none ? ", end=PERIOD" : ", end=SS");
+void AddEnd(oif_KeywordLine& line, double rate, double none) {
+    line.Fixed(rate == none ? ", end=PERIOD" : ", end=SS");
 }
 
 template <class Step>
-void WriteResponse(utl_Stream& stream, const Step& step) {
+void AddResponse(oif_KeywordLine& line, const Step& step) {
     if (IsSteady(step)) {
-        stream.OptionalLineBreak();
-        stream << ", steady state";
+        line.MayBreak().Fixed(", steady state");
     } else {
-        WriteEnd(stream, step.end, cls_UnsetDouble);
+        AddEnd(line, step.end, cls_UnsetDouble);
     }
 }
 
-void WriteReal(utl_Stream& stream, const char* parameter, double value) {
-    stream.OptionalLineBreak();
-    stream << parameter << value;
-}
-
 template <class Step>
-void WriteMxdem(utl_Stream& stream, const Step& step) {
-    if (step.mxdem != kMxdemDefault) WriteReal(stream, ", mxdem=", step.mxdem);
+void AddMxdem(oif_KeywordLine& line, const Step& step) {
+    if (step.mxdem != kMxdemDefault) line.MayBreak().Fixed(", mxdem=", step.mxdem);
 }
 
 /// The data line; the rate of change that ends the step is absent at the value `none`.
@@ -46,11 +41,11 @@ void WriteData(utl_Stream& stream, const Step& step, double none) {
 
 void oif_HeatTransfer::Write(utl_Stream& stream) const {
     const bool automatic = oif_IsAutomatic(step_);
-    stream << "*Heat Transfer";
-    WriteResponse(stream, step_);
-    if (automatic) WriteReal(stream, ", deltmx=", step_.deltmx);
-    WriteMxdem(stream, step_);
-    stream.LineBreak();
+    oif_KeywordLine line(stream, "*Heat Transfer");
+    AddResponse(line, step_);
+    if (automatic) line.MayBreak().Fixed(", deltmx=", step_.deltmx);
+    AddMxdem(line, step_);
+    line.End();
     if (automatic || !IsSteady(step_)) {
         WriteData(stream, step_, cls_UnsetDouble);
         return;
@@ -63,45 +58,44 @@ void oif_HeatTransfer::Write(utl_Stream& stream) const {
 }
 
 void oif_CoupledThermalElectric::Write(utl_Stream& stream) const {
-    stream << "*Coupled Thermal-Electrical";
-    WriteResponse(stream, step_);
+    oif_KeywordLine line(stream, "*Coupled Thermal-Electrical");
+    AddResponse(line, step_);
     if (oif_IsAutomatic(step_)) {
-        WriteReal(stream, ", deltmx=", step_.deltmx);
+        line.MayBreak().Fixed(", deltmx=", step_.deltmx);
         // For automatic increments only, unlike *Heat Transfer.
-        WriteMxdem(stream, step_);
+        AddMxdem(line, step_);
     }
-    stream.LineBreak();
+    line.End();
     WriteData(stream, step_, cls_UnsetDouble);
 }
 
 void oif_MassDiffusion::Write(utl_Stream& stream) const {
     // Here a rate of 0 is none, not the unset one.
     constexpr double none = 0.0;
-    stream << "*Mass Diffusion";
+    oif_KeywordLine line(stream, "*Mass Diffusion");
     if (IsSteady(step_)) {
-        stream << ", steady state";
+        line.Fixed(", steady state");
     } else {
-        WriteEnd(stream, step_.end, none);
-        if (oif_IsAutomatic(step_)) WriteReal(stream, ", dcmax=", step_.dcmax);
+        AddEnd(line, step_.end, none);
+        if (oif_IsAutomatic(step_)) line.MayBreak().Fixed(", dcmax=", step_.dcmax);
     }
-    stream.LineBreak();
+    line.End();
     WriteData(stream, step_, none);
 }
 
 void oif_CoupledTempDisplacement::Write(utl_Stream& stream) const {
     using Creep = kprC_CoupledTempDisplacementStep::CreepEnm;
-    stream << "*Coupled Temperature-Displacement";
-    if (step_.creep == Creep::NONE) stream << (v6Format_ ? ", creep=none" : ", no creep");
-    if (step_.creep == Creep::EXPLICIT) stream << (v6Format_ ? ", creep=explicit" : ", explicit");
+    oif_KeywordLine line(stream, "*Coupled Temperature-Displacement");
+    line.FixedIf(step_.creep == Creep::NONE, v6Format_ ? ", creep=none" : ", no creep")
+        .FixedIf(step_.creep == Creep::EXPLICIT, v6Format_ ? ", creep=explicit" : ", explicit");
     if (IsSteady(step_)) {
-        stream.OptionalLineBreak();
-        stream << ", steady state";
+        line.MayBreak().Fixed(", steady state");
     } else if (oif_IsAutomatic(step_)) {
-        if (step_.deltmx > 0.0) WriteReal(stream, ", deltmx=", step_.deltmx);
-        if (step_.creep != Creep::NONE && step_.cetol > 0.0) WriteReal(stream, ", cetol=", step_.cetol);
+        if (step_.deltmx > 0.0) line.MayBreak().Fixed(", deltmx=", step_.deltmx);
+        if (step_.creep != Creep::NONE && step_.cetol > 0.0) line.MayBreak().Fixed(", cetol=", step_.cetol);
     }
-    oif_WriteStabilization(stream, step_);
-    stream.LineBreak();
+    oif_AddStabilization(line, step_);
+    line.End();
     oif_WriteIncrements(stream, step_);
     stream << endl;
 }

@@ -1,40 +1,48 @@
 #include "store_interface/records/output/korC_OutputCatalogue.h"
 
 #include "store_interface/records/output/korC_OdbRequestTable.h"
+#include "store_interface/records/steps/kprC_DynamicSteps.h"
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
+#include "store_interface/records/steps/kprC_ThermalSteps.h"
 
 namespace {
 
 using Print = korC_OdbRequestSpec::PrintEnm;
 using Location = korC_OdbRequestSpec::LocationEnm;
 
-constexpr unsigned Bit(unsigned stepType) {
-    return korC_OdbRequestTable::Bit(stepType);
-}
+template <class Step>
+constexpr unsigned Bit = korC_OdbRequestTable::Bit(Step::Class.Id());
 
-constexpr unsigned kAnneal = Bit(0x23C0065);             // annealing between explicit steps
-constexpr unsigned kBuckle = Bit(0x23C0066);             // eigenvalue buckling prediction
-constexpr unsigned kCoupledTempDisp = Bit(0x23C0067);    // implicit fully coupled thermal-stress
-constexpr unsigned kThermalElectric = Bit(0x23C0068);    // coupled thermal-electrical conduction
-constexpr unsigned kExplicitMechanical = Bit(0x23C0069); // explicit dynamics
-constexpr unsigned kFrequency = Bit(0x23C006A);          // natural frequency extraction
-constexpr unsigned kGeostatic = Bit(0x23C006B);          // geostatic equilibrium
-constexpr unsigned kHeatTransfer = Bit(0x23C006C);       // uncoupled heat transfer
-constexpr unsigned kImplicitDynamic = Bit(0x23C006D);    // implicit direct-integration dynamics
-constexpr unsigned kMassDiffusion = Bit(0x23C006E);      // mass diffusion
-constexpr unsigned kModalDynamic = Bit(0x23C006F);       // transient modal dynamics
-constexpr unsigned kRandomResponse = Bit(0x23C0070);     // random response
-constexpr unsigned kResponseSpectrum = Bit(0x23C0071);   // response spectrum
-constexpr unsigned kSoils = Bit(0x23C0072);              // coupled pore fluid flow and stress (consolidation)
-constexpr unsigned kStatic = Bit(0x23C0073);             // general static
-constexpr unsigned kRiks = Bit(0x23C0074);               // static with arc length control
-constexpr unsigned kLinearStatic = Bit(0x23C0075);       // static linear perturbation
-constexpr unsigned kSteadyStateDirect = Bit(0x23C0076);  // direct-solution steady-state dynamics
-constexpr unsigned kSteadyStateModal = Bit(0x23C0077);   // mode-based steady-state dynamics
-constexpr unsigned kSubspaceDynamic = Bit(0x23C0078);    // subspace projection dynamics
-constexpr unsigned kVisco = Bit(0x23C007A);              // quasi-static viscoelastic and creep response
-constexpr unsigned kExplicitThermal = Bit(0x23C007B);    // explicit fully coupled thermal-stress
-constexpr unsigned kComplexFrequency = Bit(0x23C007D);   // complex eigenvalue extraction
-constexpr unsigned kSteadyStateSubspace = Bit(0x23C007E);              // subspace-based steady-state dynamics
+constexpr unsigned kAnneal = Bit<kprC_AnnealStep>; // annealing between explicit steps
+constexpr unsigned kBuckle = Bit<kprC_BuckleStep>; // eigenvalue buckling prediction
+constexpr unsigned kCoupledTempDisp =
+    Bit<kprC_CoupledTempDisplacementStep>; // implicit fully coupled thermal-stress
+constexpr unsigned kThermalElectric =
+    Bit<kprC_CoupledThermalElectricStep>; // coupled thermal-electrical conduction
+constexpr unsigned kExplicitMechanical = Bit<kprC_ExplicitDynamicsStep>; // explicit dynamics
+constexpr unsigned kFrequency = Bit<kprC_FrequencyStep>;                 // natural frequency extraction
+constexpr unsigned kGeostatic = Bit<kprC_GeostaticStep>;                 // geostatic equilibrium
+constexpr unsigned kHeatTransfer = Bit<kprC_HeatTransferStep>;           // uncoupled heat transfer
+constexpr unsigned kImplicitDynamic = Bit<kprC_ImplicitDynamicsStep>;  // implicit direct-integration dynamics
+constexpr unsigned kMassDiffusion = Bit<kprC_MassDiffusionStep>;       // mass diffusion
+constexpr unsigned kModalDynamic = Bit<kprC_ModalDynamicsStep>;        // transient modal dynamics
+constexpr unsigned kRandomResponse = Bit<kprC_RandomResponseStep>;     // random response
+constexpr unsigned kResponseSpectrum = Bit<kprC_ResponseSpectrumStep>; // response spectrum
+constexpr unsigned kSoils = Bit<kprC_SoilsStep>;     // coupled pore fluid flow and stress (consolidation)
+constexpr unsigned kStatic = Bit<kprC_StaticStep>;   // general static
+constexpr unsigned kRiks = Bit<kprC_StaticRiksStep>; // static with arc length control
+constexpr unsigned kLinearStatic = Bit<kprC_StaticLinearPerturbationStep>; // static linear perturbation
+constexpr unsigned kSteadyStateDirect =
+    Bit<kprC_SteadyStateDirectStep>; // direct-solution steady-state dynamics
+constexpr unsigned kSteadyStateModal = Bit<kprC_SteadyStateModalStep>; // mode-based steady-state dynamics
+constexpr unsigned kSubspaceDynamic = Bit<kprC_SubspaceDynamicsStep>;  // subspace projection dynamics
+constexpr unsigned kVisco = Bit<kprC_ViscoStep>; // quasi-static viscoelastic and creep response
+constexpr unsigned kExplicitThermal =
+    Bit<kprC_TempDisplacementDynamicsStep>; // explicit fully coupled thermal-stress
+constexpr unsigned kComplexFrequency = Bit<kprC_ComplexFrequencyStep>; // complex eigenvalue extraction
+constexpr unsigned kSteadyStateSubspace =
+    Bit<kprC_SteadyStateSubspaceStep>;                                 // subspace-based steady-state dynamics
 constexpr unsigned kExplicit = kExplicitMechanical | kExplicitThermal; // all explicit time integration
 constexpr unsigned kPorous = kGeostatic | kSoils;                      // steps with pore pressure
 constexpr unsigned kGeneralStatic =

@@ -1,6 +1,9 @@
 #include "store_interface/records/steps/kprC_Predicates.h"
 
-#include "store_interface/records/steps/kprC_Step.h"
+#include "store_interface/records/steps/kprC_DynamicSteps.h"
+#include "store_interface/records/steps/kprC_ModalSteps.h"
+#include "store_interface/records/steps/kprC_StaticSteps.h"
+#include "store_interface/records/steps/kprC_ThermalSteps.h"
 
 #include <algorithm>
 #include <iterator>
@@ -16,6 +19,7 @@ enum Traits : unsigned {
     kImplicitModal = 1U << 5,
     kEigenvalues = 1U << 6,
     kIntervals = 1U << 7,
+    kContinued = 1U << 8,
 };
 
 struct Procedure {
@@ -23,32 +27,31 @@ struct Procedure {
     unsigned traits;
 };
 
-// 0x23C0079 and 0x23C007C belong to no procedure.
 constexpr Procedure kProcedures[] = {
-    {0x23C0065, kExplicit},                                   // kprC_AnnealStep
-    {0x23C0066, kPerturbation | kEigenvalues},                // kprC_BuckleStep
-    {0x23C0067, kMeshDomains | kIntervals},                   // kprC_CoupledTempDisplacementStep
-    {0x23C0068, kNonmechanical | kIntervals},                 // kprC_CoupledThermalElectricStep
-    {0x23C0069, kExplicit | kMeshDomains | kIntervals},       // kprC_ExplicitDynamicsStep
-    {0x23C006A, kPerturbation | kEigenvalues},                // kprC_FrequencyStep
-    {0x23C006B, 0},                                           // kprC_GeostaticStep
-    {0x23C006C, kNonmechanical | kIntervals},                 // kprC_HeatTransferStep
-    {0x23C006D, kImplicitModal | kIntervals},                 // kprC_ImplicitDynamicsStep
-    {0x23C006E, kNonmechanical | kIntervals},                 // kprC_MassDiffusionStep
-    {0x23C006F, kPerturbation | kLoadCases | kImplicitModal}, // kprC_ModalDynamicsStep
-    {0x23C0070, kPerturbation},                               // kprC_RandomResponseStep
-    {0x23C0071, kPerturbation},                               // kprC_ResponseSpectrumStep
-    {0x23C0072, kMeshDomains | kIntervals},                   // kprC_SoilsStep
-    {0x23C0073, kMeshDomains | kIntervals},                   // kprC_StaticStep
-    {0x23C0074, 0},                                           // kprC_StaticRiksStep
-    {0x23C0075, kPerturbation | kLoadCases},                  // kprC_StaticLinearPerturbationStep
-    {0x23C0076, kPerturbation | kLoadCases},                  // kprC_SteadyStateDirectStep
-    {0x23C0077, kPerturbation | kLoadCases},                  // kprC_SteadyStateModalStep
-    {0x23C0078, kImplicitModal},                              // kprC_SubspaceDynamicsStep
-    {0x23C007A, kIntervals},                                  // kprC_ViscoStep
-    {0x23C007B, kExplicit | kMeshDomains | kIntervals},       // kprC_TempDisplacementDynamicsStep
-    {0x23C007D, kPerturbation | kEigenvalues},                // kprC_ComplexFrequencyStep
-    {0x23C007E, kPerturbation},                               // kprC_SteadyStateSubspaceStep
+    {kprC_AnnealStep::Class.Id(), kExplicit},
+    {kprC_BuckleStep::Class.Id(), kPerturbation | kEigenvalues},
+    {kprC_CoupledTempDisplacementStep::Class.Id(), kMeshDomains | kIntervals},
+    {kprC_CoupledThermalElectricStep::Class.Id(), kNonmechanical | kIntervals},
+    {kprC_ExplicitDynamicsStep::Class.Id(), kExplicit | kMeshDomains | kIntervals},
+    {kprC_FrequencyStep::Class.Id(), kPerturbation | kEigenvalues},
+    {kprC_GeostaticStep::Class.Id(), 0},
+    {kprC_HeatTransferStep::Class.Id(), kNonmechanical | kIntervals},
+    {kprC_ImplicitDynamicsStep::Class.Id(), kImplicitModal | kIntervals},
+    {kprC_MassDiffusionStep::Class.Id(), kNonmechanical | kIntervals},
+    {kprC_ModalDynamicsStep::Class.Id(), kPerturbation | kLoadCases | kImplicitModal | kContinued},
+    {kprC_RandomResponseStep::Class.Id(), kPerturbation},
+    {kprC_ResponseSpectrumStep::Class.Id(), kPerturbation},
+    {kprC_SoilsStep::Class.Id(), kMeshDomains | kIntervals},
+    {kprC_StaticStep::Class.Id(), kMeshDomains | kIntervals},
+    {kprC_StaticRiksStep::Class.Id(), 0},
+    {kprC_StaticLinearPerturbationStep::Class.Id(), kPerturbation | kLoadCases | kContinued},
+    {kprC_SteadyStateDirectStep::Class.Id(), kPerturbation | kLoadCases},
+    {kprC_SteadyStateModalStep::Class.Id(), kPerturbation | kLoadCases},
+    {kprC_SubspaceDynamicsStep::Class.Id(), kImplicitModal},
+    {kprC_ViscoStep::Class.Id(), kIntervals},
+    {kprC_TempDisplacementDynamicsStep::Class.Id(), kExplicit | kMeshDomains | kIntervals},
+    {kprC_ComplexFrequencyStep::Class.Id(), kPerturbation | kEigenvalues},
+    {kprC_SteadyStateSubspaceStep::Class.Id(), kPerturbation},
 };
 
 unsigned TraitsOf(unsigned stepType) {
@@ -95,6 +98,10 @@ bool kprC_IsImplicitModal(unsigned stepType) {
 
 bool kprC_IsFrequencyBuckle(unsigned stepType) {
     return Has(stepType, kEigenvalues);
+}
+
+bool kprC_CanBeContinued(unsigned stepType) {
+    return Has(stepType, kContinued);
 }
 
 bool kprC_ModesIsAllowed(unsigned stepType) {

@@ -18,6 +18,8 @@ bool kprC_AdaptiveMeshDomainsAreAllowed(unsigned stepType);
 bool kprC_IsImplicitModal(unsigned stepType);
 /// The eigenvalue procedures: buckling, frequency, complex frequency.
 bool kprC_IsFrequencyBuckle(unsigned stepType);
+/// The procedures whose end modal dynamics can go on from.
+bool kprC_CanBeContinued(unsigned stepType);
 
 // The forms in which output can be asked for; `isField` tells field from history output.
 
