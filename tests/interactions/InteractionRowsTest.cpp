@@ -31,7 +31,8 @@ TEST(InteractionRows, AClassHasAHistoryOrIsSaidByStepsOrIsSilent) {
     for (const oif_InteractionRow& row : oif_InteractionRows()) {
         const int ways = (row.history != nullptr ? 1 : 0) + (row.make != nullptr ? 1 : 0);
         EXPECT_EQ(ways, silent.count(row.typeId) == 1 ? 0 : 1) << cls_Classes().NameOf(row.typeId).View();
-        EXPECT_EQ(row.make != nullptr, row.saying != oif_Saying::NEVER) << cls_Classes().NameOf(row.typeId).View();
+        EXPECT_EQ(row.make != nullptr, row.saying != oif_Saying::NEVER)
+            << cls_Classes().NameOf(row.typeId).View();
         EXPECT_EQ(row.solver != oif_ContactSolver::NONE,
                   cls_Classes().InheritanceCheck(row.typeId, kinC_ContactPair::TypeId()))
             << cls_Classes().NameOf(row.typeId).View();
@@ -46,12 +47,12 @@ TEST(InteractionRows, RegionsAreThoseOfTheRecord) {
     EXPECT_EQ(&row.regions[0].region(wave), &wave.source);
     EXPECT_EQ(&row.regions[1].region(wave), &wave.standoff);
     EXPECT_EQ(&row.regions[2].region(wave), &wave.surface);
-    EXPECT_EQ(row.regions[0].kinds, 1);
-    EXPECT_EQ(row.regions[2].kinds, 8);
+    EXPECT_EQ(row.regions[0].kind, oif_RegionKind::NODES);
+    EXPECT_EQ(row.regions[2].kind, oif_RegionKind::SURFACE);
     const kinC_SelfContactXpl contact;
     const oif_InteractionRow& self = *oif_FindInteractionRow(contact.DynTypeId());
     EXPECT_EQ(&self.regions[0].region(contact), &contact.surface);
-    EXPECT_EQ(self.regions[0].kinds, 9);
+    EXPECT_EQ(self.regions[0].kind, oif_RegionKind::SURFACE_OR_NODES);
     EXPECT_EQ(oif_SolverOf(contact), oif_ContactSolver::EXPLICIT);
 }
 

@@ -885,5 +885,5 @@ std::span<const korC_CatalogueRow> korC_OutputCatalogue() {
 }
 
 bool korC_IsModeBased(unsigned stepType) {
-    return (Bit(stepType) & kModeBased) != 0;
+    return (korC_OdbRequestTable::Bit(stepType) & kModeBased) != 0;
 }

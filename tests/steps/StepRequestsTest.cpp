@@ -1,4 +1,8 @@
-#include "steps/oif_StepExtras.h"
+#include "steps/oif_StepRequests.h"
+
+#include "steps/oif_LoadCase.h"
+#include "steps/oif_MassScaling.h"
+#include "steps/oif_ModalDamping.h"
 #include "support/DeckTest.h"
 
 namespace {
