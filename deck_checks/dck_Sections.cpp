@@ -1,5 +1,6 @@
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
+#include "materials/oif_Material.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/sections/kseC_BeamSection.h"
@@ -201,9 +202,6 @@ void FindSectionsOfMeshes(const odiK_Model& model, fnd_Sink& sink) {
     }
 }
 
-constexpr std::string_view kGasketOptions[] = {"membraneElastic", "thicknessBehavior", "transShearElastic"};
-constexpr std::string_view kOptionsBeside[] = {"creep", "depvar", "expansion", "userOutputVariables"};
-
 std::vector<std::string_view> OptionsOf(const kmaC_Material& material) {
     std::vector<std::string_view> names;
     for (const cls_Field& field : material.DynFields().All()) {
@@ -219,20 +217,14 @@ std::vector<dck_IdleOption> dck_IdleGasketOptions(const odiK_Model& model) {
     const auto isIn = [](const auto& names, std::string_view name) {
         return std::ranges::find(names, name) != std::end(names);
     };
-    std::set<cow_String> gaskets;
-    for (const auto& [name, section] : model.sections) {
-        const auto* gasket = nex_canDynamicCastPtr<kseC_GasketSection>(&section);
-        if (gasket != nullptr) gaskets.insert(gasket->materialName);
-    }
+    const std::set<cow_String> ofGaskets = oif_MaterialsOfGaskets(model.sections);
     std::vector<dck_IdleOption> idle;
     for (const auto& [name, material] : model.materials) {
-        const std::vector<std::string_view> options = OptionsOf(material);
-        const bool isGasket = gaskets.count(name) != 0 && std::ranges::any_of(options, [&](auto option) {
-                                  return isIn(kGasketOptions, option);
-                              });
-        for (const std::string_view option : options) {
-            const bool ofGaskets = isIn(kGasketOptions, option);
-            const bool isIdle = isGasket ? !ofGaskets && !isIn(kOptionsBeside, option) : ofGaskets;
+        const bool isGasket = ofGaskets.count(name) != 0 && oif_HasGasketOptions(material);
+        for (const std::string_view option : OptionsOf(material)) {
+            const bool isOfGaskets = isIn(oif_kGasketOptions, option);
+            const bool isIdle =
+                isGasket ? !isOfGaskets && !isIn(oif_kOptionsBesideGaskets, option) : isOfGaskets;
             if (isIdle) idle.push_back({name, option, isGasket});
         }
     }

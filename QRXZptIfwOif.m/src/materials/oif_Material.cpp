@@ -2,6 +2,26 @@
 
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialOption.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
+
+#include <algorithm>
+
+bool oif_HasGasketOptions(const kmaC_Material& material) {
+    return std::ranges::any_of(oif_kGasketOptions, [&](std::string_view option) {
+        const cls_Field& field = *material.DynFields().Find(option);
+        return static_cast<const cls_HolderType&>(*field.type).Get(field.In(material)) != nullptr;
+    });
+}
+
+std::set<cow_String> oif_MaterialsOfGaskets(const mdl_MapString2ObjCow<kseC_Section>& sections) {
+    std::set<cow_String> names;
+    for (const auto& [name, section] : sections) {
+        const auto* gasket = nex_canDynamicCastPtr<kseC_GasketSection>(&section);
+        if (gasket != nullptr) names.insert(gasket->materialName);
+    }
+    return names;
+}
 
 void oif_Material::Write(utl_Stream& stream) const {
     const kmaC_Material& m = material_;

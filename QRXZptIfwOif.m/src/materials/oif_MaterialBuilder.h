@@ -8,9 +8,6 @@ class oif_MaterialBuilder final : public oif_ComponentOf<oif_MaterialBuilder> {
 public:
     using oif_ComponentOf::oif_ComponentOf;
     void Build() override;
-
-private:
-    bool IsOfGasketSection(const cow_String& materialName) const;
 };
 
 #endif

@@ -1,7 +1,9 @@
 #include "sections/oif_PartAttributesBuilder.h"
 
+#include "base/oif_ClassRows.h"
 #include "base/oif_Comment.h"
 #include "keyword_layer/qkw_QuorixName.h"
+#include "materials/oif_Material.h"
 #include "mesh/oif_Set.h"
 #include "mesh/oif_SetName.h"
 #include "sections/oif_BeamSections.h"
@@ -27,11 +29,44 @@ cow_String NameInComment(const rgnC_Region& region) {
     return region.ConstSet().Data().Internal() ? cow_String("Picked") : region.SetName();
 }
 
-bool IsShellSection(unsigned type) {
-    return cls_Classes().InheritanceCheck(type, kseC_ShellSection::TypeId());
-}
-
 } // namespace
+
+/// How the sections of a class are made.
+struct oif_PartAttributesBuilder::SectionRow {
+    unsigned typeId;
+    void (*create)(oif_PartAttributesBuilder& builder, const ddb_PartInstance& instance,
+                   const kseC_Section& section, const Group& group);
+    /// Beams name their profile in the comment too, and write it themselves.
+    bool writesComment = true;
+
+    template <class R, auto Create>
+    static constexpr SectionRow Of(bool writesComment = true) {
+        return {R::Class.Id(),
+                [](oif_PartAttributesBuilder& builder, const ddb_PartInstance& instance,
+                   const kseC_Section& section, const Group& group) {
+                    (builder.*Create)(instance, static_cast<const R&>(section), group);
+                },
+                writesComment};
+    }
+};
+
+const oif_PartAttributesBuilder::SectionRow* oif_PartAttributesBuilder::FindSectionRow(unsigned typeId) {
+    using B = oif_PartAttributesBuilder;
+    static constexpr SectionRow rows[] = {
+        SectionRow::Of<kseC_HomogenousSolidSection, &B::CreateSolidSection>(),
+        SectionRow::Of<kseC_CompositeSolidSection, &B::CreateSolidSection>(),
+        SectionRow::Of<kseC_HomogenousShellSection, &B::CreateShellSection>(),
+        SectionRow::Of<kseC_CompositeShellSection, &B::CreateShellSection>(),
+        SectionRow::Of<kseC_GeneralShellSection, &B::CreateShellSection>(),
+        SectionRow::Of<kseC_UserShellSection, &B::CreateShellGeneralSection>(),
+        SectionRow::Of<kseC_BeamSection, &B::CreateBeamSection>(false),
+        SectionRow::Of<kseC_TrussSection, &B::CreateTrussSection>(),
+        SectionRow::Of<kseC_MembraneSection, &B::CreateMembraneSection>(),
+        SectionRow::Of<kseC_GasketSection, &B::CreateGasketSection>(),
+        SectionRow::Of<kseC_PointSection, &B::CreatePointSection>(),
+    };
+    return oif_FindRow(rows, typeId);
+}
 
 void oif_PartAttributesBuilder::Build() {
     ForEachPartInstance([&](const cow_String& name, const ddb_PartInstance& instance) {
@@ -142,6 +177,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
         const bool isPartial = labels.Length() != assignmentSize_[groups.SectionIndex(key)];
 
         Group group;
+        group.sectionName = assignment.SectionName();
         group.offset = assignment.Offset();
         oif_SetName setName(assignment.RegionRef(), ModelInfo());
         group.setName = oif_SetName::QuoteIfNeeded(
@@ -186,7 +222,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
         if (isPartial) {
             AddInstanceDefinition(instance.name(), oif_Elset(labels, group.setName, cow_String(), true));
         }
-        CreateSection(instance, assignment.SectionName(), group);
+        CreateSection(instance, group);
     }
 }
 
@@ -200,33 +236,19 @@ void oif_PartAttributesBuilder::CreateMaterialOrientation(const ddb_PartInstance
     AddInstanceDefinition(instance.name(), oif_Orientation(Model().Model(), orientation, name, gsl_Matrix()));
 }
 
-void oif_PartAttributesBuilder::CreateSection(const ddb_PartInstance& instance, const cow_String& name,
-                                              const Group& group) {
+void oif_PartAttributesBuilder::CreateSection(const ddb_PartInstance& instance, const Group& group) {
+    const cow_String& name = group.sectionName;
     if (!Model().Sections().IsMember(name)) return;
     const nex_Context context("section", name);
     const kseC_Section& section = Model().Sections().ConstGet(name);
-    const unsigned type = section.DynTypeId();
-    if (type != kseC_BeamSection::TypeId()) {
+    const SectionRow* row = FindSectionRow(section.DynTypeId());
+    if (row == nullptr || row->writesComment) {
         AddInstanceDefinition(instance.name(), oif_Comment(cow_String("Section: ") + name));
     }
+    if (row == nullptr) return;
     Group passed = group;
     if (ElemLibrary() == bme_ElemLibrary::NONE) passed.controlsName = {};
-
-    if (type == kseC_HomogenousSolidSection::TypeId() || type == kseC_CompositeSolidSection::TypeId()) {
-        CreateSolidSection(instance, section, passed);
-    } else if (IsShellSection(type)) {
-        CreateShellSection(instance, section, passed);
-    } else if (type == kseC_BeamSection::TypeId()) {
-        CreateBeamSection(instance, name, section, passed);
-    } else if (type == kseC_TrussSection::TypeId()) {
-        CreateTrussSection(instance, section, passed);
-    } else if (type == kseC_MembraneSection::TypeId()) {
-        CreateMembraneSection(instance, section, passed);
-    } else if (type == kseC_GasketSection::TypeId()) {
-        CreateGasketSection(instance, section, passed);
-    } else if (type == kseC_PointSection::TypeId()) {
-        CreatePointSection(instance, section, passed);
-    }
+    row->create(*this, instance, section, passed);
 }
 
 void oif_PartAttributesBuilder::CreateSolidSection(const ddb_PartInstance& instance,
@@ -245,14 +267,21 @@ void oif_PartAttributesBuilder::CreateTrussSection(const ddb_PartInstance& insta
 
 void oif_PartAttributesBuilder::CreateShellSection(const ddb_PartInstance& instance,
                                                    const kseC_Section& section, const Group& group) {
-    if (section.DynTypeId() == kseC_UserShellSection::TypeId()) {
-        AddInstanceDefinition(instance.name(),
-                              oif_ShellGeneralSection(group.setName, section, group.orientationName,
-                                                      group.controlsName, group.offset));
-    } else {
-        AddInstanceDefinition(instance.name(), oif_ShellSection(group.setName, section, group.orientationName,
-                                                                group.controlsName, group.offset));
-    }
+    AddInstanceDefinition(instance.name(), oif_ShellSection(group.setName, section, group.orientationName,
+                                                            group.controlsName, group.offset));
+    AddShellStiffness(instance, section, group);
+}
+
+void oif_PartAttributesBuilder::CreateShellGeneralSection(const ddb_PartInstance& instance,
+                                                          const kseC_Section& section, const Group& group) {
+    AddInstanceDefinition(instance.name(),
+                          oif_ShellGeneralSection(group.setName, section, group.orientationName,
+                                                  group.controlsName, group.offset));
+    AddShellStiffness(instance, section, group);
+}
+
+void oif_PartAttributesBuilder::AddShellStiffness(const ddb_PartInstance& instance,
+                                                  const kseC_Section& section, const Group& group) {
     const auto* geometry = nex_canDynamicCastPtr<kseC_GeometryShellSection>(&section);
     if (geometry != nullptr && !geometry->transverseShear.IsNull()) {
         AddInstanceDefinition(instance.name(), oif_TransverseShear(geometry->transverseShear.ConstGet()));
@@ -268,33 +297,27 @@ void oif_PartAttributesBuilder::CreateMembraneSection(const ddb_PartInstance& in
 }
 
 void oif_PartAttributesBuilder::CreateGasketSection(const ddb_PartInstance& instance,
-                                                    const kseC_Section& section, const Group& group) {
-    const cow_String material = section.MaterialName();
-    bool hasBehavior = false;
-    if (Model().Materials().IsMember(material)) {
-        const kmaC_Material& record = Model().Materials().ConstGet(material);
-        hasBehavior = !record.thicknessBehavior.IsNull() || !record.transShearElastic.IsNull() ||
-                      !record.membraneElastic.IsNull();
-    }
+                                                    const kseC_GasketSection& gasket, const Group& group) {
+    const mdl_MapString2ObjCow<kmaC_Material>& materials = Model().Materials();
+    const bool hasBehavior = materials.IsMember(gasket.materialName) &&
+                             oif_HasGasketOptions(materials.ConstGet(gasket.materialName));
     AddInstanceDefinition(instance.name(),
-                          oif_GasketSection(group.setName, section, hasBehavior, group.orientationName));
+                          oif_GasketSection(group.setName, gasket, hasBehavior, group.orientationName));
     AddHourglassStiffness(instance, group);
 }
 
 void oif_PartAttributesBuilder::CreatePointSection(const ddb_PartInstance& instance,
-                                                   const kseC_Section& section, const Group& group) {
-    const auto& point = nex_canDynamicCastRef<kseC_PointSection>(section, NEX_HERE);
+                                                   const kseC_PointSection& point, const Group& group) {
     const oif_Mass mass(group.setName, point);
     if (!mass.IsEmpty()) AddInstanceDefinition(instance.name(), mass);
     const oif_RotaryI inertia(group.setName, point, group.orientationName);
     if (!inertia.IsEmpty()) AddInstanceDefinition(instance.name(), inertia);
 }
 
-void oif_PartAttributesBuilder::CreateBeamSection(const ddb_PartInstance& instance, const cow_String& name,
-                                                  const kseC_Section& section, const Group& group) {
-    const auto& beam = nex_canDynamicCastRef<kseC_BeamSection>(section, NEX_HERE);
-    AddInstanceDefinition(instance.name(),
-                          oif_Comment(cow_String("Section: ") + name + "  Profile: " + beam.profileName));
+void oif_PartAttributesBuilder::CreateBeamSection(const ddb_PartInstance& instance,
+                                                  const kseC_BeamSection& beam, const Group& group) {
+    AddInstanceDefinition(instance.name(), oif_Comment(cow_String("Section: ") + group.sectionName +
+                                                       "  Profile: " + beam.profileName));
     const kbpC_BeamProfile& profile = Model().BeamProfiles().ConstGet(beam.profileName);
     gsl_Vector vector(0.0, 0.0, -1.0);
     if (group.beamOriIndex != -1) {
@@ -302,10 +325,9 @@ void oif_PartAttributesBuilder::CreateBeamSection(const ddb_PartInstance& instan
         vector = nex_canDynamicCastRef<ptoC_BeamOrientation>(orientation, NEX_HERE).vector;
     }
     if (beam.integration == kseC_BeamSection::IntegrationEnm::DURING_ANALYSIS) {
-        AddInstanceDefinition(instance.name(), oif_BeamSection(group.setName, section, vector, profile));
+        AddInstanceDefinition(instance.name(), oif_BeamSection(group.setName, beam, vector, profile));
     } else {
-        AddInstanceDefinition(instance.name(),
-                              oif_BeamGeneralSection(group.setName, section, vector, profile));
+        AddInstanceDefinition(instance.name(), oif_BeamGeneralSection(group.setName, beam, vector, profile));
     }
 }
 

@@ -9,6 +9,10 @@
 
 #include <map>
 
+class kseC_BeamSection;
+class kseC_GasketSection;
+class kseC_PointSection;
+
 /// Sections of the instances' elements. The model gives sections, controls and orientations each on a region
 /// of its own; the deck has one section for each group of elements with the same combination of them.
 class oif_PartAttributesBuilder final : public oif_ComponentOf<oif_PartAttributesBuilder> {
@@ -22,6 +26,7 @@ public:
 private:
     /// What a group's section keywords refer to.
     struct Group {
+        cow_String sectionName;
         cow_String setName;
         int beamOriIndex = -1;
         cow_String orientationName;
@@ -39,21 +44,29 @@ private:
     void CreateSetsAndAttributes(const ddb_PartInstance& instance, const bme_MapPropertyArray& groups);
     void CreateElementControls();
 
-    void CreateSection(const ddb_PartInstance& instance, const cow_String& name, const Group& group);
+    struct SectionRow;
+    /// Null for a class whose sections are none of elements of instances.
+    static const SectionRow* FindSectionRow(unsigned typeId);
+
+    void CreateSection(const ddb_PartInstance& instance, const Group& group);
     void CreateSolidSection(const ddb_PartInstance& instance, const kseC_Section& section,
                             const Group& group);
     void CreateShellSection(const ddb_PartInstance& instance, const kseC_Section& section,
                             const Group& group);
-    void CreateBeamSection(const ddb_PartInstance& instance, const cow_String& name,
-                           const kseC_Section& section, const Group& group);
+    void CreateShellGeneralSection(const ddb_PartInstance& instance, const kseC_Section& section,
+                                   const Group& group);
+    void CreateBeamSection(const ddb_PartInstance& instance, const kseC_BeamSection& beam,
+                           const Group& group);
     void CreateTrussSection(const ddb_PartInstance& instance, const kseC_Section& section,
                             const Group& group);
     void CreateMembraneSection(const ddb_PartInstance& instance, const kseC_Section& section,
                                const Group& group);
-    void CreateGasketSection(const ddb_PartInstance& instance, const kseC_Section& section,
+    void CreateGasketSection(const ddb_PartInstance& instance, const kseC_GasketSection& gasket,
                              const Group& group);
-    void CreatePointSection(const ddb_PartInstance& instance, const kseC_Section& section,
+    void CreatePointSection(const ddb_PartInstance& instance, const kseC_PointSection& point,
                             const Group& group);
+    /// What stands behind the section of a shell.
+    void AddShellStiffness(const ddb_PartInstance& instance, const kseC_Section& section, const Group& group);
     void CreateMaterialOrientation(const ddb_PartInstance& instance,
                                    const ptoC_MaterialOrientation& orientation, const cow_String& name);
 
