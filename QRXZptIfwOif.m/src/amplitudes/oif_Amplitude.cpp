@@ -1,18 +1,14 @@
 #include "amplitudes/oif_Amplitude.h"
 
+#include "base/oif_ClassRows.h"
 #include "base/oif_DataLines.h"
+#include "base/oif_KeywordLine.h"
 #include "foundation/nex_Exception.h"
-#include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 namespace {
 
 constexpr int kNumbersOfLine = 8;
-
-template <class E>
-cow_String TextOf(E value) {
-    return omu_PrimEnum<E, 1>(value).GetString();
-}
 
 void WriteValues(utl_Stream& stream, const cow_List<double>& values) {
     oif_DataLines lines(stream, kNumbersOfLine);
@@ -34,38 +30,27 @@ void WriteRowsOfThree(utl_Stream& stream, const cow_2DArray<double>& table) {
     }
 }
 
-void WriteDefinition(utl_Stream& stream, const char* definition) {
-    stream.OptionalLineBreak();
-    stream << ", definition=" << definition;
+oif_KeywordLine& AddDefinition(oif_KeywordLine& line, const char* definition) {
+    return line.MayBreak().Fixed(", definition=", definition);
 }
 
 // The tabular definition is the solver's own default and has no word.
-void WriteCurve(utl_Stream& stream, const kamC_Tabular& curve) {
-    stream.OptionalLineBreak();
-    if (curve.smooth != kamC_Tabular::smoothDef()) stream << ", smooth=" << curve.smooth;
-    stream << endl;
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_Tabular& curve) {
+    line.MayBreak().FixedUnless(", smooth=", curve.smooth, kamC_Tabular::smoothDef()).End();
     WritePairs(stream, curve.table);
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_EquallySpaced& curve) {
-    WriteDefinition(stream, "EQUALLY SPACED");
-    stream.OptionalLineBreak();
-    if (curve.smooth != kamC_EquallySpaced::smoothDef()) {
-        stream << ", smooth=" << curve.smooth;
-        stream.OptionalLineBreak();
-    }
-    stream << ", fixed interval=" << curve.fixedInterval;
-    if (curve.begin != kamC_EquallySpaced::beginDef()) {
-        stream.OptionalLineBreak();
-        stream << ", begin=" << curve.begin;
-    }
-    stream << endl;
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_EquallySpaced& curve) {
+    AddDefinition(line, "EQUALLY SPACED").MayBreak();
+    if (curve.smooth != kamC_EquallySpaced::smoothDef()) line.Fixed(", smooth=", curve.smooth).MayBreak();
+    line.Fixed(", fixed interval=", curve.fixedInterval);
+    if (curve.begin != kamC_EquallySpaced::beginDef()) line.MayBreak().Fixed(", begin=", curve.begin);
+    line.End();
     WriteValues(stream, curve.values);
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_Periodic& curve) {
-    WriteDefinition(stream, "PERIODIC");
-    stream << endl;
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_Periodic& curve) {
+    AddDefinition(line, "PERIODIC").End();
     // Without terms the first data line goes with them.
     if (curve.table.IsEmpty()) return;
     stream << curve.table.NumRows() << ", " << curve.frequency << ", " << curve.start << ", " << curve.a0
@@ -73,84 +58,87 @@ void WriteCurve(utl_Stream& stream, const kamC_Periodic& curve) {
     WritePairs(stream, curve.table);
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_Modulated& curve) {
-    WriteDefinition(stream, "MODULATED");
-    stream << endl
-           << curve.initial << ", " << curve.magnitude << ", " << curve.start << ", " << curve.frequency1
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_Modulated& curve) {
+    AddDefinition(line, "MODULATED").End();
+    stream << curve.initial << ", " << curve.magnitude << ", " << curve.start << ", " << curve.frequency1
            << ", " << curve.frequency2 << endl;
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_Decay& curve) {
-    WriteDefinition(stream, "DECAY");
-    stream << endl
-           << curve.initial << ", " << curve.maximum << ", " << curve.start << ", " << curve.decayTime
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_Decay& curve) {
+    AddDefinition(line, "DECAY").End();
+    stream << curve.initial << ", " << curve.maximum << ", " << curve.start << ", " << curve.decayTime
            << endl;
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_SolutionDependent& curve) {
-    WriteDefinition(stream, "SOLUTION DEPENDENT");
-    stream << endl << curve.initial << ", " << curve.minimum << ", " << curve.maximum << endl;
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_SolutionDependent& curve) {
+    AddDefinition(line, "SOLUTION DEPENDENT").End();
+    stream << curve.initial << ", " << curve.minimum << ", " << curve.maximum << endl;
 }
 
-void WriteCurve(utl_Stream& stream, const kamC_SmoothStep& curve) {
-    WriteDefinition(stream, "SMOOTH STEP");
-    stream.OptionalLineBreak();
-    stream << endl;
+void WriteCurve(utl_Stream& stream, oif_KeywordLine& line, const kamC_SmoothStep& curve) {
+    AddDefinition(line, "SMOOTH STEP").MayBreak().End();
     WritePairs(stream, curve.table);
 }
 
+/// How the amplitudes of a class are written behind what all share.
+struct CurveRow {
+    unsigned typeId;
+    void (*write)(utl_Stream& stream, oif_KeywordLine& line, const kamC_Amplitude& record);
+};
+
 template <class Curve>
-bool WriteIf(utl_Stream& stream, const kamC_Amplitude& record) {
-    if (record.DynTypeId() != Curve::TypeId()) return false;
-    WriteCurve(stream, nex_canDynamicCastRef<Curve>(record, NEX_HERE));
-    return true;
+constexpr CurveRow RowOf() {
+    return {Curve::Class.Id(), [](utl_Stream& stream, oif_KeywordLine& line, const kamC_Amplitude& record) {
+                WriteCurve(stream, line, static_cast<const Curve&>(record));
+            }};
 }
 
-template <class... Curves>
-bool WriteAnyOf(utl_Stream& stream, const kamC_Amplitude& record) {
-    return (WriteIf<Curves>(stream, record) || ...);
-}
+constexpr CurveRow kCurves[] = {
+    RowOf<kamC_Tabular>(), RowOf<kamC_EquallySpaced>(),     RowOf<kamC_Periodic>(),   RowOf<kamC_Modulated>(),
+    RowOf<kamC_Decay>(),   RowOf<kamC_SolutionDependent>(), RowOf<kamC_SmoothStep>(),
+};
 
 } // namespace
 
 void oif_Amplitude::Write(utl_Stream& stream) const {
-    stream << "*Amplitude, name=" << qkw_QuorixName(Name(), false);
-    stream.OptionalLineBreak();
     const kamC_Amplitude& record = Record();
+    oif_KeywordLine line(stream, "*Amplitude");
+    line.Fixed(", name=", qkw_QuorixName(Name(), false)).MayBreak();
     if (record.timeSpan != kamC_Amplitude::timeSpanDef()) {
-        stream << ", time=" << TextOf(record.timeSpan) << " TIME";
+        line.Fixed(", time=", record.timeSpan).Text(" TIME");
     }
-    if (!WriteAnyOf<kamC_Tabular, kamC_EquallySpaced, kamC_Periodic, kamC_Modulated, kamC_Decay,
-                    kamC_SolutionDependent, kamC_SmoothStep>(stream, record)) {
-        nex_Raise("Unknown amplitude definition");
-    }
+    const CurveRow* row = oif_FindRow(kCurves, record.DynTypeId());
+    if (row == nullptr) nex_Raise("Unknown amplitude definition");
+    row->write(stream, line, record);
 }
 
 void oif_PsdDefinition::Write(utl_Stream& stream) const {
     if (Record().DynTypeId() != kamC_PsdDefinition::TypeId()) return;
     const auto& density = nex_canDynamicCastRef<kamC_PsdDefinition>(Record(), NEX_HERE);
-    stream << "*Psd-Definition, name=" << qkw_QuorixName(Name(), false);
-    stream.OptionalLineBreak();
-    if (density.dbReference != 0.0) stream << ", db Reference=" << density.dbReference;
-    stream.OptionalLineBreak();
-    if (density.g != kamC_PsdDefinition::gDef()) stream << ", g=" << density.g;
-    stream.OptionalLineBreak();
-    if (density.psdType != kamC_PsdDefinition::psdTypeDef()) stream << ", type=" << TextOf(density.psdType);
-    stream.OptionalLineBreak();
-    if (density.user) stream << ", user";
-    stream << endl;
+    oif_KeywordLine(stream, "*Psd-Definition")
+        .Fixed(", name=", qkw_QuorixName(Name(), false))
+        .MayBreak()
+        .FixedUnless(", db Reference=", density.dbReference, 0.0)
+        .MayBreak()
+        .FixedUnless(", g=", density.g, kamC_PsdDefinition::gDef())
+        .MayBreak()
+        .FixedUnless(", type=", density.psdType, kamC_PsdDefinition::psdTypeDef())
+        .MayBreak()
+        .FixedIf(density.user, ", user")
+        .End();
     WriteRowsOfThree(stream, density.table);
 }
 
 void oif_Spectrum::Write(utl_Stream& stream) const {
     if (Record().DynTypeId() != kamC_Spectrum::TypeId()) return;
     const auto& spectrum = nex_canDynamicCastRef<kamC_Spectrum>(Record(), NEX_HERE);
-    stream << "*Spectrum, name=" << qkw_QuorixName(Name(), false);
-    stream.OptionalLineBreak();
-    if (spectrum.g != 0.0) stream << ", g=" << spectrum.g;
-    stream.OptionalLineBreak();
-    if (spectrum.type != kamC_Spectrum::TypeEnm::ACCELERATION) stream << ", type=" << TextOf(spectrum.type);
-    stream << endl;
+    oif_KeywordLine(stream, "*Spectrum")
+        .Fixed(", name=", qkw_QuorixName(Name(), false))
+        .MayBreak()
+        .FixedUnless(", g=", spectrum.g, 0.0)
+        .MayBreak()
+        .FixedUnless(", type=", spectrum.type, kamC_Spectrum::TypeEnm::ACCELERATION)
+        .End();
     WriteRowsOfThree(stream, spectrum.table);
     // Behind the rows stands an empty line, here only.
     stream << endl;

@@ -1,5 +1,6 @@
 #include "materials/oif_Material.h"
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialOption.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -25,17 +26,15 @@ std::set<cow_String> oif_MaterialsOfGaskets(const mdl_MapString2ObjCow<kseC_Sect
 
 void oif_Material::Write(utl_Stream& stream) const {
     const kmaC_Material& m = material_;
-    stream << "*Material, name=" << qkw_QuorixName(name_, false);
+    oif_KeywordLine line(stream, "*Material");
+    line.Fixed(", name=", qkw_QuorixName(name_, false));
     if (!m.regularization.IsNull()) {
         const kmaC_Regularization& r = m.regularization.ConstGet();
-        if (r.rtol != r.rtolDef()) stream << ", rtol=" << r.rtol;
-        if (r.strainRateRegularization != r.strainRateRegularizationDef()) {
-            using Form = kmaC_Regularization::StrainRateRegularizationEnm;
-            stream << ", strain rate regularization="
-                   << omu_PrimEnum<Form, 1>(r.strainRateRegularization).GetString();
-        }
+        line.FixedUnless(", rtol=", r.rtol, r.rtolDef())
+            .FixedUnless(", strain rate regularization=", r.strainRateRegularization,
+                         r.strainRateRegularizationDef());
     }
-    stream.LineBreak();
+    line.End();
 
     const bool hasViscoelastic = !m.viscoelastic.IsNull();
     oif_WriteOptions(stream, m.acousticMedium, m.capPlasticity, m.clayPlasticity, m.concrete, m.conductivity,

@@ -1,5 +1,6 @@
 #include "mesh/oif_Element.h"
 
+#include "base/oif_KeywordLine.h"
 #include "base/oif_ModelInfo.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/model/odiK_Mesh.h"
@@ -37,9 +38,10 @@ oif_Element::oif_Element(int elementOffset, int nodeOffset, const ddb_ElementCla
 
 void oif_Element::Write(utl_Stream& stream) const {
     if (withHeader_) {
-        stream << "*Element, type=" << (singleForm_ ? type_ : elements_->elementTypeLabel());
-        if (!elset_.IsEmpty()) stream << ", elset=" << elset_;
-        stream << endl;
+        oif_KeywordLine(stream, "*Element")
+            .Fixed(", type=", singleForm_ ? type_ : elements_->elementTypeLabel())
+            .FixedUnless(", elset=", elset_, cow_String())
+            .End();
     }
     if (singleForm_) {
         stream << firstNumber_ << ", " << secondNumber_ << endl;

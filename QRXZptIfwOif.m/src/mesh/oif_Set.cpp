@@ -1,5 +1,6 @@
 #include "mesh/oif_Set.h"
 
+#include "base/oif_KeywordLine.h"
 #include "foundation/omi_BlkBitVect.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/model/odiK_Mesh.h"
@@ -174,18 +175,19 @@ void oif_SetKeyword::WriteMembers(utl_Stream& stream) const {
 
 void oif_Nset::Write(utl_Stream& stream) const {
     if (labels_.IsEmpty() && members_.IsEmpty()) return;
-    stream << "*Nset, nset=" << qkw_QuorixName(setName_, false);
+    oif_KeywordLine line(stream, "*Nset");
+    line.Fixed(", nset=", qkw_QuorixName(setName_, false));
     if (labels_.IsEmpty()) {
         // Unlike an element set, a node set of members never is internal.
-        stream << endl;
+        line.End();
         WriteMembers(stream);
         return;
     }
     oif_Set set(labels_);
-    if (!instanceName_.IsEmpty()) stream << ", instance=" << qkw_QuorixName(instanceName_, false);
-    if (internal_) stream << ", internal";
-    if (set.CanGenerate()) stream << ", generate";
-    stream << endl;
+    line.FixedName(", instance=", instanceName_)
+        .FixedIf(internal_, ", internal")
+        .FixedIf(set.CanGenerate(), ", generate")
+        .End();
     set.WriteData(stream);
 }
 
@@ -198,16 +200,16 @@ oif_Elset::oif_Elset(const cow_List<int>& labels, cow_String name, cow_String in
 
 void oif_Elset::Write(utl_Stream& stream) const {
     if (labels_.IsEmpty() && members_.IsEmpty()) return;
-    stream << "*Elset, elset=" << qkw_QuorixName(setName_, false).Printable();
-    if (!instanceName_.IsEmpty()) stream << ", instance=" << qkw_QuorixName(instanceName_, false).Printable();
-    if (internal_) stream << ", internal";
+    oif_KeywordLine line(stream, "*Elset");
+    line.Fixed(", elset=", qkw_QuorixName(setName_, false))
+        .FixedName(", instance=", instanceName_)
+        .FixedIf(internal_, ", internal");
     if (labels_.IsEmpty()) {
-        stream << endl;
+        line.End();
         WriteMembers(stream);
         return;
     }
     oif_Set set(labels_);
-    if (set.CanGenerate()) stream << ", generate";
-    stream << endl;
+    line.FixedIf(set.CanGenerate(), ", generate").End();
     set.WriteData(stream);
 }

@@ -1,5 +1,6 @@
 #include "mesh/oif_Surface.h"
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_Set.h"
 
@@ -73,35 +74,36 @@ cow_String oif_Surface::FaceSetName(const cow_String& face) const {
 }
 
 void oif_Surface::WriteSurfaceElsets(utl_Stream& stream, const LabelsOfFace& faces) const {
-    for (cow_ConstMapIterator<cow_String, cow_List<int>> it(faces); !it.IsDone(); it.Next()) {
-        stream << "*Elset, elset=" << qkw_QuorixName(FaceSetName(it.CurrentKey()), false);
-        if (!instanceName_.IsEmpty()) stream << ", instance=" << qkw_QuorixName(instanceName_, false);
-        stream << ", internal";
-        oif_Set set(it.CurrentValue());
-        if (set.CanGenerate()) stream << ", generate";
-        stream << endl;
+    for (const auto& [face, labels] : faces) {
+        oif_Set set(labels);
+        oif_KeywordLine(stream, "*Elset")
+            .Fixed(", elset=", qkw_QuorixName(FaceSetName(face), false))
+            .FixedName(", instance=", instanceName_)
+            .Fixed(", internal")
+            .FixedIf(set.CanGenerate(), ", generate")
+            .End();
         set.WriteData(stream);
     }
 }
 
 void oif_Surface::WriteSurfaceKeyword(utl_Stream& stream) const {
-    stream << "*Surface, type=ELEMENT"
-           << ", name=" << qkw_QuorixName(name_, false);
-    if (internal_) stream << ", internal";
-    stream << endl;
+    oif_KeywordLine(stream, "*Surface, type=ELEMENT")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .FixedIf(internal_, ", internal")
+        .End();
 }
 
 void oif_Surface::WriteSurfaceDatalines(utl_Stream& stream, const LabelsOfFace& faces) const {
-    for (cow_ConstMapIterator<cow_String, cow_List<int>> it(faces); !it.IsDone(); it.Next()) {
-        stream << qkw_QuorixName(FaceSetName(it.CurrentKey()), false) << ", " << it.CurrentKey() << endl;
+    for (const auto& [face, labels] : faces) {
+        stream << qkw_QuorixName(FaceSetName(face), false) << ", " << face << endl;
     }
 }
 
 void oif_Surface::WriteSurfaceFromList(utl_Stream& stream) const {
-    stream << "*Surface, type=NODE"
-           << ", name=" << qkw_QuorixName(name_, false);
-    if (internal_) stream << ", internal";
-    stream << endl;
+    oif_KeywordLine(stream, "*Surface, type=NODE")
+        .Fixed(", name=", qkw_QuorixName(name_, false))
+        .FixedIf(internal_, ", internal")
+        .End();
     for (int i = 0; i < nodeSets_.Length(); ++i) stream << nodeSets_[i] << ", " << 1.0 << endl;
 }
 

@@ -1,6 +1,7 @@
 #include "output/oif_Output.h"
 
 #include "base/oif_DataLines.h"
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/steps/kprC_Predicates.h"
 
@@ -62,15 +63,13 @@ oif_Output::oif_Output(const korC_OdbChannel& channel, TypeEnm type, const cow_S
 }
 
 void oif_Output::Write(utl_Stream& stream) const {
-    stream << "*Output" << (channel_.IsField() ? ", field" : ", history");
+    oif_KeywordLine line(stream, "*Output");
+    line.Fixed(channel_.IsField() ? ", field" : ", history");
     // No output has no variables either.
     if (frequency_ != 0 || type_ != TypeEnm::FREQUENCY) {
-        if (pre_) {
-            stream << ", variable=PRESELECT";
-        } else if (all_) {
-            stream << ", variable=ALL";
-        }
-        if (!filter_.IsEmpty()) stream << ", filter=" << filter_;
+        line.FixedIf(pre_, ", variable=PRESELECT")
+            .FixedIf(all_ && !pre_, ", variable=ALL")
+            .FixedUnless(", filter=", filter_, cow_String());
     }
     switch (type_) {
     case TypeEnm::FREQUENCY: {
@@ -78,24 +77,24 @@ void oif_Output::Write(utl_Stream& stream) const {
         const bool isUsual =
             korC_DefaultOutputType(stepType_, channel_.IsField()) == korC_TypeEnm::FREQUENCY &&
             frequency_ == usual;
-        if (!isUsual) stream << ", frequency=" << frequency_;
+        line.FixedIf(!isUsual, ", frequency=", frequency_);
         break;
     }
-    case TypeEnm::NUMBER_INTERVAL: WriteNumberInterval(stream); break;
-    case TypeEnm::TIME_INTERVAL: stream << ", time interval=" << timeInterval_; break;
+    case TypeEnm::NUMBER_INTERVAL: AddNumberInterval(line); break;
+    case TypeEnm::TIME_INTERVAL: line.Fixed(", time interval=", timeInterval_); break;
     case TypeEnm::MODE_LIST: WriteModes(stream); break;
-    case TypeEnm::TIME_POINTS: stream << ", time points=" << timePoints_; break;
+    case TypeEnm::TIME_POINTS: line.Fixed(", time points=", timePoints_); break;
     }
     const bool hasMarks =
         type_ == TypeEnm::NUMBER_INTERVAL || type_ == TypeEnm::TIME_INTERVAL || type_ == TypeEnm::TIME_POINTS;
     if (hasMarks && timeMarks_ == kprC_IsExplicit(stepType_) &&
         kprC_TimeMarksIsAllowed(stepType_, channel_.IsField())) {
-        stream << (timeMarks_ ? ", time marks=YES" : ", time marks=NO");
+        line.Fixed(timeMarks_ ? ", time marks=YES" : ", time marks=NO");
     }
-    stream.LineBreak();
+    line.End();
 }
 
-void oif_Output::WriteNumberInterval(utl_Stream& stream) const {
+void oif_Output::AddNumberInterval(oif_KeywordLine& line) const {
     const bool isField = channel_.IsField();
     const int usual = isField ? korC_OdbRequestTable::fieldNumberIntervalDef()
                               : korC_OdbRequestTable::historyNumberIntervalDef();
@@ -104,10 +103,10 @@ void oif_Output::WriteNumberInterval(utl_Stream& stream) const {
         return;
     }
     if (isField || !kprC_IsExplicit(stepType_)) {
-        stream << ", number interval=" << numberInterval_;
+        line.Fixed(", number interval=", numberInterval_);
     } else if (stepTime_ > 0.0 && numberInterval_ >= 1) {
         // Explicit steps know no number of intervals for history.
-        stream << ", time interval=" << stepTime_ / numberInterval_;
+        line.Fixed(", time interval=", stepTime_ / numberInterval_);
     }
 }
 

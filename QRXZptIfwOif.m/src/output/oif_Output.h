@@ -4,6 +4,8 @@
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 
+class oif_KeywordLine;
+
 /// Opens a group of output requests that are equally frequent:
 ///     *Output, field|history[, variable=PRESELECT|ALL][, filter=FILTER]FREQUENCY[, time marks=YES|NO]
 /// FREQUENCY is ", frequency=N", ", number interval=N", ", time interval=T", ", mode list" (the modes follow
@@ -35,7 +37,7 @@ public:
 private:
     oif_Output(const korC_OdbChannel& channel, TypeEnm type, bool timeMarks, bool pre, bool all,
                unsigned stepType, const cow_String& filter);
-    void WriteNumberInterval(utl_Stream& stream) const;
+    void AddNumberInterval(oif_KeywordLine& line) const;
     void WriteModes(utl_Stream& stream) const;
 
     int frequency_ = 0;

@@ -1,5 +1,6 @@
 #include "sections/oif_BeamSections.h"
 
+#include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -128,17 +129,10 @@ void WritePoint(utl_Stream& stream, const char* keyword, const cow_List<double>&
 
 void WriteDamping(utl_Stream& stream, const kseC_BeamSection& section) {
     if (section.alphaDamping == 0.0 && section.betaDamping == 0.0 && section.compositeDamping == 0.0) return;
-    stream << "*Damping";
-    if (section.alphaDamping != 0.0) {
-        stream << ", alpha=" << section.alphaDamping;
-        stream.OptionalLineBreak();
-    }
-    if (section.betaDamping != 0.0) {
-        stream << ", beta=" << section.betaDamping;
-        stream.OptionalLineBreak();
-    }
-    if (section.compositeDamping != 0.0) stream << ", composite=" << section.compositeDamping;
-    stream.LineBreak();
+    oif_KeywordLine line(stream, "*Damping");
+    if (section.alphaDamping != 0.0) line.Fixed(", alpha=", section.alphaDamping).MayBreak();
+    if (section.betaDamping != 0.0) line.Fixed(", beta=", section.betaDamping).MayBreak();
+    line.FixedUnless(", composite=", section.compositeDamping, 0.0).End();
 }
 
 void WriteSectionPoints(utl_Stream& stream, const cow_2DArray<double>& points) {

@@ -1,26 +1,23 @@
 #include "sections/oif_PointInertia.h"
 
+#include "base/oif_KeywordLine.h"
+
 namespace {
 
-void WriteParameter(utl_Stream& stream, const char* name, double value) {
-    if (value == 0.0) return;
-    stream.OptionalLineBreak();
-    stream << name << value;
-}
-
-void WriteHead(utl_Stream& stream, const char* keyword, const cow_String& setName, double alpha,
-               double composite) {
-    stream << keyword << ", elset=" << setName;
-    WriteParameter(stream, ", alpha=", alpha);
-    WriteParameter(stream, ", composite=", composite);
+oif_KeywordLine Head(utl_Stream& stream, const char* keyword, const cow_String& setName, double alpha,
+                     double composite) {
+    oif_KeywordLine line(stream, keyword);
+    line.Fixed(", elset=", setName);
+    if (alpha != 0.0) line.MayBreak().Fixed(", alpha=", alpha);
+    if (composite != 0.0) line.MayBreak().Fixed(", composite=", composite);
+    return line;
 }
 
 } // namespace
 
 void oif_Mass::Write(utl_Stream& stream) const {
     if (IsEmpty()) return;
-    WriteHead(stream, "*Mass", setName_, alpha_, composite_);
-    stream.LineBreak();
+    Head(stream, "*Mass", setName_, alpha_, composite_).End();
     stream << mass_ << ", " << endl;
 }
 
@@ -31,12 +28,10 @@ bool oif_RotaryI::IsEmpty() const {
 
 void oif_RotaryI::Write(utl_Stream& stream) const {
     if (IsEmpty()) return;
-    WriteHead(stream, "*RotaryI", setName_, inertia_.rotaryAlphaDamping, inertia_.rotaryCompositeDamping);
-    if (!orientationName_.IsEmpty()) {
-        stream.OptionalLineBreak();
-        stream << ", orientation=" << orientationName_;
-    }
-    stream.LineBreak();
+    oif_KeywordLine line =
+        Head(stream, "*RotaryI", setName_, inertia_.rotaryAlphaDamping, inertia_.rotaryCompositeDamping);
+    if (!orientationName_.IsEmpty()) line.MayBreak().Fixed(", orientation=", orientationName_);
+    line.End();
     stream << inertia_.i11 << ", " << inertia_.i22 << ", " << inertia_.i33 << ", " << inertia_.i12 << ", "
            << inertia_.i13 << ", " << inertia_.i23 << endl;
 }

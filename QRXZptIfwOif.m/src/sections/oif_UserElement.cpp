@@ -1,6 +1,7 @@
 #include "sections/oif_UserElement.h"
 
 #include "base/oif_DataLines.h"
+#include "base/oif_KeywordLine.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <limits>
@@ -8,13 +9,17 @@
 void oif_UserElement::Write(utl_Stream& stream) const {
     const auto* sensor = nex_canDynamicCastPtr<kinC_ActuatorSensor>(interaction_.Referent());
     if (sensor == nullptr) return;
-    stream << "*User Element, type=" << sensor->elementType << ", nodes=1";
-    if (sensor->coordinates != 0) stream << ", coordinates=" << sensor->coordinates;
-    stream << ", properties=" << realProperties_;
-    stream.OptionalLineBreak();
-    stream << ", i properties=" << intProperties_;
-    if (sensor->unsymm) stream << ", unsymm";
-    stream << ", variables=" << sensor->variables << endl << sensor->nodeSetText << endl;
+    oif_KeywordLine(stream, "*User Element")
+        .Fixed(", type=", sensor->elementType)
+        .Fixed(", nodes=1")
+        .FixedUnless(", coordinates=", sensor->coordinates, 0)
+        .Fixed(", properties=", realProperties_)
+        .MayBreak()
+        .Fixed(", i properties=", intProperties_)
+        .FixedIf(sensor->unsymm, ", unsymm")
+        .Fixed(", variables=", sensor->variables)
+        .End();
+    stream << sensor->nodeSetText << endl;
 }
 
 void oif_UelProperty::Write(utl_Stream& stream) const {
