@@ -10,8 +10,8 @@ void oif_AmplitudeBuilder::Build() {
 }
 
 void oif_AmplitudeBuilder::CreateAllAmplitudes() {
-    for (mdl_MapString2ObjCowIT<kamC_Amplitude> it(Model().Amplitudes()); !it.IsDone(); it.Next()) {
-        CreateAmplitude(it.CurrentValue(), it.CurrentKey());
+    for (const auto& [name, amplitude] : Model().Amplitudes()) {
+        CreateAmplitude(amplitude, name);
     }
 }
 

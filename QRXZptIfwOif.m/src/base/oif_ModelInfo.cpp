@@ -44,10 +44,9 @@ void oif_ModelInfo::EnterMesh(const cow_String& instance, const ddb_Mesh& mesh) 
 
 void oif_ModelInfo::SetMeshData() {
     const ddb_Assembly assembly = model_.rootAssembly();
-    for (ddb_InstanceContainerIT it = assembly.instance().createIterator(); !it.isDone(); it.next()) {
-        const ddb_BaseInstance instance = it.currentValue();
+    for (const auto& [name, instance] : assembly.instance()) {
         if (!instance.IsPartInstance()) continue;
-        EnterMesh(it.currentKey(), ddb_PartInstance(instance).mesh());
+        EnterMesh(name, ddb_PartInstance(instance).mesh());
     }
     if (assembly.hasMesh()) {
         EnterMesh(cow_String(), assembly.mesh());

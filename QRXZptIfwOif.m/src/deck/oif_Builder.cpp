@@ -75,14 +75,14 @@ void oif_Builder::WriteHeading(utl_Stream& stream, const cow_String& text) const
 }
 
 void oif_Builder::WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const {
-    for (int i = 0; i < keywords.Length(); ++i) keywords.UncheckedConstGet(i).ConstGet().Write(stream);
+    for (const qkw_KeywordHandle& keyword : keywords) keyword.ConstGet().Write(stream);
 }
 
 void oif_Builder::WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
     if (v6Format_) WriteHeading(stream, "PARTS");
-    for (auto it = model_->Parts().createIterator(); !it.isDone(); it.next()) {
+    for (const auto& [name, part] : model_->Parts()) {
         for (int i = 0; i < components.Length(); ++i) {
-            WriteInput(stream, components.Get(i).Get().PartDefinition(it.currentKey()));
+            WriteInput(stream, components.Get(i).Get().PartDefinition(name));
         }
     }
 }
@@ -93,9 +93,9 @@ void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream, qkw_Component
         // The assembly's name goes out as it stands, without quotes.
         stream << "*Assembly, name=" << model_->Model().rootAssembly().name() << endl;
     }
-    for (auto it = model_->Instances().createIterator(); !it.isDone(); it.next()) {
+    for (const auto& [name, instance] : model_->Instances()) {
         for (int i = 0; i < components.Length(); ++i) {
-            WriteInput(stream, components.Get(i).Get().InstanceDefinition(it.currentKey()));
+            WriteInput(stream, components.Get(i).Get().InstanceDefinition(name));
         }
     }
 }
@@ -111,22 +111,19 @@ void oif_Builder::WriteOtherModelDefinitions(utl_Stream& stream, qkw_ComponentLi
 }
 
 void oif_Builder::WriteStepDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
-    int count = 0;
-    for (kprC_StepContainerIT it(model_->Steps()); !it.IsDone(); it.Next(), ++count) {
-        const cow_String& stepName = it.CurrentKey();
+    for (const auto& [stepName, anyStep] : model_->Steps()) {
         const nex_Context context("step", stepName);
         for (int i = 0; i < components.Length(); ++i) {
             WriteInput(stream, components.Get(i).Get().StepDefinition(stepName));
         }
         // The initial step has no load cases.
-        if (count == 0) continue;
-        const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(it.CurrentValue(), NEX_HERE);
-        const cow_List<cow_String> loadCases = step.loadCases.Keys();
-        for (int k = 0; k < loadCases.Length(); ++k) {
+        if (stepName == model_->InitialStepName()) continue;
+        const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(anyStep, NEX_HERE);
+        for (const auto& [loadCaseName, loadCase] : step.loadCases) {
             // The list of the empty key is the body.
-            if (loadCases[k].IsEmpty()) continue;
+            if (loadCaseName.IsEmpty()) continue;
             for (int i = 0; i < components.Length(); ++i) {
-                WriteInput(stream, components.Get(i).Get().StepDefinition(stepName, loadCases[k]));
+                WriteInput(stream, components.Get(i).Get().StepDefinition(stepName, loadCaseName));
             }
         }
     }

@@ -5,8 +5,7 @@
 oif_Region::oif_Region(const qkw_Model& model, const rgnC_Region& region) {
     if (!region.Shortcut().HasValue()) return;
     const auto find = [&](const ddb_SetList& sets) {
-        for (ddb_SetListIT it = sets.createIterator(); !it.isDone(); it.next()) {
-            const ddb_Set set = it.currentItem();
+        for (const ddb_Set& set : sets) {
             if (!(set.Shortcut() == region.Shortcut())) continue;
             setName_ = set.setLabel();
             return true;
@@ -15,9 +14,9 @@ oif_Region::oif_Region(const qkw_Model& model, const rgnC_Region& region) {
     };
     const ddb_Assembly assembly = static_cast<const oif_Model&>(model).Model().rootAssembly();
     if (find(assembly.set())) return;
-    for (ddb_InstanceContainerIT it = assembly.instance().createIterator(); !it.isDone(); it.next()) {
-        if (!it.currentValue().IsPartInstance()) continue;
-        const ddb_PartInstance instance(it.currentValue());
+    for (const auto& [name, entry] : assembly.instance()) {
+        if (!entry.IsPartInstance()) continue;
+        const ddb_PartInstance instance(entry);
         if (!find(instance.mesh().set())) continue;
         instanceName_ = instance.name();
         return;

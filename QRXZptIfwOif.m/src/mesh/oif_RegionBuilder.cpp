@@ -15,8 +15,8 @@ void oif_RegionBuilder::Build() {
 
 void oif_RegionBuilder::CreateInstanceRegions(const ddb_PartInstance& instance) {
     const cow_String& name = instance.name();
-    for (ddb_SetListIT it = instance.mesh().set().createIterator(); !it.isDone(); it.next()) {
-        const rgnC_SetData setData = it.currentItem().set();
+    for (const ddb_Set& set : instance.mesh().set()) {
+        const rgnC_SetData setData = set.set();
         switch (static_cast<res_SetTypeEnm>(setData.Kind())) {
         case res_SetTypeEnm::NODES: AddInstanceDefinition(name, oif_Nset(setData, instance)); break;
         case res_SetTypeEnm::ELEMENTS: AddInstanceDefinition(name, oif_Elset(setData, instance)); break;
@@ -28,8 +28,8 @@ void oif_RegionBuilder::CreateInstanceRegions(const ddb_PartInstance& instance) 
 void oif_RegionBuilder::CreateAssemblyRegions() {
     const ddb_Assembly assembly = Model().RootAssembly();
     // Surfaces stand behind all node and element sets.
-    for (ddb_SetListIT it = assembly.set().createIterator(); !it.isDone(); it.next()) {
-        const rgnC_SetData setData = it.currentItem().set();
+    for (const ddb_Set& set : assembly.set()) {
+        const rgnC_SetData setData = set.set();
         const auto kind = static_cast<res_SetTypeEnm>(setData.Kind());
         if (kind == res_SetTypeEnm::FACETS) continue;
         std::set<int> meshesDone;
@@ -48,8 +48,8 @@ void oif_RegionBuilder::CreateAssemblyRegions() {
             }
         }
     }
-    for (ddb_SetListIT it = assembly.set().createIterator(); !it.isDone(); it.next()) {
-        const rgnC_SetData setData = it.currentItem().set();
+    for (const ddb_Set& set : assembly.set()) {
+        const rgnC_SetData setData = set.set();
         if (setData.Kind() == static_cast<int>(res_SetTypeEnm::FACETS)) {
             AddAssemblyDefinition(oif_Surface(setData, assembly));
         }
@@ -58,16 +58,15 @@ void oif_RegionBuilder::CreateAssemblyRegions() {
 
 void oif_RegionBuilder::CreateContactNodeSets() {
     cow_List<rgnC_Region> regions;
-    const cow_List<cow_String> interactions = Model().Interactions().Keys();
-    for (int i = 0; i < interactions.Length(); ++i) {
-        regions.Concatenate(Model().Interactions().ConstGet(interactions[i]).ConstGetContactNodeSets());
+    for (const auto& [name, interaction] : Model().Interactions()) {
+        regions.Concatenate(interaction.ConstGetContactNodeSets());
     }
-    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
-        regions.Concatenate(it.CurrentValue().ConstGetContactNodeSets());
+    for (const auto& [key, constraint] : Model().Constraints()) {
+        regions.Concatenate(constraint.ConstGetContactNodeSets());
     }
     std::set<cow_String> surfacesDone;
-    for (int i = 0; i < regions.Length(); ++i) {
-        const oif_SetName name(regions[i], ModelInfo());
+    for (const rgnC_Region& region : regions) {
+        const oif_SetName name(region, ModelInfo());
         const cow_String surface = name.UniqueSurfaceName(oif_SetName::regionContext::ASSEMBLY);
         const cow_String nodeSet = name.UniqueSetName(oif_SetName::regionContext::ASSEMBLY);
         if (surfacesDone.insert(surface).second)

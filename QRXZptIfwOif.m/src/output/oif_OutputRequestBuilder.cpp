@@ -79,8 +79,7 @@ void TakeFrequency(korC_TypeEnm type, const korC_OutputState& state, korC_OdbReq
 } // namespace
 
 oif_OutputRequestBuilder::oif_OutputRequestBuilder(oif_ModelInfo& modelInfo) : oif_ComponentOf(modelInfo) {
-    for (mdl_MapString2ObjCowIT<karC_RemeshingRule> it(Model().RemeshingRules()); !it.IsDone(); it.Next()) {
-        const karC_RemeshingRule& rule = it.CurrentValue();
+    for (const auto& [key, rule] : Model().RemeshingRules()) {
         if (!rule.suppressed && !Holds(remeshingSteps_, rule.stepName)) remeshingSteps_.Append(rule.stepName);
     }
 }
@@ -187,8 +186,7 @@ bool oif_OutputRequestBuilder::RefersToSomething(const korC_Output& output) cons
 
 bool oif_OutputRequestBuilder::HasFieldRequest(const cow_String& stepName) const {
     // Requests that end here or are suppressed count: the step has to stop the output of the one before it.
-    for (kprC_PropagatingContainerIT<korC_FieldOutput> it(Model().FieldOutputs()); !it.IsDone(); it.Next()) {
-        const korC_FieldOutput& output = it.CurrentValue();
+    for (const auto& [key, output] : Model().FieldOutputs()) {
         if (!output.HasStep(stepName)) continue;
         const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
         if (isPlain || RefersToSomething(output)) return true;
@@ -197,9 +195,7 @@ bool oif_OutputRequestBuilder::HasFieldRequest(const cow_String& stepName) const
 }
 
 bool oif_OutputRequestBuilder::HasHistoryRequest(const cow_String& stepName) const {
-    for (kprC_PropagatingContainerIT<korC_HistoryOutput> it(Model().HistoryOutputs()); !it.IsDone();
-         it.Next()) {
-        const korC_HistoryOutput& output = it.CurrentValue();
+    for (const auto& [key, output] : Model().HistoryOutputs()) {
         if (!output.HasStep(stepName)) continue;
         const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
         // Springs alone are no reason for output.
@@ -284,10 +280,10 @@ void oif_OutputRequestBuilder::Collect(const korC_Output& output, const cow_Stri
 oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetField(const Place& place,
                                                                      cow_List<cow_String>& names) const {
     Channel channel(true);
-    for (kprC_PropagatingContainerIT<korC_FieldOutput> it(Model().FieldOutputs()); !it.IsDone(); it.Next()) {
+    for (const auto& [name, output] : Model().FieldOutputs()) {
         Request request;
-        request.directions = it.CurrentValue().directions;
-        Collect<korC_FieldOutputState>(it.CurrentValue(), it.CurrentKey(), place, request, channel, names);
+        request.directions = output.directions;
+        Collect<korC_FieldOutputState>(output, name, place, request, channel, names);
     }
     if (Holds(remeshingSteps_, place.stepName)) CollectRemeshingRules(place, channel, names);
     return channel;
@@ -296,20 +292,18 @@ oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetField(const Place
 oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetHistory(const Place& place,
                                                                        cow_List<cow_String>& names) const {
     Channel channel(false);
-    for (kprC_PropagatingContainerIT<korC_HistoryOutput> it(Model().HistoryOutputs()); !it.IsDone();
-         it.Next()) {
+    for (const auto& [name, output] : Model().HistoryOutputs()) {
         Request request;
-        request.section = it.CurrentValue().section;
-        request.springs = it.CurrentValue().springs;
-        Collect<korC_HistoryOutputState>(it.CurrentValue(), it.CurrentKey(), place, request, channel, names);
+        request.section = output.section;
+        request.springs = output.springs;
+        Collect<korC_HistoryOutputState>(output, name, place, request, channel, names);
     }
     return channel;
 }
 
 void oif_OutputRequestBuilder::CollectRemeshingRules(const Place& place, Channel& channel,
                                                      cow_List<cow_String>& names) const {
-    for (mdl_MapString2ObjCowIT<karC_RemeshingRule> it(Model().RemeshingRules()); !it.IsDone(); it.Next()) {
-        const karC_RemeshingRule& rule = it.CurrentValue();
+    for (const auto& [name, rule] : Model().RemeshingRules()) {
         if (!(rule.stepName == place.stepName) || rule.suppressed || !rule.fieldOutput) continue;
         Request request;
         request.region = rule.region;
@@ -317,9 +311,9 @@ void oif_OutputRequestBuilder::CollectRemeshingRules(const Place& place, Channel
         request.variables.Append("EVOL");
         request.frequency = rule.EveryIncrement() ? Table::fieldFrequencyDef() : Table::lastIncrementDef();
         request.timeMarks = !kprC_IsExplicit(place.stepType);
-        cow_String name = cow_String(" from REMESHING RULE: ") + it.CurrentKey();
-        if (!rule.description.IsEmpty()) name = name + "\n" + rule.description;
-        Merge(request, name, channel, names);
+        cow_String title = cow_String(" from REMESHING RULE: ") + name;
+        if (!rule.description.IsEmpty()) title = title + "\n" + rule.description;
+        Merge(request, title, channel, names);
     }
 }
 

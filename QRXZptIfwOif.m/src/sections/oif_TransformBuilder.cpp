@@ -25,15 +25,13 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         datums_.Append(datum);
         regions_.Append(region);
     };
-    for (kprC_PropagatingContainerIT<kbcC_BC> it(Model().BCs()); !it.IsDone(); it.Next()) {
-        const kbcC_BC& condition = it.CurrentValue();
+    for (const auto& [key, condition] : Model().BCs()) {
         if (condition.suppressed) continue;
         // A symmetry condition counts also without a system.
         if (condition.datum.IsNullRef() && condition.DynTypeId() != kbcC_SymmetryBC::TypeId()) continue;
         append(condition.datum, condition.region);
     }
-    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
-        const kloC_Load& load = it.CurrentValue();
+    for (const auto& [key, load] : Model().Loads()) {
         if (load.suppressed) continue;
         const auto appendSystemOf = [&](const auto* typed) {
             if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, load.region);
@@ -41,10 +39,10 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
         appendSystemOf(nex_canDynamicCastPtr<kloC_ConcentratedForce>(&load));
         appendSystemOf(nex_canDynamicCastPtr<kloC_Moment>(&load));
     }
-    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
-        const auto* equation = nex_canDynamicCastPtr<kcoC_Equation>(&it.CurrentValue());
+    for (const auto& [name, constraint] : Model().Constraints()) {
+        const auto* equation = nex_canDynamicCastPtr<kcoC_Equation>(&constraint);
         if (equation == nullptr) continue;
-        const nex_Context context("constraint", it.CurrentKey());
+        const nex_Context context("constraint", name);
         for (int i = 0; i < equation->terms.Length(); ++i) {
             const kcoC_EquationTerm& term = equation->terms[i];
             if (term.csys.Id() <= 0) continue;
@@ -89,16 +87,16 @@ void oif_TransformBuilder::WriteConnectorOrientations() {
 }
 
 void oif_TransformBuilder::WriteCouplingOrientations() {
-    for (mdl_MapString2ObjCowIT<kcoC_Constraint> it(Model().Constraints()); !it.IsDone(); it.Next()) {
-        const auto* coupling = nex_canDynamicCastPtr<kcoC_Coupling>(&it.CurrentValue());
+    for (const auto& [key, constraint] : Model().Constraints()) {
+        const auto* coupling = nex_canDynamicCastPtr<kcoC_Coupling>(&constraint);
         if (coupling == nullptr) continue;
         WriteOrientation(coupling->orientation, 0.0, cow_String(), ptoC_MaterialOrientation::axisEnm::AXIS_1);
     }
 }
 
 void oif_TransformBuilder::WriteInertiaReliefOrientations() {
-    for (kprC_PropagatingContainerIT<kloC_Load> it(Model().Loads()); !it.IsDone(); it.Next()) {
-        const auto* relief = nex_canDynamicCastPtr<kloC_InertiaRelief>(&it.CurrentValue());
+    for (const auto& [key, load] : Model().Loads()) {
+        const auto* relief = nex_canDynamicCastPtr<kloC_InertiaRelief>(&load);
         if (relief == nullptr || relief->suppressed) continue;
         WriteOrientation(relief->datum, 0.0, {}, ptoC_MaterialOrientation::axisEnm::AXIS_1);
     }
