@@ -160,14 +160,18 @@ void CheckParts(const odiK_Model& model, RecordWalk& walk, const fnd_Path& place
 }
 
 void CheckSteps(const odiK_Model& model, RecordWalk& walk, const fnd_Path& place, fnd_Sink& sink) {
-    if (model.steps.Size() > 0 && model.steps.StepAt(0).DynTypeId() != kprC_InitialStep::TypeId()) {
-        const fnd_Path first(place, std::size_t{0});
-        sink.Add("initial-step", fnd_Path(first, "class"),
-                 "found " + fnd_Quoted(cls_Classes().NameOf(model.steps.StepAt(0).DynTypeId()).View()),
-                 "kprC_InitialStep as the first step");
-    }
     for (int i = 0; i < model.steps.Size(); ++i) {
         const fnd_Path step(place, static_cast<std::size_t>(i));
+        const unsigned type = model.steps.StepAt(i).DynTypeId();
+        const bool isInitial = type == kprC_InitialStep::TypeId();
+        if (i == 0 && !isInitial) {
+            sink.Add("initial-step", fnd_Path(step, "class"),
+                     "found " + fnd_Quoted(cls_Classes().NameOf(type).View()),
+                     "kprC_InitialStep as the first step");
+        } else if (i > 0 && isInitial) {
+            sink.Add("initial-step", fnd_Path(step, "class"), "found a second kprC_InitialStep",
+                     "it in the first place alone");
+        }
         walk.Name(model.steps.NameAt(i), fnd_Path(step, "name"));
         walk.Record(model.steps.StepAt(i), step);
     }

@@ -31,11 +31,6 @@ void mdf_ModelReader::Read(mdf_Value& json, const fnd_Path& path) {
             ReadRepository(repository, *value, place);
         }
     }
-    if (!model_.cyclicSymmetry.IsNull() &&
-        model_.cyclicSymmetry.ConstGet().symmetryType == calC_SymmetryTypeEnm::NONE) {
-        diagnostics_.Add("idle-sector", fnd_Path(path, "cyclicSymmetry"),
-                         "the sector definition is idle, since symmetryType is NONE");
-    }
     records_.References().Check();
     fnd_Below problems(diagnostics_, path);
     odiK_CheckModelRules(model_, problems);

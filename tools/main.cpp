@@ -34,7 +34,8 @@ struct CommandLine {
     bool json = false;
     bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
-    CLI::App* checkCommand = app.add_subcommand("check", "Look for errors in a model, write nothing");
+    CLI::App* checkCommand =
+        app.add_subcommand("check", "Look for errors in a model and what its deck can't say, write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =

@@ -81,10 +81,20 @@ void CheckEquations(const odiK_Model& model, const fnd_Path& root, fnd_Sink& sin
     }
 }
 
+void CheckSector(const odiK_Model& model, const fnd_Path& root, fnd_Sink& sink) {
+    if (model.cyclicSymmetry.IsNull() ||
+        model.cyclicSymmetry.ConstGet().symmetryType != calC_SymmetryTypeEnm::NONE) {
+        return;
+    }
+    sink.Add("idle-sector", fnd_Path(root, "cyclicSymmetry"),
+             "the sector definition is idle, since symmetryType is NONE");
+}
+
 } // namespace
 
 void odiK_CheckModelRules(const odiK_Model& model, fnd_Sink& sink) {
     const fnd_Path root;
+    CheckSector(model, root, sink);
     CheckEquations(model, root, sink);
     CheckGeneralContact(model, root, sink);
 }

@@ -57,6 +57,17 @@ TEST(Check, StoreFilledInMemory_IsHeldAgainstTheRulesOfModelFiles) {
             "step-times /steps/1/initialInc: found 2.0, expected timePeriod (1.0) or less"}));
 }
 
+TEST(Check, InitialStepInAnotherPlaceThanTheFirst_IsAnError) {
+    TestStore store;
+    store.model.steps.Append("Pull", kprC_StaticStep());
+    store.model.steps.Append("Initial", kprC_InitialStep());
+    EXPECT_EQ(Found(store.odb),
+              (Texts{"initial-step /steps/0/class: found 'kprC_StaticStep', expected kprC_InitialStep as the "
+                     "first step",
+                     "initial-step /steps/1/class: found a second kprC_InitialStep, expected it in the first "
+                     "place alone"}));
+}
+
 TEST(Check, StoreWithoutErrors_IsToldWhatItsDeckLeavesOut) {
     TestStore store;
     store.model.steps.Append("Initial", kprC_InitialStep());
