@@ -1,6 +1,7 @@
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 #include "materials/oif_Material.h"
+#include "store_interface/model/ddb_ElementTypes.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/sections/kseC_BeamSection.h"
@@ -63,82 +64,34 @@ void FindIdleMaterials(const odiK_Model& model, fnd_Sink& sink) {
     }
 }
 
-/// The sections that elements of a kind can take, by the beginnings of their type labels.
-struct ElementFamily {
-    std::string_view beginning;
-    unsigned (*sections[2])();
-};
-
-constexpr ElementFamily kFamilies[] = {
-    {"B2", {kseC_BeamSection::TypeId}},
-    {"B3", {kseC_BeamSection::TypeId}},
-    {"PIPE", {kseC_BeamSection::TypeId}},
-    {"ELBOW", {kseC_BeamSection::TypeId}},
-    {"FRAME", {kseC_BeamSection::TypeId}},
-    {"T2D", {kseC_TrussSection::TypeId, kseC_SolidSection::TypeId}},
-    {"T3D", {kseC_TrussSection::TypeId, kseC_SolidSection::TypeId}},
-    {"S3", {kseC_ShellSection::TypeId}},
-    {"S4", {kseC_ShellSection::TypeId}},
-    {"S8", {kseC_ShellSection::TypeId}},
-    {"S9", {kseC_ShellSection::TypeId}},
-    {"STRI", {kseC_ShellSection::TypeId}},
-    {"DS", {kseC_ShellSection::TypeId}},
-    {"SAX", {kseC_ShellSection::TypeId}},
-    {"DSAX", {kseC_ShellSection::TypeId}},
-    {"SC", {kseC_ShellSection::TypeId}},
-    {"M3D", {kseC_MembraneSection::TypeId}},
-    {"MAX", {kseC_MembraneSection::TypeId}},
-    {"MGAX", {kseC_MembraneSection::TypeId}},
-    {"GK", {kseC_GasketSection::TypeId}},
-    {"MASS", {kseC_PointSection::TypeId}},
-    {"ROTARYI", {kseC_PointSection::TypeId}},
-    {"C3D", {kseC_SolidSection::TypeId}},
-    {"CPE", {kseC_SolidSection::TypeId}},
-    {"CPS", {kseC_SolidSection::TypeId}},
-    {"CAX", {kseC_SolidSection::TypeId}},
-    {"CGAX", {kseC_SolidSection::TypeId}},
-    {"DC1D", {kseC_SolidSection::TypeId}},
-    {"DC2D", {kseC_SolidSection::TypeId}},
-    {"DC3D", {kseC_SolidSection::TypeId}},
-    {"DCAX", {kseC_SolidSection::TypeId}},
-    {"AC2D", {kseC_SolidSection::TypeId}},
-    {"AC3D", {kseC_SolidSection::TypeId}},
-    {"ACAX", {kseC_SolidSection::TypeId}},
-};
-
-/// Elements that have no section of their own: rigid ones, and connectors, whose section is the assembly's.
-constexpr std::string_view kWithoutSection[] = {"R2D", "R3D", "RAX", "RB", "CONN"};
-
-bool BeginsWith(const cow_String& label, std::string_view beginning) {
-    return label.View().size() >= beginning.size() &&
-           omu_EqualInAnyCapitals(label.View().substr(0, beginning.size()), beginning);
-}
-
-const ElementFamily* FamilyOf(const cow_String& label) {
-    const ElementFamily* found = nullptr;
-    for (const ElementFamily& family : kFamilies) {
-        if (BeginsWith(label, family.beginning) &&
-            (found == nullptr || family.beginning.size() > found->beginning.size())) {
-            found = &family;
-        }
-    }
-    return found;
-}
-
 bool NeedsSection(const cow_String& label) {
     // Surface elements are not written at all.
     if (label.View().find("SURF") != std::string_view::npos) return false;
-    return std::none_of(std::begin(kWithoutSection), std::end(kWithoutSection),
-                        [&](std::string_view beginning) { return BeginsWith(label, beginning); });
+    const ddb_ElementFamily* family = ddb_FamilyOf(label.View());
+    return family == nullptr || family->section != ddb_SectionNeedEnm::NOTHING;
+}
+
+bool CanTake(ddb_SectionNeedEnm need, unsigned section) {
+    const auto isOne = [&](unsigned (*id)()) { return cls_Classes().InheritanceCheck(section, id()); };
+    switch (need) {
+    case ddb_SectionNeedEnm::BEAM: return isOne(kseC_BeamSection::TypeId);
+    case ddb_SectionNeedEnm::TRUSS:
+        return isOne(kseC_TrussSection::TypeId) || isOne(kseC_SolidSection::TypeId);
+    case ddb_SectionNeedEnm::SHELL: return isOne(kseC_ShellSection::TypeId);
+    case ddb_SectionNeedEnm::MEMBRANE: return isOne(kseC_MembraneSection::TypeId);
+    case ddb_SectionNeedEnm::GASKET: return isOne(kseC_GasketSection::TypeId);
+    case ddb_SectionNeedEnm::POINT: return isOne(kseC_PointSection::TypeId);
+    case ddb_SectionNeedEnm::SOLID: return isOne(kseC_SolidSection::TypeId);
+    case ddb_SectionNeedEnm::NOTHING:
+    case ddb_SectionNeedEnm::UNKNOWN: break;
+    }
+    return true;
 }
 
 bool CanTake(const cow_String& label, unsigned section) {
-    const ElementFamily* family = FamilyOf(label);
+    const ddb_ElementFamily* family = ddb_FamilyOf(label.View());
     // Of other elements nothing is known.
-    if (family == nullptr) return true;
-    return std::any_of(std::begin(family->sections), std::end(family->sections), [&](unsigned (*id)()) {
-        return id != nullptr && cls_Classes().InheritanceCheck(section, id());
-    });
+    return family == nullptr || CanTake(family->section, section);
 }
 
 /// The sections of the elements of one mesh, as the assignments in their order give them.
