@@ -14,10 +14,11 @@ target_compile_options(qrx_precompiled INTERFACE
     $<$<AND:$<CXX_COMPILER_ID:GNU>,$<VERSION_LESS:$<CXX_COMPILER_VERSION>,13>>:-Wno-array-bounds
         -Wno-stringop-overflow -Wno-stringop-overread>)
 
-# What the second build of each library is made with, that the tests are linked to as well.
+# What the second build of each library is made with, that the tests are linked to as well. Optimising would cost
+# more time than it saves the tests.
 add_library(qrx_sanitizers INTERFACE)
 set(QRX_SANITIZER_FLAGS -fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
-target_compile_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS} -O1 -g1)
+target_compile_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS} -O0 -g1)
 target_link_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS})
 
 # qrx_sanitized(LIST NAMES...): the targets of the second build where there are such, else the names as they are.

@@ -17,5 +17,8 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
 void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
 /// The part that only the deck writer's rules tell. To be asked of a model without errors.
 void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
+/// Writes the deck of "Default Model" to nowhere: says what is raised, unless it stands among the `told` ones,
+/// and how large a huge deck will be.
+void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink);
 
 #endif

@@ -20,6 +20,8 @@ std::vector<dck_IdleOption> dck_IdleGasketOptions(const odiK_Model& model);
 // What can be foreseen of a complete model, family by family: what its deck can't say, what raises, what no
 // step writes. Places are below the model.
 
+/// Element types that don't exist, node counts and faces that don't fit a type, names of sets with a dot.
+void dck_CheckElements(const odiK_Model& model, fnd_Sink& sink);
 /// Elements without a section or with one that they can't take, idle materials, options that gaskets or
 /// materials that are none leave out.
 void dck_CheckSections(const odiK_Model& model, fnd_Sink& sink);
@@ -33,5 +35,17 @@ void dck_CheckConstraints(const odiK_Model& model, fnd_Sink& sink);
 /// allow and what is written instead, objects that aren't there. Suppressed requests are passed over; what
 /// holds in several steps is said of the first.
 void dck_CheckRequests(const odiK_Model& model, fnd_Sink& sink);
+
+/// What procedures need of materials and elements; steps of both solvers in one job.
+void dck_CheckProcedures(const odiK_Model& model, fnd_Sink& sink);
+/// What contradicts itself: values of one degree of freedom, loads on held ones, ties and contact pairs whose
+/// two sides are one.
+void dck_CheckConflicts(const odiK_Model& model, fnd_Sink& sink);
+/// States that say nothing: in steps out of reach, without components, with intervals that don't count, with
+/// amplitudes that end too early.
+void dck_CheckStates(const odiK_Model& model, fnd_Sink& sink);
+/// What the model holds and no line of the deck carries: fields that decks don't know, nodes of the assembly,
+/// objects that nothing refers to.
+void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink);
 
 #endif

@@ -5,6 +5,7 @@
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kbcC_MotionBCs.h"
+#include "store_interface/records/conditions/kbcC_SupportBCs.h"
 
 #include <optional>
 #include <set>
@@ -49,6 +50,10 @@ void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
         if (bc.suppressed) continue;
         const std::string place = Place("boundaryConditions", name);
         FindOnRegion(bc, place, sink);
+        if (bc.DynTypeId() == kbcC_SymmetryBC::TypeId()) {
+            sink.Add("comment-only", place, "decks tell of a symmetry record in a comment only", {},
+                     "for symmetry take kbcC_TypeBC with XSYMM, YSYMM or ZSYMM");
+        }
         if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
             if (!elementSets) elementSets = ElementSetsOf(model);
             if (motion->connectors.IsEmpty()) {

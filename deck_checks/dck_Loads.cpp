@@ -98,7 +98,7 @@ void FindOnLoads(const oif_ModelInfo& info, fnd_Sink& sink) {
         if (failure != nullptr) {
             sink.Add("cannot-be-written", place, CannotCarry(failure));
         } else if (IsHeldByItsLength(load, steps)) {
-            sink.Add("comment-only", place,
+            sink.Add("held-by-length", place,
                      "decks tell of a bolt that is held by its length in a comment only");
         } else if (written.empty()) {
             sink.Add("never-written", place, "no step writes the load");

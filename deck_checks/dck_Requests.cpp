@@ -42,7 +42,7 @@ std::string Frequency(const korC_OutputState& state) {
 void FindOnFrequency(const korC_OutputState& state, const kprC_AnalysisStep& step, const cow_String& stepName,
                      bool isField, Report& report) {
     const korC_TypeEnm type = state.frequencyType.ConstGet();
-    if (Builder::IsAllowed(type, step, isField)) return;
+    if (oif_OutputCollector::IsAllowed(type, step, isField)) return;
     const std::string usual = isField ? Frequency(korC_FieldOutputState(step.DynTypeId()))
                                       : Frequency(korC_HistoryOutputState(step.DynTypeId()));
     report.AddInStep("output-not-allowed", stepName,

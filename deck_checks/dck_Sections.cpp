@@ -20,50 +20,6 @@ std::string Elements(int count) {
     return std::to_string(count) + (count == 1 ? " element" : " elements");
 }
 
-/// Collects the texts of all fields of a record, and of the records in it, that name objects of the kind.
-void CollectNames(const cls_FieldType& type, const void* value, const cls_Field& field, std::string_view kind,
-                  std::set<std::string>& names) {
-    switch (type.Kind()) {
-    case cls_FieldKind::String:
-        if (field.refersTo != nullptr && field.refersTo == kind) {
-            names.insert(Text(*static_cast<const cow_String*>(value)));
-        }
-        break;
-    case cls_FieldKind::List: {
-        const auto& list = static_cast<const cls_ListType&>(type);
-        for (int i = 0; i < list.Length(value); ++i) {
-            CollectNames(list.ItemType(), list.Item(value, i), field, kind, names);
-        }
-        break;
-    }
-    case cls_FieldKind::Record:
-    case cls_FieldKind::Optional:
-    case cls_FieldKind::Variant: {
-        const cls_Record* record = static_cast<const cls_HolderType&>(type).Get(value);
-        if (record == nullptr) break;
-        for (const cls_Field& each : record->DynFields().All()) {
-            CollectNames(*each.type, each.In(*record), each, kind, names);
-        }
-        break;
-    }
-    default: break;
-    }
-}
-
-void FindIdleMaterials(const odiK_Model& model, fnd_Sink& sink) {
-    std::set<std::string> used;
-    for (mdl_RepositoryIT it(model.sections); !it.IsDone(); it.Next()) {
-        const cls_Record& section = it.CurrentRecord();
-        for (const cls_Field& field : section.DynFields().All()) {
-            CollectNames(*field.type, field.In(section), field, "material", used);
-        }
-    }
-    for (mdl_RepositoryIT it(model.materials); !it.IsDone(); it.Next()) {
-        if (used.count(Text(it.CurrentKey())) != 0) continue;
-        sink.Add("idle-material", Place("materials", it.CurrentKey()), "no section uses the material");
-    }
-}
-
 bool NeedsSection(const cow_String& label) {
     // Surface elements are not written at all.
     if (label.View().find("SURF") != std::string_view::npos) return false;
@@ -186,7 +142,6 @@ std::vector<dck_IdleOption> dck_IdleGasketOptions(const odiK_Model& model) {
 
 void dck_CheckSections(const odiK_Model& model, fnd_Sink& sink) {
     FindSectionsOfMeshes(model, sink);
-    FindIdleMaterials(model, sink);
     for (const dck_IdleOption& idle : dck_IdleGasketOptions(model)) {
         sink.Add("not-in-deck", Place("materials", idle.material).append("/").append(idle.option),
                  idle.ofGasket

@@ -53,11 +53,6 @@ void mdf_MeshReader::ReadAssemblyMesh(mdf_Value& json, const fnd_Path& path) {
     }
     mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
     ReadNodesAndElements(mesh, json, path, true);
-    if (mesh.Nodes().NumNodes() > 0) {
-        diagnostics_.Add("assembly-nodes", fnd_Path(path, "nodes"),
-                         "the assembly's own " + std::to_string(mesh.Nodes().NumNodes()) +
-                             " nodes reach no deck");
-    }
 }
 
 void mdf_MeshReader::ReadNodes(odiK_Mesh& mesh, mdf_Value& json, const fnd_Path& path) {

@@ -83,6 +83,31 @@ std::string NameList(const std::vector<std::string>& names) {
     return text;
 }
 
+ordered_json JsonOf(const std::vector<dck_LeftOut>& leftOut) {
+    ordered_json entries = ordered_json::array();
+    for (const dck_LeftOut& entry : leftOut) {
+        entries.push_back(
+            {{"what", entry.what}, {"why", entry.why}, {"count", entry.count}, {"names", entry.names}});
+    }
+    return entries;
+}
+
+void PrintLeftOut(const std::vector<dck_LeftOut>& leftOut, std::size_t width, RunReport& report) {
+    if (leftOut.empty()) return;
+    report.Print("left out, since a deck can't carry it:\n");
+    for (const dck_LeftOut& entry : leftOut) {
+        std::string text = std::string(entry.what) + " (" + entry.why + ")";
+        if (!entry.names.empty()) text += ": " + NameList(entry.names);
+        report.Print(CountLine(Grouped(entry.count), text, width));
+    }
+}
+
+std::size_t WidthOf(const std::vector<dck_LeftOut>& leftOut) {
+    std::size_t width = 0;
+    for (const dck_LeftOut& entry : leftOut) width = std::max(width, Grouped(entry.count).size());
+    return width;
+}
+
 void Summarise(const std::string& target, const DeckFile::Result& result, double seconds,
                const std::vector<dck_KindCount>& counts, const std::vector<dck_LeftOut>& leftOut,
                RunReport& report) {
@@ -91,27 +116,17 @@ void Summarise(const std::string& target, const DeckFile::Result& result, double
         written = {{"target", target}, {"bytes", result.bytes}, {"seconds", seconds}};
         ordered_json& byKind = written["counts"] = ordered_json::object();
         for (const dck_KindCount& kind : counts) byKind[kind.key] = kind.count;
-        ordered_json& missing = written["leftOut"] = ordered_json::array();
-        for (const dck_LeftOut& entry : leftOut) {
-            missing.push_back(
-                {{"what", entry.what}, {"why", entry.why}, {"count", entry.count}, {"names", entry.names}});
-        }
+        written["leftOut"] = JsonOf(leftOut);
         return;
     }
-    std::size_t width = 0;
+    std::size_t width = WidthOf(leftOut);
     for (const dck_KindCount& kind : counts) width = std::max(width, Grouped(kind.count).size());
-    for (const dck_LeftOut& entry : leftOut) width = std::max(width, Grouped(entry.count).size());
     char time[32];
     std::snprintf(time, sizeof time, "%.2f s", seconds);
     report.Print(target + ": " + Grouped(result.bytes) + " bytes in " + time + "\n");
     if (!counts.empty()) report.Print("written:\n");
     for (const dck_KindCount& kind : counts) report.Print(CountLine(Grouped(kind.count), kind.name, width));
-    if (!leftOut.empty()) report.Print("left out, since a deck can't carry it:\n");
-    for (const dck_LeftOut& entry : leftOut) {
-        std::string text = std::string(entry.what) + " (" + entry.why + ")";
-        if (!entry.names.empty()) text += ": " + NameList(entry.names);
-        report.Print(CountLine(Grouped(entry.count), text, width));
-    }
+    PrintLeftOut(leftOut, width, report);
 }
 
 /// Replaces the file as a whole; false, with the reason, when the file system refuses. What `write` raises
@@ -197,8 +212,13 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     if (odb == nullptr) return code;
     fnd_List list;
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
+    dck_Rehearse(*odb, std::vector<fnd_Finding>(list.findings), list);
     for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
     report.Print(model + ": no errors\n");
+    const std::vector<dck_LeftOut> leftOut =
+        dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));
+    if (report.AsJson()) report.Member("leftOut") = JsonOf(leftOut);
+    PrintLeftOut(leftOut, WidthOf(leftOut), report);
     return code;
 }
 

@@ -9,6 +9,7 @@ const fnd_RecordRules& fnd_RecordRules::All() {
         fnd_AddInteractionRules(all);
         fnd_AddLoadRules(all);
         fnd_AddMaterialRules(all);
+        fnd_AddMaterialValueRules(all);
         fnd_AddPartAttributeRules(all);
         fnd_AddSectionRules(all);
         fnd_AddStepRules(all);

@@ -23,6 +23,10 @@ void fnd_RecordCheck::NotNegative(const char* field, double value) {
     if (value < 0) Add("negative-number", field, "found " + fnd_Shown(value), "0 or more");
 }
 
+void fnd_RecordCheck::Positive(const char* field, double value) {
+    if (!(value > 0)) Add("not-positive", field, "found " + fnd_Shown(value), "more than 0");
+}
+
 void fnd_RecordRules::Run(const cls_Record& record, fnd_RecordCheck& check) const {
     const cls_ClassRegistrar& classes = cls_Classes();
     for (const cls_ClassEntry* entry = classes.Find(record.DynTypeId()); entry != nullptr;

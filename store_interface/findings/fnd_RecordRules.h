@@ -12,9 +12,11 @@
 class fnd_RecordCheck {
 public:
     fnd_RecordCheck(fnd_Sink& sink, const fnd_Path& path) : sink_(sink), path_(path) {}
-    void Add(fnd_CodeName code, const char* field, std::string found, std::string expected = {},
+    /// `field` is "" for the record as such.
+    void Add(fnd_CodeName code, std::string_view field, std::string found, std::string expected = {},
              std::string hint = {}) {
-        sink_.Add(code, fnd_Path(path_, std::string_view(field)), std::move(found), std::move(expected),
+        const fnd_Path member(path_, field);
+        sink_.Add(code, field.empty() ? path_ : member, std::move(found), std::move(expected),
                   std::move(hint));
     }
     /// An error unless the table has no rows, or as many columns as there are names, such as "time, value",
@@ -24,6 +26,8 @@ public:
     /// An error unless the number is 0 or more.
     void NotNegative(const char* field, int value);
     void NotNegative(const char* field, double value);
+    /// A warning unless the number is above 0.
+    void Positive(const char* field, double value);
 
 private:
     fnd_Sink& sink_;
@@ -78,6 +82,7 @@ void fnd_AddConnectorRules(fnd_RecordRules& rules);
 void fnd_AddInteractionRules(fnd_RecordRules& rules);
 void fnd_AddLoadRules(fnd_RecordRules& rules);
 void fnd_AddMaterialRules(fnd_RecordRules& rules);
+void fnd_AddMaterialValueRules(fnd_RecordRules& rules);
 void fnd_AddPartAttributeRules(fnd_RecordRules& rules);
 void fnd_AddSectionRules(fnd_RecordRules& rules);
 void fnd_AddStepRules(fnd_RecordRules& rules);

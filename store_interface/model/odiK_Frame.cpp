@@ -51,6 +51,10 @@ std::vector<odiK_AttributeInput>& BeamOrientationsOf(odiK_Part& part) {
     return part.attributes.beamOrientations;
 }
 
+constexpr char kNoConstants[] = "put the line of physical constants into topLevelSolverInput";
+constexpr char kNoRestart[] = "the job's command line says what it goes on from";
+constexpr char kNoGlobalJob[] = "the job's command line names the global job";
+
 } // namespace
 
 const cls_FieldTable& odiK_ModelData::Fields() {
@@ -63,14 +67,21 @@ const cls_FieldTable& odiK_ModelData::Fields() {
             .Field<&R::solverInput>("solverInput", "text that closes the model section")
             .Verbatim()
             .Field<&R::absoluteZero>("absoluteZero", "absolute zero on the temperature scale in use")
+            .NotInDeck(kNoConstants)
             .Field<&R::stefanBoltzmann>("stefanBoltzmann", "Stefan-Boltzmann constant in the units in use")
+            .NotInDeck(kNoConstants)
             .Field<&R::waveFormulation>("waveFormulation", "how acoustic waves from outside are formulated")
             .Words(kWaveFormulations)
             .Field<&R::restartJob>("restartJob", "job that this one goes on from")
+            .NotInDeck(kNoRestart)
             .Field<&R::restartStep>("restartStep", "step of that job to go on from")
+            .NotInDeck(kNoRestart)
             .Field<&R::restartIncrement>("restartIncrement", "increment of that step to go on from")
+            .NotInDeck(kNoRestart)
             .Field<&R::endRestartStep>("endRestartStep", "ends the step where the restart is read")
+            .NotInDeck(kNoRestart)
             .Field<&R::globalJob>("globalJob", "job of the global model that drives this submodel")
+            .NotInDeck(kNoGlobalJob)
             .Field<&R::shellToSolid>("shellToSolid", "the global model is of shells, the submodel of solids")
             .Field<&R::analysisProduct>(
                 "analysisProduct", "without it EXPLICIT when an analysis step is explicit, else STANDARD")

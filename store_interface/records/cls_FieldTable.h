@@ -221,6 +221,8 @@ struct cls_Field {
     bool required = false;
     /// Filled by the store or a program, never by a model file.
     bool notModelData = false;
+    /// Why no deck ever tells of the field, with what to do instead; null for fields that decks tell of.
+    const char* notInDeck = nullptr;
     cls_BaseStateRule baseState = cls_BaseStateRule::Carried;
 
     /// Null for a part of the tree that is no member of the record.
@@ -334,6 +336,10 @@ public:
     }
     cls_Describe& Length(int length) {
         fields_.back().length = length;
+        return *this;
+    }
+    cls_Describe& NotInDeck(const char* why) {
+        fields_.back().notInDeck = why;
         return *this;
     }
     cls_Describe& Verbatim() {

@@ -72,7 +72,9 @@ TEST(Check, StoreWithoutErrors_IsToldWhatItsDeckLeavesOut) {
     TestStore store;
     store.model.steps.Append("Initial", kprC_InitialStep());
     store.model.materials.Insert("Steel", kmaC_Material());
-    EXPECT_EQ(Found(store.odb), Texts{"idle-material /materials/Steel: no section uses the material"});
+    EXPECT_EQ(Found(store.odb),
+              (Texts{"empty-material /materials/Steel: found no option, expected one at least",
+                     "unused /materials: nothing uses 1 of the materials: Steel"}));
 }
 
 TEST(Check, Codes_EachNamedOnce_HaveAMeaning) {

@@ -2,15 +2,20 @@
 #define QRX_TESTS_DECK_CHECKS_FINDINGSTEST_H
 
 #include "deck_checks/dck_Check.h"
+#include "deck_checks/dck_Checks.h"
 #include "model_file/mdf_ModelFile.h"
+#include "store_interface/model/odiK_Model.h"
 
 #include <gtest/gtest.h>
 
 using Texts = std::vector<std::string>;
 
-/// "place: text" of what the deck of a model can't say, for the places that begin so. `members` are those of
-/// the model; places are below it.
-inline Texts DeckFindings(const std::string& members, const std::string& place = {}) {
+/// Which findings of a store are wanted.
+using Finder = void (*)(const odb_Odb& odb, fnd_Sink& sink);
+
+/// "place: text" of what a check finds, for the places that begin so. `members` are those of the model;
+/// places are below it.
+inline Texts FindingsBy(Finder find, const std::string& members, const std::string& place = {}) {
     mdf_Report report;
     const auto odb = mdf_ReadModelText(
         R"({"format": "qrx-model/1", "models": {"Default Model": {)" + members + "}}}", "test", report);
@@ -20,14 +25,35 @@ inline Texts DeckFindings(const std::string& members, const std::string& place =
     Texts found;
     if (odb == nullptr) return found;
     fnd_List list;
-    dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
-    const std::string root = "/models/Default Model";
+    find(*odb, list);
     for (const fnd_Finding& finding : list.findings) {
-        EXPECT_EQ(finding.place.substr(0, root.size()), root);
-        const std::string below = finding.place.substr(root.size());
-        if (below.starts_with(place)) found.push_back(below + ": " + finding.Text());
+        if (finding.place.starts_with(place)) found.push_back(finding.place + ": " + finding.Text());
     }
     return found;
+}
+
+/// The findings of one family of checks.
+template <void (*Check)(const odiK_Model&, fnd_Sink&)>
+Texts FindingsOf(const std::string& members, const std::string& place = {}) {
+    return FindingsBy(
+        [](const odb_Odb& odb, fnd_Sink& sink) { Check(*odb.FindModel(odb_Odb::DefaultModelName()), sink); },
+        members, place);
+}
+
+/// What the deck of a model can't say, by all checks.
+inline Texts DeckFindings(const std::string& members, const std::string& place = {}) {
+    return FindingsBy(
+        [](const odb_Odb& odb, fnd_Sink& sink) {
+            fnd_List list;
+            dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
+            const std::string root = "/models/Default Model";
+            for (fnd_Finding& finding : list.findings) {
+                EXPECT_EQ(finding.place.substr(0, root.size()), root);
+                finding.place.erase(0, root.size());
+                sink.Take(std::move(finding));
+            }
+        },
+        members, place);
 }
 
 /// The same in a model of an instance I of one shell with the node set N, the element set E and the surface

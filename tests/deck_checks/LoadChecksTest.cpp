@@ -1,11 +1,18 @@
+#include "base/oif_ModelInfo.h"
 #include "deck_checks/FindingsTest.h"
+#include "store_interface/model/odb_Odb.h"
 
 namespace {
+
+void CheckLoadsOf(const odb_Odb& odb, fnd_Sink& sink) {
+    dck_CheckLoads(oif_ModelInfo(odb.ddb().model(odb_Odb::DefaultModelName())), sink);
+}
 
 /// "place: text" of each finding in a model with these loads or fields, on an instance A with a node set N,
 /// an element set E and a surface F; S1 and S2 are static steps.
 Texts Found(const std::string& container, const std::string& members, const std::string& stepMembers = "") {
-    return DeckFindings(R"(
+    return FindingsBy(CheckLoadsOf,
+                      R"(
         "parts": {"P": {"mesh": {
             "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
             "elements": [{"type": "T3D2", "labels": [1], "connectivity": [[1, 2]]}],
@@ -15,8 +22,8 @@ Texts Found(const std::string& container, const std::string& members, const std:
         "assembly": {"instances": {"A": {"part": "P"}}},
         "steps": [{"name": "S0", "class": "kprC_InitialStep"}, {"name": "S1", "class": "kprC_StaticStep"},
                   {"name": "S2", "class": "kprC_StaticLinearPerturbationStep")" +
-                            stepMembers + "}], \"" + container + "\": " + members,
-                        "/" + container);
+                          stepMembers + "}], \"" + container + "\": " + members,
+                      "/" + container);
 }
 
 Texts OfLoad(const std::string& className, const std::string& members, const std::string& stepMembers = "") {

@@ -20,65 +20,57 @@ const std::string kOnAll = R"(, "sectionAssignments": [{"region": "ALL", "sectio
 } // namespace
 
 TEST(ModelChecks, ElementsWithoutASection_AreCountedOnceForAllInstancesOfAPart) {
-    EXPECT_EQ(DeckFindings(Part("C3D8", "")), Texts{"/parts/P: 4 elements have no section"});
-    EXPECT_EQ(
-        DeckFindings(kSteel + kSolid +
-                     Part("C3D8", R"(, "sectionAssignments": [{"region": "SOME", "sectionName": "S"}])")),
-        Texts{"/parts/P: 1 element has no section"});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(Part("C3D8", "")), Texts{"/parts/P: 4 elements have no section"});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(
+                  kSteel + kSolid +
+                  Part("C3D8", R"(, "sectionAssignments": [{"region": "SOME", "sectionName": "S"}])")),
+              Texts{"/parts/P: 1 element has no section"});
 }
 
 TEST(ModelChecks, WholeModel_HasNothingToSay) {
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("C3D8", kOnAll)), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("C3D8", kOnAll)), Texts{});
 }
 
 TEST(ModelChecks, RigidSurfaceAndConnectorElements_NeedNoSection) {
-    EXPECT_EQ(DeckFindings(Part("R3D4", "")), Texts{});
-    EXPECT_EQ(DeckFindings(Part("SURF3D4", "")), Texts{});
-    EXPECT_EQ(DeckFindings(Part("CONN3D2", "")), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(Part("R3D4", "")), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(Part("SURF3D4", "")), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(Part("CONN3D2", "")), Texts{});
 }
 
 TEST(ModelChecks, ElementTypeThatCannotTakeTheSection_IsNamed) {
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("S4R", kOnAll)),
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("S4R", kOnAll)),
               Texts{"/parts/P: 4 elements of type 'S4R' can't take the section 'S' "
                     "(kseC_HomogenousSolidSection)"});
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("b31", kOnAll)),
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("b31", kOnAll)),
               Texts{"/parts/P: 4 elements of type 'b31' can't take the section 'S' "
                     "(kseC_HomogenousSolidSection)"});
 }
 
 TEST(ModelChecks, TrussElements_TakeSolidAndTrussSections) {
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("T3D2", kOnAll)), Texts{});
-    EXPECT_EQ(DeckFindings(kSteel +
-                           R"("sections": {"S": {"class": "kseC_TrussSection", "materialName": "Steel"}},)" +
-                           Part("T3D2", kOnAll)),
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("T3D2", kOnAll)), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(
+                  kSteel + R"("sections": {"S": {"class": "kseC_TrussSection", "materialName": "Steel"}},)" +
+                  Part("T3D2", kOnAll)),
               Texts{});
 }
 
 TEST(ModelChecks, UnknownElementType_TakesAnySection) {
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + Part("SPRINGA", kOnAll)), Texts{});
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("SPRINGA", kOnAll)), Texts{});
 }
 
 TEST(ModelChecks, LaterAssignment_DecidesWhichSectionAnElementHas) {
-    EXPECT_EQ(DeckFindings(kSteel + R"("sections": {
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(
+                  kSteel + R"("sections": {
                  "Shell": {"class": "kseC_HomogenousShellSection", "materialName": "Steel"},
                  "Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)" +
-                           Part("S4", R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"},
+                  Part("S4", R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"},
                                                               {"region": "SOME", "sectionName": "Shell"}])")),
               Texts{"/parts/P: 1 element of type 'S4' can't take the section 'Solid' "
                     "(kseC_HomogenousSolidSection)"});
 }
 
-TEST(ModelChecks, MaterialThatNoSectionUses_IsNamed) {
-    EXPECT_EQ(DeckFindings(R"("materials": {"a/b": {}, "Bars": {}, "Ply": {}, "Steel": {}},
-        "sections": {
-          "S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"},
-          "C": {"class": "kseC_CompositeShellSection", "layers": [{"materialName": "Ply"}],
-                "rebars": {"layers": [{"name": "L", "materialName": "Bars"}]}}})"),
-              Texts{"/materials/a~1b: no section uses the material"});
-}
-
 TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
-    EXPECT_EQ(DeckFindings(kSteel + kSolid + R"("parts": {"P": {"mesh": {
+    EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + R"("parts": {"P": {"mesh": {
         "nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
         "elements": [{"type": "MASS", "labels": [1], "connectivity": [[1]]}],
         "sets": [{"name": "ALL", "kind": "element", "labels": [1]}]}}},
@@ -92,16 +84,17 @@ TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
 namespace {
 
 /// Findings on a condition "B", or on conditions given whole, on a mesh that needs no section.
-Texts ConditionDeckFindings(const std::string& conditions, const std::string& loadCases = "") {
+Texts ConditionFindings(const std::string& conditions, const std::string& loadCases = "") {
     const std::string mesh = R"("parts": {"P": {"mesh": {
         "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]},
         "elements": [{"type": "CONN3D2", "labels": [1], "connectivity": [[1, 2]]}],
         "sets": [{"name": "N", "kind": "node", "labels": [1]}, {"name": "E", "kind": "element", "labels": [1]},
                  {"name": "S", "kind": "surface", "facets": [[1, "END1"]]}]}}},
         "assembly": {"instances": {"A": {"part": "P"}}})";
-    return DeckFindings(mesh + R"(, "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
+    return FindingsOf<dck_CheckConditions>(mesh +
+                                           R"(, "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
         {"name": "Linear", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {)" +
-                        loadCases + R"(}}], "boundaryConditions": {)" + conditions + "}");
+                                           loadCases + R"(}}], "boundaryConditions": {)" + conditions + "}");
 }
 
 const std::string kPlace = "/boundaryConditions/";
@@ -110,7 +103,7 @@ const std::string kPlace = "/boundaryConditions/";
 
 TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
     EXPECT_EQ(
-        ConditionDeckFindings(R"(
+        ConditionFindings(R"(
         "element": {"class": "kbcC_DisplacementBC", "region": "A.E", "states": {"Initial": {"u1": 0}}},
         "none": {"class": "kbcC_TypeBC", "states": {"Initial": {"typeName": 0}}},
         "right": {"class": "kbcC_PorePressureBC", "region": "A.N", "states": {"Initial": {"magnitude": 0}}},
@@ -123,7 +116,7 @@ TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
 
 TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
     EXPECT_EQ(
-        ConditionDeckFindings(R"(
+        ConditionFindings(R"(
         "nodes": {"class": "kbcC_ConnVelocityBC", "region": "A.N", "connectors": ["A.E", "A.N"],
                   "states": {"Initial": {"v1": 0}}},
         "nothing": {"class": "kbcC_ConnVelocityBC", "region": "A.E", "states": {"Initial": {"v1": 0}}},
@@ -137,25 +130,24 @@ TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
 }
 
 TEST(ModelChecks, ConditionThatNoStepWrites_IsTold) {
-    EXPECT_EQ(ConditionDeckFindings(R"(
+    EXPECT_EQ(ConditionFindings(R"(
         "left out": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
         "taken": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
         "without states": {"class": "kbcC_TypeBC", "region": "A.N"})",
-                                    R"("case": {"bcs": {"taken": 1}})"),
+                                R"("case": {"bcs": {"taken": 1}})"),
               (Texts{kPlace + "left out: no step writes the condition",
                      kPlace + "without states: no step writes the condition"}));
 }
 
 TEST(MaterialChecks, GasketOptionsWithoutAGasketSection_AreNamed) {
-    const Texts found =
-        DeckFindings(R"("materials": {"M": {"transShearElastic": {}, "membraneElastic": {}}})");
+    const Texts found = FindingsOf<dck_CheckSections>(
+        R"("materials": {"M": {"transShearElastic": {}, "membraneElastic": {}}})");
     const std::string left = ": no gasket section names this material, so this will not stand in the deck";
-    EXPECT_EQ(found, (Texts{"/materials/M: no section uses the material",
-                            "/materials/M/transShearElastic" + left, "/materials/M/membraneElastic" + left}));
+    EXPECT_EQ(found, (Texts{"/materials/M/transShearElastic" + left, "/materials/M/membraneElastic" + left}));
 }
 
 TEST(MaterialChecks, OtherOptionsOfAGasket_AreNamed) {
-    const Texts found = DeckFindings(
+    const Texts found = FindingsOf<dck_CheckSections>(
         R"("materials": {"M": {"membraneElastic": {}, "density": {}, "creep": {}, "regularization": {}}},
            "sections": {"S": {"class": "kseC_GasketSection", "materialName": "M"}})");
     const std::string left =

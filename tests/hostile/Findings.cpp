@@ -12,14 +12,15 @@ std::vector<std::string> Findings(std::string_view text) {
         // What the program prints begins with the file, the place in it and the kind.
         const std::string place =
             each.line > 0 ? std::to_string(each.line) + ":" + std::to_string(each.column) + ":" : "";
-        const std::string head = "m.json:" + place + (each.IsError() ? " error: " : " warning: ");
+        const std::string kind = fnd_SeverityWord(each.code->severity);
+        const std::string head = "m.json:" + place + " " + kind + ": ";
         EXPECT_EQ(line.substr(0, head.size()), head);
         std::string finding = line.substr(head.size());
         constexpr std::string_view prefix = "/models/Default Model";
         if (finding.starts_with(prefix)) finding.replace(0, prefix.size(), "@");
         if (!place.empty()) finding.insert(0, place + " ");
         if (each.place.empty() && place.empty()) finding.insert(0, ": ");
-        findings.push_back((each.IsError() ? "" : "warning ") + finding);
+        findings.push_back((each.IsError() ? "" : kind + " ") + finding);
     }
     return findings;
 }

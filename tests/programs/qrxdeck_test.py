@@ -474,10 +474,10 @@ class OtherCommands(ProgramTest):
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
         run = self.run_program("check", "model.json")
         self.assertEqual((run.returncode, run.errors),
-                         (0, "model.json: warning: /models/Default Model/materials/RING: no section uses the "
-                             "material\n"
-                             "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
-                             "gasket section names this material, so this will not stand in the deck\n"))
+                         (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
+                             "gasket section names this material, so this will not stand in the deck\n"
+                             "model.json: note: /models/Default Model/materials: nothing uses 1 of the "
+                             "materials: RING\n"))
         run = self.run_program("write", "model.json")
         self.assertRegex(run.output, r"left out, since a deck can't carry it:\n +1  gasket options \(no gasket "
                                      r"section names their materials\): RING membraneElastic\n$")

@@ -41,7 +41,8 @@ ROOMS = {
         ["sections"],
         ["connectors"],
         ["assembly", "steps", "conditions", "constraints"],
-        ["interactions", "output"],
+        ["interactions"],
+        ["output"],
         ["deck"],
     ],
 }

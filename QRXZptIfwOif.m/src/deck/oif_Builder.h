@@ -27,8 +27,10 @@ public:
     oif_Builder& operator=(const oif_Builder&) = delete;
 
     /// Deletes an old file of the name and writes the deck. False when the file can't be opened; whether all
-    /// bytes arrived tells qio_LastReport(). May be called once.
+    /// bytes arrived tells qio_LastReport().
     bool WriteInputFile(const cow_String& fileName);
+    /// Writes the deck to a device. One of the two may be called, once.
+    void WriteTo(qio_ostream& device);
 
 private:
     void BuildComponents();

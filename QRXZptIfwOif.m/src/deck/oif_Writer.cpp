@@ -9,3 +9,8 @@ void oif_Writer::WriteInputFile(const char* jobName) {
     oif_Builder builder(modelInfo);
     builder.WriteInputFile(fileName);
 }
+
+void oif_Writer::WriteTo(qio_ostream& device) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_Builder(modelInfo).WriteTo(device);
+}

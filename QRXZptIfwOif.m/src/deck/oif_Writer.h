@@ -2,6 +2,7 @@
 #define QRX_OIF_WRITER_H
 
 class odb_Odb;
+class qio_ostream;
 
 /// The way in: writes the model named "Default Model" of an open store as a deck.
 class oif_Writer {
@@ -14,6 +15,8 @@ public:
     /// qio_LastReport() tells. Raises QRXBasException (with a context) when the model can't be told in the
     /// deck's language; the file then stays as far as it was written.
     void WriteInputFile(const char* jobName);
+    /// The same text, handed to a device of the caller's piece by piece. Raises likewise.
+    void WriteTo(qio_ostream& device);
 
 private:
     const odb_Odb& odb_;

@@ -1,13 +1,13 @@
 #include "output/oif_OutputRequestBuilder.h"
 
 #include "base/oif_Comment.h"
+#include "interactions/oif_InteractionRow.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "mesh/oif_SetName.h"
 #include "output/oif_Output.h"
 #include "steps/oif_StepControls.h"
 #include "steps/oif_StepRequests.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
-#include "store_interface/records/conditions/kloC_BoltLoad.h"
 #include "store_interface/records/interactions/kinC_Contact.h"
 #include "store_interface/records/steps/kprC_Predicates.h"
 
@@ -47,45 +47,16 @@ bool IsElementRegion(const rgnC_Region& region) {
     return (flags & kElementContent) != 0 && (flags & (kNodeContent | kOtherContent)) == 0;
 }
 
-bool Holds(const cow_List<cow_String>& names, const cow_String& name) {
-    for (int i = 0; i < names.Length(); ++i) {
-        if (names[i] == name) return true;
-    }
-    return false;
-}
-
 /// The first name with the suffix, as decks print it; empty for none.
 cow_String FirstWith(const cow_List<cow_String>& names, const char* suffix) {
     if (names.IsEmpty()) return {};
     return qkw_QuorixName(names[0] + suffix, false).Printable();
 }
 
-/// Time points have another number in a request.
-korC_OdbRequest::TypeEnm RequestType(korC_TypeEnm type) {
-    return type == korC_TypeEnm::TIME_POINTS ? korC_OdbRequest::TypeEnm::TIME_POINTS
-                                             : static_cast<korC_OdbRequest::TypeEnm>(type);
-}
-
-void TakeFrequency(korC_TypeEnm type, const korC_OutputState& state, korC_OdbRequest& request) {
-    switch (type) {
-    case korC_TypeEnm::FREQUENCY: request.frequency = state.frequency.ConstGet(); break;
-    case korC_TypeEnm::NUMBER_INTERVAL: request.numberInterval = state.numberInterval.ConstGet(); break;
-    case korC_TypeEnm::TIME_INTERVAL: request.timeInterval = state.timeInterval.ConstGet(); break;
-    case korC_TypeEnm::MODE_LIST: request.modeList = state.modeList.ConstGet(); break;
-    case korC_TypeEnm::TIME_POINTS: request.timePoints = state.timePoints.ConstGet(); break;
-    }
-}
-
 } // namespace
 
-oif_OutputRequestBuilder::oif_OutputRequestBuilder(oif_ModelInfo& modelInfo) : oif_ComponentOf(modelInfo) {
-    for (const auto& [key, rule] : Model().RemeshingRules()) {
-        if (!rule.suppressed && !Holds(remeshingSteps_, rule.stepName)) remeshingSteps_.Append(rule.stepName);
-    }
-}
-
 void oif_OutputRequestBuilder::Build() {
-    hasSimBasedStep_ = false;
+    oif_OutputCollector requests(Model());
     mdl_ObjCow<kprC_DiagnosticPrint> print;
     kprC_StepContainerIT it(Model().Steps());
     if (it.IsDone()) return;
@@ -93,14 +64,13 @@ void oif_OutputRequestBuilder::Build() {
         const cow_String& stepName = it.CurrentKey();
         const nex_Context context("step", stepName);
         const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(it.CurrentValue(), NEX_HERE);
-        // Earlier steps don't know of it yet.
-        if (!step.suppressed && step.SimBased()) hasSimBasedStep_ = true;
+        requests.Enter(step);
         AddSolutionControls(step, stepName);
         AddSolverControls(step, stepName);
         const cow_String monitorSet = GetMonitorSetName(step);
-        const bool hasField = HasFieldRequest(stepName);
+        const bool hasField = requests.HasField(stepName);
         // Load cases have no history.
-        const bool hasHistory = step.loadCases.IsEmpty() && HasHistoryRequest(stepName);
+        const bool hasHistory = step.loadCases.IsEmpty() && requests.HasHistory(stepName);
         if (hasField || hasHistory || !step.restart.IsNull() || !step.diagnosticPrint.IsNull() ||
             !monitorSet.IsEmpty()) {
             AddStepDefinition(stepName, oif_Comment("\nOUTPUT REQUESTS\n"));
@@ -109,15 +79,16 @@ void oif_OutputRequestBuilder::Build() {
         AddDiagnosticPrint(step, stepName, print);
         if (!monitorSet.IsEmpty()) AddStepDefinition(stepName, oif_Monitor(step.monitor, monitorSet));
         const unsigned stepType = step.DynTypeId();
-        const Place place{step, stepName, stepType, kprC_IsExplicit(stepType) ? step.TimePeriod() : 0.0};
+        const oif_OutputPlace place{step, stepName, stepType,
+                                    kprC_IsExplicit(stepType) ? step.TimePeriod() : 0.0};
         if (hasField) {
             cow_List<cow_String> names;
-            const Channel channel = GetField(place, names);
+            const Channel channel = requests.GetField(place, names);
             CreateOdbRequests(channel, place, names);
         }
         if (hasHistory) {
             cow_List<cow_String> names;
-            const Channel channel = GetHistory(place, names);
+            const Channel channel = requests.GetHistory(place, names);
             CreateOdbRequests(channel, place, names);
         }
     }
@@ -173,150 +144,6 @@ cow_String oif_OutputRequestBuilder::GetMonitorSetName(const kprC_AnalysisStep& 
     return oif_RegionName(region, ModelInfo());
 }
 
-bool oif_OutputRequestBuilder::RefersToSomething(const korC_Output& output) const {
-    if (!output.boltLoad.IsEmpty()) {
-        if (!Model().Loads().IsMember(output.boltLoad)) return false;
-        const kloC_Load& load = Model().Loads().ConstGet(output.boltLoad);
-        return load.DynTypeId() == kloC_BoltLoad::TypeId() && !load.suppressed;
-    }
-    const cow_String interaction = GetInteractionSetName(output.interactions);
-    return Model().Interactions().IsMember(interaction) &&
-           !Model().Interactions().ConstGet(interaction).suppressed;
-}
-
-bool oif_OutputRequestBuilder::HasFieldRequest(const cow_String& stepName) const {
-    // Requests that end here or are suppressed count: the step has to stop the output of the one before it.
-    for (const auto& [key, output] : Model().FieldOutputs()) {
-        if (!output.HasStep(stepName)) continue;
-        const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
-        if (isPlain || RefersToSomething(output)) return true;
-    }
-    return Holds(remeshingSteps_, stepName);
-}
-
-bool oif_OutputRequestBuilder::HasHistoryRequest(const cow_String& stepName) const {
-    for (const auto& [key, output] : Model().HistoryOutputs()) {
-        if (!output.HasStep(stepName)) continue;
-        const bool isPlain = output.boltLoad.IsEmpty() && output.interactions.IsEmpty();
-        // Springs alone are no reason for output.
-        if (isPlain ? output.springs.IsEmpty() : RefersToSomething(output)) return true;
-    }
-    return false;
-}
-
-bool oif_OutputRequestBuilder::IsAllowed(korC_TypeEnm type, const kprC_AnalysisStep& step, bool isField) {
-    const unsigned stepType = step.DynTypeId();
-    switch (type) {
-    case korC_TypeEnm::FREQUENCY: return kprC_OutputFrequencyIsAllowed(stepType, isField);
-    case korC_TypeEnm::NUMBER_INTERVAL: return kprC_NumberIntervalIsAllowed(step);
-    case korC_TypeEnm::TIME_INTERVAL: return kprC_TimeIntervalIsAllowed(stepType);
-    case korC_TypeEnm::TIME_POINTS: return kprC_TimePointIsAllowed(stepType, isField);
-    case korC_TypeEnm::MODE_LIST: return kprC_ModesIsAllowed(stepType);
-    }
-    return false;
-}
-
-void oif_OutputRequestBuilder::Merge(const Request& request, const cow_String& name, Channel& channel,
-                                     cow_List<cow_String>& names) {
-    for (int i = 0; i < channel.requests.Length(); ++i) {
-        if (!(channel.requests[i] == request)) continue;
-        names.Get(i) = names[i] + ", " + name;
-        return;
-    }
-    channel.requests.Append(request);
-    names.Append(name);
-}
-
-template <class State>
-void oif_OutputRequestBuilder::Collect(const korC_Output& output, const cow_String& name, const Place& place,
-                                       Request request, Channel& channel, cow_List<cow_String>& names) const {
-    const Domain domain = output.DomainType();
-    if (output.suppressed || domain == Domain::SPRINGS) return;
-    if (!korC_Output::IsActive(output.Status(place.stepName))) return;
-    const nex_Context context("output request", name);
-    request.region = output.region;
-    request.boltLoad = output.boltLoad;
-    request.sectionPoints = output.sectionPoints;
-    request.interactions = output.interactions;
-    request.filter = output.filter;
-    if (output.rebar == korC_RebarEnm::INCLUDE || output.rebar == korC_RebarEnm::ONLY) {
-        request.rebar = output.rebar;
-    }
-
-    State state = nex_canDynamicCastRef<State>(output.ConstGetState(place.stepName), NEX_HERE);
-    request.frequency = state.frequency.ConstGet();
-    request.numberInterval = state.numberInterval.ConstGet();
-    request.timeInterval = state.timeInterval.ConstGet();
-    request.modeList = state.modeList.ConstGet();
-    request.timeMarks = state.timeMarks.ConstGet();
-    request.timePoints = state.timePoints.ConstGet();
-    korC_TypeEnm type = state.frequencyType.ConstGet();
-    if (!IsAllowed(type, place.step, channel.IsField())) {
-        const State usual(place.stepType);
-        type = usual.frequencyType.ConstGet();
-        TakeFrequency(type, usual, request);
-    }
-    request.frequencyType = RequestType(type);
-
-    if (!state.variables.ConstGet().IsEmpty()) {
-        state.ReconstructVariables(place.stepType);
-        state.ConvertVariablesToVariablesSymbol(place.stepType, false);
-    }
-    request.variables = state.variables.ConstGet();
-    if (request.variables.IsEmpty()) {
-        // Names that the procedure doesn't know leave it to the type, the preselection by default.
-        const Table& table = Table::Instance();
-        request.variablesType = state.variablesType.ConstGet();
-        if (request.variablesType == korC_VariablesTypeEnm::PRESELECT) {
-            request.variables = table.Defaults(channel.Type(), place.stepType, HasSimBasedStep(), domain, 0);
-        } else if (request.variablesType == korC_VariablesTypeEnm::ALL) {
-            request.variables = table.All(channel.Type(), place.stepType, domain, 0);
-        }
-        if (request.variables.IsEmpty()) return;
-    }
-    Merge(request, name, channel, names);
-}
-
-oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetField(const Place& place,
-                                                                     cow_List<cow_String>& names) const {
-    Channel channel(true);
-    for (const auto& [name, output] : Model().FieldOutputs()) {
-        Request request;
-        request.directions = output.directions;
-        Collect<korC_FieldOutputState>(output, name, place, request, channel, names);
-    }
-    if (Holds(remeshingSteps_, place.stepName)) CollectRemeshingRules(place, channel, names);
-    return channel;
-}
-
-oif_OutputRequestBuilder::Channel oif_OutputRequestBuilder::GetHistory(const Place& place,
-                                                                       cow_List<cow_String>& names) const {
-    Channel channel(false);
-    for (const auto& [name, output] : Model().HistoryOutputs()) {
-        Request request;
-        request.section = output.section;
-        request.springs = output.springs;
-        Collect<korC_HistoryOutputState>(output, name, place, request, channel, names);
-    }
-    return channel;
-}
-
-void oif_OutputRequestBuilder::CollectRemeshingRules(const Place& place, Channel& channel,
-                                                     cow_List<cow_String>& names) const {
-    for (const auto& [name, rule] : Model().RemeshingRules()) {
-        if (!(rule.stepName == place.stepName) || rule.suppressed || !rule.fieldOutput) continue;
-        Request request;
-        request.region = rule.region;
-        request.variables = rule.GetFullVariableList();
-        request.variables.Append("EVOL");
-        request.frequency = rule.EveryIncrement() ? Table::fieldFrequencyDef() : Table::lastIncrementDef();
-        request.timeMarks = !kprC_IsExplicit(place.stepType);
-        cow_String title = cow_String(" from REMESHING RULE: ") + name;
-        if (!rule.description.IsEmpty()) title = title + "\n" + rule.description;
-        Merge(request, title, channel, names);
-    }
-}
-
 bool oif_OutputRequestBuilder::IsScreenedOut(const Request& request, const Channel& channel,
                                              unsigned stepType) {
     const Table& table = Table::Instance();
@@ -330,7 +157,7 @@ bool oif_OutputRequestBuilder::IsScreenedOut(const Request& request, const Chann
            (!IsWritableElementRegion(request.region) && onlyOf(Print::ELEMENT, Print::ELEMENT_OR_CONTACT));
 }
 
-void oif_OutputRequestBuilder::CreateOdbRequests(const Channel& channel, const Place& place,
+void oif_OutputRequestBuilder::CreateOdbRequests(const Channel& channel, const oif_OutputPlace& place,
                                                  const cow_List<cow_String>& names) {
     cow_List<Request> requests;
     for (int i = 0; i < channel.requests.Length(); ++i) {
@@ -384,12 +211,13 @@ oif_OutputRequestBuilder::Traits oif_OutputRequestBuilder::TraitsOf(const Reques
     traits.all = request.variablesType == korC_VariablesTypeEnm::ALL;
     traits.whole = traits.domain == Domain::WHOLE_MODEL;
     if (traits.domain == Domain::SET) traits.setName = oif_RegionName(request.region, ModelInfo());
-    if (traits.domain == Domain::INTERACTION) traits.setName = GetInteractionSetName(request.interactions);
+    if (traits.domain == Domain::INTERACTION) traits.setName = oif_FirstInteraction(request.interactions);
     traits.hasSurface = traits.domain == Domain::CONTACT_SURFACE && !GetSurfaceName(request.region).IsEmpty();
     return traits;
 }
 
-void oif_OutputRequestBuilder::RequestNoOutput(const Channel& channel, const Place& place, bool pre) {
+void oif_OutputRequestBuilder::RequestNoOutput(const Channel& channel, const oif_OutputPlace& place,
+                                               bool pre) {
     Request none;
     if (channel.IsField() && kprC_ModesIsAllowed(place.stepType)) {
         none.frequencyType = Request::TypeEnm::MODE_LIST;
@@ -406,7 +234,7 @@ void oif_OutputRequestBuilder::RequestNoOutput(const Channel& channel, const Pla
 }
 
 void oif_OutputRequestBuilder::AddOutputDefinition(const Request& request, const Channel& channel,
-                                                   const Place& place, bool pre, bool all) {
+                                                   const oif_OutputPlace& place, bool pre, bool all) {
     using Type = Request::TypeEnm;
     const Type type = request.frequencyType;
     const unsigned stepType = place.stepType;
@@ -434,7 +262,7 @@ void oif_OutputRequestBuilder::AddOutputDefinition(const Request& request, const
 }
 
 void oif_OutputRequestBuilder::AddOutputSuboptions(const Request& request, const Channel& channel,
-                                                   const Place& place, const Traits& traits) {
+                                                   const oif_OutputPlace& place, const Traits& traits) {
     AddIntegratedOutput(request, place, traits);
     if (traits.domain == Domain::INTEGRATED_SECTION) return;
     const bool isContact = traits.domain == Domain::CONTACT_SURFACE || traits.domain == Domain::INTERACTION;
@@ -454,13 +282,13 @@ bool oif_OutputRequestBuilder::IsSilent(const Request& request, const Traits& tr
            (traits.whole && request.directions && (traits.pre || traits.all));
 }
 
-void oif_OutputRequestBuilder::AddIntegratedOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddIntegratedOutput(const Request& request, const oif_OutputPlace& place,
                                                    const Traits& traits) {
     if (request.section.IsEmpty() || IsSilent(request, traits)) return;
     AddStepDefinition(place.stepName, oif_IntegratedOutput(request, place.stepType, traits.pre, traits.all));
 }
 
-void oif_OutputRequestBuilder::AddNodeOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddNodeOutput(const Request& request, const oif_OutputPlace& place,
                                              const Traits& traits) {
     if (request.rebar == korC_RebarEnm::ONLY) return;
     // With section points the *Output line didn't say it all.
@@ -471,7 +299,7 @@ void oif_OutputRequestBuilder::AddNodeOutput(const Request& request, const Place
 }
 
 void oif_OutputRequestBuilder::AddElementOutput(const Request& request, const Channel& channel,
-                                                const Place& place, const Traits& traits,
+                                                const oif_OutputPlace& place, const Traits& traits,
                                                 const cow_String& secondName, bool force) {
     const auto add = [&](const cow_String& setName, bool rebar) {
         AddStepDefinition(place.stepName, oif_ElementOutput(channel, request, place.stepType, setName,
@@ -489,20 +317,20 @@ void oif_OutputRequestBuilder::AddElementOutput(const Request& request, const Ch
     if (allOfModel && request.rebar != korC_RebarEnm::EXCLUDE) add(traits.setName, true);
 }
 
-void oif_OutputRequestBuilder::AddModalOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddModalOutput(const Request& request, const oif_OutputPlace& place,
                                               const Traits& traits) {
     if (IsSilent(request, traits) || kprC_IsExplicit(place.stepType)) return;
     AddStepDefinition(place.stepName, oif_ModalOutput(request, place.stepType, traits.all));
 }
 
-void oif_OutputRequestBuilder::AddEnergyOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddEnergyOutput(const Request& request, const oif_OutputPlace& place,
                                                const Traits& traits) {
     if (IsSilent(request, traits) || !IsWritableElementRegion(request.region)) return;
     AddStepDefinition(place.stepName,
                       oif_EnergyOutput(request, place.stepType, traits.setName, traits.pre, traits.all));
 }
 
-void oif_OutputRequestBuilder::AddIncrementationOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddIncrementationOutput(const Request& request, const oif_OutputPlace& place,
                                                        const Traits& traits) {
     if (IsSilent(request, traits) || !kprC_IsExplicit(place.stepType)) return;
     AddStepDefinition(place.stepName,
@@ -510,26 +338,28 @@ void oif_OutputRequestBuilder::AddIncrementationOutput(const Request& request, c
 }
 
 void oif_OutputRequestBuilder::AddContactOutput(const Request& request, const Channel& channel,
-                                                const Place& place, const Traits& traits) {
+                                                const oif_OutputPlace& place, const Traits& traits) {
     if (IsSilent(request, traits)) return;
     cow_String master;
     cow_String slave;
     cow_String cpset;
-    const cow_String first = GetInteractionSetName(request.interactions);
+    const cow_String first = oif_FirstInteraction(request.interactions);
     if (Model().Interactions().IsMember(first)) {
         const kinC_Interaction& interaction = Model().Interactions().ConstGet(first);
-        const unsigned type = interaction.DynTypeId();
-        if (interaction.suppressed || !interaction.HasStep(place.stepName)) {
-            // A pair that isn't there in the step is not named.
-        } else if (type == kinC_SurfaceToSurfaceContactStd::TypeId()) {
-            const auto& pair = nex_canDynamicCastRef<kinC_SurfaceToSurfaceContact>(interaction, NEX_HERE);
-            master = GetSurfaceName(pair.master);
-            slave = GetSurfaceName(pair.slave);
-        } else if (type == kinC_SelfContactStd::TypeId()) {
-            master = GetSurfaceName(nex_canDynamicCastRef<kinC_SelfContact>(interaction, NEX_HERE).surface);
-        } else if (type == kinC_SurfaceToSurfaceContactXpl::TypeId() ||
-                   type == kinC_SelfContactXpl::TypeId()) {
-            cpset = first;
+        // A pair that isn't there in the step is not named.
+        const bool isThere = !interaction.suppressed && interaction.HasStep(place.stepName);
+        switch (isThere ? oif_SolverOf(interaction) : oif_ContactSolver::NONE) {
+        case oif_ContactSolver::NONE: break;
+        case oif_ContactSolver::IMPLICIT:
+            if (const auto* pair = nex_canDynamicCastPtr<kinC_SurfaceToSurfaceContact>(&interaction)) {
+                master = GetSurfaceName(pair->master);
+                slave = GetSurfaceName(pair->slave);
+            } else {
+                master =
+                    GetSurfaceName(nex_canDynamicCastRef<kinC_SelfContact>(interaction, NEX_HERE).surface);
+            }
+            break;
+        case oif_ContactSolver::EXPLICIT: cpset = first; break;
         }
     }
     if (!traits.hasSurface && traits.domain == Domain::SET) {
@@ -541,7 +371,7 @@ void oif_OutputRequestBuilder::AddContactOutput(const Request& request, const Ch
                                         oif_RegionName(request.region, ModelInfo()), !channel.IsField()));
 }
 
-void oif_OutputRequestBuilder::AddRadiationOutput(const Request& request, const Place& place,
+void oif_OutputRequestBuilder::AddRadiationOutput(const Request& request, const oif_OutputPlace& place,
                                                   const Traits& traits) {
     if (IsSilent(request, traits) || kprC_IsExplicit(place.stepType)) return;
     if (traits.domain == Domain::BOLT_LOAD || !IsWritableElementRegion(request.region)) return;
@@ -564,10 +394,6 @@ cow_String oif_OutputRequestBuilder::GetSpringSetName(const cow_List<cow_String>
 
 cow_String oif_OutputRequestBuilder::GetDashpotSetName(const cow_List<cow_String>& springs) {
     return FirstWith(springs, "-dashpot");
-}
-
-cow_String oif_OutputRequestBuilder::GetInteractionSetName(const cow_List<cow_String>& interactions) {
-    return interactions.IsEmpty() ? cow_String() : interactions[0];
 }
 
 const cls_Record* oif_OutputRequestBuilder::GetSpring(const cow_String&) {

@@ -1,5 +1,6 @@
 #include "sections/oif_BeamSections.h"
 
+#include "base/oif_ClassRows.h"
 #include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
@@ -89,17 +90,26 @@ void WriteProfileOf(utl_Stream& stream, const kbpC_TrapezoidalProfile& p) {
     WriteSimple(stream, "section=TRAPEZOID", {p.a, p.b, p.c, p.d});
 }
 
-template <class Profile>
-bool WriteIf(utl_Stream& stream, const kbpC_BeamProfile& profile) {
-    if (profile.DynTypeId() != Profile::TypeId()) return false;
-    WriteProfileOf(stream, nex_canDynamicCastRef<Profile>(profile, NEX_HERE));
-    return true;
-}
+struct ProfileRow {
+    unsigned typeId;
+    void (*write)(utl_Stream& stream, const kbpC_BeamProfile& profile);
 
-template <class... Profiles>
-bool WriteAnyOf(utl_Stream& stream, const kbpC_BeamProfile& profile) {
-    return (WriteIf<Profiles>(stream, profile) || ...);
-}
+    template <class Profile>
+    static constexpr ProfileRow Of() {
+        return {Profile::Class.Id(), [](utl_Stream& stream, const kbpC_BeamProfile& profile) {
+                    WriteProfileOf(stream, static_cast<const Profile&>(profile));
+                }};
+    }
+};
+
+/// The profiles whose line is the same in both kinds of beam sections.
+constexpr ProfileRow kProfiles[] = {
+    ProfileRow::Of<kbpC_CircularProfile>(),    ProfileRow::Of<kbpC_HexagonalProfile>(),
+    ProfileRow::Of<kbpC_PipeProfile>(),        ProfileRow::Of<kbpC_IbeamProfile>(),
+    ProfileRow::Of<kbpC_BoxProfile>(),         ProfileRow::Of<kbpC_ArbitraryProfile>(),
+    ProfileRow::Of<kbpC_RectangularProfile>(), ProfileRow::Of<kbpC_LbeamProfile>(),
+    ProfileRow::Of<kbpC_TbeamProfile>(),       ProfileRow::Of<kbpC_TrapezoidalProfile>(),
+};
 
 void WriteFluidInertia(utl_Stream& stream, const kseC_BeamSection& section) {
     stream << "*Beam Fluid Inertia";
@@ -156,17 +166,18 @@ void oif_BeamSectionCommon::WriteData(utl_Stream& stream) const {
     if (section_->DynTypeId() != kseC_BeamSection::TypeId()) return;
     const auto& section = nex_canDynamicCastRef<kseC_BeamSection>(section_.ConstGet(), NEX_HERE);
     const bool isGeneral = section.integration == Integration::BEFORE_ANALYSIS;
+    oif_KeywordLine line(stream, keyword_);
     // Each parameter brings the comma behind it.
-    stream << keyword_ << ", elset=" << setName_ << ", ";
-    stream.OptionalLineBreak();
+    line.Fixed(", elset=", setName_).Separator();
     if (section.integration == Integration::DURING_ANALYSIS) {
         WriteMaterialBehavior(stream, section);
         stream.OptionalLineBreak();
     }
     if (isGeneral) {
         // This one has a comma ahead too, so that two stand side by side.
-        if (section.dependencies > 0) stream << ", dependencies=" << section.dependencies << ", ";
-        stream.OptionalLineBreak();
+        line.FixedIf(section.dependencies > 0, ", dependencies=", section.dependencies)
+            .FixedIf(section.dependencies > 0, ", ")
+            .MayBreak();
     }
     if (IsGiven(section.poisson)) stream << "poisson = " << section.poisson << ", ";
     stream.OptionalLineBreak();
@@ -189,9 +200,9 @@ void oif_BeamSectionCommon::WriteProfile(utl_Stream& stream) const {
     const kbpC_BeamProfile& profile = profile_.ConstGet();
     if (profile.DynTypeId() == kbpC_GeneralizedProfile::TypeId()) {
         WriteGeneralizedProfile(stream, nex_canDynamicCastRef<kbpC_GeneralizedProfile>(profile, NEX_HERE));
-    } else if (!WriteAnyOf<kbpC_CircularProfile, kbpC_HexagonalProfile, kbpC_PipeProfile, kbpC_IbeamProfile,
-                           kbpC_BoxProfile, kbpC_ArbitraryProfile, kbpC_RectangularProfile, kbpC_LbeamProfile,
-                           kbpC_TbeamProfile, kbpC_TrapezoidalProfile>(stream, profile)) {
+    } else if (const ProfileRow* row = oif_FindRow(kProfiles, profile.DynTypeId())) {
+        row->write(stream, profile);
+    } else {
         stream.LineBreak();
     }
 }

@@ -1,5 +1,7 @@
 #include "sections/oif_ElementControls.h"
 
+#include "base/oif_KeywordLine.h"
+
 #include <cmath>
 #include <initializer_list>
 
@@ -13,10 +15,8 @@ bool Differ(double a, double b) {
 
 /// The parameter, if the value is one of those that have one.
 template <class E>
-void WriteWord(utl_Stream& stream, const char* name, E value, std::initializer_list<E> written) {
-    for (const E one : written) {
-        if (one == value) stream << name << omu_PrimEnum<E, 1>(value).GetString();
-    }
+void AddWord(oif_KeywordLine& line, const char* name, E value, std::initializer_list<E> written) {
+    for (const E one : written) line.FixedIf(one == value, name, value);
 }
 
 } // namespace
@@ -40,21 +40,22 @@ void oif_SectionControls::Write(utl_Stream& stream) const {
     using Split = Params::KinematicSplitEnm;
     using Hourglass = Params::HourglassEnm;
     const Params defaults;
-    stream << "*Section Controls, name=" << name_;
-    WriteWord(stream, ", DISTORTION CONTROL=", params_.distortionControl, {Distortion::YES, Distortion::NO});
-    if (params_.distortionControl == Distortion::YES && Differ(params_.lengthRatio, defaults.lengthRatio)) {
-        stream << ", length ratio=" << params_.lengthRatio;
-    }
-    WriteWord(stream, ", kinematic split=", params_.kinematicSplit, {Split::ORTHOGONAL, Split::CENTROID});
-    WriteWord(stream, ", hourglass=", params_.hourglass,
-              {Hourglass::RELAX_STIFFNESS, Hourglass::STIFFNESS, Hourglass::VISCOUS, Hourglass::COMBINED,
-               Hourglass::ENHANCED});
-    WriteWord(stream, ", second order accuracy=", params_.secondOrderAccuracy,
-              {Params::SecondOrderAccuracyEnm::YES});
-    WriteWord(stream, ", stress rate=", params_.stressRate, {Params::StressRateEnm::SPIN});
-    if (params_.hourglass == Hourglass::COMBINED && Differ(params_.weightFactor, defaults.weightFactor)) {
-        stream << ", weight factor=" << params_.weightFactor;
-    }
+    oif_KeywordLine line(stream, "*Section Controls, name=");
+    line.Text(name_);
+    AddWord(line, ", DISTORTION CONTROL=", params_.distortionControl, {Distortion::YES, Distortion::NO});
+    line.FixedIf(params_.distortionControl == Distortion::YES &&
+                     Differ(params_.lengthRatio, defaults.lengthRatio),
+                 ", length ratio=", params_.lengthRatio);
+    AddWord(line, ", kinematic split=", params_.kinematicSplit, {Split::ORTHOGONAL, Split::CENTROID});
+    AddWord(line, ", hourglass=", params_.hourglass,
+            {Hourglass::RELAX_STIFFNESS, Hourglass::STIFFNESS, Hourglass::VISCOUS, Hourglass::COMBINED,
+             Hourglass::ENHANCED});
+    AddWord(line, ", second order accuracy=", params_.secondOrderAccuracy,
+            {Params::SecondOrderAccuracyEnm::YES});
+    AddWord(line, ", stress rate=", params_.stressRate, {Params::StressRateEnm::SPIN});
+    line.FixedIf(params_.hourglass == Hourglass::COMBINED &&
+                     Differ(params_.weightFactor, defaults.weightFactor),
+                 ", weight factor=", params_.weightFactor);
     stream << endl
            << params_.displacementHourglass << ", " << params_.rotationalHourglass << ", "
            << params_.outOfPlaneHourglass;

@@ -164,7 +164,8 @@ const cls_FieldTable& korC_Output::Fields() {
             .Field<&R::rebar>("rebar", "whether element output is for rebar too, or only")
             .Field<&R::filter>("filter", "name of a filter of time, written as it stands")
             .RefersTo("filter")
-            .Field<&R::layupLocation>("layupLocation", "place of section points in the plies of a layup");
+            .Field<&R::layupLocation>("layupLocation", "place of section points in the plies of a layup")
+            .NotInDeck("sectionPoints say where");
     return fields;
 }
 

@@ -25,8 +25,42 @@ void CheckBeam(const kseC_BeamSection& section, fnd_RecordCheck& check) {
         }
         return;
     }
+    if (section.materialTable.IsEmpty()) {
+        check.Add("beam-without-moduli", "materialTable", "found no row",
+                  MaterialColumns(section) + ": a section integrated before the analysis takes no others");
+    }
     check.Columns("materialTable", section.materialTable, MaterialColumns(section).c_str(),
                   section.dependencies);
+}
+
+template <class Record>
+void CheckThickness(const Record& record, fnd_RecordCheck& check) {
+    check.Positive("thickness", record.thickness);
+}
+
+void CheckArea(const kseC_TrussSection& section, fnd_RecordCheck& check) {
+    check.Positive("area", section.area);
+}
+
+void CheckRebar(const kseC_RebarLayer& layer, fnd_RecordCheck& check) {
+    check.Positive("area", layer.area);
+}
+
+/// What may be zero: the distance of an I's origin from its lower edge, and of a trapezoid's from its base;
+/// the wall of a hexagon or box that is given by its first; integrals of a profile but for its area.
+bool MayBeZero(const kbpC_BeamProfile& profile, std::string_view field) {
+    if (profile.DynTypeId() == kbpC_GeneralizedProfile::TypeId()) return field != "area";
+    const auto* box = dynamic_cast<const kbpC_BoxProfile*>(&profile);
+    if (box != nullptr && box->uniformThickness) return field == "t2" || field == "t3" || field == "t4";
+    const bool isTrapezoid = profile.DynTypeId() == kbpC_TrapezoidalProfile::TypeId();
+    return field == "l" || (isTrapezoid && field == "d");
+}
+
+void CheckProfile(const kbpC_BeamProfile& profile, fnd_RecordCheck& check) {
+    for (const cls_Field& field : profile.DynFields().All()) {
+        if (field.type->Kind() != cls_FieldKind::Double || MayBeZero(profile, field.name)) continue;
+        check.Positive(field.name, *static_cast<const double*>(field.In(profile)));
+    }
 }
 
 void CheckShell(const kseC_GeometryShellSection& shell, fnd_RecordCheck& check) {
@@ -65,4 +99,12 @@ void fnd_AddSectionRules(fnd_RecordRules& rules) {
     rules.Add<CheckGeneralShell<kseC_GeneralShellSection>>();
     rules.Add<CheckGeneralShell<kseC_UserShellSection>>();
     rules.Add<CheckArbitraryProfile>();
+    rules.Add<CheckThickness<kseC_HomogenousShellSection>>();
+    rules.Add<CheckThickness<kseC_CompositeShellLayer>>();
+    rules.Add<CheckThickness<kseC_HomogenousSolidSection>>();
+    rules.Add<CheckThickness<kseC_CompositeSolidLayer>>();
+    rules.Add<CheckThickness<kseC_MembraneSection>>();
+    rules.Add<CheckArea>();
+    rules.Add<CheckRebar>();
+    rules.Add<CheckProfile>();
 }

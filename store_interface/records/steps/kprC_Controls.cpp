@@ -79,7 +79,8 @@ const cls_FieldTable& kprC_PrimaryControls::Fields() {
             .DefaultItems<DefaultLineSearchItems>()
             .Field<&R::quasiNewtonMaxIterations>(
                 "quasiNewtonMaxIterations",
-                "line search iterations of the quasi-Newton technique; stored, never written");
+                "line search iterations of the quasi-Newton technique; stored, never written")
+            .NotInDeck("lineSearch has the iterations");
     return fields;
 }
 

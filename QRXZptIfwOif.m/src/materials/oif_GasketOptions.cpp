@@ -7,61 +7,7 @@ void GasketDependencies(oif_OptionLine& line, int dependencies) {
     line.BreakingUnless("dependencies=", dependencies, 0);
 }
 
-void WriteConstants(utl_Stream& stream, const kmaC_UserMaterial& option, const cow_List<double>& constants,
-                    const char* type) {
-    oif_OptionLine line(stream, "*User Material");
-    line.Breaking("constants=", constants.Length());
-    if (type != nullptr) line.Breaking(type);
-    line.BreakingIf(option.unsymm, "unsymm").End();
-    stream << oif_TableOfOneRow([&](int i) { return constants[i]; }, constants.Length());
-}
-
 } // namespace
-
-void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_AcousticMedium& option) {
-    // The break, if any, comes ahead of the comma.
-    const auto start = [&](const char* text, int dependencies) {
-        stream << text;
-        if (dependencies > 0) stream << ", dependencies=" << dependencies;
-        stream.LineBreak();
-    };
-    stream << keyword;
-    stream.OptionalLineBreak();
-    start("", option.dependencies);
-    stream << oif_DependentTable(option);
-    if (!option.volumetricDrag) return;
-    start("*Acoustic Medium, Volumetric Drag", option.volumetricDragDependencies);
-    stream << oif_DependentTable(option.volumetricDragTable, option.volumetricDragDependencies,
-                                 option.volumetricDragTemperatureDependency);
-}
-
-void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_Sorption& option) {
-    oif_OptionLine(stream, keyword)
-        .BreakingUnless("law=", option.lawAbsorption, option.lawAbsorptionDef())
-        .End();
-    stream << oif_PlainTable(option.absorptionTable);
-    if (!option.exsorption) return;
-    oif_OptionLine(stream, "*Sorption, type=Exsorption")
-        .BreakingUnless("law=", option.lawExsorption, option.lawExsorptionDef())
-        .End();
-    stream << oif_PlainTable(option.exsorptionTable);
-    if (option.scanning == option.scanningDef()) return;
-    stream << "*Sorption, type=Scanning";
-    stream.LineBreak();
-    stream << option.scanning;
-    stream.LineBreak();
-}
-
-void oif_WriteSpecial(utl_Stream& stream, const char*, const kmaC_UserMaterial& option) {
-    using Type = kmaC_UserMaterial::TypeEnm;
-    if (option.type != Type::THERMAL) {
-        WriteConstants(stream, option, option.mechanicalConstants,
-                       option.type == Type::MECHANICAL ? nullptr : "type=MECHANICAL");
-    }
-    if (option.type != Type::MECHANICAL) {
-        WriteConstants(stream, option, option.thermalConstants, "type=THERMAL");
-    }
-}
 
 void oif_WriteSpecial(utl_Stream& stream, const char* keyword, const kmaC_MembraneElastic& option) {
     oif_OptionLine line(stream, keyword);

@@ -1,0 +1,145 @@
+#include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Text.h"
+#include "deck_checks/dck_Walk.h"
+#include "store_interface/model/odiK_Repositories.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+#include <map>
+#include <memory>
+#include <set>
+
+namespace {
+
+/// Says of fields that no deck tells of that they have been given.
+class LostFields {
+public:
+    explicit LostFields(fnd_Sink& sink) : sink_(sink) {}
+
+    void Visit(const cls_Record& record, const mdl_GivenState* given, const fnd_Path& place) {
+        const auto& fields = record.DynFields().All();
+        for (std::size_t i = 0; i < fields.size(); ++i) {
+            const cls_Field& field = fields[i];
+            if (field.notInDeck == nullptr || !dck_IsGiven(given, i)) continue;
+            const cls_Record* usual = UsualOf(record);
+            if (usual != nullptr && field.type->Equal(field.In(record), field.In(*usual))) continue;
+            sink_.Add("not-in-deck", fnd_Path(place, field.name),
+                      "found a value, and no line of a deck carries it", {}, field.notInDeck);
+        }
+    }
+
+private:
+    /// A record of the class as it is without a word of the user.
+    const cls_Record* UsualOf(const cls_Record& record) {
+        if (dynamic_cast<const odiK_ModelData*>(&record) != nullptr) return &usualModel_;
+        auto& usual = usual_[record.DynTypeId()];
+        if (usual == nullptr) {
+            const cls_ClassEntry* entry = cls_Classes().Find(record.DynTypeId());
+            if (entry != nullptr && entry->create != nullptr) usual.reset(entry->create());
+        }
+        return usual.get();
+    }
+
+    fnd_Sink& sink_;
+    odiK_ModelData usualModel_;
+    std::map<unsigned, std::unique_ptr<cls_Record>> usual_;
+};
+
+/// Which objects others refer to, by the kind that fields tell.
+class Uses {
+public:
+    void Visit(const cls_Record& record, const mdl_GivenState* given) {
+        const auto& fields = record.DynFields().All();
+        for (std::size_t i = 0; i < fields.size(); ++i) {
+            if (fields[i].refersTo != nullptr && dck_IsGiven(given, i)) {
+                Add(*fields[i].type, fields[i].In(record), fields[i].refersTo);
+            }
+        }
+    }
+    bool Has(const char* kind, const cow_String& name) const {
+        const auto found = names_.find(std::string_view(kind));
+        return found != names_.end() && found->second.count(name) != 0;
+    }
+
+private:
+    void Add(const cls_FieldType& type, const void* value, const char* kind) {
+        switch (type.Kind()) {
+        case cls_FieldKind::String:
+            names_[std::string(kind)].insert(*static_cast<const cow_String*>(value));
+            return;
+        case cls_FieldKind::List: {
+            const auto& list = static_cast<const cls_ListType&>(type);
+            for (int i = 0; i < list.Length(value); ++i) Add(list.ItemType(), list.Item(value, i), kind);
+            return;
+        }
+        case cls_FieldKind::Map: {
+            const auto& map = static_cast<const cls_MapType&>(type);
+            for (const cow_String& key : map.Keys(value)) {
+                names_[std::string(kind)].insert(key);
+                Add(map.ItemType(), map.Item(value, key), kind);
+            }
+            return;
+        }
+        case cls_FieldKind::Attribute: {
+            const auto& attribute = static_cast<const cls_AttributeType&>(type);
+            return Add(attribute.ValueType(), attribute.Value(value), kind);
+        }
+        default: return;
+        }
+    }
+
+    std::map<std::string, std::set<cow_String>, std::less<>> names_;
+};
+
+void FindUnused(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
+    constexpr std::size_t kShown = 5;
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        const bool canBeUnused =
+            repository.kind != nullptr && !repository.IsInOrder() && !repository.IsPropagating();
+        if (!canBeUnused || repository.kind == std::string_view("constraint")) continue;
+        std::vector<cow_String> names;
+        for (const auto& [name, record] : repository.In(model)) {
+            if (!uses.Has(repository.kind, name)) names.push_back(name);
+        }
+        if (names.empty()) continue;
+        std::string shown;
+        for (std::size_t i = 0; i < names.size() && i < kShown; ++i) {
+            shown += (i == 0 ? "" : ", ") + Text(names[i]);
+        }
+        if (names.size() > kShown) shown += ", ...";
+        sink.Add("unused", std::string("/") + repository.member,
+                 "nothing uses " + std::to_string(names.size()) + " of the " + repository.plural + ": " +
+                     shown);
+    }
+}
+
+void FindAssemblyNodes(const odiK_Model& model, fnd_Sink& sink) {
+    const auto& mesh = model.ConstAssemblyMesh();
+    const int nodes = mesh.IsNull() ? 0 : mesh->Nodes().NumNodes();
+    if (nodes == 0) return;
+    std::string sets;
+    for (const auto& set : model.AssemblySets()) {
+        for (const rgnC_SubsetData& subset : set->subsets) {
+            if (set->type != res_SetTypeEnm::NODES || subset.meshIndex != 0) continue;
+            sets += (sets.empty() ? "" : ", ") + Quoted(set->name);
+            break;
+        }
+    }
+    sink.Add("assembly-nodes", "/assembly/mesh/nodes",
+             "the assembly's own " + std::to_string(nodes) + " nodes reach no deck" +
+                 (sets.empty() ? "" : "; they stand in the sets " + sets),
+             {}, "make each a part of one node, and an instance of it");
+}
+
+} // namespace
+
+void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink) {
+    LostFields lost(sink);
+    Uses uses;
+    dck_ForEachRecord(model,
+                      [&](const cls_Record& record, const mdl_GivenState* given, const fnd_Path& place) {
+                          lost.Visit(record, given, place);
+                          uses.Visit(record, given);
+                      });
+    FindUnused(model, uses, sink);
+    FindAssemblyNodes(model, sink);
+}
