@@ -22,8 +22,13 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     if (file == nullptr) return false;
     qio_ios device;
     device.attach(file, true);
-    utl_Stream stream(device, kLineLimit, kPrecision, kPrecision);
+    WriteInput(device);
+    device.close();
+    return true;
+}
 
+void oif_Builder::WriteInput(qio_ostream& device) {
+    utl_Stream stream(device, kLineLimit, kPrecision, kPrecision);
     BuildComponents();
     qkw_ComponentList components = WriteList();
     WriteInput(stream, jobKeywords_.ModelDefinition());
@@ -33,8 +38,6 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     WriteOtherModelDefinitions(stream, components);
     WriteStepDefinitions(stream, components);
     stream.Flush();
-    device.close();
-    return true;
 }
 
 // Later components use what earlier ones stored in the model info: labels first, regions behind instances and

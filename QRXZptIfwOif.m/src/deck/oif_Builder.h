@@ -29,6 +29,8 @@ public:
     /// Deletes an old file of the name and writes the deck. False when the file can't be opened; whether all
     /// bytes arrived tells qio_LastReport(). May be called once.
     bool WriteInputFile(const cow_String& fileName);
+    /// Writes the deck to a device. One of the two may be called, and once.
+    void WriteInput(qio_ostream& device);
 
 private:
     void BuildComponents();

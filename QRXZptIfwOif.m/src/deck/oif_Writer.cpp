@@ -9,3 +9,9 @@ void oif_Writer::WriteInputFile(const char* jobName) {
     oif_Builder builder(modelInfo);
     builder.WriteInputFile(fileName);
 }
+
+void oif_Writer::WriteInput(qio_ostream& device) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_Builder builder(modelInfo);
+    builder.WriteInput(device);
+}
