@@ -46,7 +46,7 @@ void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fn
     const fnd_Path place(models, odb_Odb::DefaultModelName());
     Counter counter;
     try {
-        oif_Writer(store).WriteTo(counter);
+        oif_Writer(store).WriteInput(counter);
     } catch (const QRXBasException& failure) {
         const std::string text = failure.what();
         const bool isTold = std::ranges::any_of(told, [&](const fnd_Finding& finding) {

@@ -1,5 +1,6 @@
 #include "conditions/oif_BCTable.h"
 #include "conditions/oif_BoundaryConditionBuilder.h"
+#include "conditions/oif_WrittenSteps.h"
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 #include "store_interface/model/odiK_Model.h"
@@ -7,6 +8,7 @@
 #include "store_interface/records/conditions/kbcC_MotionBCs.h"
 #include "store_interface/records/conditions/kbcC_SupportBCs.h"
 
+#include <algorithm>
 #include <optional>
 #include <set>
 
@@ -45,6 +47,7 @@ void FindOnRegion(const kbcC_BC& bc, const std::string& place, fnd_Sink& sink) {
 void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
     const oif_BCOpStatus status =
         oif_BoundaryConditionBuilder::OpStatusOf(model.boundaryConditions, model.loads, model.steps);
+    oif_WrittenSteps finder(model.steps, status);
     std::optional<std::set<std::string>> elementSets;
     for (const auto& [name, bc] : model.boundaryConditions) {
         if (bc.suppressed) continue;
@@ -66,12 +69,14 @@ void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
                          "found " + Quoted(motion->connectors[i]) + ", which is no element set");
             }
         }
-        bool written = false;
-        for (const auto& [stepName, step] : model.steps) {
-            for (const auto& at : oif_BCOpStatus::Places(step, name, bc.Status(stepName))) {
-                written = written || status.Writes(bc, stepName, at.IsLoadCase());
-            }
-        }
-        if (!written) sink.Add("never-written", place, "no step writes the condition");
+        const auto writes = [&](const kbcC_BC& each, const cow_String& stepName, bool inLoadCase) {
+            return status.Writes(each, stepName, inLoadCase);
+        };
+        const std::vector<int> written = finder.Of("boundary condition", name, bc, writes);
+        const bool isWritten = std::ranges::any_of(written, [&](int i) {
+            const cow_String& stepName = model.steps.NameAt(i);
+            return !oif_BCOpStatus::Places(model.steps.StepAt(i), name, bc.Status(stepName)).empty();
+        });
+        if (!isWritten) sink.Add("never-written", place, "no step writes the condition");
     }
 }

@@ -2,7 +2,7 @@
 #include "conditions/oif_FieldTable.h"
 #include "conditions/oif_LoadTable.h"
 #include "conditions/oif_MechanicalLoads.h"
-#include "conditions/oif_OpStatus.h"
+#include "conditions/oif_WrittenSteps.h"
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 
@@ -47,13 +47,15 @@ const char* CommentOnly(const kloC_Load& load, const oif_LoadRow& row) {
 
 /// The steps that write an object, in themselves or in a load case.
 template <class OpStatus, class T>
-std::vector<cow_String> WrittenIn(const OpStatus& status, const kprC_StepContainer& steps,
-                                  const cow_String& name, const T& object) {
+std::vector<cow_String> WrittenIn(oif_WrittenSteps& finder, const OpStatus& status,
+                                  const kprC_StepContainer& steps, const char* kind, const cow_String& name,
+                                  const T& object) {
     std::vector<cow_String> written;
-    for (const auto& [stepName, step] : steps) {
-        if (status.Writes(object, stepName) && !OpStatus::Places(step, name).empty()) {
-            written.push_back(stepName);
-        }
+    const auto writes = [&status](const T& each, const cow_String& step, bool) {
+        return status.Writes(each, step);
+    };
+    for (const int step : finder.Of(kind, name, object, writes)) {
+        if (!OpStatus::Places(steps.StepAt(step), name).empty()) written.push_back(steps.NameAt(step));
     }
     return written;
 }
@@ -61,12 +63,9 @@ std::vector<cow_String> WrittenIn(const OpStatus& status, const kprC_StepContain
 bool IsHeldByItsLength(const kloC_Load& load, const kprC_StepContainer& steps) {
     if (load.DynTypeId() != kloC_BoltLoad::TypeId()) return false;
     const auto& bolt = static_cast<const kloC_BoltLoad&>(load);
-    for (int i = 1; i < steps.Size(); ++i) {
-        if (kloC_Load::IsActive(bolt.Status(steps.NameAt(i))) && !bolt.IsByForce(steps.NameAt(i))) {
-            return true;
-        }
-    }
-    return false;
+    return !oif_StepsWhere(load, steps.Size(), [&](int i) {
+                return kloC_Load::IsActive(bolt.Status(steps.NameAt(i))) && !bolt.IsByForce(steps.NameAt(i));
+            }).empty();
 }
 
 std::string CannotCarry(const char* failure) {
@@ -84,13 +83,14 @@ void FindOnLoads(const oif_ModelInfo& info, fnd_Sink& sink) {
     }
     oif_LoadOpStatus status;
     if (canBeWritten) status.Configure(loads, steps.Keys(), info);
+    oif_WrittenSteps finder(steps, status);
     for (const auto& [name, load] : loads) {
         const oif_LoadRow* row = oif_FindLoadRow(load.DynTypeId());
         if (load.suppressed || row == nullptr) continue;
         const std::string place = Place("loads", name);
         FindOnRegion(load.region, row->region, place, "load", sink);
         if (!canBeWritten) continue;
-        const std::vector<cow_String> written = WrittenIn(status, steps, name, load);
+        const std::vector<cow_String> written = WrittenIn(finder, status, steps, "load", name, load);
         const char* failure = nullptr;
         for (const cow_String& step : written) {
             if (failure == nullptr) failure = FailureOf(load, *row, step);
@@ -113,12 +113,13 @@ void FindOnFields(const oif_ModelInfo& info, fnd_Sink& sink) {
     const kprC_StepContainer& steps = info.Model().Steps();
     oif_FieldOpStatus status;
     status.Configure(fields, steps.Keys());
+    oif_WrittenSteps finder(steps, status);
     for (const auto& [name, field] : fields) {
         if (field.suppressed) continue;
         const std::string place = Place("fields", name);
         FindOnRegion(field.region, oif_FindFieldRow(field.DynTypeId())->RegionOf(field), place, "field",
                      sink);
-        if (WrittenIn(status, steps, name, field).empty()) {
+        if (WrittenIn(finder, status, steps, "field", name, field).empty()) {
             sink.Add("never-written", place, "no step writes the field");
         }
     }

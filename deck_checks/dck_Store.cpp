@@ -1,6 +1,7 @@
 #include "deck_checks/dck_Check.h"
 #include "store_interface/findings/fnd_RecordRules.h"
 #include "store_interface/findings/fnd_Text.h"
+#include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/model/odb_Odb.h"
 #include "store_interface/model/odiK_ModelRules.h"
 #include "store_interface/model/odiK_References.h"
@@ -16,11 +17,7 @@ class RecordWalk {
 public:
     RecordWalk(const odiK_Model& model, fnd_Sink& sink) : references_(model), sink_(sink) {}
 
-    void Name(const cow_String& name, const fnd_Path& place) {
-        const fnd_NameProblem problem = fnd_ProblemOfName(name.View());
-        if (!problem.found.empty())
-            sink_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
-    }
+    void Name(const cow_String& name, const fnd_Path& place) { fnd_CheckName(name.View(), place, sink_); }
 
     void Record(const cls_Record& record, const fnd_Path& place) {
         for (const cls_Field& field : record.DynFields().All()) {
@@ -62,7 +59,7 @@ private:
     }
 
     void Text(const cow_String& text, const cls_Field& field, const fnd_Path& path) {
-        if (field.nameOf != nullptr && !text.IsEmpty()) Name(text, path);
+        if (!text.IsEmpty() && !fnd_CheckText(field, text.View(), path, sink_)) return;
         references_.Check(field, std::string(text.View()), path.Text(), sink_);
     }
 

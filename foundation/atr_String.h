@@ -1,12 +1,14 @@
 #ifndef QRX_FOUNDATION_ATR_STRING_H
 #define QRX_FOUNDATION_ATR_STRING_H
 
+#include "foundation/thr_Shared.h"
+
 #include <string_view>
 
 /// The shared storage of a text: its count of holders and its length; the characters and a final zero
 /// byte follow it in the same piece of memory.
 struct atr_StringRep {
-    int count;
+    thr_Count count;
     int length;
 
     /// New storage for `length` characters, count 1; the final zero byte is set, the characters are not.
@@ -15,14 +17,14 @@ struct atr_StringRep {
     char* Characters() { return reinterpret_cast<char*>(this + 1); }
 };
 
-/// A text that is shared by its copies: copying adds one to a plain integer count.
+/// A text that is shared by its copies: copying adds one to a count.
 /// A default-constructed text has no storage and reads as "".
 class atr_StringBase {
 public:
     atr_StringBase() = default;
     explicit atr_StringBase(std::string_view text);
     atr_StringBase(const atr_StringBase& other) noexcept : characters_(other.characters_), rep_(other.rep_) {
-        if (rep_ != nullptr) ++rep_->count;
+        if (rep_ != nullptr) rep_->count.Increment();
     }
     atr_StringBase(atr_StringBase&& other) noexcept : characters_(other.characters_), rep_(other.rep_) {
         other.characters_ = "";
@@ -39,7 +41,7 @@ public:
 
 protected:
     void Drop() noexcept {
-        if (rep_ != nullptr && --rep_->count == 0) atr_StringRep::Release(rep_);
+        if (rep_ != nullptr && rep_->count.Decrement()) atr_StringRep::Release(rep_);
     }
 
     const char* characters_ = "";

@@ -2,28 +2,22 @@
 #define QRX_FOUNDATION_COW_COUNTEDHLD_H
 
 #include "foundation/mem_Allocation.h"
+#include "foundation/thr_Shared.h"
 
 #include <type_traits>
 #include <utility>
 
-/// A plain integer reference count; not for use by several threads.
-class cow_Counter : public QRXBasCowAllocator {
+/// A reference count on the heap.
+class cow_Counter : public thr_Count, public QRXBasCowAllocator {
 public:
-    explicit cow_Counter(int count = 1) : count_(count) {}
-    void Increment() { ++count_; }
-    /// True when the count falls to zero.
-    bool Decrement() { return --count_ == 0; }
-    int Count() const { return count_; }
-
-private:
-    int count_;
+    using thr_Count::thr_Count;
 };
 
 /// The count of an object on the heap, and how to delete it.
 class cow_OwnerCount : public cow_Counter {
 public:
     using Destroy = void (*)(void* referent);
-    explicit cow_OwnerCount(Destroy destroy) : destroy_(destroy) {}
+    explicit cow_OwnerCount(Destroy destroy) : cow_Counter(1), destroy_(destroy) {}
     Destroy HowToDestroy() const { return destroy_; }
 
 private:

@@ -48,13 +48,13 @@ public:
     cow_ListBlock& operator=(const cow_ListBlock&) = delete;
     ~cow_ListBlock() { mem_Free(items_); }
 
-    void Increment() { ++count_; }
-    bool Decrement() { return --count_ == 0; }
-    bool IsShared() const { return count_ > 1; }
+    void Increment() { count_.Increment(); }
+    bool Decrement() { return count_.Decrement(); }
+    bool IsShared() const { return count_.Count() > 1; }
     T* Items() { return items_; }
 
 private:
-    int count_ = 1;
+    thr_Count count_;
     T* items_;
 };
 

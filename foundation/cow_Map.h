@@ -180,9 +180,9 @@ private:
     static constexpr int kWalksPerIndex = 8;
 
     const Node* FindNode(const K& key) const {
-        if (count_ >= kSmallestIndexed && HasIndex()) {
-            const auto place = index_->find(cow_MapIndexKey(key));
-            return place == index_->end() ? nullptr : place->second;
+        if (const Index* index = count_ < kSmallestIndexed ? nullptr : FindIndex()) {
+            const auto place = index->find(cow_MapIndexKey(key));
+            return place == index->end() ? nullptr : place->second;
         }
         const Node* node = root_.Referent();
         for (int depth = 0; node != nullptr && !(node->key == key); ++depth) {
@@ -191,23 +191,25 @@ private:
         return node;
     }
 
-    bool HasIndex() const {
-        if (index_ != nullptr) return true;
-        if (++walks_ < count_ / kWalksPerIndex) return false;
-        index_ = std::make_unique<Index>();
+    // The index, made when it begins to pay; null before that.
+    const Index* FindIndex() const {
+        if (const Index* index = index_.Get()) return index;
+        walks_ = walks_ + 1;
+        if (walks_ < count_ / kWalksPerIndex) return nullptr;
+        auto index = std::make_unique<Index>();
         std::vector<Node*> open{root_.Referent()};
         while (!open.empty()) {
             Node* node = open.back();
             open.pop_back();
-            index_->emplace(cow_MapIndexKey(node->key), node);
+            index->emplace(cow_MapIndexKey(node->key), node);
             if (!node->right.IsNull()) open.push_back(node->right.Referent());
             if (!node->left.IsNull()) open.push_back(node->left.Referent());
         }
-        return true;
+        return index_.Keep(std::move(index));
     }
 
-    void DropIndex() const {
-        index_.reset();
+    void DropIndex() {
+        index_.Drop();
         walks_ = 0;
     }
 
@@ -225,7 +227,7 @@ private:
         ++count_;
         Node* node = place->Referent();
         try {
-            if (index_ != nullptr) index_->emplace(cow_MapIndexKey(node->key), node);
+            if (Index* index = index_.Get()) index->emplace(cow_MapIndexKey(node->key), node);
         } catch (...) {
             // The tree is whole; an index that misses a key is worse than none.
             DropIndex();
@@ -249,9 +251,9 @@ private:
     Handle root_;
     int count_ = 0;
     // Whether another map may share nodes. Never becomes false again.
-    mutable bool shared_ = false;
-    mutable int walks_ = 0;
-    mutable std::unique_ptr<Index> index_;
+    mutable thr_Relaxed<bool> shared_ = false;
+    mutable thr_Relaxed<int> walks_ = 0;
+    thr_Kept<Index> index_;
 };
 
 template <class K, class V>

@@ -11,7 +11,7 @@
 
 atr_StringRep* atr_StringRep::Create(int length) {
     void* memory = mem_OperatorNewThrow(sizeof(atr_StringRep) + static_cast<std::size_t>(length) + 1);
-    auto* rep = new (memory) atr_StringRep{1, length};
+    auto* rep = new (memory) atr_StringRep{thr_Count(1), length};
     rep->Characters()[length] = '\0';
     return rep;
 }
@@ -39,7 +39,7 @@ atr_StringBase::atr_StringBase(std::string_view text) {
 }
 
 atr_StringBase& atr_StringBase::operator=(const atr_StringBase& other) noexcept {
-    if (other.rep_ != nullptr) ++other.rep_->count;
+    if (other.rep_ != nullptr) other.rep_->count.Increment();
     Drop();
     characters_ = other.characters_;
     rep_ = other.rep_;

@@ -45,8 +45,11 @@ void qio_RecordOpenFailure(int error) {
 }
 
 std::FILE* qio_OpenFile(const char* path, const char* mode) {
-    errno = 0;
-    std::FILE* file = qio_CurrentSystem().open(path, mode);
+    std::FILE* file = nullptr;
+    do {
+        errno = 0;
+        file = qio_CurrentSystem().open(path, mode);
+    } while (file == nullptr && errno == EINTR);
     if (file == nullptr) qio_RecordOpenFailure(ReasonOr(EIO));
     return file;
 }
@@ -88,7 +91,8 @@ void qio_ios::close() noexcept {
     if (flushed != 0) KeepError(ReasonOr(EIO));
     if (own_) {
         errno = 0;
-        if (qio_CurrentSystem().close(file_) != 0) KeepError(ReasonOr(EIO));
+        // An interrupted close has closed.
+        if (qio_CurrentSystem().close(file_) != 0 && errno != EINTR) KeepError(ReasonOr(EIO));
     }
     file_ = nullptr;
     lastReport = report_;

@@ -17,6 +17,10 @@ void mdf_Diagnostics::Take(fnd_Finding finding) {
     report_->findings.push_back(std::move(finding));
 }
 
+bool mdf_Diagnostics::WantsHint() {
+    return numErrors_ < kMaxFindings;
+}
+
 void mdf_Diagnostics::Expected(const fnd_Path& path, const mdf_Value& found, const std::string& expected,
                                const std::string& hint) {
     Add("wrong-value", path, "found " + mdf_Shown(found), expected, hint);
@@ -59,7 +63,7 @@ std::string mdf_Report::Line(const fnd_Finding& finding) const {
 }
 
 std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding) {
-    std::string line = fileName + ":";
+    std::string line = fnd_Visible(fileName) + ":";
     if (finding.line > 0) line += std::to_string(finding.line) + ":" + std::to_string(finding.column) + ":";
     line.append(" ").append(fnd_SeverityWord(finding.code->severity)).append(": ");
     if (!finding.place.empty()) line += fnd_Visible(finding.place) + ": ";

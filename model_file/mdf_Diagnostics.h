@@ -3,6 +3,7 @@
 
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Value.h"
+#include "store_interface/findings/fnd_Nearest.h"
 #include "store_interface/findings/fnd_Text.h"
 
 #include <map>
@@ -12,6 +13,7 @@ class mdf_Diagnostics final : public fnd_Sink {
 public:
     explicit mdf_Diagnostics(mdf_Report& report) : report_(&report) {}
     void Take(fnd_Finding finding) override;
+    bool WantsHint() override;
     /// "found <value>, expected <expected>".
     void Expected(const fnd_Path& path, const mdf_Value& found, const std::string& expected,
                   const std::string& hint = {});

@@ -20,7 +20,9 @@ void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
         diagnostics.Add("unknown-member", fnd_Path(path, member.name),
                         "found an unknown member " + fnd_Quoted(member.name),
                         known.empty() ? std::string("none") : fnd_OneOf(known),
-                        fnd_DidYouMean(member.name, known));
+                        fnd_DidYouMean(diagnostics, member.name, [&known](fnd_Nearest& nearest) {
+                            for (const std::string& name : known) nearest.Try(name);
+                        }));
     }
 }
 

@@ -1,5 +1,7 @@
 #include "model_file/mdf_MeshReader.h"
 
+#include "store_interface/findings/fnd_TextRules.h"
+
 #include <cmath>
 #include <limits>
 
@@ -197,11 +199,7 @@ void mdf_MeshReader::ReadElementClass(odiK_Mesh& mesh, mdf_Value& json, const fn
         diagnostics_.Expected(fnd_Path(path, "type"), *type, "the label of an element type");
         return;
     }
-    const fnd_NameProblem problem = fnd_ProblemOfName(type->String());
-    if (!problem.found.empty()) {
-        diagnostics_.Add("name-in-deck", fnd_Path(path, "type"), "found " + problem.found, problem.expected);
-        return;
-    }
+    if (!fnd_CheckName(type->String(), fnd_Path(path, "type"), diagnostics_)) return;
     if (ddb_ShapeOfLabel(type->String()).unknown) {
         diagnostics_.Add("unknown-element-type", fnd_Path(path, "type"),
                          fnd_Quoted(type->String()) +

@@ -2,6 +2,7 @@
 
 #include "model_file/mdf_ModelReader.h"
 #include "model_file/mdf_Parser.h"
+#include "store_interface/findings/fnd_TextRules.h"
 
 #include <algorithm>
 
@@ -22,11 +23,7 @@ void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagn
     std::vector<std::string> names;
     for (mdf_Member& member : models.Members()) {
         const fnd_Path place(path, member.name);
-        const fnd_NameProblem problem = fnd_ProblemOfName(member.name);
-        if (!problem.found.empty()) {
-            diagnostics.Add("name-in-deck", place, "found " + problem.found, problem.expected);
-            continue;
-        }
+        if (!fnd_CheckName(member.name, place, diagnostics)) continue;
         names.push_back(member.name);
         odiK_Model& model = odb.AddModel(cow_String(member.name));
         mdf_ModelReader(model, diagnostics).Read(member.value, place);

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelReader.h"
 
+#include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/model/odiK_ModelRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
@@ -42,13 +43,6 @@ void mdf_ModelReader::Read(mdf_Value& json, const fnd_Path& path) {
     model_.SetComplete();
 }
 
-bool mdf_ModelReader::CheckName(const std::string& name, const fnd_Path& path) {
-    const fnd_NameProblem problem = fnd_ProblemOfName(name);
-    if (!problem.found.empty())
-        diagnostics_.Add("name-in-deck", path, "found " + problem.found, problem.expected);
-    return problem.found.empty();
-}
-
 void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Value& json,
                                      const fnd_Path& path) {
     if (!json.IsObject()) {
@@ -61,7 +55,7 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
         const fnd_Path place(path, member.name);
-        if (!CheckName(member.name, place)) continue;
+        if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
         capitals.Enter(member.name, place, "name", diagnostics_);
         const std::unique_ptr<cls_Record> record =
             records_.ReadVariant(info.ItemTypeId(), member.value, place, others);
@@ -111,7 +105,7 @@ void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const fnd_Pa
         return;
     }
     records_.ReadRecord(*record, json, path, {"name", "class"});
-    if (!CheckName(name, namePath)) return;
+    if (!fnd_CheckName(name, namePath, diagnostics_)) return;
     capitals.Enter(name, namePath, "step", diagnostics_);
     if (model_.steps.IsMember(cow_String(name))) {
         diagnostics_.Add("duplicate-name", namePath, "found a second step named " + fnd_Quoted(name),
@@ -131,6 +125,7 @@ void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const fnd_Pa
 }
 
 void mdf_ModelReader::Propagate(const fnd_Path& path) {
+    const kprC_Timeline timeline(model_.steps);
     for (const odiK_Repository& info : odiK_Repositories()) {
         if (!info.IsPropagating()) continue;
         mdl_Repository& repository = info.In(model_);
@@ -139,7 +134,7 @@ void mdf_ModelReader::Propagate(const fnd_Path& path) {
             auto& object = static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name));
             const fnd_Path place(container, name.View());
             fnd_Below below(diagnostics_, place);
-            for (fnd_Finding& problem : object.Propagate(model_.steps)) below.Take(std::move(problem));
+            for (fnd_Finding& problem : object.Propagate(timeline)) below.Take(std::move(problem));
         }
     }
 }

@@ -18,7 +18,6 @@ private:
     void ReadSteps(const mdf_Value& json, const fnd_Path& path);
     void ReadStep(const mdf_Value& json, bool isFirst, const fnd_Path& path, mdf_CapitalsCheck& capitals);
     void Propagate(const fnd_Path& path);
-    bool CheckName(const std::string& name, const fnd_Path& path);
 
     odiK_Model& model_;
     mdf_Diagnostics& diagnostics_;

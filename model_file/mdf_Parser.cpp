@@ -459,7 +459,12 @@ bool mdf_ReadFile(const std::string& path, std::string& text, fnd_Finding& error
         return false;
     };
     errno = 0;
-    const std::unique_ptr<std::FILE, int (*)(std::FILE*)> file(std::fopen(path.c_str(), "rb"), std::fclose);
+    std::FILE* opened = nullptr;
+    do {
+        errno = 0;
+        opened = std::fopen(path.c_str(), "rb");
+    } while (opened == nullptr && errno == EINTR);
+    const std::unique_ptr<std::FILE, int (*)(std::FILE*)> file(opened, std::fclose);
     if (!file) return fail(errno);
     std::setvbuf(file.get(), nullptr, _IONBF, 0);
     std::error_code unknown;
@@ -470,7 +475,11 @@ bool mdf_ReadFile(const std::string& path, std::string& text, fnd_Finding& error
     while (true) {
         errno = 0;
         length += std::fread(text.data() + length, 1, text.size() - length, file.get());
-        if (std::ferror(file.get()) != 0) return fail(errno);
+        if (std::ferror(file.get()) != 0) {
+            if (errno != EINTR) return fail(errno);
+            std::clearerr(file.get());
+            continue;
+        }
         if (length < text.size()) break;
         text.resize(2 * text.size() + 4096);
     }

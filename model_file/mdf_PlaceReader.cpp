@@ -2,34 +2,28 @@
 
 #include "model_file/mdf_Members.h"
 
-namespace {
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
-
-} // namespace
-
 bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const fnd_Path& path) {
     if (json.IsNull()) {
         datum = {};
         return true;
     }
-    std::vector<std::string> names;
-    for (const odiK_Datum& known : model_.Datums()) names.push_back(Text(known.name));
     if (json.IsString()) datum = model_.FindDatum(cow_String(json.String()));
     if (json.IsString() && (!datum.IsNullRef() || references_.IsWrong(json.String()))) return true;
+    const auto tryAll = [this](fnd_Nearest& nearest) {
+        for (const odiK_Datum& known : model_.Datums()) nearest.Try(known.name.View());
+    };
     diagnostics_.Expected(path, json, "the name of a datum, or null",
-                          json.IsString() ? fnd_DidYouMean(json.String(), names) : std::string());
+                          json.IsString() ? fnd_DidYouMean(diagnostics_, json.String(), tryAll)
+                                          : std::string());
     return false;
 }
 
 void mdf_PlaceReader::ReportNoInstance(const std::string& name, const fnd_Path& path) {
     if (references_.IsWrong(name)) return;
-    std::vector<std::string> names;
-    for (const auto& [known, entry] : model_.Instances()) names.push_back(Text(known));
     diagnostics_.Add("no-such-name", path, "found instance " + fnd_Quoted(name), "the name of an instance",
-                     fnd_DidYouMean(name, names));
+                     fnd_DidYouMean(diagnostics_, name, [this](fnd_Nearest& nearest) {
+                         for (const auto& [known, entry] : model_.Instances()) nearest.Try(known.View());
+                     }));
 }
 
 bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const fnd_Path& path) {
@@ -86,12 +80,11 @@ void mdf_PlaceReader::ReportNoSet(const Names& names, const fnd_Path& path) {
     if (references_.IsWrong(names.set)) return;
     static const std::vector<cow_CountedHld<odiK_Set>> none;
     const auto mesh = owner == nullptr ? cow_CountedHld<odiK_Mesh>() : owner->Mesh();
-    std::vector<std::string> known;
-    for (const auto& set : owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets()) {
-        known.push_back(Text(set->name));
-    }
+    const auto& sets = owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets();
     diagnostics_.Add("no-such-set", path, "found set " + fnd_Quoted(names.set),
                      "the name of a set of " +
                          (owner == nullptr ? "the assembly" : "instance " + fnd_Quoted(names.instance)),
-                     fnd_DidYouMean(names.set, known));
+                     fnd_DidYouMean(diagnostics_, names.set, [&sets](fnd_Nearest& nearest) {
+                         for (const auto& set : sets) nearest.Try(set->name.View());
+                     }));
 }

@@ -1,6 +1,7 @@
 #include "model_file/mdf_RecordReader.h"
 
 #include "store_interface/findings/fnd_RecordRules.h"
+#include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <algorithm>
@@ -211,12 +212,7 @@ bool mdf_RecordReader::ReadString(cow_String& value, const mdf_Value& json, cons
                                                       : "the name of a " + kind);
         return false;
     }
-    const fnd_NameProblem problem =
-        field.nameOf == nullptr ? fnd_NameProblem() : fnd_ProblemOfName(json.String());
-    if (!problem.found.empty()) {
-        diagnostics_.Add("name-in-deck", path, "found " + problem.found, problem.expected);
-        return false;
-    }
+    if (!fnd_CheckText(field, json.String(), path, diagnostics_)) return false;
     value = cow_String(json.String());
     references_.Note(field, json.String(), path);
     return true;
@@ -445,11 +441,7 @@ bool mdf_RecordReader::ReadMap(const cls_MapType& type, void* value, const mdf_V
     for (const mdf_Member& member : json.Members()) {
         const fnd_Path place(path, member.name);
         if (field.refersTo == nullptr) {
-            const fnd_NameProblem problem = fnd_ProblemOfName(member.name);
-            if (!problem.found.empty()) {
-                diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
-                continue;
-            }
+            if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
             capitals.Enter(member.name, place, "name", diagnostics_);
         } else {
             references_.Note(field, member.name, place);
@@ -511,13 +503,14 @@ void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Valu
         diagnostics_.Expected(path, states, "an object of states by step");
         return;
     }
-    const std::vector<std::string> steps = mdf_Names(model_.steps.Keys());
     for (const mdf_Member& member : states.Members()) {
         const fnd_Path place(path, member.name);
         if (references_.IsWrong(member.name)) continue;
         if (!model_.steps.IsMember(cow_String(member.name))) {
             diagnostics_.Add("no-such-name", place, "found " + fnd_Quoted(member.name), "the name of a step",
-                             fnd_DidYouMean(member.name, steps));
+                             fnd_DidYouMean(diagnostics_, member.name, [this](fnd_Nearest& nearest) {
+                                 for (const auto& [name, step] : model_.steps) nearest.Try(name.View());
+                             }));
             continue;
         }
         ReadState(object, member.name, member.value, place);

@@ -35,8 +35,12 @@ constexpr char kFrame[] = R"({
       "description": "A name that can stand in a deck.",
       "type": "string", "minLength": 1, "maxLength": 80, "pattern": "^[^\"\\u0000-\\u001f\\u007f]*$"
     },
+    "LINE": {
+      "description": "A text that can stand on one line of a deck.",
+      "type": "string", "pattern": "^[^\\u0000-\\u001f\\u007f]*$"
+    },
     "TEXT": {
-      "description": "Deck text: a string as it stands, or an array of strings, each of which becomes a line.",
+      "description": "Deck text, with whatever keywords are in it: a string as it stands, or an array of strings, each of which becomes a line.",
       "anyOf": [{"type": "string"}, {"type": "array", "items": {"type": "string"}}]
     },
     "INT": {"type": "integer", "minimum": -2147483648, "maximum": 2147483647},
@@ -394,7 +398,8 @@ private:
         if (field != nullptr && field->verbatim) return Reference("TEXT");
         if (field != nullptr && field->nameOf != nullptr) return Reference("NAME");
         if (field != nullptr && !field->words.empty()) return {{"enum", field->words}};
-        return {{"type", "string"}};
+        if (field != nullptr && field->freeText) return {{"type", "string"}};
+        return Reference("LINE");
     }
 
     static Json TreeOf(const cls_FieldType& type, const cls_Field& field) {

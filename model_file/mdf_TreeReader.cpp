@@ -1,6 +1,7 @@
 #include "model_file/mdf_TreeReader.h"
 
 #include "model_file/mdf_Parser.h"
+#include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 void mdf_TreeReader::ReadFields(cls_Record& frame, mdf_Value& json, const fnd_Path& path) {
@@ -72,11 +73,7 @@ void mdf_TreeReader::ForEachNamed(mdf_Value& json, const fnd_Path& path, const c
     mdf_CapitalsCheck capitals;
     for (mdf_Member& member : json.Members()) {
         const fnd_Path place(path, member.name);
-        const fnd_NameProblem problem = fnd_ProblemOfName(member.name);
-        if (!problem.found.empty()) {
-            diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
-            continue;
-        }
+        if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
         capitals.Enter(member.name, place, thing, diagnostics_);
         read(cow_String(member.name), member.value, place);
     }
@@ -108,11 +105,11 @@ void mdf_TreeReader::CheckPart(odiK_Instance& instance, const mdf_Value& json, c
         return;
     }
     if (model_.Parts().count(instance.partName) != 0) return;
-    std::vector<std::string> names;
-    for (const auto& [name, part] : model_.Parts()) names.emplace_back(name.View());
     const std::string given(instance.partName.View());
     diagnostics_.Add("no-such-name", place, "found " + mdf_Shown(mdf_Value(given)), "the name of a part",
-                     fnd_DidYouMean(given, names));
+                     fnd_DidYouMean(diagnostics_, given, [this](fnd_Nearest& nearest) {
+                         for (const auto& [name, part] : model_.Parts()) nearest.Try(name.View());
+                     }));
     instance.partName = cow_String();
 }
 
@@ -151,12 +148,12 @@ void mdf_TreeReader::CheckAttributeInputs(const std::vector<odiK_AttributeInput>
         const int id = mesh == nullptr ? -1 : mesh->FindSet(inputs[i].setName);
         if (id < 0 && records_.References().IsWrong(name)) continue;
         if (id < 0) {
-            std::vector<std::string> names;
-            if (mesh != nullptr) {
-                for (const auto& set : mesh->Sets()) names.emplace_back(set->name.View());
-            }
             diagnostics_.Add("no-such-set", place, "found " + fnd_Quoted(name),
-                             "the name of a set of the mesh", fnd_DidYouMean(name, names));
+                             "the name of a set of the mesh",
+                             fnd_DidYouMean(diagnostics_, name, [mesh](fnd_Nearest& nearest) {
+                                 if (mesh == nullptr) return;
+                                 for (const auto& set : mesh->Sets()) nearest.Try(set->name.View());
+                             }));
         } else if (mesh->Sets()[static_cast<std::size_t>(id)]->type != res_SetTypeEnm::ELEMENTS) {
             diagnostics_.Add("wrong-set-kind", place,
                              "found " + fnd_Quoted(name) + ", which is no element set", "an element set");

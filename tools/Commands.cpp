@@ -9,9 +9,12 @@
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
+#include "store_interface/findings/fnd_Text.h"
 #include "tools/DeckFile.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
+#include "tools/OutOfMemory.h"
+#include "tools/StandardStreams.h"
 #include "tools/VariableList.h"
 
 #include <algorithm>
@@ -19,8 +22,6 @@
 #include <chrono>
 #include <cstdio>
 #include <filesystem>
-#include <fstream>
-#include <iostream>
 #include <sstream>
 #include <system_error>
 
@@ -108,12 +109,12 @@ std::size_t WidthOf(const std::vector<dck_LeftOut>& leftOut) {
     return width;
 }
 
-void Summarise(const std::string& target, const DeckFile::Result& result, double seconds,
+void Summarise(const std::string& target, long long bytes, double seconds,
                const std::vector<dck_KindCount>& counts, const std::vector<dck_LeftOut>& leftOut,
                RunReport& report) {
     if (report.AsJson()) {
         ordered_json& written = report.Member("written");
-        written = {{"target", target}, {"bytes", result.bytes}, {"seconds", seconds}};
+        written = {{"target", target}, {"bytes", bytes}, {"seconds", seconds}};
         ordered_json& byKind = written["counts"] = ordered_json::object();
         for (const dck_KindCount& kind : counts) byKind[kind.key] = kind.count;
         written["leftOut"] = JsonOf(leftOut);
@@ -123,25 +124,37 @@ void Summarise(const std::string& target, const DeckFile::Result& result, double
     for (const dck_KindCount& kind : counts) width = std::max(width, Grouped(kind.count).size());
     char time[32];
     std::snprintf(time, sizeof time, "%.2f s", seconds);
-    report.Print(target + ": " + Grouped(result.bytes) + " bytes in " + time + "\n");
+    report.Print(fnd_Visible(target) + ": " + Grouped(bytes) + " bytes in " + time + "\n");
     if (!counts.empty()) report.Print("written:\n");
     for (const dck_KindCount& kind : counts) report.Print(CountLine(Grouped(kind.count), kind.name, width));
     PrintLeftOut(leftOut, width, report);
 }
 
-/// Replaces the file as a whole; false, with the reason, when the file system refuses. What `write` raises
-/// beyond that comes through.
-bool Replace(DeckFile& file, const std::function<void(const char* jobName)>& write, DeckFile::Result& result,
-             RunReport& report) {
+/// The standard output takes nothing; the reason has been told.
+class OutputIsLost {};
+
+/// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
+/// there is to say of it, for which everything that can fail is done before the file stands. What `write`
+/// raises beyond that comes through.
+bool Replace(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell, RunReport& report) {
+    DeckFile::Result result;
+    const auto ready = [&](long long bytes) {
+        tell(bytes);
+        if (!report.PrepareForSuccess()) throw OutputIsLost();
+    };
     try {
-        result = file.Replace(write);
+        result = file.Replace(write, ready);
     } catch (const DeckFileError& failure) {
         report.Error(file.Target(), failure.what());
         return false;
+    } catch (const OutputIsLost&) {
+        return false;
     }
+    report.MarkWritten();
+    OutOfMemory::MarkWritten();
     if (result.removeError != 0) {
-        report.Warning(file.Target(), "the temporary folder '" + file.TemporaryFolder() +
-                                          "' can't be removed: " + ReasonText(result.removeError));
+        report.Warning(file.Target(), "the temporary folder " + fnd_Quoted(file.TemporaryFolder()) +
+                                          " can't be removed: " + ReasonText(result.removeError));
     }
     if (result.folderSyncError != 0) {
         report.Warning(file.Target(), "the " + file.Thing() +
@@ -151,13 +164,12 @@ bool Replace(DeckFile& file, const std::function<void(const char* jobName)>& wri
     return true;
 }
 
-/// Writes the text where DeckFile wants it.
-void WriteText(const std::string& text, const std::string& jobName) {
-    qio_ios device;
-    std::FILE* file = qio_OpenFile((jobName + ".inp").c_str(), "wb");
-    if (file == nullptr) return;
-    device.attach(file, true);
-    device.Write(text.data(), text.size());
+/// The same for a text, of which there is nothing to say.
+bool ReplaceByText(const std::string& target, const char* thing, std::string_view text, RunReport& report) {
+    DeckFile file(target, DeckFileSystem::Standard(), thing);
+    const auto write = [text](qio_ostream& device) { device.Write(text.data(), text.size()); };
+    return Replace(
+        file, write, [](long long) {}, report);
 }
 
 double SecondsSince(std::chrono::steady_clock::time_point start) {
@@ -169,8 +181,18 @@ double SecondsSince(std::chrono::steady_clock::time_point start) {
 ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
     const std::string target = TargetOf(request);
     if (target.empty()) {
-        report.Error("qrxdeck", "the job '" + request.job + "' names no file");
+        report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) + " names no file");
         return ExitCode::WRONG_USAGE;
+    }
+    if (!request.outputDir.empty() && std::filesystem::path(request.job).is_absolute()) {
+        report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) +
+                                    " is an absolute path, so it can't stand in the folder " +
+                                    fnd_Quoted(request.outputDir));
+        return ExitCode::WRONG_USAGE;
+    }
+    if (!CanWriteToStandardOutput()) {
+        report.Error("standard output", "it is closed");
+        return ExitCode::FILE_SYSTEM_REFUSED;
     }
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code);
@@ -186,24 +208,23 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
                                     "\" to write a deck from");
         return ExitCode::MODEL_IS_WRONG;
     }
-    // Before the deck, so that nothing can fail once it stands.
     const std::vector<dck_KindCount> counts = dck_CountsOfDeck(*model);
     const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(odb, *model);
 
     DeckFile deck(target);
-    DeckFile::Result result;
     fnd_List list;
     try {
         dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
-        const auto write = [&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); };
-        if (!Replace(deck, write, result, report)) return ExitCode::FILE_SYSTEM_REFUSED;
+        const auto write = [&odb](qio_ostream& device) { oif_Writer(odb).WriteInput(device); };
+        const auto tell = [&](long long bytes) {
+            for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
+            Summarise(target, bytes, SecondsSince(start), counts, leftOut, report);
+        };
+        return Replace(deck, write, tell, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
     } catch (const QRXBasException& failure) {
         report.WriterError(failure.what(), failure.Context());
         return ExitCode::CANNOT_BE_EXPRESSED;
     }
-    for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
-    Summarise(target, result, SecondsSince(start), counts, leftOut, report);
-    return ExitCode::DONE;
 }
 
 ExitCode RunCheck(const std::string& model, RunReport& report) {
@@ -214,7 +235,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
     dck_Rehearse(*odb, std::vector<fnd_Finding>(list.findings), list);
     for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
-    report.Print(model + ": no errors\n");
+    report.Print(fnd_Visible(model) + ": no errors\n");
     const std::vector<dck_LeftOut> leftOut =
         dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));
     if (report.AsJson()) report.Member("leftOut") = JsonOf(leftOut);
@@ -254,7 +275,7 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {
-        if (!isCanonical) report.Print(request.model + "\n");
+        if (!isCanonical) report.Print(fnd_Visible(request.model) + "\n");
         return isCanonical ? ExitCode::DONE : ExitCode::MODEL_IS_WRONG;
     }
     if (mdf_HasComments(text)) report.Warning(request.model, "its comments are left out");
@@ -263,17 +284,16 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         report.Print(formatted.str());
         return ExitCode::DONE;
     }
-    DeckFile file(request.output, DeckFileSystem::Standard(), "model file");
-    DeckFile::Result result;
-    const auto write = [&](const char* jobName) { WriteText(formatted.str(), jobName); };
-    return Replace(file, write, result, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
+    return ReplaceByText(request.output, "model file", formatted.view(), report)
+               ? ExitCode::DONE
+               : ExitCode::FILE_SYSTEM_REFUSED;
 }
 
 ExitCode RunVariables(const std::string& stepType, RunReport& report) {
     const std::optional<unsigned> type = FindStepType(stepType);
     if (!stepType.empty() && !type) {
-        report.Error("qrxdeck",
-                     "there is no step type '" + stepType + "'; the step types are " + StepTypeNames());
+        report.Error("qrxdeck", "there is no step type " + fnd_Quoted(stepType) + "; the step types are " +
+                                    StepTypeNames());
         return ExitCode::WRONG_USAGE;
     }
     ordered_json& variables = report.Member("variables") = DescribeVariables(type);
@@ -282,15 +302,12 @@ ExitCode RunVariables(const std::string& stepType, RunReport& report) {
 }
 
 ExitCode RunSchema(const std::string& output, RunReport& report) {
+    std::ostringstream schema;
+    mdf_WriteSchema(schema);
     if (output.empty()) {
-        if (mdf_WriteSchema(std::cout) && std::cout.flush()) return ExitCode::DONE;
-        report.Error("standard output", "cannot write the schema");
-        return ExitCode::FILE_SYSTEM_REFUSED;
+        report.Print(schema.str());
+        return ExitCode::DONE;
     }
-    errno = 0;
-    std::ofstream file(output, std::ios::binary);
-    if (file && mdf_WriteSchema(file)) file.close();
-    if (file) return ExitCode::DONE;
-    report.Error(output, "cannot write the schema: " + ReasonText(errno));
-    return ExitCode::FILE_SYSTEM_REFUSED;
+    return ReplaceByText(output, "schema", schema.view(), report) ? ExitCode::DONE
+                                                                  : ExitCode::FILE_SYSTEM_REFUSED;
 }

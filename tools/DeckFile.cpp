@@ -1,53 +1,137 @@
 #include "tools/DeckFile.h"
 
 #include "foundation/qio_Device.h"
-#include "tools/SignalCleanUp.h"
+#include "tools/ScratchFolder.h"
 
 #include <cerrno>
 #include <cstdio>
-#include <cstdlib>
 #include <filesystem>
+#include <memory>
+#include <optional>
 #include <system_error>
-#include <utility>
+#include <vector>
 
 #include <fcntl.h>
+#include <sys/file.h>
 #include <unistd.h>
+#if __has_include(<sys/xattr.h>)
+#include <sys/xattr.h>
+#endif
 
 namespace {
 
 constexpr DeckFileSystem kStandardSystem{
-    [](const char* path, struct stat* found) { return ::stat(path, found); },
-    [](char* pattern) { return ::mkdtemp(pattern); },
-    [](const char* path) { return ::open(path, O_RDONLY | O_CLOEXEC); },
+    [](const char* path, char* buffer, std::size_t bytes) { return ::readlink(path, buffer, bytes); },
+    [](int at, const char* name, int flags) { return ::openat(at, name, flags); },
+    [](int at, const char* name, struct stat* found) {
+        return ::fstatat(at, name, found, AT_SYMLINK_NOFOLLOW);
+    },
+    [](int at, const char* name) { return ::faccessat(at, name, W_OK, AT_EACCESS); },
+    [](int at, const char* name) { return ::mkdirat(at, name, 0700); },
+    [](int file, struct stat* found) { return ::fstat(file, found); },
+    [](int file) { return ::flock(file, LOCK_EX | LOCK_NB); },
+    [](int at, const char* name, mode_t mode) {
+        return ::openat(at, name, O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, mode);
+    },
     [](int file) { return ::fsync(file); },
+    [](int file, uid_t owner, gid_t group) { return ::fchown(file, owner, group); },
+    [](int file, mode_t mode) { return ::fchmod(file, mode); },
     [](int file) { return ::close(file); },
-    [](const char* from, const char* to) { return std::rename(from, to); },
-    [](const char* path) { return ::unlink(path); },
-    [](const char* path) { return ::rmdir(path); },
+    [](int fromFolder, const char* from, int toFolder, const char* to) {
+        return ::renameat(fromFolder, from, toFolder, to);
+    },
+    [](int at, const char* name) { return ::unlinkat(at, name, 0); },
+    [](int at, const char* name) { return ::unlinkat(at, name, AT_REMOVEDIR); },
 };
 
 std::string WithReason(const std::string& action, int error) {
     return error == 0 ? action : action + ": " + std::generic_category().message(error);
 }
 
-int ReasonOr(int fallback) {
-    return errno != 0 ? errno : fallback;
-}
-
-/// Calls until the call isn't interrupted; the errno value of the failure, 0 for none.
-template <class Call>
-int ErrorOf(Call call) {
-    for (;;) {
-        errno = 0;
-        if (call() >= 0) return 0;
-        if (errno != EINTR) return ReasonOr(EIO);
-    }
-}
-
 std::string FolderOf(const std::string& path) {
     const std::string folder = std::filesystem::path(path).parent_path().string();
     return folder.empty() ? "." : folder;
 }
+
+/// The path at the end of the chain of links that begins at the path; there may be nothing there.
+std::string EndOfLinks(const std::string& path, const DeckFileSystem& system) {
+    constexpr int longestChain = 40;
+    std::filesystem::path end = path;
+    for (int i = 0; i < longestChain; ++i) {
+        char target[4096];
+        ssize_t length = 0;
+        const int error = ErrorOf(
+            [&] { return static_cast<int>(length = system.readlink(end.c_str(), target, sizeof target)); });
+        // No link; what else may be wrong with it shows when it is looked at.
+        if (error != 0) return end.string();
+        const std::filesystem::path next(std::string(target, static_cast<std::size_t>(length)));
+        end = next.is_absolute() ? next : end.parent_path() / next;
+    }
+    throw DeckFileError("cannot look at what is there", ELOOP);
+}
+
+int OpenFolder(const std::string& path, const DeckFileSystem& system) {
+    int folder = -1;
+    const auto open = [&](int flags) {
+        return ErrorOf([&] { return folder = system.openFolder(AT_FDCWD, path.c_str(), flags | O_CLOEXEC); });
+    };
+    int error = open(O_RDONLY | O_DIRECTORY);
+#ifdef O_PATH
+    // A folder that may be written but not listed.
+    if (error == EACCES) error = open(O_PATH | O_DIRECTORY);
+#endif
+    if (error != 0) throw DeckFileError("cannot open the folder '" + path + "'", error);
+    return folder;
+}
+
+/// What is at the target; none where nothing is.
+std::optional<struct stat> FindOld(int folder, const std::string& name, const DeckFileSystem& system) {
+    struct stat found = {};
+    const int error = ErrorOf([&] { return system.inspect(folder, name.c_str(), &found); });
+    if (error == ENOENT) return std::nullopt;
+    if (error != 0) throw DeckFileError("cannot look at what is there", error);
+    if (S_ISDIR(found.st_mode)) throw DeckFileError("a folder is in its place", EISDIR);
+    if (!S_ISREG(found.st_mode)) throw DeckFileError("something that is no file is in its place", 0);
+    const int accessError = ErrorOf([&] { return system.mayWrite(folder, name.c_str()); });
+    if (accessError != 0) throw DeckFileError("the file in its place may not be written", accessError);
+    return found;
+}
+
+/// Gives the new file the access control list of the old one; false when it has one that can't be given.
+bool CopyAccessList(int file, const std::string& old) {
+#if __has_include(<sys/xattr.h>)
+    constexpr const char* list = "system.posix_acl_access";
+    const ssize_t size = ::lgetxattr(old.c_str(), list, nullptr, 0);
+    if (size <= 0) return true;
+    std::vector<char> value(static_cast<std::size_t>(size));
+    return ::lgetxattr(old.c_str(), list, value.data(), value.size()) == size &&
+           ::fsetxattr(file, list, value.data(), value.size(), 0) == 0;
+#else
+    static_cast<void>(file);
+    static_cast<void>(old);
+    return true;
+#endif
+}
+
+/// Makes the new file as accessible as the old one, and to nobody more.
+int TakeOver(int file, const struct stat& old, const std::string& oldPath, const DeckFileSystem& system) {
+    bool hasGroup = ErrorOf([&] { return system.chown(file, old.st_uid, old.st_gid); }) == 0;
+    if (!hasGroup) {
+        hasGroup = ErrorOf([&] { return system.chown(file, static_cast<uid_t>(-1), old.st_gid); }) == 0;
+    }
+    const mode_t mode = old.st_mode & 0777;
+    // Another group gets no more than all others have.
+    const mode_t narrowed = (mode & 0707) | (mode & ((mode & 07) << 3));
+    if (hasGroup) {
+        const int error = ErrorOf([&] { return system.chmod(file, mode); });
+        if (error != 0 || CopyAccessList(file, oldPath)) return error;
+    }
+    return ErrorOf([&] { return system.chmod(file, narrowed); });
+}
+
+struct FileCloser {
+    void operator()(std::FILE* file) const { std::fclose(file); }
+};
 
 } // namespace
 
@@ -58,98 +142,64 @@ const DeckFileSystem& DeckFileSystem::Standard() {
 DeckFileError::DeckFileError(const std::string& action, int error)
     : std::runtime_error(WithReason(action, error)), error_(error) {}
 
-/// The temporary folder with the deck in it; removes both.
-class DeckFile::Scratch {
-public:
-    Scratch(const std::string& folder, const DeckFileSystem& system) : system_(system) {
-        folder_ = folder + "/.qrxdeck-XXXXXX";
-        jobName_.reserve(folder_.size() + 5);
-        deck_.reserve(folder_.size() + 9);
-        const SignalCleanUp::Block block;
-        errno = 0;
-        if (system_.makeFolder(folder_.data()) == nullptr) {
-            throw DeckFileError("cannot make a temporary folder in '" + folder + "'", ReasonOr(EIO));
-        }
-        jobName_.append(folder_).append("/deck");
-        deck_.append(jobName_).append(".inp");
-        SignalCleanUp::Set(deck_.c_str(), folder_.c_str());
-    }
-    Scratch(const Scratch&) = delete;
-    Scratch& operator=(const Scratch&) = delete;
-    ~Scratch() { Remove(); }
-
-    const std::string& Folder() const { return folder_; }
-    const char* JobName() const { return jobName_.c_str(); }
-    const std::string& Deck() const { return deck_; }
-
-    void MarkMoved() { moved_ = true; }
-    /// The errno value of the failure, 0 for none. Only the first call removes.
-    int Remove() noexcept {
-        if (removed_) return 0;
-        removed_ = true;
-        const int fileError = moved_ ? 0 : ErrorOf([this] { return system_.remove(deck_.c_str()); });
-        const int folderError = ErrorOf([this] { return system_.removeFolder(folder_.c_str()); });
-        SignalCleanUp::Clear();
-        return fileError != 0 && fileError != ENOENT ? fileError : folderError;
-    }
-
-private:
-    const DeckFileSystem& system_;
-    std::string folder_;
-    std::string jobName_;
-    std::string deck_;
-    bool moved_ = false;
-    bool removed_ = false;
-};
-
 DeckFile::DeckFile(std::string target, const DeckFileSystem& system, std::string thing)
-    : target_(std::move(target)), thing_(std::move(thing)), folder_(FolderOf(target_)), system_(system) {}
+    : target_(std::move(target)), thing_(std::move(thing)), system_(system) {}
 
-DeckFile::Result DeckFile::Replace(const std::function<void(const char* jobName)>& write) {
-    CheckTarget();
-    Scratch scratch(folder_, system_);
-    temporaryFolder_ = scratch.Folder();
-    qio_RecordOpenFailure(ENOENT);
-    write(scratch.JobName());
+DeckFile::Result DeckFile::Replace(const Write& write, const Ready& ready) {
+    const std::string path = EndOfLinks(target_, system_);
+    const std::string folderName = FolderOf(path);
+    const std::string name = std::filesystem::path(path).filename().string();
+    Descriptor folder(OpenFolder(folderName, system_), system_);
+    const std::optional<struct stat> old = FindOld(folder.Number(), name, system_);
+    ScratchFolder::RemoveLeavings(folder.Number(), system_);
+    ScratchFolder scratch(folder.Number(), folderName, system_);
+    temporaryFolder_ = folderName + "/" + scratch.Name();
 
-    const qio_Report report = qio_LastReport();
-    if (!report.opened) throw DeckFileError("cannot make the file", report.error);
-    if (report.error != 0) throw DeckFileError("cannot write the " + thing_, report.error);
-    SyncFile(scratch.Deck());
-    const int error = ErrorOf([&] { return system_.rename(scratch.Deck().c_str(), target_.c_str()); });
-    if (error != 0) throw DeckFileError("cannot put the " + thing_ + " in its place", error);
+    const auto check = [](const std::string& action, int error) {
+        if (error != 0) throw DeckFileError(action, error);
+    };
+    int number = -1;
+    check("cannot make the file", ErrorOf([&] {
+              return number = system_.create(scratch.Number(), ScratchFolder::kFileName, old ? 0600 : 0666);
+          }));
+    Descriptor file(number, system_);
+    Result result;
+    result.bytes = WriteTo(number, write);
+    if (old) check("cannot keep the access to the " + thing_, TakeOver(number, *old, path, system_));
+    const int syncError = ErrorOf([&] { return system_.sync(number); });
+    // Some file systems have nothing to sync.
+    if (syncError != EINVAL && syncError != ENOTSUP) {
+        check("cannot bring the " + thing_ + " to the disk", syncError);
+    }
+    check("cannot write the " + thing_, file.Close());
+    if (ready) ready(result.bytes);
+    check("cannot put the " + thing_ + " in its place", ErrorOf([&] {
+              return system_.rename(scratch.Number(), ScratchFolder::kFileName, folder.Number(),
+                                    name.c_str());
+          }));
 
     scratch.MarkMoved();
-    Result result;
-    result.bytes = report.bytes;
     result.removeError = scratch.Remove();
-    result.folderSyncError = Sync(folder_.c_str());
+    result.folderSyncError = ErrorOf([&] { return system_.sync(folder.Number()); });
+    if (result.folderSyncError == EINVAL || result.folderSyncError == ENOTSUP) result.folderSyncError = 0;
+    const int closeError = folder.Close();
+    if (result.folderSyncError == 0) result.folderSyncError = closeError;
     return result;
 }
 
-void DeckFile::CheckTarget() const {
-    struct stat found = {};
-    const int error = ErrorOf([&] { return system_.inspect(target_.c_str(), &found); });
-    if (error == ENOENT) return;
-    if (error != 0) throw DeckFileError("cannot look at what is there", error);
-    if (S_ISDIR(found.st_mode)) throw DeckFileError("a folder is in its place", EISDIR);
-    if (!S_ISREG(found.st_mode)) throw DeckFileError("something that is no file is in its place", 0);
-}
-
-void DeckFile::SyncFile(const std::string& path) const {
-    const int error = Sync(path.c_str());
-    if (error != 0) throw DeckFileError("cannot bring the " + thing_ + " to the disk", error);
-}
-
-int DeckFile::Sync(const char* path) const {
-    int file = -1;
-    const int openError = ErrorOf([&] { return file = system_.open(path); });
-    if (openError != 0) return openError;
-    int error = ErrorOf([&] { return system_.sync(file); });
-    // Some file systems have nothing to sync.
-    if (error == EINVAL || error == ENOTSUP) error = 0;
-    errno = 0;
-    // An interrupted close has closed.
-    if (system_.close(file) != 0 && errno != EINTR && error == 0) error = ReasonOr(EIO);
-    return error;
+long long DeckFile::WriteTo(int number, const Write& write) const {
+    const int copy = ::fcntl(number, F_DUPFD_CLOEXEC, 0);
+    const std::unique_ptr<std::FILE, FileCloser> stream(copy < 0 ? nullptr : ::fdopen(copy, "wb"));
+    if (stream == nullptr) {
+        const int error = ErrorNumber();
+        if (copy >= 0) ::close(copy);
+        throw DeckFileError("cannot make the file", error);
+    }
+    std::setvbuf(stream.get(), nullptr, _IONBF, 0);
+    qio_ios device;
+    device.attach(stream.get(), false);
+    write(device);
+    device.close();
+    if (device.Error() != 0) throw DeckFileError("cannot write the " + thing_, device.Error());
+    return device.Bytes();
 }

@@ -6,21 +6,33 @@
 #include <string>
 
 #include <sys/stat.h>
+#include <sys/types.h>
 
-/// The system calls that put a deck in its place. Tests put their own here to make a call fail.
+class qio_ostream;
+
+/// The system calls that put a deck in its place, each as the call of that name and -1 with errno when it
+/// fails. `at` is an open folder, in which names are looked up. Tests put their own here to make a call fail.
 struct DeckFileSystem {
-    /// As stat.
-    int (*inspect)(const char* path, struct stat* found);
-    /// As mkdtemp.
-    char* (*makeFolder)(char* pattern);
-    /// As open, for reading.
-    int (*open)(const char* path);
-    /// As fsync, close, rename, unlink and rmdir.
+    ssize_t (*readlink)(const char* path, char* buffer, std::size_t bytes);
+    int (*openFolder)(int at, const char* name, int flags);
+    /// Never follows a link at the name itself.
+    int (*inspect)(int at, const char* name, struct stat* found);
+    /// As faccessat, for writing.
+    int (*mayWrite)(int at, const char* name);
+    int (*makeFolder)(int at, const char* name);
+    /// As fstat.
+    int (*inspectOpen)(int file, struct stat* found);
+    /// As flock: alone, without waiting.
+    int (*lock)(int file);
+    /// As openat, for a new file to be written.
+    int (*create)(int at, const char* name, mode_t mode);
     int (*sync)(int file);
+    int (*chown)(int file, uid_t owner, gid_t group);
+    int (*chmod)(int file, mode_t mode);
     int (*close)(int file);
-    int (*rename)(const char* from, const char* to);
-    int (*remove)(const char* path);
-    int (*removeFolder)(const char* path);
+    int (*rename)(int fromFolder, const char* from, int toFolder, const char* to);
+    int (*remove)(int at, const char* name);
+    int (*removeFolder)(int at, const char* name);
 
     static const DeckFileSystem& Standard();
 };
@@ -39,6 +51,10 @@ private:
 /// A deck, or another file, that is replaced as a whole or not at all: it is written in a fresh hidden folder
 /// beside its place, brought to the disk, and renamed onto its place in one step. Whatever fails before that,
 /// an exception of the writer included, leaves an older deck as it was and nothing else behind.
+///
+/// The hidden folder belongs to the user alone and is used through its descriptor, so nobody who may write to
+/// the folder of the deck can put another file, or a link, in between. It is locked while its run lives; one
+/// that a run left behind when it was killed is removed by the next run that writes beside it.
 class DeckFile {
 public:
     struct Result {
@@ -48,16 +64,21 @@ public:
         int folderSyncError = 0;
         int removeError = 0;
     };
+    using Write = std::function<void(qio_ostream& device)>;
+    using Ready = std::function<void(long long bytes)>;
 
-    /// A symbolic link at the target is replaced, not followed. The system must outlive the deck file.
-    /// Messages call the file by the word `thing`.
+    /// A symbolic link at the target is followed: what it points to is replaced. The system must outlive the
+    /// deck file. Messages call the file by the word `thing`.
     explicit DeckFile(std::string target, const DeckFileSystem& system = DeckFileSystem::Standard(),
                       std::string thing = "deck");
 
-    /// Calls `write` with a job name to write `<job name>.inp` under; the name is free of whatever the
-    /// target's name holds. The bytes must go through the library's device, whose report of this thread tells
-    /// whether all arrived. Raises DeckFileError, and lets the exceptions of `write` through.
-    Result Replace(const std::function<void(const char* jobName)>& write);
+    /// Calls `write`, and `ready` when all is written and only the renaming is left. Raises DeckFileError,
+    /// and lets the exceptions of both through.
+    ///
+    /// What replaces a file has its mode, its access control list and, where that is permitted, its owner and
+    /// group; where it isn't, nobody has more rights than before. A file that may not be written is not
+    /// replaced. Other hard links to it go on showing what it held.
+    Result Replace(const Write& write, const Ready& ready = {});
 
     const std::string& Target() const { return target_; }
     const std::string& Thing() const { return thing_; }
@@ -65,16 +86,11 @@ public:
     const std::string& TemporaryFolder() const { return temporaryFolder_; }
 
 private:
-    class Scratch;
-
-    void CheckTarget() const;
-    void SyncFile(const std::string& path) const;
-    /// The errno value of the failure, 0 for none.
-    int Sync(const char* path) const;
+    /// The bytes that were written to the open file.
+    long long WriteTo(int number, const Write& write) const;
 
     std::string target_;
     std::string thing_;
-    std::string folder_;
     std::string temporaryFolder_;
     const DeckFileSystem& system_;
 };

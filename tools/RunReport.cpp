@@ -1,10 +1,23 @@
 #include "tools/RunReport.h"
 
+#include "store_interface/findings/fnd_Text.h"
+#include "tools/StandardStreams.h"
+
 #include <cerrno>
-#include <cstdio>
 #include <system_error>
 
 using nlohmann::ordered_json;
+
+namespace {
+
+constexpr std::size_t kBufferBytes = std::size_t{64} * 1024;
+
+void PutError(std::string line) {
+    line += '\n';
+    WriteToStandardError(line);
+}
+
+} // namespace
 
 RunReport::RunReport(bool asJson) : asJson_(asJson) {
     root_["exitCode"] = 0;
@@ -33,23 +46,39 @@ void RunReport::WriterError(const std::string& text, const std::string& context)
 }
 
 void RunReport::Print(const std::string& text) {
-    if (!asJson_) std::fwrite(text.data(), 1, text.size(), stdout);
+    if (asJson_) return;
+    pending_ += text;
+    if (pending_.size() < kBufferBytes) return;
+    Put(pending_);
+    pending_.clear();
+}
+
+bool RunReport::PrepareForSuccess() {
+    if (asJson_) {
+        prepared_ = JsonText(ExitCode::DONE);
+        return true;
+    }
+    const bool put = Put(pending_);
+    pending_.clear();
+    return put;
 }
 
 ExitCode RunReport::Finish(ExitCode code) {
-    if (asJson_) {
-        root_["exitCode"] = static_cast<int>(code);
-        // File names may hold bytes that are no UTF-8.
-        const std::string text = root_.dump(2, ' ', false, ordered_json::error_handler_t::replace) + "\n";
-        std::fwrite(text.data(), 1, text.size(), stdout);
+    if (!asJson_) {
+        Put(pending_);
+    } else if (code == ExitCode::DONE && !prepared_.empty()) {
+        Put(prepared_);
+    } else {
+        Put(JsonText(code));
     }
-    errno = 0;
-    const bool failed = std::fflush(stdout) != 0 || std::ferror(stdout) != 0;
-    if (!failed) return code;
-    const int error = errno;
-    PutError("standard output: error: " +
-             (error == 0 ? "write error" : std::generic_category().message(error)));
-    return code == ExitCode::DONE ? ExitCode::FILE_SYSTEM_REFUSED : code;
+    if (!isOutputLost_ || code != ExitCode::DONE) return code;
+    return isWritten_ ? ExitCode::REPORT_LOST : ExitCode::FILE_SYSTEM_REFUSED;
+}
+
+std::string RunReport::JsonText(ExitCode code) {
+    root_["exitCode"] = static_cast<int>(code);
+    // File names may hold bytes that are no UTF-8.
+    return root_.dump(2, ' ', false, ordered_json::error_handler_t::replace) + "\n";
 }
 
 void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
@@ -57,6 +86,7 @@ void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
         PutError(mdf_LineOf(file, finding));
         return;
     }
+    prepared_.clear();
     ordered_json entry = {
         {"severity", fnd_SeverityWord(finding.code->severity)}, {"code", finding.code->name}, {"file", file}};
     if (finding.line > 0) {
@@ -72,7 +102,11 @@ void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
     root_["messages"].push_back(entry);
 }
 
-void RunReport::PutError(const std::string& line) {
-    std::fwrite(line.data(), 1, line.size(), stderr);
-    std::fputc('\n', stderr);
+bool RunReport::Put(std::string_view text) {
+    if (isOutputLost_) return false;
+    const int error = WriteToStandardOutput(text);
+    if (error == 0) return true;
+    isOutputLost_ = true;
+    PutError("standard output: error: " + std::generic_category().message(error));
+    return false;
 }

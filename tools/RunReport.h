@@ -15,6 +15,7 @@ enum class ExitCode : int {
     FILE_SYSTEM_REFUSED = 3, ///< or there is not enough memory
     CANNOT_BE_EXPRESSED = 4,
     INTERNAL_FAILURE = 5,
+    REPORT_LOST = 6, ///< what was to be written stands, but the report on it could not be given
 };
 
 /// What a run has to say: as text, messages at once on the standard error; or all of it as one JSON object on
@@ -34,13 +35,27 @@ public:
     nlohmann::ordered_json& Member(const char* name) { return root_[name]; }
     /// Text for the standard output; left out of JSON.
     void Print(const std::string& text);
-    /// Ends the report. An output that can't be written turns success into a refusal of the file system.
+
+    /// To be called when the file that the run writes needs nothing but its renaming: puts out what was
+    /// printed, and makes the JSON object of a run that is done, so that all that this could fail for has
+    /// been by then. False, with the reason told, when the standard output takes nothing.
+    bool PrepareForSuccess();
+    /// From now on a report that can't be given is all that can be lost.
+    void MarkWritten() { isWritten_ = true; }
+    /// Ends the report. An output that can't be written turns success into a refusal of the file system, or
+    /// into a lost report.
     ExitCode Finish(ExitCode code);
 
 private:
-    static void PutError(const std::string& line);
+    /// False, with the reason told, when it can't be written.
+    bool Put(std::string_view text);
+    std::string JsonText(ExitCode code);
 
     bool asJson_;
+    bool isWritten_ = false;
+    bool isOutputLost_ = false;
+    std::string pending_;  // printed, not yet written
+    std::string prepared_; // the JSON object of a run that is done; empty when there is more to say
     nlohmann::ordered_json root_;
 };
 

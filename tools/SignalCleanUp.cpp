@@ -1,24 +1,24 @@
 #include "tools/SignalCleanUp.h"
 
+#include "tools/ScratchFolder.h"
+
 #include <climits>
 #include <cstring>
 
+#include <fcntl.h>
 #include <unistd.h>
 
 namespace {
 
-constexpr int kSignals[] = {SIGINT, SIGTERM, SIGHUP};
+constexpr int kSignals[] = {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGXCPU};
 
-char theFile[PATH_MAX];
-char theFolder[PATH_MAX];
+int theFolder = -1;
+int theScratch = -1;
+char theName[NAME_MAX + 1];
 volatile std::sig_atomic_t isSet = 0;
 
-// Only calls that are safe within a signal handler.
 void CleanUp(int signal) {
-    if (isSet != 0) {
-        ::unlink(theFile);
-        ::rmdir(theFolder);
-    }
+    SignalCleanUp::Remove();
     // The handler is the default one by now; this arrives when it returns.
     ::raise(signal);
 }
@@ -40,16 +40,22 @@ void SignalCleanUp::Install() {
     std::signal(SIGXFSZ, SIG_IGN);
 }
 
-void SignalCleanUp::Set(const char* file, const char* folder) noexcept {
-    // Longer paths can't be made in the first place.
-    if (std::strlen(file) >= sizeof theFile) return;
-    std::strcpy(theFile, file);
-    std::strcpy(theFolder, folder);
+void SignalCleanUp::Set(int at, const char* name, int folder) noexcept {
+    if (std::strlen(name) >= sizeof theName) return;
+    std::strcpy(theName, name);
+    theFolder = at;
+    theScratch = folder;
     isSet = 1;
 }
 
 void SignalCleanUp::Clear() noexcept {
     isSet = 0;
+}
+
+void SignalCleanUp::Remove() noexcept {
+    if (isSet == 0) return;
+    ::unlinkat(theScratch, ScratchFolder::kFileName, 0);
+    ::unlinkat(theFolder, theName, AT_REMOVEDIR);
 }
 
 SignalCleanUp::Block::Block() noexcept {

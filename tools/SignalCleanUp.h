@@ -3,16 +3,20 @@
 
 #include <csignal>
 
-/// Removes one file and its folder when a signal ends the process. There is one such pair in a process.
+/// Removes one folder and the file in it when a signal, or a lack of memory, ends the process. There is one
+/// such folder in a process.
 class SignalCleanUp {
 public:
-    /// From now on SIGINT, SIGTERM and SIGHUP clean up before they end the process. A file that outgrows its
+    /// From now on signals that end the process and can be caught clean up first. A file that outgrows its
     /// limit fails with EFBIG instead of ending it.
     static void Install();
 
-    /// Takes copies. Call Set() while a Block lives, together with the making of the folder.
-    static void Set(const char* file, const char* folder) noexcept;
+    /// The folder of this name in the open folder `at`, itself open as `folder`; the name is copied. Call
+    /// Set() while a Block lives, together with the making of the folder.
+    static void Set(int at, const char* name, int folder) noexcept;
     static void Clear() noexcept;
+    /// Removes what is set; only calls that are safe within a signal handler.
+    static void Remove() noexcept;
 
     /// Holds the signals back for as long as it lives.
     class Block {

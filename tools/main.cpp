@@ -1,13 +1,16 @@
 #include "foundation/nex_Exception.h"
+#include "store_interface/findings/fnd_Text.h"
 #include "tools/Commands.h"
+#include "tools/OutOfMemory.h"
 #include "tools/SignalCleanUp.h"
+#include "tools/StandardStreams.h"
 
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
 #include <cstdio>
-#include <iostream>
 #include <new>
+#include <sstream>
 #include <string_view>
 
 namespace {
@@ -21,8 +24,11 @@ constexpr char kExitCodes[] =
     "  3  a file can't be read or written, or there is not enough memory\n"
     "  4  a deck can't express the model: the reason on a line, object and step on the next\n"
     "  5  an internal failure\n"
+    "  6  the file was written, but the report on it is lost\n"
     "\n"
-    "A run that fails leaves an older deck as it was.\n";
+    "A run that fails with 1 to 5 leaves an older deck as it was. A deck takes over the access rights of "
+    "the\n"
+    "one that it replaces, which must be writable; a link is followed, other hard links keep the old deck.\n";
 
 struct CommandLine {
     CLI::App app{kAbout, "qrxdeck"};
@@ -53,7 +59,8 @@ struct CommandLine {
         writeCommand
             ->add_option(
                 "--job", write.job,
-                "Name of the deck without \".inp\"; may hold a folder, relative to the output folder "
+                "Name of the deck without \".inp\"; may hold a folder, relative to the output folder, "
+                "out of which \"../\" leads; an absolute path excludes --output-dir "
                 "(default: the model file's name without extension)")
             ->type_name("NAME");
         writeCommand
@@ -89,8 +96,8 @@ struct CommandLine {
     std::string Complaint(const CLI::ParseError& error, int argc, char** argv) const {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
-        return std::string("there is no command '") + argv[1] +
-               "'; the commands are write, check, info, format, variables and schema";
+        return "there is no command " + fnd_Quoted(argv[1]) +
+               "; the commands are write, check, info, format, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
@@ -118,8 +125,7 @@ ExitCode RunGuarded(const CommandLine& commandLine, RunReport& report) {
     try {
         return commandLine.Run(report);
     } catch (const std::bad_alloc&) {
-        report.Error("qrxdeck", "not enough memory");
-        return ExitCode::FILE_SYSTEM_REFUSED;
+        OutOfMemory::End();
     } catch (const std::exception& failure) {
         report.Error("qrxdeck", std::string("internal failure: ") + failure.what());
         return ExitCode::INTERNAL_FAILURE;
@@ -136,14 +142,16 @@ ExitCode Main(int argc, char** argv) {
                                       [](const char* word) { return std::string_view(word) == "--json"; });
         RunReport report(wrong && json);
         if (!wrong) {
-            commandLine.app.exit(error, std::cout, std::cerr);
-            std::cout.flush();
+            std::ostringstream text;
+            commandLine.app.exit(error, text, text);
+            report.Print(text.str());
             return report.Finish(ExitCode::DONE);
         }
         report.Error("qrxdeck", commandLine.Complaint(error, argc, argv));
         if (!json) std::fputs("Run with --help for more information.\n", stderr);
         return report.Finish(ExitCode::WRONG_USAGE);
     }
+    OutOfMemory::Install(commandLine.json);
     RunReport report(commandLine.json);
     return report.Finish(RunGuarded(commandLine, report));
 }
@@ -151,12 +159,13 @@ ExitCode Main(int argc, char** argv) {
 } // namespace
 
 int main(int argc, char** argv) {
+    SecureStandardStreams();
     SignalCleanUp::Install();
+    OutOfMemory::Install(false);
     try {
         return static_cast<int>(Main(argc, argv));
     } catch (const std::bad_alloc&) {
-        std::fputs("qrxdeck: error: not enough memory\n", stderr);
-        return static_cast<int>(ExitCode::FILE_SYSTEM_REFUSED);
+        OutOfMemory::End();
     } catch (const std::exception& failure) {
         std::fprintf(stderr, "qrxdeck: error: internal failure: %s\n", failure.what());
         return static_cast<int>(ExitCode::INTERNAL_FAILURE);

@@ -45,8 +45,8 @@ struct fnd_Finding {
     std::string Text() const;
 };
 
-inline fnd_Finding fnd_Make(fnd_CodeName code, std::string place, std::string found, std::string expected = {},
-                            std::string hint = {}) {
+inline fnd_Finding fnd_Make(fnd_CodeName code, std::string place, std::string found,
+                            std::string expected = {}, std::string hint = {}) {
     return {&code.Row(), std::move(place), std::move(found), std::move(expected), std::move(hint)};
 }
 
@@ -58,6 +58,9 @@ class fnd_Sink {
 public:
     virtual ~fnd_Sink() = default;
     virtual void Take(fnd_Finding finding) = 0;
+    /// Whether the next finding is worth a hint that has to be searched for. Of many errors of one kind the
+    /// first few hints say it all.
+    virtual bool WantsHint() { return hints_++ < kMostHints; }
 
     void Add(fnd_CodeName code, std::string place, std::string found, std::string expected = {},
              std::string hint = {}) {
@@ -67,6 +70,12 @@ public:
              std::string hint = {}) {
         Add(code, place.Text(), std::move(found), std::move(expected), std::move(hint));
     }
+
+protected:
+    static constexpr int kMostHints = 50;
+
+private:
+    int hints_ = 0;
 };
 
 /// Keeps them all.
@@ -87,6 +96,7 @@ class fnd_Below final : public fnd_Sink {
 public:
     fnd_Below(fnd_Sink& sink, const fnd_Path& path) : sink_(sink), path_(path) {}
     void Take(fnd_Finding finding) override;
+    bool WantsHint() override { return sink_.WantsHint(); }
 
 private:
     fnd_Sink& sink_;

@@ -17,8 +17,6 @@ std::string fnd_Shown(double value);
 std::string fnd_Counted(long long count, const char* singular);
 /// "one of a, b, c".
 std::string fnd_OneOf(const std::vector<std::string>& words);
-/// The known name that is nearest to `name`, as "did you mean 'x'?", or nothing when none is near.
-std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>& known);
 /// The text with A to Z as a to z.
 std::string fnd_LowerCase(std::string_view text);
 
@@ -28,5 +26,7 @@ struct fnd_NameProblem {
     std::string expected;
 };
 fnd_NameProblem fnd_ProblemOfName(std::string_view name);
+/// The same of a text that stands on a line of the deck but is no name.
+fnd_NameProblem fnd_ProblemOfText(std::string_view text);
 
 #endif

@@ -5,7 +5,7 @@
 ddb_Model ddb_Ddb::model(const cow_String& name) const {
     const auto place = models_->find(name);
     if (place == models_->end()) cow_RaiseNoSuchKey("ddb_Ddb", name);
-    if (!place->second->IsComplete()) place->second->Complete();
+    place->second->EnsureComplete();
     return ddb_Model(place->second);
 }
 

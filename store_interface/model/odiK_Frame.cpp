@@ -62,6 +62,7 @@ const cls_FieldTable& odiK_ModelData::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::description>("description", "for people; never in the deck")
+            .FreeText()
             .Field<&R::topLevelSolverInput>("topLevelSolverInput", "opening text of the deck")
             .Verbatim()
             .Field<&R::solverInput>("solverInput", "text that closes the model section")

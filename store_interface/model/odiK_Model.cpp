@@ -40,10 +40,10 @@ void Place(odiK_Datum& datum) {
     if (csys || datum.type == dtu_DatumType::PLANE) NormalizeAxis(datum.zAxis, datum.name, "zAxis");
 }
 
-void Propagate(mdl_Repository& repository, const kprC_StepContainer& steps) {
+void Propagate(mdl_Repository& repository, const kprC_Timeline& timeline) {
     for (const cow_String& name : repository.Keys()) {
         const auto problems =
-            static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name)).Propagate(steps);
+            static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name)).Propagate(timeline);
         if (!problems.empty()) mdl_RaisePropagationProblem(name, problems.front());
     }
 }
@@ -72,14 +72,13 @@ dtmC_DatumRef odiK_Model::AddDatum(odiK_Datum datum) {
     datum.givenAxes[2] = datum.zAxis;
     Place(datum);
     datums_.push_back(datum);
+    datumIndex_.emplace(datums_.back().name.View(), static_cast<int>(datums_.size()));
     return dtmC_DatumRef(static_cast<int>(datums_.size()));
 }
 
 dtmC_DatumRef odiK_Model::FindDatum(const cow_String& name) const {
-    for (std::size_t i = 0; i < datums_.size(); ++i) {
-        if (datums_[i].name == name) return dtmC_DatumRef(static_cast<int>(i) + 1);
-    }
-    return {};
+    const auto place = datumIndex_.find(name.View());
+    return place == datumIndex_.end() ? dtmC_DatumRef() : dtmC_DatumRef(place->second);
 }
 
 template <class Entry>
@@ -268,8 +267,15 @@ void odiK_Model::Complete() {
     }
     if (!assemblyMesh_.IsNull()) assemblyMesh_->FinishElements(problems);
     CompleteTree(problems);
+    const kprC_Timeline timeline(steps);
     for (const odiK_Repository& repository : odiK_Repositories()) {
-        if (repository.IsPropagating()) Propagate(repository.In(*this), steps);
+        if (repository.IsPropagating()) Propagate(repository.In(*this), timeline);
     }
     SetComplete();
+}
+
+void odiK_Model::EnsureComplete() {
+    if (IsComplete()) return;
+    const std::lock_guard<std::mutex> lock(completing_);
+    if (!IsComplete()) Complete();
 }

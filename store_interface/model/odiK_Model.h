@@ -16,7 +16,9 @@
 #include "store_interface/records/sections/kbpC_BeamProfile.h"
 #include "store_interface/records/sections/kseC_ConnectorSection.h"
 
+#include <atomic>
 #include <map>
+#include <mutex>
 #include <optional>
 
 /// An attribute of a part, given on a set of the mesh by name until the instance is known.
@@ -190,11 +192,13 @@ public:
     /// steps. Raises when something can't be. Must be called again after a change of a model that has been
     /// read.
     void Complete();
-    /// The same but for what lives across steps.
+    /// The same, once. Threads that read one model may call it at once.
+    void EnsureComplete();
+    /// Complete() but for what lives across steps.
     void CompleteTree(fnd_Sink& problems);
     /// Tells that all of it has been worked out.
-    void SetComplete() { complete_ = true; }
-    bool IsComplete() const { return complete_; }
+    void SetComplete() { complete_.store(true, std::memory_order_release); }
+    bool IsComplete() const { return complete_.load(std::memory_order_acquire); }
 
 private:
     template <class Entry>
@@ -203,11 +207,13 @@ private:
 
     cow_String name_;
     std::vector<odiK_Datum> datums_;
+    std::unordered_map<std::string_view, int> datumIndex_; // ids; the names lie in the datums
     std::map<cow_String, cow_CountedHld<odiK_Part>> parts_;
     std::map<cow_String, cow_CountedHld<odiK_Instance>> instances_;
     std::vector<cow_CountedHld<odiK_Instance>> instanceOfMesh_;
     bool sealed_ = false;
-    bool complete_ = false;
+    std::atomic<bool> complete_ = false;
+    std::mutex completing_;
     cow_CountedHld<odiK_Mesh> assemblyMesh_;
     odiK_Assembly assembly_;
     std::vector<cow_CountedHld<odiK_Set>> assemblySets_;

@@ -1,5 +1,6 @@
 #include "store_interface/model/odiK_References.h"
 
+#include "store_interface/findings/fnd_Nearest.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -57,7 +58,9 @@ void odiK_References::Check(const cls_Field& field, const std::string& name, con
     const bool startsWithVowel = std::string_view("aeiou").find(kind.front()) != std::string_view::npos;
     sink.Add("no-such-name", place, "found " + fnd_Quoted(name),
              std::string("the name of ") + (startsWithVowel ? "an " : "a ") + kind,
-             fnd_DidYouMean(name, names.inOrder));
+             fnd_DidYouMean(sink, name, [&names](fnd_Nearest& nearest) {
+                 for (const std::string& known : names.inOrder) nearest.Try(known);
+             }));
 }
 
 void odiK_References::CheckClass(const cls_Field& field, const std::string& name, const std::string& place,

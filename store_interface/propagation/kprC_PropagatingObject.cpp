@@ -58,30 +58,40 @@ bool mdl_GivenState::IsGiven(const char* field) const {
     return false;
 }
 
+mdl_GivenState* kprC_PropagatingObject::Given::Find(const cow_String& stepName) {
+    if (!places.empty()) {
+        const auto place = places.find(stepName.View());
+        return place == places.end() ? nullptr : &states[place->second];
+    }
+    const auto place = std::ranges::find(states, stepName, &mdl_GivenState::stepName);
+    return place == states.end() ? nullptr : &*place;
+}
+
 const std::vector<mdl_GivenState>& kprC_PropagatingObject::GivenStates() const {
     static const std::vector<mdl_GivenState> none;
-    return given_.IsNull() ? none : given_.ConstGet();
+    return given_.IsNull() ? none : given_.ConstGet().states;
 }
 
 const mdl_GivenState* kprC_PropagatingObject::GivenState(const cow_String& stepName) const {
-    const std::vector<mdl_GivenState>& all = GivenStates();
-    const auto place = std::find_if(all.begin(), all.end(),
-                                    [&](const mdl_GivenState& given) { return given.stepName == stepName; });
-    return place == all.end() ? nullptr : &*place;
+    return given_.IsNull() ? nullptr : given_.Referent()->Find(stepName);
 }
 
 mdl_GivenState& kprC_PropagatingObject::Give(const cow_String& stepName) {
-    if (given_.IsNull()) given_.Reset(new std::vector<mdl_GivenState>());
-    std::vector<mdl_GivenState>& all = given_.Get();
-    const auto place = std::find_if(all.begin(), all.end(),
-                                    [&](const mdl_GivenState& given) { return given.stepName == stepName; });
-    if (place != all.end()) return *place;
+    constexpr std::size_t few = 16;
+    if (given_.IsNull()) given_.Reset(new Given());
+    Given& all = given_.Get();
+    if (mdl_GivenState* known = all.Find(stepName)) return *known;
     mdl_GivenState given;
     given.stepName = stepName;
     given.record = mdl_ObjCow<cls_Record>(NewState(0));
     given.marks.assign(given.record.ConstGet().DynFields().All().size(), mdl_GivenEnm::ABSENT);
-    all.push_back(std::move(given));
-    return all.back();
+    all.states.push_back(std::move(given));
+    if (all.states.size() > few) {
+        for (std::size_t i = all.places.size(); i < all.states.size(); ++i) {
+            all.places.emplace(all.states[i].stepName.View(), i);
+        }
+    }
+    return all.states.back();
 }
 
 bool kprC_PropagatingObject::IsActive(Status status) {
@@ -346,29 +356,86 @@ private:
     bool begun_ = false;
 };
 
-std::vector<kprC_PropagatingObject::StepResult>
-kprC_PropagatingObject::WorkOut(const kprC_StepContainer& steps, std::vector<fnd_Finding>& problems) const {
+/// Asks the engine for as few steps as tell of all.
+class kprC_PropagatingObject::Walk {
+public:
+    Walk(Engine& engine, const kprC_Timeline& timeline) : engine_(engine), timeline_(timeline) {}
+
+    void Given(int step, const mdl_GivenState& given) { Ask(step, &given); }
+
+    /// Steps from `from` on, before `to`, for which nothing is given. What such a step hands on, the next of
+    /// its kind hands on unchanged if it came to the same as the one before: then all that follow do.
+    void Carry(int from, int to) {
+        int general = timeline_.Next(false, from);
+        int perturbation = timeline_.Next(true, from);
+        bool isSettled = false;
+        bool isGeneralNew = true;
+        bool isPerturbationNew = true;
+        while (std::min(general, perturbation) < to) {
+            if (general < perturbation) {
+                isSettled = !Ask(general, nullptr) && !isGeneralNew;
+                isGeneralNew = false;
+                // What a perturbation sees may have changed.
+                isPerturbationNew = true;
+                general = isSettled ? to : timeline_.Next(false, general + 1);
+            } else {
+                const bool same = !Ask(perturbation, nullptr) && !isPerturbationNew;
+                isPerturbationNew = false;
+                perturbation = same ? timeline_.Next(true, std::min(general, to))
+                                    : timeline_.Next(true, perturbation + 1);
+            }
+        }
+    }
+
+    History Take() { return std::move(history_); }
+
+private:
+    /// Whether the step came to something else than the last one of its kind.
+    bool Ask(int step, const mdl_GivenState* given) {
+        const kprC_StepContainer& steps = timeline_.Steps();
+        StepResult result = engine_.Step(steps.NameAt(step), steps.StepAt(step), given);
+        std::vector<RunResult>& runs = history_.ofKind[timeline_.IsPerturbation(step) ? 1 : 0];
+        if (!runs.empty() && IsSame(runs.back().result, result)) return false;
+        runs.push_back({step, std::move(result)});
+        return true;
+    }
+
+    static bool IsSame(const StepResult& a, const StepResult& b) {
+        if (a.status != b.status || a.state.IsNull() != b.state.IsNull()) return false;
+        return a.state == b.state || cls_RecordsEqual(a.state.ConstGet(), b.state.ConstGet());
+    }
+
+    Engine& engine_;
+    const kprC_Timeline& timeline_;
+    History history_;
+};
+
+kprC_PropagatingObject::History kprC_PropagatingObject::WorkOut(const kprC_Timeline& timeline,
+                                                                std::vector<fnd_Finding>& problems) const {
     Engine engine(*this, problems);
-    std::vector<StepResult> results;
-    results.reserve(static_cast<std::size_t>(steps.Size()));
-    std::vector<const mdl_GivenState*> givenAt(static_cast<std::size_t>(steps.Size()));
+    Walk walk(engine, timeline);
+    std::vector<std::pair<int, const mdl_GivenState*>> givenAt;
     std::vector<cow_String> unknown;
     for (const mdl_GivenState& given : GivenStates()) {
-        const int index = steps.IndexOf(given.stepName);
+        const int index = timeline.Steps().IndexOf(given.stepName);
         if (index < 0) {
             unknown.push_back(given.stepName);
         } else {
-            givenAt[static_cast<std::size_t>(index)] = &given;
+            givenAt.emplace_back(index, &given);
         }
     }
-    for (int i = 0; i < steps.Size(); ++i) {
-        results.push_back(
-            engine.Step(steps.NameAt(i), steps.StepAt(i), givenAt[static_cast<std::size_t>(i)]));
+    std::ranges::sort(givenAt);
+    int next = 0;
+    for (const auto& [step, given] : givenAt) {
+        walk.Carry(next, step);
+        walk.Given(step, *given);
+        next = step + 1;
     }
+    walk.Carry(next, timeline.Size());
     for (const cow_String& name : unknown) {
         problems.push_back(Impossible(name, "a state, but there is no step of that name"));
     }
-    return results;
+    return walk.Take();
 }
 
 void mdl_RaisePropagationProblem(const cow_String& object, const fnd_Finding& problem) {

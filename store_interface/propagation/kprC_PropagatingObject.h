@@ -2,11 +2,14 @@
 #define QRX_STORE_KPRC_PROPAGATINGOBJECT_H
 
 #include "store_interface/findings/fnd_Finding.h"
+#include "store_interface/propagation/kprC_Timeline.h"
 #include "store_interface/propagation/mdl_PropAttr.h"
-#include "store_interface/records/steps/kprC_StepContainer.h"
 
+#include <algorithm>
+#include <map>
 #include <memory>
 #include <optional>
+#include <unordered_map>
 #include <vector>
 
 /// What the user said of one field of a state.
@@ -68,7 +71,7 @@ public:
 
     /// Works out all steps; must run again after a change of states or steps. Gives the states that can't
     /// be, in step order, then those of unknown steps; they are treated as if nothing had been said.
-    virtual std::vector<fnd_Finding> Propagate(const kprC_StepContainer& steps) = 0;
+    virtual std::vector<fnd_Finding> Propagate(const kprC_Timeline& timeline) = 0;
     /// The status in the step. An unknown step raises.
     virtual mdl_PropagationStatusEnm StatusIn(const cow_String& stepName) const = 0;
 
@@ -89,14 +92,30 @@ protected:
         mdl_PropagationStatusEnm status = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
         mdl_ObjCow<cls_Record> state; // null: none
     };
-    std::vector<StepResult> WorkOut(const kprC_StepContainer& steps,
-                                    std::vector<fnd_Finding>& problems) const;
+    /// What the object is from a step on, in all steps of its kind.
+    struct RunResult {
+        int first = 0;
+        StepResult result;
+    };
+    /// General steps and perturbations, each in ascending order.
+    struct History {
+        std::vector<RunResult> ofKind[2];
+    };
+    History WorkOut(const kprC_Timeline& timeline, std::vector<fnd_Finding>& problems) const;
     [[noreturn]] void RaiseNoSuchStep(const cow_String& stepName) const;
 
 private:
     class Engine;
+    class Walk;
+    struct Given {
+        std::vector<mdl_GivenState> states;
+        // Where they are many; the views lie in the names' storage, which copies share.
+        std::unordered_map<std::string_view, std::size_t> places;
+
+        mdl_GivenState* Find(const cow_String& stepName);
+    };
     // Shared by copies, since every keyword holds a copy of its object.
-    cow_COW<std::vector<mdl_GivenState>, cow_Direct<std::vector<mdl_GivenState>>> given_;
+    cow_COW<Given, cow_Direct<Given>> given_;
 };
 
 /// Sets fields of a user's state by member: Edit<S>(given).Set<&S::u1>(0.5).Clear<&S::amplitude>().
@@ -147,67 +166,104 @@ public:
     using StateRecord = S;
 
     mdl_PropagationStatusEnm Status(const cow_String& stepName) const {
-        return ConstGetStateQuad(stepName).status;
+        return RunAt(IndexOf(stepName)).status;
     }
     mdl_PropagationStatusEnm StatusIn(const cow_String& stepName) const override { return Status(stepName); }
     /// Status, state and procedure in the step. An unknown step raises.
-    const kprC_PropagatingState<S>& ConstGetStateQuad(const cow_String& stepName) const {
-        const int index = steps_.IndexOf(stepName);
-        if (index < 0) this->RaiseNoSuchStep(stepName);
-        return states_.ConstGet()[static_cast<std::size_t>(index)];
+    kprC_PropagatingState<S> ConstGetStateQuad(const cow_String& stepName) const {
+        const int step = IndexOf(stepName);
+        const Run& run = RunAt(step);
+        const auto& replaced = states_.ConstGet().replaced;
+        const auto own = replaced.empty() ? replaced.end() : replaced.find(step);
+        const bool isOwn = own != replaced.end();
+        return {timeline_.Steps().NameAt(step), run.status, isOwn ? own->second : run.state,
+                isOwn || run.hasState, timeline_.Steps().StepAt(step).ProcedureType()};
     }
     /// Whether the user gave a state for the step, a deactivation included.
     bool HasStep(const cow_String& stepName) const { return this->GivenState(stepName) != nullptr; }
     /// The name of the first step of status 1; empty if there is none.
     cow_String CreateStepName() const {
         if (states_.IsNull()) return {};
-        for (const auto& state : states_.ConstGet()) {
-            if (state.status == mdl_PropagationStatusEnm::CREATED) return state.stepName;
+        int first = timeline_.Size();
+        for (const auto& runs : states_.ConstGet().ofKind) {
+            const auto run = std::ranges::find(runs, mdl_PropagationStatusEnm::CREATED, &Run::status);
+            if (run != runs.end()) first = std::min(first, run->first);
         }
-        return {};
+        return first < timeline_.Size() ? timeline_.Steps().NameAt(first) : cow_String();
     }
 
-    std::vector<fnd_Finding> Propagate(const kprC_StepContainer& steps) override {
+    std::vector<fnd_Finding> Propagate(const kprC_Timeline& timeline) override {
         std::vector<fnd_Finding> problems;
-        const auto results = this->WorkOut(steps, problems);
+        const auto history = this->WorkOut(timeline, problems);
+        auto shared = std::make_unique<States>();
         mdl_ObjCow<S> none;
-        auto shared = std::make_unique<States>(results.size());
-        States& states = *shared;
-        for (std::size_t i = 0; i < results.size(); ++i) {
-            states[i].stepName = steps.NameAt(static_cast<int>(i));
-            states[i].status = results[i].status;
-            states[i].procedureType = steps.StepAt(static_cast<int>(i)).ProcedureType();
-            states[i].hasState = !results[i].state.IsNull();
-            if (states[i].hasState) {
-                // Steps that carry one state share it here too.
-                const bool same = i > 0 && results[i].state == results[i - 1].state;
-                states[i].state = same ? states[i - 1].state
-                                       : mdl_ObjCow<S>(static_cast<const S&>(results[i].state.ConstGet()));
-            } else {
-                if (none.IsNull()) none = mdl_ObjCow<S>(static_cast<S*>(this->NewState(0)));
-                states[i].state = none;
+        for (std::size_t kind = 0; kind < 2; ++kind) {
+            std::vector<Run>& runs = shared->ofKind[kind];
+            runs.reserve(history.ofKind[kind].size());
+            for (const auto& [first, result] : history.ofKind[kind]) {
+                if (result.state.IsNull() && none.IsNull()) {
+                    none = mdl_ObjCow<S>(static_cast<S*>(this->NewState(0)));
+                }
+                const bool hasState = !result.state.IsNull();
+                runs.push_back(
+                    {first, result.status, hasState,
+                     hasState ? mdl_ObjCow<S>(static_cast<const S&>(result.state.ConstGet())) : none});
             }
         }
         states_.Reset(shared.release());
-        steps_ = steps;
+        timeline_ = timeline;
         return problems;
+    }
+    /// The steps when the statuses were worked out, and all runs of them in which status and state are the
+    /// same, in the order of their first steps.
+    const kprC_Timeline& Timeline() const { return timeline_; }
+    std::vector<kprC_StepRun> Runs() const {
+        std::vector<kprC_StepRun> all;
+        if (states_.IsNull()) return all;
+        for (const bool perturbation : {false, true}) {
+            const auto& runs = states_.ConstGet().ofKind[perturbation ? 1 : 0];
+            for (std::size_t i = 0; i < runs.size(); ++i) {
+                const int end = i + 1 < runs.size() ? runs[i + 1].first : timeline_.Size();
+                all.push_back({runs[i].first, end, perturbation});
+            }
+        }
+        std::ranges::sort(all, {}, &kprC_StepRun::first);
+        return all;
     }
 
 protected:
-    bool KnowsStep(const cow_String& stepName) const { return steps_.IsMember(stepName); }
+    bool KnowsStep(const cow_String& stepName) const { return timeline_.Steps().IsMember(stepName); }
     /// Puts a copy of the state in the place of the step's; no status changes. An unknown step raises.
     void ReplaceState(const cow_String& stepName, const S& state) {
-        const int index = steps_.IndexOf(stepName);
-        if (index < 0) this->RaiseNoSuchStep(stepName);
-        auto& replaced = states_.Get()[static_cast<std::size_t>(index)];
-        replaced.state = mdl_ObjCow<S>(state);
-        replaced.hasState = true;
+        const int step = IndexOf(stepName);
+        states_.Get().replaced[step] = mdl_ObjCow<S>(state);
     }
 
 private:
-    using States = std::vector<kprC_PropagatingState<S>>;
+    /// What the object is from a step on, in all steps of its kind.
+    struct Run {
+        int first = 0;
+        mdl_PropagationStatusEnm status = mdl_PropagationStatusEnm::NOT_YET_ACTIVE;
+        bool hasState = false;
+        mdl_ObjCow<S> state;
+    };
+    struct States {
+        std::vector<Run> ofKind[2];
+        std::map<int, mdl_ObjCow<S>> replaced; // states of single steps
+    };
+
+    int IndexOf(const cow_String& stepName) const {
+        const int step = timeline_.Steps().IndexOf(stepName);
+        if (step < 0) this->RaiseNoSuchStep(stepName);
+        return step;
+    }
+    const Run& RunAt(int step) const {
+        const auto& runs = states_.ConstGet().ofKind[timeline_.IsPerturbation(step) ? 1 : 0];
+        return *std::prev(std::ranges::upper_bound(runs, step, {}, &Run::first));
+    }
+
     cow_COW<States, cow_Direct<States>> states_; // shared by copies
-    kprC_StepContainer steps_;                   // as they were when the states were worked out
+    kprC_Timeline timeline_;                     // as it was when the states were worked out
 };
 
 /// Objects that live across steps, by name, in ascending byte order.
@@ -235,10 +291,10 @@ public:
 
 template <class T>
 void kprC_PropagatingContainer<T>::Propagate(const kprC_StepContainer& steps) {
-    const cow_List<cow_String> keys = this->Keys();
-    for (int i = 0; i < keys.Length(); ++i) {
-        const auto problems = this->Get(keys[i]).Propagate(steps);
-        if (!problems.empty()) mdl_RaisePropagationProblem(keys[i], problems.front());
+    const kprC_Timeline timeline(steps);
+    for (const cow_String& key : this->Keys()) {
+        const auto problems = this->Get(key).Propagate(timeline);
+        if (!problems.empty()) mdl_RaisePropagationProblem(key, problems.front());
     }
 }
 

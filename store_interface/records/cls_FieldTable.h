@@ -215,8 +215,11 @@ struct cls_Field {
     /// For a list of reals that counts by position: the list that holds where a model file says nothing. An
     /// item given as null is the item of the same place; a list too short goes on with its tail.
     cow_List<double> (*defaultItems)(const cls_Record& record) = nullptr;
-    /// For a text that the deck takes as it stands: a model file may give it line by line.
+    /// For a text that the deck takes as it stands, with whatever keywords are in it: a model file may give
+    /// it line by line.
     bool verbatim = false;
+    /// For a text that may run over several lines: no keyword line is made of it.
+    bool freeText = false;
     /// Absent or empty is an error of a model file.
     bool required = false;
     /// Filled by the store or a program, never by a model file.
@@ -344,6 +347,10 @@ public:
     }
     cls_Describe& Verbatim() {
         fields_.back().verbatim = true;
+        return *this;
+    }
+    cls_Describe& FreeText() {
+        fields_.back().freeText = true;
         return *this;
     }
     /// `Items` takes the record as a const C&.

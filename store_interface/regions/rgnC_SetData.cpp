@@ -2,6 +2,8 @@
 
 #include "store_interface/records/cls_FieldTable.h"
 
+#include <numeric>
+
 const omu_EnumTable& omu_EnumTableOf(res_SetTypeEnm) {
     static constexpr omu_EnumRow rows[] = {
         {0, "node", "node"}, {1, "element", "element"}, {2, "surface", "surface"}};
@@ -28,4 +30,21 @@ rgnC_SubsetData rgnC_SetData::SubSet(int index) const {
     rgnC_SubsetData subset = set_->subsets[static_cast<std::size_t>(index)];
     if (LiesInOneMesh()) subset.meshIndex = meshIndex_;
     return subset;
+}
+
+std::vector<int> rgnC_SetData::SubSetsIn(int meshIndex) const {
+    if (LiesInOneMesh()) {
+        std::vector<int> all(meshIndex == meshIndex_ ? set_->subsets.size() : 0);
+        std::iota(all.begin(), all.end(), 0);
+        return all;
+    }
+    const auto& kept = set_->placesOfMeshes;
+    const odiK_Set::PlacesOfMeshes* places = kept.Get();
+    if (places == nullptr) {
+        auto made = std::make_unique<odiK_Set::PlacesOfMeshes>();
+        for (int i = 0; i < NumSubSets(); ++i) (*made)[MeshIndexOfSubSet(i)].push_back(i);
+        places = kept.Keep(std::move(made));
+    }
+    const auto found = places->find(meshIndex);
+    return found == places->end() ? std::vector<int>() : found->second;
 }

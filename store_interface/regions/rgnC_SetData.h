@@ -6,6 +6,7 @@
 #include "foundation/cow_String.h"
 #include "store_interface/records/cls_Record.h"
 
+#include <unordered_map>
 #include <vector>
 
 struct omu_EnumTable;
@@ -49,11 +50,13 @@ struct odiK_Set : odiK_SetHead {
     /// What the entries come to for the deck, worked out at the first use: labels, and face names for
     /// facets. Kept only for sets that lie in one mesh.
     struct Resolved {
-        bool done = false;
         cow_List<int> labels;
         cow_List<cow_String> faces;
     };
-    mutable Resolved resolved;
+    thr_Kept<Resolved> resolved;
+    /// The places of the subsets by their mesh index; worked out at the first use.
+    using PlacesOfMeshes = std::unordered_map<int, std::vector<int>>;
+    thr_Kept<PlacesOfMeshes> placesOfMeshes;
 };
 
 /// The view on a set's data. A set of a shared mesh is seen from one instance: its subsets then carry that
@@ -77,6 +80,8 @@ public:
     int MeshIndexOfSubSet(int index) const {
         return LiesInOneMesh() ? meshIndex_ : set_->subsets[static_cast<std::size_t>(index)].meshIndex;
     }
+    /// The places of the subsets in one mesh, in their order.
+    std::vector<int> SubSetsIn(int meshIndex) const;
     /// The store's object, whose caches the readers of large sets share.
     const odiK_Set& Object() const { return *set_; }
     /// Whether all subsets lie in one mesh, seen from one instance.

@@ -25,7 +25,7 @@ TEST(Memory, EachAllocationFailing_LeavesTheOldDeckWholeAndNoDebris) {
             const FailingAllocation failing(n);
             try {
                 DeckFile deck(target);
-                deck.Replace([&odb](const char* jobName) { oif_Writer(odb).WriteInputFile(jobName); });
+                deck.Replace([&odb](qio_ostream& device) { oif_Writer(odb).WriteInput(device); });
             } catch (const std::bad_alloc&) {
                 raised = true;
             }

@@ -88,7 +88,10 @@ TEST(WriteDeck, DiskThatIsFull_IsCodeThree) {
     const TestFolder folder;
     static qio_System real = qio_CurrentSystem();
     qio_System full = real;
-    full.open = [](const char*, const char* mode) { return real.open("/dev/full", mode); };
+    full.write = [](const char*, std::size_t, std::FILE*) {
+        errno = ENOSPC;
+        return std::size_t{0};
+    };
     const qio_SystemSwap swap(full);
     const Outcome outcome = Write(odb, folder.Path("job.inp"));
     EXPECT_EQ(outcome.code, ExitCode::FILE_SYSTEM_REFUSED);

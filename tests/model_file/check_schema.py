@@ -79,6 +79,7 @@ def broken():
         changed("flag as number", lambda m, d: m["timePoints"]["T"].update(generate=1)),
         changed("real as integer", lambda m, d: m["cyclicSymmetry"].update(numberOfSectors=1.5)),
         changed("step without a class", lambda m, d: m["steps"][0].pop("class")),
+        changed("two lines in a name of a job", lambda m, d: m.update(globalJob="a\n*Step")),
         changed("number in a text of lines", lambda m, d: m["steps"][0].update(solverInput=["a", 1])),
     ]
 

@@ -93,9 +93,9 @@ class ProgramTest(unittest.TestCase):
         path.write_text(model if isinstance(model, str) else json.dumps(model), encoding="utf-8")
         return path
 
-    def run_program(self, *arguments, **options):
+    def run_program(self, *arguments, program=None, **options):
         options = {"cwd": self.folder, "capture_output": True, **options}
-        run = subprocess.run([PROGRAM, *arguments], **options)
+        run = subprocess.run([program or PROGRAM, *arguments], **options)
         run.output = (run.stdout or b"").decode(errors="replace")
         run.errors = (run.stderr or b"").decode(errors="replace")
         return run
@@ -294,8 +294,7 @@ class Refusals(ProgramTest):
 
     def test_OutputFolderThatIsNotThere_IsCodeThreeAndNotMade(self):
         run = self.run_program("write", "model.json", "--output-dir", "none")
-        self.assert_refused(run, 3, "none/model.inp: error: cannot make a temporary folder in 'none': "
-                            "No such file or directory\n")
+        self.assert_refused(run, 3, "none/model.inp: error: cannot open the folder 'none': No such file or directory\n")
         self.assertFalse((self.folder / "none").exists())
 
     def test_OutputFolderThatIsAFile_IsCodeThree(self):
@@ -440,10 +439,10 @@ class Signals(ProgramTest):
     def test_RunThatIsEnded_LeavesTheOldDeckAndNoDebris(self):
         self.put("model.json", large_model(300000))
         (self.folder / "model.inp").write_bytes(OLD_DECK)
-        for number in [signal.SIGINT, signal.SIGTERM, signal.SIGHUP]:
+        for number in [signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGQUIT, signal.SIGXCPU]:
             with self.subTest(signal=number):
                 run = subprocess.Popen([PROGRAM, "write", "model.json"], cwd=self.folder,
-                                       stdout=subprocess.DEVNULL)
+                                       stdout=subprocess.DEVNULL, preexec_fn=no_core)
                 while run.poll() is None and not any(n.startswith(b".qrxdeck") for n in self.entries()):
                     time.sleep(0.001)
                 run.send_signal(number)
@@ -451,6 +450,147 @@ class Signals(ProgramTest):
                 self.assertEqual(run.returncode, -number)
                 self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
                 self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+    def test_RunThatIsKilled_IsClearedUpByTheNextOneAlone(self):
+        self.put("large.json", large_model(300000))
+        runs = []
+        for _ in range(2):
+            run = subprocess.Popen([PROGRAM, "write", "large.json"], cwd=self.folder, stdout=subprocess.DEVNULL)
+            while run.poll() is None and sum(n.startswith(b".qrxdeck") for n in self.entries()) <= len(runs):
+                time.sleep(0.001)
+            run.send_signal(signal.SIGSTOP)
+            runs.append(run)
+        dead, alive = runs
+        dead.kill()
+        dead.wait()
+        self.assertEqual(sum(n.startswith(b".qrxdeck") for n in self.entries()), 2)
+        self.assertEqual(self.run_program("write", "model.json").returncode, 0)
+        self.assertEqual(sum(n.startswith(b".qrxdeck") for n in self.entries()), 1)
+        alive.send_signal(signal.SIGCONT)
+        self.assertEqual(alive.wait(), 0)
+        self.assertEqual(self.entries(), [b"large.inp", b"large.json", b"model.inp", b"model.json"])
+
+
+def no_core():
+    resource.setrlimit(resource.RLIMIT_CORE, (0, 0))
+
+
+class Files(ProgramTest):
+    def test_ReplacedDeck_KeepsItsRights(self):
+        deck = self.folder / "model.inp"
+        for mode in [0o600, 0o664, 0o640]:
+            deck.write_bytes(OLD_DECK)
+            deck.chmod(mode)
+            self.assertEqual(self.run_program("write", "model.json").returncode, 0)
+            self.assertEqual(deck.read_bytes(), DECK)
+            self.assertEqual(deck.stat().st_mode & 0o7777, mode)
+
+    def test_LinkAtTheTarget_IsFollowed(self):
+        (self.folder / "decks").mkdir()
+        (self.folder / "decks" / "real.inp").write_bytes(OLD_DECK)
+        (self.folder / "model.inp").symlink_to("decks/real.inp")
+        self.assertEqual(self.run_program("write", "model.json").returncode, 0)
+        self.assertTrue((self.folder / "model.inp").is_symlink())
+        self.assertEqual((self.folder / "decks" / "real.inp").read_bytes(), DECK)
+        self.assertEqual(self.entries("decks"), [b"real.inp"])
+
+    def test_DeckThatMayNotBeWritten_IsRefused(self):
+        deck = self.folder / "model.inp"
+        deck.write_bytes(OLD_DECK)
+        deck.chmod(0o444)
+        program, other = PROGRAM, {}
+        if os.geteuid() == 0:
+            program = shutil.copy(PROGRAM, self.folder)
+            for path in [self.folder, deck, self.folder / "model.json"]:
+                os.chown(path, 65534, 65534)
+            other = {"user": 65534, "group": 65534, "extra_groups": []}
+        run = self.run_program("write", "model.json", program=program, **other)
+        self.assert_refused(run, 3, "model.inp: error: the file in its place may not be written: "
+                            "Permission denied\n")
+        self.assertEqual(deck.read_bytes(), OLD_DECK)
+
+    def test_AbsoluteJobBesideAnOutputFolder_IsWrongUsage(self):
+        job = str(self.folder / "job")
+        run = self.run_program("write", "model.json", "--job", job, "--output-dir", "elsewhere")
+        self.assert_refused(run, 2)
+        self.assertIn("absolute", run.errors)
+        self.assertEqual(self.run_program("write", "model.json", "--job", job).returncode, 0)
+        self.assertEqual((self.folder / "job.inp").read_bytes(), DECK)
+
+    def test_NamesOfFiles_DoNotActOnTheTerminal(self):
+        name = "a\x1b[31m\nb"
+        (self.folder / (name + ".json")).write_text(json.dumps(MODEL))
+        for arguments in [["write"], ["check"], ["format", "--check"]]:
+            run = self.run_program(arguments[0], name + ".json", *arguments[1:])
+            self.assertNotIn("\x1b", run.output + run.errors)
+            self.assertIn("a\\x1B[31m\\x0Ab", run.output)
+        run = self.run_program("check", "none" + name)
+        self.assertIn("none" + "a\\x1B[31m\\x0Ab: error:", run.errors)
+        self.assertNotIn("\x1b", run.errors)
+
+    def test_ReportThatCannotBePutOut_LeavesTheOldDeck(self):
+        deck = self.folder / "model.inp"
+        deck.write_bytes(OLD_DECK)
+        with open("/dev/full", "wb") as full:
+            run = self.run_program("write", "model.json", stdout=full, stderr=subprocess.PIPE, capture_output=False)
+        self.assertEqual(run.returncode, 3)
+        self.assertEqual(run.errors, "standard output: error: No space left on device\n")
+        self.assertEqual(deck.read_bytes(), OLD_DECK)
+        run = self.run_program("write", "model.json", preexec_fn=lambda: os.close(1))
+        self.assert_refused(run, 3, "standard output: error: it is closed\n")
+        self.assertEqual(deck.read_bytes(), OLD_DECK)
+        self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
+
+    def test_ReportInJsonThatIsLost_IsCodeSixAndTheDeckStands(self):
+        with open("/dev/full", "wb") as full:
+            run = self.run_program("write", "model.json", "--json", stdout=full, stderr=subprocess.PIPE,
+                                   capture_output=False)
+        self.assertEqual(run.returncode, 6)
+        self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
+
+    def test_ClosedStreams_DoNotGetIntoTheDeck(self):
+        def close_all():
+            for number in range(3):
+                os.close(number)
+        subprocess.run([PROGRAM, "write", "model.json", "--json"], cwd=self.folder, preexec_fn=close_all)
+        self.assertFalse((self.folder / "model.inp").exists())
+        subprocess.run([PROGRAM, "write", "model.json"], cwd=self.folder, stdout=subprocess.DEVNULL,
+                       preexec_fn=lambda: os.close(2))
+        self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
+
+    def test_SchemaFile_IsReplacedAsAWhole(self):
+        path = self.folder / "schema.json"
+        path.write_bytes(OLD_DECK)
+        run = self.run_program(
+            "schema", "--output", "schema.json",
+            preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_FSIZE, (4096, resource.RLIM_INFINITY)))
+        self.assertEqual(run.returncode, 3)
+        self.assertEqual(path.read_bytes(), OLD_DECK)
+        self.assertEqual(self.entries(), [b"model.json", b"schema.json"])
+
+    def test_LastingShortageOfMemory_IsCodeThreeWhateverIsAsked(self):
+        def limit(mebibytes):
+            return lambda: resource.setrlimit(resource.RLIMIT_AS, (mebibytes << 20, resource.RLIM_INFINITY))
+        if self.run_program("--version", preexec_fn=limit(64)).returncode != 0:
+            self.skipTest("a program with sanitizers does not start in so little memory")
+        self.put("model.json", large_model(200000))
+        codes = set()
+        for command in [["write"], ["check"], ["info"], ["write", "--json"], ["info", "--json"], ["format"]]:
+            deck = self.folder / "model.inp"
+            for mebibytes in range(6, 60, 3):
+                deck.write_bytes(OLD_DECK)
+                run = self.run_program(command[0], "model.json", *command[1:], preexec_fn=limit(mebibytes))
+                if run.returncode == 127:
+                    continue
+                with self.subTest(command=command, mebibytes=mebibytes, errors=run.errors):
+                    self.assertIn(run.returncode, [0, 3])
+                    codes.add(run.returncode)
+                    if run.returncode == 3:
+                        self.assertEqual(deck.read_bytes(), OLD_DECK)
+                        if "--json" in command and run.output:
+                            self.assertEqual(json.loads(run.output)["exitCode"], 3)
+                    self.assertEqual([n for n in self.entries() if n.startswith(b".")], [])
+        self.assertEqual(codes, {0, 3})
 
 
 class OtherCommands(ProgramTest):
@@ -650,12 +790,12 @@ class OtherCommands(ProgramTest):
 
     def test_SchemaInAFolderThatIsNotThere_IsCodeThree(self):
         run = self.run_program("schema", "--output", "none/schema.json")
-        self.assert_refused(run, 3, "none/schema.json: error: cannot write the schema: "
+        self.assert_refused(run, 3, "none/schema.json: error: cannot open the folder 'none': "
                             "No such file or directory\n")
 
-    def test_SchemaOnAFullDisk_IsCodeThree(self):
+    def test_SchemaOntoADevice_IsCodeThree(self):
         run = self.run_program("schema", "--output", "/dev/full")
-        self.assert_refused(run, 3, "/dev/full: error: cannot write the schema: No space left on device\n")
+        self.assert_refused(run, 3, "/dev/full: error: something that is no file is in its place\n")
 
     def test_Version_IsOnALineOfItsOwn(self):
         run = self.run_program("--version")
@@ -726,7 +866,7 @@ class Format(ProgramTest):
         self.assert_refused(self.run_program("format", "none.json"), 3,
                             "none.json: error: the file can't be read: No such file or directory\n")
         run = self.run_program("format", "model.json", "-o", "none/out.json")
-        self.assert_refused(run, 3, "none/out.json: error: cannot make a temporary folder in 'none': "
+        self.assert_refused(run, 3, "none/out.json: error: cannot open the folder 'none': "
                             "No such file or directory\n")
 
     def test_FileThatOutgrowsItsLimit_LeavesTheOldFile(self):

@@ -28,15 +28,16 @@ void oif_BoundaryConditionBuilder::Build() {
     const kprC_StepContainer& steps = Model().Steps();
     const oif_BCOpStatus opStatus = OpStatusOf(Model().BCs(), Model().Loads(), steps);
     const oif_ObjectsOfSteps<kbcC_BC> conditions(
-        "boundary condition", Model().BCs(), steps,
+        "boundary condition", Model().BCs(), steps, opStatus,
         [&](const kbcC_BC& bc, const cow_String& step, bool inLoadCase) {
             return opStatus.Writes(bc, step, inLoadCase);
         });
     const oif_ObjectsOfSteps<kloC_Load> bolts(
-        "load", Model().Loads(), steps, [&](const kloC_Load& load, const cow_String& step, bool inLoadCase) {
-            return load.DynTypeId() == kloC_BoltLoad::TypeId() &&
-                   opStatus.WritesBolt(static_cast<const kloC_BoltLoad&>(load), step, inLoadCase);
-        });
+        "load", Model().Loads(), steps, opStatus,
+        [&](const kloC_Load& load, const cow_String& step, bool inLoadCase) {
+            return opStatus.WritesBolt(static_cast<const kloC_BoltLoad&>(load), step, inLoadCase);
+        },
+        [](const kloC_Load& load) { return load.DynTypeId() == kloC_BoltLoad::TypeId(); });
     oif_BoundarySubmodelList submodels;
     BuildElementSets();
     for (int i = 0; i < steps.Size(); ++i) {
@@ -132,7 +133,8 @@ void oif_BoundaryConditionBuilder::CreateEmptyBCs(int step, const std::set<cow_S
     const nex_Context context("step", stepName);
     bool hasBaseState = false;
     for (const auto& [name, bc] : Model().BCs()) {
-        hasBaseState = hasBaseState || (!bc.suppressed && oif_BCOpStatus::IsOfBaseState(bc.Status(stepName)));
+        hasBaseState = !bc.suppressed && oif_BCOpStatus::IsOfBaseState(bc.Status(stepName));
+        if (hasBaseState) break;
     }
     for (const auto& [name, loadCase] : analysis.loadCases) {
         if (loadCasesWithBolts.count(name) != 0 || loadCase.BcCount() != 0) continue;

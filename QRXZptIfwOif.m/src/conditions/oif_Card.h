@@ -21,7 +21,7 @@ struct oif_CardOf {
     float scale = 1.0F;
 
     const T& Object() const { return object.ConstGet(); }
-    const auto& Quad() const { return Object().ConstGetStateQuad(step); }
+    auto Quad() const { return Object().ConstGetStateQuad(step); }
     bool InLoadCase() const { return !loadCase.IsEmpty(); }
     double Factor() const { return static_cast<double>(scale); }
 };

@@ -4,7 +4,7 @@
 #include "base/oif_BlockHeader.h"
 #include "base/oif_Component.h"
 #include "conditions/oif_Card.h"
-#include "conditions/oif_OpStatus.h"
+#include "conditions/oif_WrittenSteps.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
@@ -26,28 +26,25 @@ public:
     };
 
     /// `kind` is what messages call the objects; `test(object, stepName, inLoadCase)`, of which the last
-    /// tells whether the step has load cases.
-    template <class Test>
+    /// tells whether the step has load cases, is asked of objects that `counts` lets in.
+    template <class Test, class Counts>
     oif_ObjectsOfSteps(const char* kind, const kprC_PropagatingContainer<T>& objects,
-                       const kprC_StepContainer& steps, const Test& test)
+                       const kprC_StepContainer& steps, const oif_OpStatus& status, const Test& test,
+                       const Counts& counts)
         : kind_(kind), ofStep_(static_cast<std::size_t>(steps.Size())) {
-        std::vector<bool> hasLoadCases;
-        for (const auto& [name, step] : steps) {
-            const auto* analysis = nex_canDynamicCastPtr<kprC_AnalysisStep>(&step);
-            hasLoadCases.push_back(analysis != nullptr && !analysis->loadCases.IsEmpty());
-        }
+        oif_WrittenSteps written(steps, status);
         for (const auto& [name, object] : objects) {
-            Entry* entry = nullptr;
-            for (std::size_t i = 0; i < ofStep_.size(); ++i) {
-                const cow_String& step = steps.NameAt(static_cast<int>(i));
-                const nex_Context stepContext("step", step);
-                const nex_Context context(kind, name);
-                if (!test(object, step, hasLoadCases[i])) continue;
-                if (entry == nullptr) entry = &entries_.emplace_back(Entry{name, object});
-                ofStep_[i].push_back(entry);
-            }
+            if (!counts(object)) continue;
+            const std::vector<int> found = written.Of(kind, name, object, test);
+            if (found.empty()) continue;
+            Entry* entry = &entries_.emplace_back(Entry{name, object});
+            for (const int step : found) ofStep_[static_cast<std::size_t>(step)].push_back(entry);
         }
     }
+    template <class Test>
+    oif_ObjectsOfSteps(const char* kind, const kprC_PropagatingContainer<T>& objects,
+                       const kprC_StepContainer& steps, const oif_OpStatus& status, const Test& test)
+        : oif_ObjectsOfSteps(kind, objects, steps, status, test, [](const T&) { return true; }) {}
     const char* Kind() const { return kind_; }
     const std::vector<Entry*>& In(int step) const { return ofStep_.at(static_cast<std::size_t>(step)); }
 

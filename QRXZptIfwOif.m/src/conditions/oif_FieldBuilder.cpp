@@ -15,7 +15,7 @@ void oif_FieldBuilder::BuildFieldsHistory() {
     opStatus.Configure(Model().Fields(), steps.Keys());
     const oif_FieldSetting setting{FindMaxTempSizeInModel(), FindMaxGenFieldSizeInModel()};
     const oif_ObjectsOfSteps<kpfC_Field> written(
-        "field", Model().Fields(), steps,
+        "field", Model().Fields(), steps, opStatus,
         [&](const kpfC_Field& field, const cow_String& step, bool) { return opStatus.Writes(field, step); });
     for (int i = 0; i < steps.Size(); ++i) {
         MakeCards(

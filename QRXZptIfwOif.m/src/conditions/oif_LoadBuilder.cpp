@@ -15,7 +15,7 @@ void oif_LoadBuilder::BuildLoadsHistory() {
     oif_LoadOpStatus opStatus;
     opStatus.Configure(Model().Loads(), steps.Keys(), ModelInfo());
     const oif_ObjectsOfSteps<kloC_Load> written(
-        "load", Model().Loads(), steps,
+        "load", Model().Loads(), steps, opStatus,
         [&](const kloC_Load& load, const cow_String& step, bool) { return opStatus.Writes(load, step); });
     const kinC_CyclicSymmetry* cyclic = FindCyclicInteraction();
     for (int i = 0; i < steps.Size(); ++i) {

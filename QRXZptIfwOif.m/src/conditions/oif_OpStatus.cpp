@@ -61,9 +61,8 @@ bool All(const klcC_LoadCase&) {
 } // namespace
 
 bool oif_OpStatus::OpNew(unsigned int typeId, const cow_String& stepName) const {
-    const cow_List<int>& flags = opNewFlags.ConstGet(Key(typeId));
     // A step that is not there fails as place -1 of the list does.
-    return flags.ConstGet(stepIndex_.Find(stepName)) != 0;
+    return Flags(typeId).ConstGet(stepIndex_.Find(stepName)) != 0;
 }
 
 void oif_OpStatus::ForceOpNew(int stepIndex) {

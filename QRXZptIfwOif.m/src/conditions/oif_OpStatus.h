@@ -17,6 +17,27 @@ struct oif_ConditionPlace {
 };
 using oif_ConditionPlaces = std::vector<oif_ConditionPlace>;
 
+/// The steps behind the initial one for which `test` holds, which must rest on the object's status and state
+/// alone: what is the same in a run of steps is asked once. `size` is the number of steps.
+template <class T, class Test>
+std::vector<int> oif_StepsWhere(const T& object, int size, const Test& test) {
+    std::vector<int> steps;
+    const kprC_Timeline& timeline = object.Timeline();
+    if (timeline.Size() != size) {
+        // Steps that the object doesn't know are for `test` to find out.
+        for (int i = 1; i < size; ++i) {
+            if (test(i)) steps.push_back(i);
+        }
+        return steps;
+    }
+    for (const auto& [first, end, perturbation] : object.Runs()) {
+        int step = first > 0 ? first : timeline.Next(perturbation, 1);
+        if (step >= end || !test(step)) continue;
+        for (; step < end; step = timeline.Next(perturbation, step + 1)) steps.push_back(step);
+    }
+    return steps;
+}
+
 /// Which keyword families are written with ", op=NEW" in which steps. A keyword without it adds to what the
 /// steps before said and changes it; one with it wipes out all earlier definitions of its family, so that
 /// everything that goes on has to be said again. A builder configures its status once, before it makes any
@@ -28,7 +49,9 @@ public:
     /// Whether the family of the class is written with ", op=NEW" in the step. A class without a family and
     /// an unknown step raise.
     bool OpNew(unsigned int typeId, const cow_String& stepName) const;
-    /// The same of an object's keyword, in the step or in a load case of it.
+    /// The flags of the family of the class, step by step. A class without a family raises.
+    const cow_List<int>& Flags(unsigned int typeId) const { return opNewFlags.ConstGet(Key(typeId)); }
+    /// Whether an object's keyword is, in the step or in a load case of it.
     template <class T>
     oif_Op Op(const T& object, const cow_String& stepName, bool /*inLoadCase*/ = false) const {
         return OpNew(object.DynTypeId(), stepName) ? oif_Op::NEW : oif_Op::MODIFY;
@@ -52,8 +75,9 @@ protected:
     void SetFlagsWhere(const char* kind, const kprC_PropagatingContainer<T>& objects, const Test& test) {
         for (const auto& [name, object] : objects) {
             const nex_Context context(kind, name);
-            for (int i = 1; i < stepNames.Length(); ++i) {
-                if (test(object, stepNames[i])) SetFlag(Key(object.DynTypeId()), i);
+            for (const int step : oif_StepsWhere(object, stepNames.Length(),
+                                                 [&](int i) { return test(object, stepNames[i]); })) {
+                SetFlag(Key(object.DynTypeId()), step);
             }
         }
     }

@@ -22,12 +22,12 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     if (file == nullptr) return false;
     qio_ios device;
     device.attach(file, true);
-    WriteTo(device);
+    WriteInput(device);
     device.close();
     return true;
 }
 
-void oif_Builder::WriteTo(qio_ostream& device) {
+void oif_Builder::WriteInput(qio_ostream& device) {
     utl_Stream stream(device, kLineLimit, kPrecision, kPrecision);
     BuildComponents();
     qkw_ComponentList components = WriteList();

@@ -27,10 +27,10 @@ public:
     oif_Builder& operator=(const oif_Builder&) = delete;
 
     /// Deletes an old file of the name and writes the deck. False when the file can't be opened; whether all
-    /// bytes arrived tells qio_LastReport().
+    /// bytes arrived tells qio_LastReport(). May be called once.
     bool WriteInputFile(const cow_String& fileName);
-    /// Writes the deck to a device. One of the two may be called, once.
-    void WriteTo(qio_ostream& device);
+    /// Writes the deck to a device. One of the two may be called, and once.
+    void WriteInput(qio_ostream& device);
 
 private:
     void BuildComponents();

@@ -10,7 +10,8 @@ void oif_Writer::WriteInputFile(const char* jobName) {
     builder.WriteInputFile(fileName);
 }
 
-void oif_Writer::WriteTo(qio_ostream& device) {
+void oif_Writer::WriteInput(qio_ostream& device) {
     oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
-    oif_Builder(modelInfo).WriteTo(device);
+    oif_Builder builder(modelInfo);
+    builder.WriteInput(device);
 }

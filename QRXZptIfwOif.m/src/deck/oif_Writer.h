@@ -4,7 +4,8 @@
 class odb_Odb;
 class qio_ostream;
 
-/// The way in: writes the model named "Default Model" of an open store as a deck.
+/// The way in: writes the model named "Default Model" of an open store as a deck. Several threads may write at
+/// once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
 class oif_Writer {
 public:
     /// The store must outlive the writer.
@@ -15,8 +16,8 @@ public:
     /// qio_LastReport() tells. Raises QRXBasException (with a context) when the model can't be told in the
     /// deck's language; the file then stays as far as it was written.
     void WriteInputFile(const char* jobName);
-    /// The same text, handed to a device of the caller's piece by piece. Raises likewise.
-    void WriteTo(qio_ostream& device);
+    /// Writes the same text to a device, which knows whether all of it arrived.
+    void WriteInput(qio_ostream& device);
 
 private:
     const odb_Odb& odb_;

@@ -63,15 +63,14 @@ oif_Set::oif_Set(const rgnC_SetData& setData, const ddb_PartInstance& instance) 
 
 void oif_Set::ComputeData(const rgnC_SetData& setData, const ddb_Mesh& mesh) {
     // A set of a shared mesh has the same labels in every instance: they are worked out once.
-    odiK_Set::Resolved& resolved = setData.Object().resolved;
-    if (setData.LiesInOneMesh() && resolved.done) {
-        labels_ = resolved.labels;
-        faces_ = resolved.faces;
+    const auto& kept = setData.Object().resolved;
+    if (const odiK_Set::Resolved* resolved = setData.LiesInOneMesh() ? kept.Get() : nullptr) {
+        labels_ = resolved->labels;
+        faces_ = resolved->faces;
         return;
     }
     const auto kind = static_cast<res_SetTypeEnm>(setData.Kind());
-    for (int i = 0; i < setData.NumSubSets(); ++i) {
-        if (setData.MeshIndexOfSubSet(i) != mesh.meshIndex()) continue;
+    for (const int i : setData.SubSetsIn(mesh.meshIndex())) {
         const rgnC_SubsetData subset = setData.SubSet(i);
         if (kind == res_SetTypeEnm::NODES) {
             cow_List<int> labels;
@@ -88,7 +87,9 @@ void oif_Set::ComputeData(const rgnC_SetData& setData, const ddb_Mesh& mesh) {
             AppendFacets(subset, elements);
         }
     }
-    if (setData.LiesInOneMesh()) resolved = {true, labels_, faces_};
+    if (setData.LiesInOneMesh()) {
+        kept.Keep(std::unique_ptr<odiK_Set::Resolved>(new odiK_Set::Resolved{labels_, faces_}));
+    }
 }
 
 void oif_Set::AppendFacets(const rgnC_SubsetData& subset, const odiK_ElementClass& elements) {

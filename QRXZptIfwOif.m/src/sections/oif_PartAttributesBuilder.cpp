@@ -20,6 +20,7 @@
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
 
+#include <unordered_map>
 #include <vector>
 
 namespace {
@@ -147,14 +148,13 @@ void oif_PartAttributesBuilder::SetMatOriInArray(const ddb_PartInstance& instanc
 void oif_PartAttributesBuilder::ProcessPropertyArray(const ddb_PartInstance& instance) {
     if (properties_.IsEmpty()) return;
     std::vector<cow_List<bme_Property>> groups;
+    std::unordered_map<bme_Property, std::size_t, bme_PropertyHash> groupOf;
     std::size_t current = 0;
     for (int i = 0; i < properties_.Length(); ++i) {
         const bme_Property& property = properties_.UncheckedConstGet(i);
-        // Neighbours mostly belong together. No two groups are equal, so it's the same whichever is asked
-        // first.
+        // Neighbours mostly belong together.
         if (groups.empty() || !(groups[current].UncheckedConstGet(0) == property)) {
-            current = 0;
-            while (current < groups.size() && !(groups[current].UncheckedConstGet(0) == property)) ++current;
+            current = groupOf.try_emplace(property, groups.size()).first->second;
             if (current == groups.size()) groups.emplace_back();
         }
         groups[current].Append(property);
@@ -229,10 +229,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
 void oif_PartAttributesBuilder::CreateMaterialOrientation(const ddb_PartInstance& instance,
                                                           const ptoC_MaterialOrientation& orientation,
                                                           const cow_String& name) {
-    for (int i = 0; i < writtenOrientations_.Length(); ++i) {
-        if (writtenOrientations_[i] == name) return;
-    }
-    writtenOrientations_.Append(name);
+    if (!writtenOrientations_.insert(name).second) return;
     AddInstanceDefinition(instance.name(), oif_Orientation(Model().Model(), orientation, name, gsl_Matrix()));
 }
 

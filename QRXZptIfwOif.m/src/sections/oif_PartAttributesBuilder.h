@@ -8,6 +8,7 @@
 #include "store_interface/records/sections/kseC_Section.h"
 
 #include <map>
+#include <set>
 
 class kseC_BeamSection;
 class kseC_GasketSection;
@@ -82,7 +83,7 @@ private:
     int nextElemCtrlKey_ = 0;
     // Of the instance at hand: an entry for each element, in the order of the mesh.
     cow_List<bme_Property> properties_;
-    cow_List<cow_String> writtenOrientations_;
+    std::set<cow_String> writtenOrientations_;
     /// Labels that each section assignment names, also those that later assignments take over.
     std::map<int, int> assignmentSize_;
 };

@@ -36,14 +36,15 @@ void CheckFriction(const kinC_TangentialBehavior& friction, fnd_RecordCheck& che
     check.NotNegative("dependencies", friction.dependencies);
     check.NotNegative("nStateDependentVars", friction.nStateDependentVars);
     if (friction.formulation == penalty || friction.formulation == lagrange) {
-        const long long columns = (friction.directionality == 2 ? 2 : 1) +
+        const long long columns = (friction.directionality == 2 ? 2LL : 1LL) +
                                   (friction.temperatureDependency ? 1 : 0) +
                                   (friction.pressureDependency ? 1 : 0) +
                                   (friction.slipRateDependency ? 1 : 0) + std::max(friction.dependencies, 0);
         WarnOfColumns(check, "table", friction.table, columns, columns);
     } else if (friction.formulation == exponentialDecay) {
         const int needed = friction.exponentialDecayDefinition == 1 ? 4 : 3;
-        const int found = friction.table.NumRows() * friction.table.NumColumns();
+        const long long found =
+            static_cast<long long>(friction.table.NumRows()) * friction.table.NumColumns();
         if (found < needed) {
             check.Add("table-numbers", "table", "found " + fnd_Counted(found, "number"),
                       std::to_string(needed) + " for an exponential decay");
@@ -69,7 +70,7 @@ void CheckConductance(const kinC_ThermalConductance& conductance, fnd_RecordChec
                              int count, bool byTemperature, bool byMassFlowRate) {
         check.NotNegative(dependencies, count);
         const long long expected =
-            2 + (byTemperature ? 1 : 0) + (byMassFlowRate ? 1 : 0) + std::max(count, 0);
+            2LL + (byTemperature ? 1 : 0) + (byMassFlowRate ? 1 : 0) + std::max(count, 0);
         WarnOfColumns(check, table, values, expected, expected);
     };
     columns("clearanceTable", conductance.clearanceTable, "dependencies", conductance.dependencies,
@@ -81,7 +82,7 @@ void CheckConductance(const kinC_ThermalConductance& conductance, fnd_RecordChec
 
 void CheckFilmProperty(const kinC_FilmConditionProp& film, fnd_RecordCheck& check) {
     check.NotNegative("dependencies", film.dependencies);
-    const long long columns = 1 + (film.temperatureDependency ? 1 : 0) + std::max(film.dependencies, 0);
+    const long long columns = 1LL + (film.temperatureDependency ? 1 : 0) + std::max(film.dependencies, 0);
     WarnOfColumns(check, "table", film.table, columns, columns);
 }
 

@@ -36,6 +36,7 @@ const cls_FieldTable& karC_RemeshingRule::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::description>("description", "free text")
+            .FreeText()
             .Field<&R::suppressed>("suppressed",
                                    "a suppressed rule gives no output and its step doesn't count")
             .Field<&R::stepName>("stepName", "the step that works the indicators out")

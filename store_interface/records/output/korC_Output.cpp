@@ -197,7 +197,8 @@ const cls_FieldTable& korC_IntegratedOutputSection::Fields() {
             .Field<&R::refNode>("refNode",
                                 "a set of the one node about which moments are taken; none for the "
                                 "centre of the surface")
-            .Field<&R::description>("description", "free text");
+            .Field<&R::description>("description", "free text")
+            .FreeText();
     return fields;
 }
 
@@ -219,7 +220,8 @@ const cls_FieldTable& kprC_TimePoint::Fields() {
 const cls_FieldTable& kadC_AdptMeshCtrl::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kadC_AdptMeshCtrl>(cls_Record::Fields())
-            .Field<&kadC_AdptMeshCtrl::description>("description", "free text");
+            .Field<&kadC_AdptMeshCtrl::description>("description", "free text")
+            .FreeText();
     return fields;
 }
 

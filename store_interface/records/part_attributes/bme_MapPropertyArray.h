@@ -19,6 +19,17 @@ struct bme_Property {
     }
 };
 
+struct bme_PropertyHash {
+    std::size_t operator()(const bme_Property& property) const {
+        std::size_t hash = 0;
+        for (const int index :
+             {property.SectionIndex, property.ElemCtrlIndex, property.BeamOriIndex, property.MatOriIndex}) {
+            hash = (hash ^ static_cast<unsigned>(index)) * 0x9E3779B97F4A7C15ULL;
+        }
+        return hash;
+    }
+};
+
 /// Groups of elements with equal properties, by group number.
 class bme_MapPropertyArray : public cow_Map<int, cow_List<bme_Property>> {
 public:

@@ -29,8 +29,8 @@ void CheckComponents(const char* field, const cow_List<int>& components, fnd_Rec
 /// What a table is made of, column by column.
 class Columns {
 public:
-    Columns(int count, const std::string& what) { And(count, what); }
-    Columns& And(int count, const std::string& what) {
+    Columns(long long count, const std::string& what) { And(count, what); }
+    Columns& And(long long count, const std::string& what) {
         if (count <= 0) return *this;
         least_ += count;
         what_ += (what_.empty() ? "" : ", ") + what;
@@ -75,7 +75,7 @@ void CheckSpring(const R& record, int motions, fnd_RecordCheck& check) {
     CheckComponents("components", record.components, check);
     CheckComponents("independentComponents", record.independentComponents, check);
     if (static_cast<int>(record.behavior) > 1) return; // rigid: there is no table
-    const int count = record.components.Length();
+    const long long count = record.components.Length();
     const bool isUncoupled = record.coupling == R::CouplingEnm::UNCOUPLED;
     const auto dependent = [&](Columns columns) {
         columns.Dependent(record.temperatureDependency, record.dependencies)

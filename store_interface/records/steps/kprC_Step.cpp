@@ -70,9 +70,11 @@ unsigned kprC_Step::ProcedureType() const {
 const cls_FieldTable& kprC_Step::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kprC_Step>(cls_Record::Fields())
-            .Field<&kprC_Step::description>(
-                "description",
-                "free text; when not empty it stands on a line of its own below the step's first line")
+            .Field<&kprC_Step::description>("description",
+                                            "free text; when not empty it stands as it is below the step's "
+                                            "first line, so that a line of it that "
+                                            "begins with \"*\" is read as a keyword")
+            .FreeText()
             .Field<&kprC_Step::suppressed>("suppressed", "a suppressed step is written like any other")
             .Field<&kprC_Step::solverInput>("solverInput",
                                             "deck text that closes the step's body, as it stands")

@@ -19,8 +19,11 @@ void kprC_StepIndex::Append(const cow_String& name) {
 
 int kprC_StepIndex::Find(const cow_String& name) const {
     // Who asks mostly has a copy of the name from here, with the same characters.
-    for (std::size_t guess = last_; guess < std::min(last_ + 2, names_.size()); ++guess) {
-        if (names_[guess].CStr() == name.CStr()) return static_cast<int>(last_ = guess);
+    const std::size_t last = last_;
+    for (std::size_t guess = last; guess < std::min(last + 2, names_.size()); ++guess) {
+        if (names_[guess].CStr() != name.CStr()) continue;
+        if (guess != last) last_ = guess;
+        return static_cast<int>(guess);
     }
     const auto place = places_.find(name.View());
     if (place == places_.end()) return -1;

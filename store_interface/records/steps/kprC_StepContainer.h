@@ -23,7 +23,7 @@ private:
     std::vector<cow_String> names_;
     // The views lie in the names' shared storage, which copies of the index keep alive too.
     std::unordered_map<std::string_view, int> places_;
-    mutable std::size_t last_ = 0;
+    mutable thr_Relaxed<std::size_t> last_ = 0;
 };
 
 /// The steps in the order of the analysis, the initial step first; not in name order. Copies share the steps

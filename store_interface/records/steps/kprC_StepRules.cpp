@@ -80,6 +80,21 @@ void CheckComplexFrequency(const kprC_ComplexFrequencyStep&, fnd_RecordCheck& re
                "with \"Unimplemented function to write out *Step card\"");
 }
 
+/// The description stands in the deck as it is, below the step's first line.
+void CheckDescription(const kprC_Step& step, fnd_RecordCheck& report) {
+    std::string_view rest = step.description.View();
+    while (!rest.empty()) {
+        const std::string_view line = rest.substr(0, rest.find('\n'));
+        rest.remove_prefix(std::min(line.size() + 1, rest.size()));
+        const std::size_t begin = line.find_first_not_of(" \t");
+        if (begin == std::string_view::npos || line[begin] != '*') continue;
+        if (line.substr(begin).starts_with("**")) continue;
+        report.Add("keyword-in-text", "description",
+                   "found the line " + fnd_Quoted(line.substr(0, 60)) + ", which will be read as a keyword");
+        return;
+    }
+}
+
 template <class Range>
 void CheckRange(const Range& range, fnd_RecordCheck& report) {
     report.NotNegative("points", range.points);
@@ -142,6 +157,7 @@ void CheckFieldLists(const kprC_PrimaryControls& controls, fnd_RecordCheck& repo
 
 void fnd_AddStepRules(fnd_RecordRules& rules) {
     rules.Add<CheckStep>();
+    rules.Add<CheckDescription>();
     rules.Add<CheckAnalysisStep>();
     rules.Add<CheckFrequency>();
     rules.Add<CheckComplexFrequency>();

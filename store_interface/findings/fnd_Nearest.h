@@ -1,0 +1,41 @@
+#ifndef QRX_STORE_FND_NEAREST_H
+#define QRX_STORE_FND_NEAREST_H
+
+#include "store_interface/findings/fnd_Finding.h"
+
+/// Looks among known names for the one that a wrong name was meant to be: the nearest by characters put in,
+/// left out, changed or swapped with the next, capitals not counted.
+class fnd_Nearest {
+public:
+    explicit fnd_Nearest(std::string_view name);
+    void Try(std::string_view candidate);
+    /// "did you mean 'x'?", or nothing when none is near.
+    std::string Hint() const;
+
+private:
+    static constexpr std::size_t kLongest = 80;
+
+    /// The distance when it is below `least_`, else `least_`.
+    std::size_t DistanceTo(const char* candidate, std::size_t length) const;
+
+    char name_[kLongest];
+    std::size_t length_ = 0;
+    unsigned long long letters_ = 0;
+    std::size_t least_ = 0; ///< only what is nearer counts
+    std::string nearest_;
+};
+
+/// The known name that is nearest to `name`, as "did you mean 'x'?", or nothing when none is near.
+std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>& known);
+
+/// The same for a finding that goes to the sink, among names that are worth listing only if it wants hints:
+/// `tryAll` gives them to a fnd_Nearest.
+template <class TryAll>
+std::string fnd_DidYouMean(fnd_Sink& sink, std::string_view name, const TryAll& tryAll) {
+    if (!sink.WantsHint()) return {};
+    fnd_Nearest nearest(name);
+    tryAll(nearest);
+    return nearest.Hint();
+}
+
+#endif

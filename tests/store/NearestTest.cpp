@@ -1,0 +1,78 @@
+#include "store_interface/findings/fnd_Nearest.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <random>
+
+namespace {
+
+/// The distance by its definition, over whole tables.
+std::size_t Distance(const std::string& a, const std::string& b) {
+    std::vector<std::vector<std::size_t>> cells(a.size() + 1, std::vector<std::size_t>(b.size() + 1));
+    for (std::size_t i = 0; i <= a.size(); ++i) {
+        for (std::size_t j = 0; j <= b.size(); ++j) {
+            if (i == 0 || j == 0) {
+                cells[i][j] = i + j;
+                continue;
+            }
+            const bool same = a[i - 1] == b[j - 1];
+            cells[i][j] =
+                std::min({cells[i - 1][j] + 1, cells[i][j - 1] + 1, cells[i - 1][j - 1] + (same ? 0 : 1)});
+            if (i > 1 && j > 1 && a[i - 1] == b[j - 2] && a[i - 2] == b[j - 1]) {
+                cells[i][j] = std::min(cells[i][j], cells[i - 2][j - 2] + 1);
+            }
+        }
+    }
+    return cells[a.size()][b.size()];
+}
+
+std::string Expected(const std::string& name, const std::vector<std::string>& known) {
+    std::size_t least = std::min(std::max<std::size_t>(1, name.size() / 3) + 1, name.size());
+    std::string nearest;
+    for (const std::string& candidate : known) {
+        const std::size_t distance = Distance(name, candidate);
+        if (distance >= least || candidate.empty()) continue;
+        least = distance;
+        nearest = candidate;
+    }
+    return nearest.empty() ? "" : "did you mean '" + nearest + "'?";
+}
+
+TEST(Nearest, AnyNames_GiveWhatTheWholeTableOfDistancesGives) {
+    std::mt19937 random(3);
+    const auto name = [&] {
+        std::string text;
+        const std::size_t length = random() % 14;
+        while (text.size() < length) text += "abc1"[random() % 4];
+        return text;
+    };
+    for (int i = 0; i < 20000; ++i) {
+        const std::string wrong = name();
+        std::vector<std::string> known;
+        for (std::size_t k = random() % 6; k > 0; --k) known.push_back(name());
+        std::string listed;
+        for (const std::string& each : known) listed += each + " ";
+        ASSERT_EQ(fnd_DidYouMean(wrong, known), Expected(wrong, known)) << wrong << " of " << listed;
+    }
+}
+
+TEST(Nearest, CapitalsAreNotCounted) {
+    EXPECT_EQ(fnd_DidYouMean("steel", {"Stool", "STEEL"}), "did you mean 'STEEL'?");
+    EXPECT_EQ(fnd_DidYouMean("x", {"y"}), "");
+    EXPECT_EQ(fnd_DidYouMean("", {"y"}), "");
+    EXPECT_EQ(fnd_DidYouMean(std::string(81, 'x'), {std::string(80, 'x')}), "");
+    EXPECT_EQ(fnd_DidYouMean(std::string(80, 'x'), {std::string(79, 'x')}),
+              "did you mean '" + std::string(79, 'x') + "'?");
+}
+
+TEST(Nearest, SinkThatHasHadEnough_IsNotSearchedFor) {
+    fnd_List list;
+    int searches = 0;
+    for (int i = 0; i < 1000; ++i) {
+        fnd_DidYouMean(list, "name", [&](fnd_Nearest&) { ++searches; });
+    }
+    EXPECT_EQ(searches, 50);
+}
+
+} // namespace
