@@ -228,9 +228,10 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     mdf_Report found;
     const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found);
     report.AddAll(found);
-    if (odb == nullptr) return ExitCode::MODEL_IS_WRONG;
+    if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
-    mdf_WriteModelFile(*odb, formatted);
+    const std::string place = request.output.empty() ? request.model : request.output;
+    mdf_WriteModelFile(*odb, formatted, found.meshOrigins, std::filesystem::path(place).parent_path().string());
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {
