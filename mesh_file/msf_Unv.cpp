@@ -76,7 +76,8 @@ void UnvReader::Read() {
         builder_.Note(msf_Counted(numOtherMembers_, "member") +
                       " of groups are neither nodes nor elements and were left out");
     if (numNoElements_ > 0)
-        builder_.Note(msf_Counted(numNoElements_, "member") + " of groups are elements that were left out");
+        builder_.Note(msf_Counted(numNoElements_, "member") +
+                      " of groups are elements that the file doesn't have, or that were left out");
 }
 
 std::vector<Dataset> UnvReader::Datasets() {
@@ -228,10 +229,9 @@ void UnvReader::ReadMembers(const std::string& name, long long count, bool fourN
             ++numOtherMembers_;
         } else if (builder_.FindCell(label, block, place)) {
             builder_.AddToGroup(name, block, place);
-        } else if (numNoCells_ > 0) {
-            ++numNoElements_;
         } else {
-            at_.FailAtWord("found element " + std::to_string(label), "the label of an element of the file");
+            // Some meshers name points here that they write no elements for.
+            ++numNoElements_;
         }
     }
 }

@@ -86,12 +86,20 @@ private:
         }
     }
 
+    /// Whether the word stands ahead; raw numbers may stand there as well, of which nothing is passed over.
+    bool IsNext(std::string_view word) const {
+        std::string_view rest = at_.Rest().substr(0, 64);
+        while (!rest.empty() && (rest.front() == ' ' || rest.front() == '\n' || rest.front() == '\r'))
+            rest.remove_prefix(1);
+        return Capitals(rest.substr(0, word.size())) == word;
+    }
+
     std::size_t Count(const char* things) { return at_.Count(things, 1); }
 
     void ReadCells() {
         const std::size_t cells = Count("cells");
         const std::size_t numbers = Count("numbers");
-        if (Capitals(at_.PeekWord()) != "OFFSETS") {
+        if (!IsNext("OFFSETS")) {
             grid_.countsAhead = true;
             ReadNumbers(grid_.connectivity, numbers, Type::INT32);
             return;
@@ -111,7 +119,7 @@ private:
             at_.Word("the name of a field");
             const std::size_t arrays = Count("arrays");
             for (std::size_t i = 0; i < arrays; ++i) {
-                if (Capitals(at_.PeekWord()) == "METADATA") ReadSection(Capitals(at_.Word("METADATA")));
+                if (IsNext("METADATA")) ReadSection(Capitals(at_.Word("METADATA")));
                 const std::string name = Decoded(at_.Word("the name of an array"));
                 const std::size_t components = Count("components");
                 const std::size_t tuples = Count("tuples");
@@ -134,7 +142,7 @@ private:
             if (const std::string_view next = at_.PeekWord();
                 !next.empty() && next.front() >= '0' && next.front() <= '9')
                 components = Count("components");
-            if (Capitals(at_.PeekWord()) == "LOOKUP_TABLE") {
+            if (IsNext("LOOKUP_TABLE")) {
                 at_.Word("LOOKUP_TABLE");
                 at_.Word("the name of a table");
             }

@@ -276,9 +276,29 @@ bool mdf_MeshImport::NameGroups() {
                         "give it another name in \"groups\"");
             continue;
         }
-        PlanSets(group, name);
+        if (!JoinNodes(group, name)) PlanSets(group, name);
     }
     return good;
+}
+
+/// Some formats list the nodes of a group beside its cells: they go into the node set of these cells.
+bool mdf_MeshImport::JoinNodes(std::size_t place, const std::string& name) {
+    const msf_Group& group = source_.groups[place];
+    if (group.dimension != 0 || !group.cells.empty()) return false;
+    const auto sameGroup = [&](const SetPlan& plan) { return source_.groups[plan.group].name == group.name; };
+    const auto cells = std::ranges::find_if(
+        plans_, [&](const SetPlan& plan) { return plan.name == name && sameGroup(plan); });
+    if (cells == plans_.end()) return false;
+    const bool areNodes = cells->content == Content::NODES;
+    const std::string nodesName = areNodes ? name : name + kNodesEnding;
+    const auto nodes = std::ranges::find_if(
+        plans_, [&](const SetPlan& plan) { return plan.name == nodesName && sameGroup(plan); });
+    if (nodes != plans_.end()) {
+        nodes->nodes = &group;
+    } else {
+        plans_.push_back({nodesName, Content::NODES, place, nullptr});
+    }
+    return true;
 }
 
 void mdf_MeshImport::PlanSets(std::size_t place, const std::string& name) {
@@ -294,9 +314,9 @@ void mdf_MeshImport::PlanSets(std::size_t place, const std::string& name) {
     }
     const long long others = group.NumCells() - elements;
     if (elements > 0) {
-        plans_.push_back({name, Content::ELEMENTS, place});
-        if (shells) plans_.push_back({name + kSidesEnding, Content::SHELL_SIDES, place});
-        if (group.dimension == 0) plans_.push_back({name + kNodesEnding, Content::NODES, place});
+        plans_.push_back({name, Content::ELEMENTS, place, nullptr});
+        if (shells) plans_.push_back({name + kSidesEnding, Content::SHELL_SIDES, place, nullptr});
+        if (group.dimension == 0) plans_.push_back({name + kNodesEnding, Content::NODES, place, nullptr});
         if (others > 0)
             Note(msf_Counted(others, "cell") + " of group " + GroupText(group) +
                  " make no elements and were left out of its set");
@@ -311,9 +331,9 @@ void mdf_MeshImport::PlanSets(std::size_t place, const std::string& name) {
                              return cel_CellOf(Block(each.block).kind).dimension == MostDimension() &&
                                     HasNumberedFaces(each.shape);
                          });
-    if (onFaces) plans_.push_back({name, Content::FACES, place});
-    plans_.push_back(onFaces ? SetPlan{name + kNodesEnding, Content::NODES_OF_FACES, place}
-                             : SetPlan{name, Content::NODES, place});
+    if (onFaces) plans_.push_back({name, Content::FACES, place, nullptr});
+    plans_.push_back(onFaces ? SetPlan{name + kNodesEnding, Content::NODES_OF_FACES, place, nullptr}
+                             : SetPlan{name, Content::NODES, place, nullptr});
 }
 
 bool mdf_MeshImport::CheckNames() {

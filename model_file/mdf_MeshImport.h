@@ -39,6 +39,8 @@ private:
         std::string name;
         Content content = Content::ELEMENTS;
         std::size_t group = 0;
+        /// A group of nodes of the same name, whose nodes are added.
+        const msf_Group* nodes = nullptr;
     };
     struct Facet {
         int order; // of the block among the elements'
@@ -55,12 +57,14 @@ private:
     bool NameGroups();
     bool NameGroup(std::size_t group, std::string& name);
     void PlanSets(std::size_t group, const std::string& name);
+    bool JoinNodes(std::size_t group, const std::string& name);
     bool CheckNames();
     bool MatchFaces();
     bool ReportFaces(std::size_t group, std::size_t first, std::size_t count);
 
     // Nodes and elements.
     void MarkNodes();
+    void MarkNodesOf(const msf_Group& group);
     void AddNodes(odiK_Mesh& mesh);
     void AddElements(odiK_Mesh& mesh);
     std::vector<int> Connectivity(const Elements& elements);
@@ -71,6 +75,7 @@ private:
     void AddAllElements(odiK_Mesh& mesh);
     std::vector<msf_Run> ElementRuns(const msf_Group& group) const;
     std::vector<Facet> FacetsOf(std::size_t group) const;
+    std::vector<int> NodesOf(const SetPlan& plan);
     std::vector<int> NodesOfFaces(std::size_t group) const;
     std::vector<int> NodesOfCells(std::size_t group);
     std::vector<int> NewPlaces(std::vector<int> places) const;

@@ -19,6 +19,13 @@ std::vector<std::size_t> PlacesOf(cel_KindEnm kind, int width) {
 
 } // namespace
 
+void mdf_MeshImport::MarkNodesOf(const msf_Group& group) {
+    for (const int node : group.nodes) {
+        char& used = isUsed_[static_cast<std::size_t>(node)];
+        if (used == 0) used = 2;
+    }
+}
+
 /// Nodes of elements stay, and those that groups of points and nodes name.
 void mdf_MeshImport::MarkNodes() {
     isUsed_.assign(static_cast<std::size_t>(source_.NumNodes()), 0);
@@ -31,11 +38,8 @@ void mdf_MeshImport::MarkNodes() {
     }
     for (const SetPlan& plan : plans_) {
         const msf_Group& group = source_.groups[plan.group];
-        if (plan.content != Content::NODES || group.dimension != 0) continue;
-        for (const int node : group.nodes) {
-            char& used = isUsed_[static_cast<std::size_t>(node)];
-            if (used == 0) used = 2;
-        }
+        if (plan.content == Content::NODES && group.dimension == 0) MarkNodesOf(group);
+        if (plan.nodes != nullptr) MarkNodesOf(*plan.nodes);
     }
     const long long unused = std::count(isUsed_.begin(), isUsed_.end(), 0);
     if (unused == 0) return;
@@ -97,13 +101,13 @@ void mdf_MeshImport::AddElements(odiK_Mesh& mesh) {
         }
         const long long dropped = std::count(inGroup.begin(), inGroup.end(), 0);
         if (dropped > 0)
-            Note(msf_Counted(dropped, "cell") + " of kind " + std::string(cel_CellOf(block.kind).name) +
-                 " make no elements, are in no group and were left out");
+            Note("left out: " + msf_Counted(dropped, "cell") + " of kind " +
+                 std::string(cel_CellOf(block.kind).name) + ", of no element and in no group");
     }
     // Sets need the nodes of cells, which now move into the mesh.
     for (const SetPlan& plan : plans_) {
-        if (plan.content == Content::NODES) nodesOfPlans_[plan.name] = NodesOfCells(plan.group);
-        if (plan.content == Content::NODES_OF_FACES) nodesOfPlans_[plan.name] = NodesOfFaces(plan.group);
+        if (plan.content == Content::NODES || plan.content == Content::NODES_OF_FACES)
+            nodesOfPlans_[plan.name] = NewPlaces(NodesOf(plan));
     }
     for (const Elements& elements : elements_) {
         const auto controls = request_.controls.find(elements.type);
@@ -120,9 +124,16 @@ void mdf_MeshImport::AddElements(odiK_Mesh& mesh) {
     }
 }
 
+std::vector<int> mdf_MeshImport::NodesOf(const SetPlan& plan) {
+    std::vector<int> nodes =
+        plan.content == Content::NODES ? NodesOfCells(plan.group) : NodesOfFaces(plan.group);
+    if (plan.nodes != nullptr) nodes.insert(nodes.end(), plan.nodes->nodes.begin(), plan.nodes->nodes.end());
+    return nodes;
+}
+
 std::vector<int> mdf_MeshImport::NodesOfCells(std::size_t place) {
     const msf_Group& group = source_.groups[place];
-    if (group.dimension == 0) return NewPlaces(group.nodes);
+    if (group.dimension == 0) return group.nodes;
     std::vector<int> nodes;
     long long missing = 0;
     for (const msf_Run& run : group.cells) {
@@ -136,7 +147,7 @@ std::vector<int> mdf_MeshImport::NodesOfCells(std::size_t place) {
     if (missing > 0)
         Note(msf_Counted(missing, "node") + " of group " + fnd_Quoted(group.name) +
              " belong to no element and were left out of its set");
-    return NewPlaces(std::move(nodes));
+    return nodes;
 }
 
 std::vector<int> mdf_MeshImport::NodesOfFaces(std::size_t group) const {
@@ -151,7 +162,7 @@ std::vector<int> mdf_MeshImport::NodesOfFaces(std::size_t group) const {
             if (node < elements.width) nodes.push_back(block.Row(face.cell)[node]);
         }
     }
-    return NewPlaces(std::move(nodes));
+    return nodes;
 }
 
 /// In the order of the mesh, each once.

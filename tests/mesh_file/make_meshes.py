@@ -100,8 +100,9 @@ def make_plate():
     plate = occ.cut([(2, occ.addRectangle(0, 0, 0, 4, 2))], [(2, occ.addDisk(2, 1, 0, 0.5, 0.5))])[0][0][1]
     occ.synchronize()
     curves = gmsh.model.getEntities(1)
-    hole = [t for _, t in curves if gmsh.model.getType(1, t) == "Circle"]
-    left = [t for _, t in curves if gmsh.model.getBoundingBox(1, t)[3] < 1e-3]
+    boxes = {t: gmsh.model.getBoundingBox(1, t) for _, t in curves}
+    hole = [t for t, box in boxes.items() if box[0] > 1 and box[3] < 3 and box[1] > 0.2]
+    left = [t for t, box in boxes.items() if box[3] < 1e-3]
     for dimension, tags, name in ((2, [plate], "plate"), (1, hole, "hole"), (1, left, "left")):
         gmsh.model.setPhysicalName(dimension, gmsh.model.addPhysicalGroup(dimension, tags), name)
     gmsh.option.setNumber("Mesh.MeshSizeMax", 0.5)
@@ -110,11 +111,11 @@ def make_plate():
     gmsh.option.setNumber("Mesh.RecombineAll", 0)
 
 
-def write(name, version=4.1, binary=0, all_cells=0):
+def write(name, version=4.1, binary=0, all_cells=0, nodes=0):
     gmsh.option.setNumber("Mesh.MshFileVersion", version)
     gmsh.option.setNumber("Mesh.Binary", binary)
     gmsh.option.setNumber("Mesh.SaveAll", all_cells)
-    gmsh.option.setNumber("Mesh.SaveGroupsOfNodes", 1)
+    gmsh.option.setNumber("Mesh.SaveGroupsOfNodes", nodes)
     gmsh.write(str(FOLDER / name))
 
 
@@ -124,6 +125,7 @@ def write_all_formats(stem):
     write(f"{stem}_22.msh", 2.2)
     write(f"{stem}_22b.msh", 2.2, binary=1)
     write(f"{stem}.unv")
+    write(f"{stem}_nodes.unv", nodes=1)
     write(f"{stem}_a.vtk")
     write(f"{stem}_b.vtk", binary=1)
 
