@@ -29,5 +29,6 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store) {
     dck_CheckStore(store, name, list);
     const bool wrong = std::ranges::any_of(list.findings, [](const fnd_Finding& f) { return f.IsError(); });
     if (!wrong) dck_CheckDeck(store, name, list);
+    if (!wrong) dck_CheckMeshes(store, name, list);
     return std::move(list.findings);
 }

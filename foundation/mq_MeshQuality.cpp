@@ -106,6 +106,7 @@ public:
             for (const int node : block.nodes) {
                 if (IsNode(node)) used[static_cast<std::size_t>(node)] = 1;
             }
+            if (!block.hasShape) continue;
             ExamineShapes(block);
             ExamineRepetitions(block);
         }
@@ -203,7 +204,7 @@ private:
     void ForEachFace(const F& use) const {
         for (const mq_Block& block : mesh_.blocks) {
             const cel_Cell& cell = cel_CellOf(block.kind);
-            if (cell.dimension != 3 || !Fits(block)) continue;
+            if (cell.dimension != 3 || !block.hasShape || !Fits(block)) continue;
             const int* row = block.nodes.data();
             for (const int label : block.labels) {
                 for (const cel_Side& side : cell.sides) {

@@ -14,6 +14,8 @@ struct mq_Block {
     int width = 1;
     /// Plane cells lie in the plane of x and y and have a right way round.
     bool plane = false;
+    /// False: the cells only use nodes; their size, sides and repetitions are their own affair.
+    bool hasShape = true;
 };
 
 struct mq_Mesh {

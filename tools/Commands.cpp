@@ -10,6 +10,7 @@
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
 #include "tools/DeckFile.h"
+#include "tools/MeshDescription.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
 #include "tools/VariableList.h"
@@ -33,7 +34,8 @@ std::string ReasonText(int error) {
 }
 
 /// The store of a model file that is right; else null, with the code.
-std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code) {
+std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
+                                   std::list<mdf_MeshOrigin>* origins = nullptr) {
     mdf_Report found;
     found.fileName = path;
     std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
@@ -45,6 +47,7 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
         code = ExitCode::MODEL_IS_WRONG;
     }
     if (code != ExitCode::DONE) odb.reset();
+    if (origins != nullptr) *origins = std::move(found.meshOrigins);
     return odb;
 }
 
@@ -197,6 +200,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     if (odb == nullptr) return code;
     fnd_List list;
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
+    dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
     for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
     report.Print(model + ": no errors\n");
     return code;
@@ -204,7 +208,8 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
 
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    std::list<mdf_MeshOrigin> origins;
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins);
     if (odb == nullptr) return code;
     ordered_json& models = report.Member("models") = ordered_json::object();
     for (const auto& [name, entry] : odb->Models()) {
@@ -214,6 +219,10 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
         if (!history) continue;
         models[key]["history"] = DescribeHistory(*odb, name);
         report.Print(TextOfHistory(models[key]["history"]));
+    }
+    if (!origins.empty()) {
+        ordered_json& files = report.Member("meshFiles") = DescribeOrigins(origins);
+        report.Print(TextOfOrigins(files));
     }
     return code;
 }
@@ -231,7 +240,8 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
     const std::string place = request.output.empty() ? request.model : request.output;
-    mdf_WriteModelFile(*odb, formatted, found.meshOrigins, std::filesystem::path(place).parent_path().string());
+    mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
+                       std::filesystem::path(place).parent_path().string());
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {
@@ -244,9 +254,13 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         report.Print(formatted.str());
         return ExitCode::DONE;
     }
-    DeckFile file(request.output, DeckFileSystem::Standard(), "model file");
+    return WriteWholeFile(request.output, formatted.str(), report);
+}
+
+ExitCode WriteWholeFile(const std::string& path, const std::string& text, RunReport& report) {
+    DeckFile file(path, DeckFileSystem::Standard(), "model file");
     DeckFile::Result result;
-    const auto write = [&](const char* jobName) { WriteText(formatted.str(), jobName); };
+    const auto write = [&](const char* jobName) { WriteText(text, jobName); };
     return Replace(file, write, result, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
 }
 
