@@ -5,8 +5,9 @@
 
 namespace {
 
+/// Control characters are blanks too.
 bool IsBlank(char c) {
-    return c == ' ' || c == '\n' || c == '\t' || c == '\r' || c == '\f' || c == '\v';
+    return static_cast<unsigned char>(c) <= ' ';
 }
 
 std::string_view Trimmed(std::string_view text) {

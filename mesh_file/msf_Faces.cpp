@@ -10,17 +10,15 @@ namespace {
 using Corners = std::array<int, 4>;
 constexpr int kNone = 0x7FFFFFFF;
 
-Corners Sorted(Corners corners) {
-    const auto order = [&](int a, int b) {
-        if (corners[static_cast<std::size_t>(b)] < corners[static_cast<std::size_t>(a)])
-            std::swap(corners[static_cast<std::size_t>(a)], corners[static_cast<std::size_t>(b)]);
-    };
-    order(0, 1);
-    order(2, 3);
-    order(0, 2);
-    order(1, 3);
-    order(1, 2);
-    return corners;
+Corners Sorted(const Corners& corners) {
+    const int lowA = std::min(corners[0], corners[1]);
+    const int highA = std::max(corners[0], corners[1]);
+    const int lowB = std::min(corners[2], corners[3]);
+    const int highB = std::max(corners[2], corners[3]);
+    const int middleA = std::max(lowA, lowB);
+    const int middleB = std::min(highA, highB);
+    return {std::min(lowA, lowB), std::min(middleA, middleB), std::max(middleA, middleB),
+            std::max(highA, highB)};
 }
 
 /// The boundary cells by their least corner.
@@ -29,6 +27,9 @@ public:
     Boundary(const msf_Mesh& mesh, std::span<const msf_Run> runs)
         : isBoundaryNode_(static_cast<std::size_t>(mesh.NumNodes())) {
         std::vector<Corners> cells;
+        std::size_t count = 0;
+        for (const msf_Run& run : runs) count += static_cast<std::size_t>(run.end - run.begin);
+        cells.reserve(count);
         for (const msf_Run& run : runs) {
             const msf_Block& block = mesh.blocks[static_cast<std::size_t>(run.block)];
             const int corners = cel_CellOf(block.kind).corners;

@@ -2,34 +2,37 @@
 
 #include <algorithm>
 
-template <class T>
-T msf_NumberArray::At(std::size_t i) const {
-    char bytes[sizeof(T)];
-    std::memcpy(bytes, data + i * sizeof(T), sizeof(T));
-    if (bigEndian) std::reverse(bytes, bytes + sizeof(T));
-    T value;
-    std::memcpy(&value, bytes, sizeof(T));
-    return value;
-}
-
-long long msf_NumberArray::Int(std::size_t i) const {
-    switch (type) {
-    case Type::INT8: return At<std::int8_t>(i);
-    case Type::UINT8: return At<std::uint8_t>(i);
-    case Type::INT16: return At<std::int16_t>(i);
-    case Type::UINT16: return At<std::uint16_t>(i);
-    case Type::INT32: return At<std::int32_t>(i);
-    case Type::UINT32: return At<std::uint32_t>(i);
-    case Type::INT64: return At<std::int64_t>(i);
-    case Type::UINT64: return static_cast<long long>(At<std::uint64_t>(i));
-    default: return 0;
+template <class T, class U>
+void msf_NumberArray::Take(std::size_t begin, std::size_t many, U* numbers) const {
+    const char* at = data + begin * sizeof(T);
+    for (std::size_t i = 0; i < many; ++i, at += sizeof(T)) {
+        char bytes[sizeof(T)];
+        std::memcpy(bytes, at, sizeof(T));
+        if (bigEndian) std::reverse(bytes, bytes + sizeof(T));
+        T value;
+        std::memcpy(&value, bytes, sizeof(T));
+        numbers[i] = static_cast<U>(value);
     }
 }
 
-double msf_NumberArray::Real(std::size_t i) const {
-    if (type == Type::FLOAT64) return At<double>(i);
-    if (type == Type::FLOAT32) return static_cast<double>(At<float>(i));
-    return static_cast<double>(Int(i));
+void msf_NumberArray::Ints(std::size_t begin, std::size_t many, long long* numbers) const {
+    switch (type) {
+    case Type::INT8: return Take<std::int8_t>(begin, many, numbers);
+    case Type::UINT8: return Take<std::uint8_t>(begin, many, numbers);
+    case Type::INT16: return Take<std::int16_t>(begin, many, numbers);
+    case Type::UINT16: return Take<std::uint16_t>(begin, many, numbers);
+    case Type::INT32: return Take<std::int32_t>(begin, many, numbers);
+    case Type::UINT32: return Take<std::uint32_t>(begin, many, numbers);
+    case Type::INT64: return Take<std::int64_t>(begin, many, numbers);
+    case Type::UINT64: return Take<std::uint64_t>(begin, many, numbers);
+    default: std::fill_n(numbers, many, 0);
+    }
+}
+
+void msf_NumberArray::Reals(std::size_t begin, std::size_t many, double* numbers) const {
+    if (type == Type::FLOAT64) return Take<double>(begin, many, numbers);
+    if (type == Type::FLOAT32) return Take<float>(begin, many, numbers);
+    for (std::size_t i = 0; i < many; ++i) numbers[i] = static_cast<double>(Int(begin + i));
 }
 
 std::size_t msf_NumberArray::SizeOf(Type type) {
@@ -72,8 +75,9 @@ private:
                      "three for each point");
         builder_.ReserveNodes(count);
         for (std::size_t i = 0; i < count; ++i) {
-            builder_.AddNode(at_, static_cast<long long>(i) + 1, grid_.points.Real(3 * i),
-                             grid_.points.Real(3 * i + 1), grid_.points.Real(3 * i + 2));
+            double point[3];
+            grid_.points.Reals(3 * i, 3, point);
+            builder_.AddNode(at_, static_cast<long long>(i) + 1, point[0], point[1], point[2]);
         }
         builder_.FinishNodes(at_);
     }
@@ -159,8 +163,10 @@ private:
                            "of first or second order");
             const std::size_t begin = BeginOf(cell, next, *order);
             row.resize(static_cast<std::size_t>(order->nodes));
+            long long places[cel_kMaxNodes];
+            grid_.connectivity.Ints(begin, row.size(), places);
             for (std::size_t i = 0; i < row.size(); ++i) {
-                const long long node = grid_.connectivity.Int(begin + i);
+                const long long node = places[i];
                 if (node < 0 || node >= nodes)
                     FailAtCell(cell, "found point " + std::to_string(node),
                                "one of " + std::to_string(nodes) + ", from 0");

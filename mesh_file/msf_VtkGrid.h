@@ -19,8 +19,14 @@ struct msf_NumberArray {
     std::vector<char> own;
 
     bool IsReal() const { return type == Type::FLOAT32 || type == Type::FLOAT64; }
-    long long Int(std::size_t i) const;
-    double Real(std::size_t i) const;
+    long long Int(std::size_t i) const {
+        long long number = 0;
+        Ints(i, 1, &number);
+        return number;
+    }
+    /// `many` numbers from place `begin`; reals as zero.
+    void Ints(std::size_t begin, std::size_t many, long long* numbers) const;
+    void Reals(std::size_t begin, std::size_t many, double* numbers) const;
     static std::size_t SizeOf(Type type);
     /// Takes the numbers over.
     template <class T>
@@ -34,8 +40,8 @@ struct msf_NumberArray {
     }
 
 private:
-    template <class T>
-    T At(std::size_t i) const;
+    template <class T, class U>
+    void Take(std::size_t begin, std::size_t many, U* numbers) const;
 };
 
 /// An unstructured grid as both formats of VTK have it.
