@@ -71,6 +71,7 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store) {
     const bool wrong = std::ranges::any_of(list.findings, [](const fnd_Finding& f) { return f.IsError(); });
     if (!wrong) {
         dck_CheckDeck(store, name, list);
+        dck_CheckMeshes(store, name, list);
         dck_Rehearse(store, std::vector<fnd_Finding>(list.findings), list);
     }
     return std::move(list.findings);

@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Finding.h"
 
 class odb_Odb;
+struct mq_Quality;
 
 /// Everything that can be said of the model "Default Model" of a store before its deck is written, whether
 /// the store was filled in memory or from a file: errors that a model file would be refused for, and warnings
@@ -20,5 +21,10 @@ void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& 
 /// Writes the deck of "Default Model" to nowhere: says what is raised, unless it stands among the `told` ones,
 /// and how large a huge deck will be.
 void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink);
+/// The quality of all meshes: elements of negative or zero size, mid-side nodes far away, nodes and elements that
+/// stand twice, nodes of no element, faces that three solids share.
+void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
+/// The same of one mesh at the place.
+void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink);
 
 #endif

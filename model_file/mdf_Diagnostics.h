@@ -19,6 +19,10 @@ public:
                   const std::string& hint = {});
     int NumErrors() const { return numErrors_; }
 
+    const std::string& FileName() const { return report_->fileName; }
+    void SetUnreadable() { report_->unreadable = true; }
+    mdf_MeshOrigin& AddMeshOrigin() { return report_->meshOrigins.emplace_back(); }
+
 private:
     mdf_Report* report_;
     int numErrors_ = 0;

@@ -1,5 +1,6 @@
 #include "model_file/mdf_MeshReader.h"
 
+#include "model_file/mdf_MeshFile.h"
 #include "store_interface/findings/fnd_TextRules.h"
 
 #include <cmath>
@@ -23,8 +24,15 @@ cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const fnd_Pa
         diagnostics_.Expected(path, json, "an object");
         return mesh;
     }
-    mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
-    ReadNodesAndElements(*mesh, json, path, false);
+    if (json.Find("file") != nullptr) {
+        if (!mdf_MeshFileReader(records_, diagnostics_).Read(*mesh, json, path)) {
+            incomplete_.insert(mesh.Referent());
+            lacksMesh_ = true;
+        }
+    } else {
+        mdf_CheckMembers(diagnostics_, json, {"nodes", "elements", "sets"}, path);
+        ReadNodesAndElements(*mesh, json, path, false);
+    }
     if (mdf_Value* sets = json.Find("sets")) ReadSets(*mesh, *sets, fnd_Path(path, "sets"));
     return mesh;
 }

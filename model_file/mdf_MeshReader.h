@@ -17,6 +17,9 @@ public:
     /// The sets of the assembly.
     void ReadAssemblySets(mdf_Value& json, const fnd_Path& path);
 
+    /// A mesher's file gave no mesh.
+    bool LacksMesh() const { return lacksMesh_; }
+
 private:
     struct Members {
         std::vector<int> labels;
@@ -56,6 +59,7 @@ private:
     mdf_Diagnostics& diagnostics_;
     // Meshes that lack nodes or elements because of errors: what refers to these is not reported too.
     std::set<const odiK_Mesh*> incomplete_;
+    bool lacksMesh_ = false;
 };
 
 #endif

@@ -1,5 +1,7 @@
 #include "model_file/mdf_MeshWriter.h"
 
+#include <filesystem>
+
 namespace {
 
 template <class Labels>
@@ -21,7 +23,27 @@ const odiK_Instance* InstanceOf(const odiK_Model& model, int meshIndex) {
 
 } // namespace
 
+void mdf_MeshWriter::WriteOrigin(const mdf_MeshOrigin& origin) {
+    const std::filesystem::path given(origin.given.Find("file")->String());
+    out_.BeginObject();
+    for (const mdf_Member& member : origin.given.Members()) {
+        out_.Key(member.name);
+        if (member.name == "file" && given.is_relative()) {
+            out_.String(
+                std::filesystem::proximate(origin.path, folder_.empty() ? "." : folder_).generic_string());
+        } else {
+            out_.Value(member.value);
+        }
+    }
+    out_.EndObject();
+}
+
 void mdf_MeshWriter::WriteMesh(const odiK_Mesh& mesh) {
+    for (const mdf_MeshOrigin& origin : origins_) {
+        if (origin.mesh != &mesh) continue;
+        WriteOrigin(origin);
+        return;
+    }
     out_.BeginObject();
     if (mesh.Nodes().NumNodes() > 0) WriteNodes(mesh.Nodes());
     if (!mesh.Classes().empty()) {

@@ -1,10 +1,12 @@
 #ifndef QRX_MODEL_FILE_MDF_MODELFILE_H
 #define QRX_MODEL_FILE_MDF_MODELFILE_H
 
+#include "model_file/mdf_Value.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odb_Odb.h"
 
 #include <iosfwd>
+#include <list>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -13,13 +15,44 @@
 /// What model files say that they are.
 inline constexpr char mdf_kFormat[] = "qrx-model/1";
 
+class odiK_Mesh;
+
+/// Where a mesh came from that the model file only names: {"file": ...}.
+struct mdf_MeshOrigin {
+    struct Set {
+        std::string name;
+        /// "element", "surface" or "node".
+        const char* kind = "";
+        long long members = 0;
+        /// The group that it was made of, and its dimension.
+        std::string group;
+        int dimension = 0;
+    };
+
+    /// JSON pointer of the mesh.
+    std::string place;
+    std::string path;
+    /// "MSH 4.1, binary".
+    std::string format;
+    /// Cells by kind, and groups, as the file has them.
+    std::vector<std::pair<std::string, long long>> cells;
+    long long groups = 0;
+    std::vector<Set> sets;
+    /// What was merged, renamed, numbered anew or left out.
+    std::vector<std::string> notes;
+    /// The mesh, and the member as the model file has it.
+    const odiK_Mesh* mesh = nullptr;
+    mdf_Value given;
+};
+
 /// Everything that was found in one file, in the order of reading. Errors of syntax have a line and a column.
 /// Errors beyond the fiftieth are not kept.
 struct mdf_Report {
     std::string fileName;
     std::vector<fnd_Finding> findings;
-    /// The file itself could not be read; the one finding says why.
+    /// The file, or one that it names, could not be read; a finding says why.
     bool unreadable = false;
+    std::list<mdf_MeshOrigin> meshOrigins;
 
     bool HasErrors() const;
     /// "model.json:3:14: error: text", or "model.json: error: /models/A: text".
@@ -37,6 +70,10 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
 /// Writes all models of a store as a model file; fields that have their default are left out. False when the
 /// stream failed.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out);
+/// The same, where meshes that came from mesher's files stay in these; `folder` is the model file's own, from
+/// which their paths count.
+bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out, const std::list<mdf_MeshOrigin>& origins,
+                        const std::string& folder);
 
 /// Writes the JSON Schema (draft 2020-12) of model files, with the documentation of every field.
 bool mdf_WriteSchema(std::ostream& out);

@@ -21,6 +21,8 @@ void mdf_ModelReader::Read(mdf_Value& json, const fnd_Path& path) {
     }
     mdf_CheckMembers(diagnostics_, json, ModelMembers(model_), path);
     tree_.ReadFields(model_, json, path);
+    // What refers to sets of a mesh that isn't there would only be reported too.
+    if (tree_.LacksMesh()) return;
     model_.SealInstances();
     for (const odiK_Repository& repository : odiK_Repositories()) {
         const mdf_Value* value = json.Find(repository.member);

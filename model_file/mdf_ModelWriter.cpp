@@ -8,8 +8,9 @@ namespace {
 /// left out.
 class ModelWriter {
 public:
-    ModelWriter(mdf_Writer& out, const odiK_Model& model)
-        : out_(out), model_(model), records_(out, model), meshes_(out, records_, model) {}
+    ModelWriter(mdf_Writer& out, const odiK_Model& model, const std::list<mdf_MeshOrigin>& origins,
+                const std::string& folder)
+        : out_(out), model_(model), records_(out, model), meshes_(out, records_, model, origins, folder) {}
 
     void Write() {
         static const odiK_ModelData byDefault;
@@ -190,6 +191,11 @@ private:
 } // namespace
 
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream) {
+    return mdf_WriteModelFile(odb, stream, {}, "");
+}
+
+bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream, const std::list<mdf_MeshOrigin>& origins,
+                        const std::string& folder) {
     mdf_Writer out(stream);
     out.BeginObject();
     out.Key("format");
@@ -198,7 +204,7 @@ bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream) {
     out.BeginObject();
     for (const auto& [name, model] : odb.Models()) {
         out.Key(name.View());
-        ModelWriter(out, *model).Write();
+        ModelWriter(out, *model, origins, folder).Write();
     }
     out.EndObject();
     out.EndObject();

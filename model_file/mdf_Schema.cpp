@@ -1,4 +1,5 @@
 #include "model_file/mdf_Members.h"
+#include "model_file/mdf_MeshFile.h"
 #include "model_file/mdf_ModelFile.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -130,10 +131,18 @@ constexpr char kFrame[] = R"({
       }
     },
     "MESH": {
-      "description": "Nodes, elements and sets. Elements find their nodes by label, sets their members.",
+      "description": "Nodes, elements and sets. Elements find their nodes by label, sets their members. Or a mesher's file, whose cells and groups they are.",
       "type": "object",
       "additionalProperties": false,
       "properties": {
+        "file": {"description": "a mesher's file (MSH, UNV, MED, VTU, VTK, STL), relative to the model file; it takes the place of nodes and elements", "type": "string", "minLength": 1},
+        "part": {"description": "the mesh to take of a file with several", "type": "string"},
+        "scale": {"description": "coordinates of the file are multiplied by it", "type": "number", "exclusiveMinimum": 0, "default": 1},
+        "elementTypes": {"description": "element types by kind of cell, such as tetra10; null: such cells make no elements", "type": "object", "additionalProperties": {"anyOf": [{"$ref": "#/$defs/NAME"}, {"type": "null"}]}},
+        "surfaceElements": {"description": "what surface cells become; shells where there are no solids", "type": "string"},
+        "groups": {"description": "names of sets by group, or by group, '@' and dimension; null leaves the group out", "type": "object", "additionalProperties": {"anyOf": [{"$ref": "#/$defs/NAME"}, {"type": "null"}]}},
+        "groupArrays": {"description": "integer arrays of cells whose values become groups NAME_VALUE, in formats without groups", "type": "array", "items": {"type": "string"}},
+        "controls": {"description": "element controls by element type, for a file's elements", "type": "object", "additionalProperties": {"$ref": "#/$defs/bme_ElemCtrlParams"}},
         "nodes": {"description": "the nodes in the order of the deck", "$ref": "#/$defs/NODES"},
         "elements": {"description": "the elements type by type, in the order of the deck", "type": "array", "items": {"$ref": "#/$defs/ELEMENTS"}},
         "sets": {"description": "node sets, element sets and surfaces", "type": "array", "items": {"$ref": "#/$defs/SET"}}
@@ -166,6 +175,7 @@ public:
     Json Make() {
         Json schema = Json::parse(kFrame);
         Json& definitions = schema["$defs"];
+        definitions["MESH"]["properties"]["surfaceElements"]["enum"] = mdf_SurfaceFamilies();
         definitions["DATUM"] = FrameOf<odiK_Datum>();
         definitions["SET"] = FrameOf<odiK_SetHead>();
         definitions["ASSEMBLY_SET"] = FrameOf<odiK_SetHead>();

@@ -13,9 +13,9 @@ usage: install-dependencies.sh [build|test|bench|dev] ...
 END
 }
 
-build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev)
+build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev)
 test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
-bench=(libbenchmark-dev libfmt-dev)
+bench=(libbenchmark-dev libfmt-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
 [ $# -gt 0 ] || set -- build

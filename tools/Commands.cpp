@@ -11,6 +11,7 @@
 #include "model_file/mdf_Token.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/DeckFile.h"
+#include "tools/MeshDescription.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
 #include "tools/OutOfMemory.h"
@@ -34,7 +35,8 @@ std::string ReasonText(int error) {
 }
 
 /// The store of a model file that is right; else null, with the code.
-std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code) {
+std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
+                                   std::list<mdf_MeshOrigin>* origins = nullptr) {
     mdf_Report found;
     found.fileName = path;
     std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
@@ -46,6 +48,7 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
         code = ExitCode::MODEL_IS_WRONG;
     }
     if (code != ExitCode::DONE) odb.reset();
+    if (origins != nullptr) *origins = std::move(found.meshOrigins);
     return odb;
 }
 
@@ -215,6 +218,7 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     fnd_List list;
     try {
         dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
+        dck_CheckMeshes(odb, odb_Odb::DefaultModelName(), list);
         const auto write = [&odb](qio_ostream& device) { oif_Writer(odb).WriteInput(device); };
         const auto tell = [&](long long bytes) {
             for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
@@ -233,6 +237,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     if (odb == nullptr) return code;
     fnd_List list;
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
+    dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
     dck_Rehearse(*odb, std::vector<fnd_Finding>(list.findings), list);
     for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
     report.Print(fnd_Visible(model) + ": no errors\n");
@@ -245,7 +250,8 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
 
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    std::list<mdf_MeshOrigin> origins;
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins);
     if (odb == nullptr) return code;
     ordered_json& models = report.Member("models") = ordered_json::object();
     for (const auto& [name, entry] : odb->Models()) {
@@ -255,6 +261,10 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
         if (!history) continue;
         models[key]["history"] = DescribeHistory(*odb, name);
         report.Print(TextOfHistory(models[key]["history"]));
+    }
+    if (!origins.empty()) {
+        ordered_json& files = report.Member("meshFiles") = DescribeOrigins(origins);
+        report.Print(TextOfOrigins(files));
     }
     return code;
 }
@@ -269,9 +279,11 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     mdf_Report found;
     const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found);
     report.AddAll(found);
-    if (odb == nullptr) return ExitCode::MODEL_IS_WRONG;
+    if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
-    mdf_WriteModelFile(*odb, formatted);
+    const std::string place = request.output.empty() ? request.model : request.output;
+    mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
+                       std::filesystem::path(place).parent_path().string());
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {
@@ -284,9 +296,11 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         report.Print(formatted.str());
         return ExitCode::DONE;
     }
-    return ReplaceByText(request.output, "model file", formatted.view(), report)
-               ? ExitCode::DONE
-               : ExitCode::FILE_SYSTEM_REFUSED;
+    return WriteWholeFile(request.output, formatted.str(), report);
+}
+
+ExitCode WriteWholeFile(const std::string& path, const std::string& text, RunReport& report) {
+    return ReplaceByText(path, "model file", text, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
 }
 
 ExitCode RunVariables(const std::string& stepType, RunReport& report) {

@@ -4,6 +4,7 @@
 #include "tools/RunReport.h"
 
 #include <string>
+#include <vector>
 
 /// What the user asked for on the command line.
 struct WriteRequest {
@@ -22,6 +23,22 @@ struct FormatRequest {
     bool check = false;
 };
 
+struct MeshRequest {
+    std::string mesh;
+    /// Arrays of cells that become groups, of formats without groups.
+    std::vector<std::string> groupArrays;
+    /// The mesh to take of a file with several.
+    std::string part;
+};
+
+struct NewRequest {
+    std::string mesh;
+    /// Empty: the mesh file's name with the extension ".json", in the current folder.
+    std::string output;
+    /// Overwrites a file that is there.
+    bool force = false;
+};
+
 ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 /// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
@@ -33,6 +50,12 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report);
 ExitCode RunFormat(const FormatRequest& request, RunReport& report);
 /// The catalogue of output variables; `stepType` empty for all procedures.
 ExitCode RunVariables(const std::string& stepType, RunReport& report);
+/// Tells of a mesher's file.
+ExitCode RunMesh(const MeshRequest& request, RunReport& report);
+/// Makes a model file for a mesher's file.
+ExitCode RunNew(const NewRequest& request, RunReport& report);
+/// Replaces the file as a whole by the text.
+ExitCode WriteWholeFile(const std::string& path, const std::string& text, RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.
 ExitCode RunSchema(const std::string& output, RunReport& report);
 

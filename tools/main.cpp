@@ -34,6 +34,8 @@ struct CommandLine {
     CLI::App app{kAbout, "qrxdeck"};
     WriteRequest write;
     FormatRequest format;
+    MeshRequest mesh;
+    NewRequest newModel;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
@@ -43,6 +45,8 @@ struct CommandLine {
     CLI::App* checkCommand =
         app.add_subcommand("check", "Look for errors in a model and what its deck can't say, write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
+    CLI::App* meshCommand = app.add_subcommand("mesh", "Tell of a mesher's file: cells, groups, quality");
+    CLI::App* newCommand = app.add_subcommand("new", "Make a model file for a mesher's file, to go on from");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =
         app.add_subcommand("variables", "List the variables that output requests can ask for");
@@ -72,6 +76,20 @@ struct CommandLine {
             "--history", history,
             "Also what conditions, loads, interactions and output requests are in each step, "
             "and what the step writes of them");
+        AddMeshFile(meshCommand, mesh.mesh);
+        meshCommand
+            ->add_option("--group-arrays", mesh.groupArrays,
+                         "Arrays of cells that are to become groups, of formats that have none (VTK, VTU)")
+            ->type_name("NAME");
+        meshCommand->add_option("--part", mesh.part, "The mesh to take of a file with several")
+            ->type_name("NAME");
+        AddMeshFile(newCommand, newModel.mesh);
+        newCommand
+            ->add_option("-o,--output", newModel.output,
+                         "Model file to write (default: the mesh file's name with \".json\", in the "
+                         "current folder)")
+            ->type_name("FILE");
+        newCommand->add_flag("--force", newModel.force, "Overwrite the file if it is there");
         AddModel(formatCommand, format.model);
         auto* output =
             formatCommand
@@ -97,13 +115,15 @@ struct CommandLine {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
         return "there is no command " + fnd_Quoted(argv[1]) +
-               "; the commands are write, check, info, format, variables and schema";
+               "; the commands are write, check, info, mesh, new, format, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return RunCheck(model, report);
         if (*infoCommand) return RunInfo(model, history, report);
+        if (*meshCommand) return RunMesh(mesh, report);
+        if (*newCommand) return RunNew(newModel, report);
         if (*formatCommand) return RunFormat(format, report);
         if (*variablesCommand) return RunVariables(stepType, report);
         return RunSchema(schemaOutput, report);
@@ -112,6 +132,12 @@ struct CommandLine {
 private:
     void AddModel(CLI::App* command, std::string& file) {
         command->add_option("MODEL", file, "Model file, JSON")->required()->type_name("");
+        AddJson(command);
+    }
+    void AddMeshFile(CLI::App* command, std::string& file) {
+        command->add_option("MESH", file, "Mesh file: MSH, UNV, MED, VTU, VTK or STL")
+            ->required()
+            ->type_name("");
         AddJson(command);
     }
     void AddJson(CLI::App* command) {

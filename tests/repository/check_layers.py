@@ -18,8 +18,9 @@ ALLOWED = {
     "keyword_layer": ["foundation", "store_interface"],
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
-    "model_file": ["foundation", "store_interface"],
-    "tools": CORE + ["model_file"],
+    "mesh_file": ["foundation"],
+    "model_file": ["foundation", "store_interface", "mesh_file"],
+    "tools": CORE + ["mesh_file", "model_file"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
@@ -47,6 +48,7 @@ ROOMS = {
     ],
 }
 LIBRARIES = {
+    "mesh_file": ["pugixml.hpp", "zlib.h", "hdf5.h"],
     "model_file": ["nlohmann/"],
     "tools": ["nlohmann/", "CLI/"],
 }
@@ -63,8 +65,8 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"fcntl.h", "unistd.h", "sys/stat.h", "sys/types.h"}
-SYSTEM_LAYERS = {"foundation", "tools"}
+SYSTEM = {"fcntl.h", "unistd.h", "sys/mman.h", "sys/stat.h", "sys/types.h"}
+SYSTEM_LAYERS = {"foundation", "mesh_file", "tools"}
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')
 
