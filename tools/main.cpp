@@ -1,5 +1,6 @@
 #include "foundation/nex_Exception.h"
 #include "tools/Commands.h"
+#include "tools/DeckCommands.h"
 #include "tools/SignalCleanUp.h"
 
 #include <CLI/CLI.hpp>
@@ -12,7 +13,8 @@
 
 namespace {
 
-constexpr char kAbout[] = "Writes finite-element models, held in JSON model files, as keyword decks.";
+constexpr char kAbout[] =
+    "Writes finite-element models, held in JSON model files, as keyword decks; checks and compares decks.";
 constexpr char kExitCodes[] =
     "Exit codes:\n"
     "  0  done (there may be warnings)\n"
@@ -28,14 +30,15 @@ struct CommandLine {
     CLI::App app{kAbout, "qrxdeck"};
     WriteRequest write;
     FormatRequest format;
+    DeckRequest deck;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
     bool json = false;
     bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
-    CLI::App* checkCommand =
-        app.add_subcommand("check", "Look for errors in a model and what its deck can't say, write nothing");
+    CLI::App* checkCommand = app.add_subcommand(
+        "check", "Look for errors in a model and what its deck can't say, or in a deck; write nothing");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =
@@ -59,7 +62,9 @@ struct CommandLine {
         writeCommand
             ->add_option("--output-dir", write.outputDir, "Folder of the deck (default: the current one)")
             ->type_name("DIR");
-        AddModel(checkCommand, model);
+        AddModel(checkCommand, model, "Model file, JSON; or a deck, .inp");
+        checkCommand->add_flag("--no-includes", deck.keepIncludesShut,
+                               "Of a deck: don't read the files that it includes");
         AddModel(infoCommand, model);
         infoCommand->add_flag(
             "--history", history,
@@ -95,7 +100,7 @@ struct CommandLine {
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
-        if (*checkCommand) return RunCheck(model, report);
+        if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
         if (*infoCommand) return RunInfo(model, history, report);
         if (*formatCommand) return RunFormat(format, report);
         if (*variablesCommand) return RunVariables(stepType, report);
@@ -103,8 +108,8 @@ struct CommandLine {
     }
 
 private:
-    void AddModel(CLI::App* command, std::string& file) {
-        command->add_option("MODEL", file, "Model file, JSON")->required()->type_name("");
+    void AddModel(CLI::App* command, std::string& file, const char* about = "Model file, JSON") {
+        command->add_option("MODEL", file, about)->required()->type_name("");
         AddJson(command);
     }
     void AddJson(CLI::App* command) {

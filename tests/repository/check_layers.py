@@ -19,7 +19,8 @@ ALLOWED = {
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "model_file": ["foundation", "store_interface"],
-    "tools": CORE + ["model_file"],
+    "deck_reader": ["foundation"],
+    "tools": CORE + ["model_file", "deck_reader"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
