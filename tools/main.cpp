@@ -31,6 +31,7 @@ struct CommandLine {
     WriteRequest write;
     FormatRequest format;
     DeckRequest deck;
+    DiffRequest diff;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
@@ -39,6 +40,7 @@ struct CommandLine {
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
     CLI::App* checkCommand = app.add_subcommand(
         "check", "Look for errors in a model and what its deck can't say, or in a deck; write nothing");
+    CLI::App* diffCommand = app.add_subcommand("diff", "Compare two decks, or models, by what they mean");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =
@@ -65,6 +67,7 @@ struct CommandLine {
         AddModel(checkCommand, model, "Model file, JSON; or a deck, .inp");
         checkCommand->add_flag("--no-includes", deck.keepIncludesShut,
                                "Of a deck: don't read the files that it includes");
+        AddDiff();
         AddModel(infoCommand, model);
         infoCommand->add_flag(
             "--history", history,
@@ -95,12 +98,13 @@ struct CommandLine {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
         return std::string("there is no command '") + argv[1] +
-               "'; the commands are write, check, info, format, variables and schema";
+               "'; the commands are write, check, diff, info, format, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
+        if (*diffCommand) return static_cast<ExitCode>(RunDiff(diff, report));
         if (*infoCommand) return RunInfo(model, history, report);
         if (*formatCommand) return RunFormat(format, report);
         if (*variablesCommand) return RunVariables(stepType, report);
@@ -111,6 +115,24 @@ private:
     void AddModel(CLI::App* command, std::string& file, const char* about = "Model file, JSON") {
         command->add_option("MODEL", file, about)->required()->type_name("");
         AddJson(command);
+    }
+    void AddDiff() {
+        diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");
+        diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->required()->type_name("");
+        diffCommand
+            ->add_option("--tolerance", diff.tolerance,
+                         "Numbers are equal that differ by no more than this part of the greater")
+            ->type_name("R");
+        diffCommand
+            ->add_option(
+                "--ignore", diff.ignore,
+                "What makes no difference: comments, names, order, titles, output, with commas between")
+            ->delimiter(',')
+            ->type_name("WORDS");
+        diffCommand->add_flag("--no-includes", diff.deck.keepIncludesShut,
+                              "Don't read the files that the decks include");
+        AddJson(diffCommand);
+        diffCommand->footer("Exit codes: 0 equal, 1 different, 2 an error.\n");
     }
     void AddJson(CLI::App* command) {
         command->add_flag(
