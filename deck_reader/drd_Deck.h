@@ -12,6 +12,7 @@
 
 /// A parameter of a keyword line.
 struct drd_Parameter {
+    std::string name;  ///< as it stands
     std::string key;   ///< folded (drd_FoldKey)
     std::string value; ///< as it stands, quotes included, without blanks around it
     bool hasValue = false;

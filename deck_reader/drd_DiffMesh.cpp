@@ -16,6 +16,10 @@ public:
         if (count_++ < kShown) text_ += (text_.empty() ? "" : ", ") + std::to_string(label);
     }
     std::uint64_t Count() const { return count_; }
+    /// The verb for one or for many.
+    std::string_view Verb(std::string_view one, std::string_view many) const {
+        return count_ == 1 ? one : many;
+    }
     /// "3 nodes (1, 2, 3)".
     std::string Words(std::string_view what) const {
         return drd_Counted(count_, what) + " (" + text_ + (count_ > kShown ? ", ..." : "") + ")";
@@ -122,7 +126,8 @@ void drd_Differ::CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pai
     }
     if (moved.Count() > 0) {
         Tell(drd_ChangeEnm::CHANGED, "mesh",
-             context + moved.Words("node") + " stand elsewhere, at most " + drd_Shown(greatest) + " apart",
+             context + moved.Words("node") + std::string(moved.Verb(" stands", " stand")) +
+                 " elsewhere, at most " + drd_Shown(greatest) + " apart",
              firstMoved, secondMoved);
     }
     if (removed.Count() > 0) {
@@ -140,11 +145,25 @@ void drd_Differ::CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pai
          BeginOf(second.nodePlaces));
 }
 
+bool drd_Differ::SameOwners(const drd_Mesh& first, const drd_Mesh& second) const {
+    if (first.owners.Size() != second.owners.Size()) return false;
+    for (std::size_t i = 0; i < first.owners.Size(); ++i) {
+        const int a = first.owners[i];
+        const int b = second.owners[i];
+        if ((a < 0) != (b < 0)) return false;
+        if (a >= 0 && drd_FoldCase(First().owners[static_cast<std::size_t>(a)]) !=
+                          drd_FoldCase(Second().owners[static_cast<std::size_t>(b)])) {
+            return false;
+        }
+    }
+    return true;
+}
+
 bool drd_Differ::SameElements(const drd_Mesh& first, const drd_Mesh& second) const {
     if (!SameBytes(first.elements, second.elements) || !SameBytes(first.connectivity, second.connectivity)) {
         return false;
     }
-    if (!first.owners.IsEmpty() || !second.owners.IsEmpty()) return false;
+    if (!SameOwners(first, second)) return false;
     // Runs of equal types may be cut at different keywords.
     auto a = first.elementRuns.begin();
     auto b = second.elementRuns.begin();
@@ -195,11 +214,14 @@ void drd_Differ::CompareElements(const drd_Mesh& first, const drd_Mesh& second, 
         (sameType ? rewired : retyped).Add(first.elements[i]);
     }
     if (retyped.Count() > 0) {
-        Tell(drd_ChangeEnm::CHANGED, "mesh", context + retyped.Words("element") + " have another type",
+        Tell(drd_ChangeEnm::CHANGED, "mesh",
+             context + retyped.Words("element") + std::string(retyped.Verb(" has", " have")) +
+                 " another type",
              firstPlace, secondPlace);
     }
     if (rewired.Count() > 0) {
-        Tell(drd_ChangeEnm::CHANGED, "mesh", context + rewired.Words("element") + " have other nodes",
+        Tell(drd_ChangeEnm::CHANGED, "mesh",
+             context + rewired.Words("element") + std::string(rewired.Verb(" has", " have")) + " other nodes",
              firstPlace, secondPlace);
     }
     if (removed.Count() > 0) {

@@ -85,6 +85,7 @@ private:
     void CompareMeshes(Pair blocks, const Context& context);
     void CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pair blocks, const Context& context);
     void CompareElements(const drd_Mesh& first, const drd_Mesh& second, Pair blocks, const Context& context);
+    bool SameOwners(const drd_Mesh& first, const drd_Mesh& second) const;
     bool SameElements(const drd_Mesh& first, const drd_Mesh& second) const;
     void CompareSets();
     void CompareSet(Pair sets, const Context& context);

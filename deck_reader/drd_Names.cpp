@@ -218,10 +218,11 @@ bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block
     if (drd_ReadInt(folded, label)) {
         const drd_BlockEnm blockKind = deck_.blocks[static_cast<std::size_t>(block)].kind;
         const bool isInside = blockKind == drd_BlockEnm::PART || blockKind == drd_BlockEnm::INSTANCE;
-        if (HasLabel(kind, label, block) ||
-            (!isInside &&
-             ((assembly_ >= 0 && HasLabel(kind, label, assembly_)) || HasLabel(kind, label, 0)))) {
+        for (const int owner : {block, isInside ? -1 : assembly_, isInside ? -1 : 0}) {
+            if (owner < 0 || !HasLabel(kind, label, owner)) continue;
             target.label = label;
+            target.block = owner;
+            break;
         }
         return true;
     }
@@ -233,6 +234,7 @@ bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block
     if (HasLabel(kind, label, instance->second)) {
         target.label = label;
         target.instance = instance->second;
+        target.block = instance->second;
     }
     return true;
 }

@@ -51,6 +51,7 @@ struct drd_Target {
     int keyword = -1;  ///< that defines the name
     int instance = -1; ///< block of the instance whose label or set it is
     int label = 0;     ///< of a node or an element
+    int block = -1;    ///< whose mesh has the label
 
     explicit operator bool() const { return set >= 0 || keyword >= 0 || label > 0; }
 };

@@ -96,7 +96,8 @@ bool drd_Parser::ParseHeader(std::string_view header, drd_Keyword& keyword) {
         if (field.empty()) continue;
         const std::size_t equals = drd_FindOutsideQuotes(field, '=');
         drd_Parameter parameter;
-        parameter.key = drd_FoldKey(field.substr(0, equals));
+        parameter.name.assign(drd_Trim(field.substr(0, equals)));
+        parameter.key = drd_FoldKey(parameter.name);
         parameter.hasValue = equals != std::string_view::npos;
         if (parameter.hasValue) parameter.value.assign(drd_Trim(field.substr(equals + 1)));
         keyword.parameters.push_back(std::move(parameter));

@@ -22,6 +22,14 @@ struct DiffRequest {
     DeckRequest deck;
 };
 
+struct FlattenRequest {
+    /// A deck or a model file.
+    std::string input;
+    /// Empty: the standard output.
+    std::string output;
+    DeckRequest deck;
+};
+
 /// Whether the file is a deck and no model file: by its ending, else by its first character.
 bool IsDeck(const std::string& path);
 /// Reads a deck with what the store knows of element types.
@@ -38,5 +46,9 @@ ExitCode RunCheckDeck(const std::string& path, const DeckRequest& request, RunRe
 /// Compares two decks or models by meaning. Ends with 0 when they are equal, 1 when they differ, 2 for an
 /// error, as programs that compare do.
 int RunDiff(const DiffRequest& request, RunReport& report);
+/// Writes the deck in one form, for programs that compare lines; ends as RunDiff does.
+int RunTextOfDeck(const std::string& input, const DeckRequest& request, RunReport& report);
+/// Writes the deck without parts, instances and assembly.
+ExitCode RunFlatten(const FlattenRequest& request, RunReport& report);
 
 #endif

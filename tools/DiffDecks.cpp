@@ -109,8 +109,8 @@ void PrintComments(const drd_DiffResult& result, RunReport& report) {
             report.Print(std::string("  ") + sign + " " + comments[i] + "\n");
         }
         if (comments.size() > kShownComments) {
-            report.Print(std::string("  ") + sign + " and " + std::to_string(comments.size() - kShownComments) +
-                         " more\n");
+            report.Print(std::string("  ") + sign + " and " +
+                         std::to_string(comments.size() - kShownComments) + " more\n");
         }
     };
     print(result.commentsRemoved, "-");

@@ -32,6 +32,8 @@ struct CommandLine {
     FormatRequest format;
     DeckRequest deck;
     DiffRequest diff;
+    FlattenRequest flatten;
+    bool textOfDeck = false;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
@@ -41,6 +43,8 @@ struct CommandLine {
     CLI::App* checkCommand = app.add_subcommand(
         "check", "Look for errors in a model and what its deck can't say, or in a deck; write nothing");
     CLI::App* diffCommand = app.add_subcommand("diff", "Compare two decks, or models, by what they mean");
+    CLI::App* flattenCommand =
+        app.add_subcommand("flatten", "Write a deck without parts, instances and assembly");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
     CLI::App* variablesCommand =
@@ -68,6 +72,7 @@ struct CommandLine {
         checkCommand->add_flag("--no-includes", deck.keepIncludesShut,
                                "Of a deck: don't read the files that it includes");
         AddDiff();
+        AddFlatten();
         AddModel(infoCommand, model);
         infoCommand->add_flag(
             "--history", history,
@@ -98,13 +103,17 @@ struct CommandLine {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
         return std::string("there is no command '") + argv[1] +
-               "'; the commands are write, check, diff, info, format, variables and schema";
+               "'; the commands are write, check, diff, flatten, info, format, variables and schema";
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
-        if (*diffCommand) return static_cast<ExitCode>(RunDiff(diff, report));
+        if (*diffCommand) {
+            return static_cast<ExitCode>(textOfDeck ? RunTextOfDeck(diff.first, diff.deck, report)
+                                                    : RunDiff(diff, report));
+        }
+        if (*flattenCommand) return RunFlatten(flatten, report);
         if (*infoCommand) return RunInfo(model, history, report);
         if (*formatCommand) return RunFormat(format, report);
         if (*variablesCommand) return RunVariables(stepType, report);
@@ -118,7 +127,11 @@ private:
     }
     void AddDiff() {
         diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");
-        diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->required()->type_name("");
+        auto* second = diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->type_name("");
+        diffCommand
+            ->add_flag("--textconv", textOfDeck,
+                       "Compare nothing: print A in one form, for programs that compare lines")
+            ->excludes(second);
         diffCommand
             ->add_option("--tolerance", diff.tolerance,
                          "Numbers are equal that differ by no more than this part of the greater")
@@ -132,7 +145,21 @@ private:
         diffCommand->add_flag("--no-includes", diff.deck.keepIncludesShut,
                               "Don't read the files that the decks include");
         AddJson(diffCommand);
+        diffCommand->callback([this, second] {
+            if (!textOfDeck && second->empty()) throw CLI::RequiredError("B");
+        });
         diffCommand->footer("Exit codes: 0 equal, 1 different, 2 an error.\n");
+    }
+    void AddFlatten() {
+        flattenCommand->add_option("FILE", flatten.input, "Deck, .inp, or model file")
+            ->required()
+            ->type_name("");
+        flattenCommand
+            ->add_option("-o,--output", flatten.output, "Deck to write (default: the standard output)")
+            ->type_name("FILE");
+        flattenCommand->add_flag("--no-includes", flatten.deck.keepIncludesShut,
+                                 "Don't read the files that the deck includes");
+        AddJson(flattenCommand);
     }
     void AddJson(CLI::App* command) {
         command->add_flag(
