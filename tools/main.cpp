@@ -1,6 +1,7 @@
 #include "foundation/nex_Exception.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/Commands.h"
+#include "tools/DeckCommands.h"
 #include "tools/OutOfMemory.h"
 #include "tools/SignalCleanUp.h"
 #include "tools/StandardStreams.h"
@@ -15,7 +16,8 @@
 
 namespace {
 
-constexpr char kAbout[] = "Writes finite-element models, held in JSON model files, as keyword decks.";
+constexpr char kAbout[] =
+    "Writes finite-element models, held in JSON model files, as keyword decks; checks and compares decks.";
 constexpr char kExitCodes[] =
     "Exit codes:\n"
     "  0  done (there may be warnings)\n"
@@ -36,14 +38,21 @@ struct CommandLine {
     FormatRequest format;
     MeshRequest mesh;
     NewRequest newModel;
+    DeckRequest deck;
+    DiffRequest diff;
+    FlattenRequest flatten;
+    bool textOfDeck = false;
     std::string model;
     std::string schemaOutput;
     std::string stepType;
     bool json = false;
     bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
-    CLI::App* checkCommand =
-        app.add_subcommand("check", "Look for errors in a model and what its deck can't say, write nothing");
+    CLI::App* checkCommand = app.add_subcommand(
+        "check", "Look for errors in a model and what its deck can't say, or in a deck; write nothing");
+    CLI::App* diffCommand = app.add_subcommand("diff", "Compare two decks, or models, by what they mean");
+    CLI::App* flattenCommand =
+        app.add_subcommand("flatten", "Write a deck without parts, instances and assembly");
     CLI::App* infoCommand = app.add_subcommand("info", "Tell what is in a model");
     CLI::App* meshCommand = app.add_subcommand("mesh", "Tell of a mesher's file: cells, groups, quality");
     CLI::App* newCommand = app.add_subcommand("new", "Make a model file for a mesher's file, to go on from");
@@ -70,7 +79,11 @@ struct CommandLine {
         writeCommand
             ->add_option("--output-dir", write.outputDir, "Folder of the deck (default: the current one)")
             ->type_name("DIR");
-        AddModel(checkCommand, model);
+        AddModel(checkCommand, model, "Model file, JSON; or a deck, .inp");
+        checkCommand->add_flag("--no-includes", deck.keepIncludesShut,
+                               "Of a deck: don't read the files that it includes");
+        AddDiff();
+        AddFlatten();
         AddModel(infoCommand, model);
         infoCommand->add_flag(
             "--history", history,
@@ -114,13 +127,21 @@ struct CommandLine {
     std::string Complaint(const CLI::ParseError& error, int argc, char** argv) const {
         const bool named = argc > 1 && argv[1][0] != '-';
         if (!named || !app.get_subcommands().empty()) return error.what();
-        return "there is no command " + fnd_Quoted(argv[1]) +
-               "; the commands are write, check, info, mesh, new, format, variables and schema";
+        std::string commands;
+        for (const CLI::App* command : app.get_subcommands({})) {
+            commands += (commands.empty() ? "" : ", ") + command->get_name();
+        }
+        return "there is no command " + fnd_Quoted(argv[1]) + "; the commands are " + commands;
     }
 
     ExitCode Run(RunReport& report) const {
         if (*writeCommand) return RunWrite(write, report);
-        if (*checkCommand) return RunCheck(model, report);
+        if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
+        if (*diffCommand) {
+            return static_cast<ExitCode>(textOfDeck ? RunTextOfDeck(diff.first, diff.deck, report)
+                                                    : RunDiff(diff, report));
+        }
+        if (*flattenCommand) return RunFlatten(flatten, report);
         if (*infoCommand) return RunInfo(model, history, report);
         if (*meshCommand) return RunMesh(mesh, report);
         if (*newCommand) return RunNew(newModel, report);
@@ -130,8 +151,8 @@ struct CommandLine {
     }
 
 private:
-    void AddModel(CLI::App* command, std::string& file) {
-        command->add_option("MODEL", file, "Model file, JSON")->required()->type_name("");
+    void AddModel(CLI::App* command, std::string& file, const char* about = "Model file, JSON") {
+        command->add_option("MODEL", file, about)->required()->type_name("");
         AddJson(command);
     }
     void AddMeshFile(CLI::App* command, std::string& file) {
@@ -139,6 +160,42 @@ private:
             ->required()
             ->type_name("");
         AddJson(command);
+    }
+    void AddDiff() {
+        diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");
+        auto* second = diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->type_name("");
+        diffCommand
+            ->add_flag("--textconv", textOfDeck,
+                       "Compare nothing: print A in one form, for programs that compare lines")
+            ->excludes(second);
+        diffCommand
+            ->add_option("--tolerance", diff.tolerance,
+                         "Numbers are equal that differ by no more than this part of the greater")
+            ->type_name("R");
+        diffCommand
+            ->add_option(
+                "--ignore", diff.ignore,
+                "What makes no difference: comments, names, order, titles, output, with commas between")
+            ->delimiter(',')
+            ->type_name("WORDS");
+        diffCommand->add_flag("--no-includes", diff.deck.keepIncludesShut,
+                              "Don't read the files that the decks include");
+        AddJson(diffCommand);
+        diffCommand->callback([this, second] {
+            if (!textOfDeck && second->empty()) throw CLI::RequiredError("B");
+        });
+        diffCommand->footer("Exit codes: 0 equal, 1 different, 2 an error.\n");
+    }
+    void AddFlatten() {
+        flattenCommand->add_option("FILE", flatten.input, "Deck, .inp, or model file")
+            ->required()
+            ->type_name("");
+        flattenCommand
+            ->add_option("-o,--output", flatten.output, "Deck to write (default: the standard output)")
+            ->type_name("FILE");
+        flattenCommand->add_flag("--no-includes", flatten.deck.keepIncludesShut,
+                                 "Don't read the files that the deck includes");
+        AddJson(flattenCommand);
     }
     void AddJson(CLI::App* command) {
         command->add_flag(

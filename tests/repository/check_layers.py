@@ -19,8 +19,9 @@ ALLOWED = {
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "mesh_file": ["foundation"],
+    "deck_reader": ["foundation"],
     "model_file": ["foundation", "store_interface", "mesh_file"],
-    "tools": CORE + ["mesh_file", "model_file"],
+    "tools": CORE + ["mesh_file", "model_file", "deck_reader"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.

@@ -1,0 +1,411 @@
+#include "deck_reader/drd_Names.h"
+
+#include "deck_reader/drd_Text.h"
+
+#include <algorithm>
+#include <numeric>
+
+drd_LabelIndex::drd_LabelIndex(const drd_Flat<int>& labels) : labels_(labels) {
+    const std::size_t count = labels.Size();
+    if (count == 0) return;
+    bool isRun = true;
+    int greatest = labels[0];
+    for (std::size_t i = 1; i < count; ++i) {
+        isRun = isRun && labels[i] - 1 == labels[i - 1];
+        greatest = std::max(greatest, labels[i]);
+    }
+    isRun_ = isRun;
+    if (isRun) return;
+    if (static_cast<std::size_t>(greatest) <= 4 * count + 1000) {
+        BuildTable(greatest);
+    } else {
+        BuildOrder();
+    }
+}
+
+void drd_LabelIndex::BuildTable(int greatest) {
+    table_.assign(static_cast<std::size_t>(greatest) + 1, -1);
+    for (std::size_t i = 0; i < labels_.Size(); ++i) {
+        std::int32_t& place = table_[static_cast<std::size_t>(labels_[i])];
+        if (place < 0) {
+            place = static_cast<std::int32_t>(i);
+        } else {
+            repeated_.push_back(i);
+        }
+    }
+}
+
+void drd_LabelIndex::BuildOrder() {
+    ordered_.resize(labels_.Size());
+    std::iota(ordered_.begin(), ordered_.end(), 0U);
+    std::stable_sort(ordered_.begin(), ordered_.end(),
+                     [this](std::uint32_t a, std::uint32_t b) { return labels_[a] < labels_[b]; });
+    for (std::size_t i = 1; i < ordered_.size(); ++i) {
+        if (labels_[ordered_[i]] == labels_[ordered_[i - 1]]) repeated_.push_back(ordered_[i]);
+    }
+    std::sort(repeated_.begin(), repeated_.end());
+}
+
+std::int64_t drd_LabelIndex::Find(int label) const {
+    if (isRun_) {
+        const std::int64_t place = std::int64_t{label} - labels_[0];
+        return place >= 0 && place < static_cast<std::int64_t>(labels_.Size()) ? place : -1;
+    }
+    if (!table_.empty()) {
+        return label >= 0 && static_cast<std::size_t>(label) < table_.size()
+                   ? table_[static_cast<std::size_t>(label)]
+                   : -1;
+    }
+    const auto found =
+        std::lower_bound(ordered_.begin(), ordered_.end(), label,
+                         [this](std::uint32_t place, int sought) { return labels_[place] < sought; });
+    return found != ordered_.end() && labels_[*found] == label ? std::int64_t{*found} : -1;
+}
+
+namespace {
+
+std::string KeyOf(drd_KindEnm kind, int block, std::string_view folded) {
+    std::string key = std::to_string(static_cast<int>(kind)) + "/" + std::to_string(block) + "/";
+    return key.append(folded);
+}
+
+/// Names that a part, an instance and the assembly have each for itself.
+bool IsScoped(drd_KindEnm kind) {
+    return kind == drd_KindEnm::NODE_SET || kind == drd_KindEnm::ELEMENT_SET ||
+           kind == drd_KindEnm::SURFACE || kind == drd_KindEnm::ORIENTATION;
+}
+
+bool IsSet(drd_KindEnm kind) {
+    return kind == drd_KindEnm::NODE_SET || kind == drd_KindEnm::ELEMENT_SET;
+}
+
+} // namespace
+
+drd_Names::drd_Names(const drd_Deck& deck) : deck_(deck) {
+    for (std::size_t i = 0; i < deck.blocks.size(); ++i) {
+        const drd_Block& block = deck.blocks[i];
+        if (block.kind == drd_BlockEnm::ASSEMBLY && assembly_ < 0) assembly_ = static_cast<int>(i);
+        if (block.kind == drd_BlockEnm::PART) parts_.emplace(drd_FoldCase(block.name), static_cast<int>(i));
+        if (block.kind == drd_BlockEnm::INSTANCE)
+            instances_.emplace(drd_FoldCase(block.name), static_cast<int>(i));
+    }
+    AddSets();
+    AddDefinitions();
+}
+
+void drd_Names::AddSets() {
+    for (std::size_t i = 0; i < deck_.setParts.size(); ++i) {
+        const drd_SetPart& part = deck_.setParts[i];
+        const auto [place, isNew] = index_.try_emplace(KeyOf(part.kind, part.block, drd_FoldCase(part.name)),
+                                                       static_cast<int>(sets_.size()));
+        if (isNew) sets_.push_back({part.kind, part.block, part.name, {}});
+        sets_[static_cast<std::size_t>(place->second)].parts.push_back(static_cast<int>(i));
+    }
+}
+
+void drd_Names::AddDefinitions() {
+    for (std::size_t i = 0; i < deck_.keywords.size(); ++i) {
+        const drd_Keyword& keyword = deck_.keywords[i];
+        if (keyword.row == nullptr || keyword.row->defines == drd_KindEnm::NONE) continue;
+        const std::string name = drd_FoldName(keyword.Value(drd_NameParameter(*keyword.row)));
+        if (name.empty()) continue;
+        const drd_KindEnm kind = keyword.row->defines;
+        // A step may begin as a part ends: blocks are known by the block around them.
+        int block = kind == drd_KindEnm::LOAD_CASE
+                        ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
+                        : (IsScoped(kind) ? keyword.block : -1);
+        if (!index_.try_emplace(KeyOf(kind, block, name), static_cast<int>(i)).second &&
+            kind != drd_KindEnm::CONTACT_PAIR && kind != drd_KindEnm::DERIVED) {
+            definedTwice_.push_back(static_cast<int>(i));
+        }
+    }
+}
+
+int drd_Names::FindPart(std::string_view value) const {
+    const auto found = parts_.find(drd_FoldName(value));
+    return found == parts_.end() ? -1 : found->second;
+}
+
+int drd_Names::FindInstance(std::string_view name) const {
+    const auto found = instances_.find(drd_FoldCase(name));
+    return found == instances_.end() ? -1 : found->second;
+}
+
+int drd_Names::PartOf(int instance) const {
+    const drd_Block& block = deck_.blocks[static_cast<std::size_t>(instance)];
+    if (block.kind != drd_BlockEnm::INSTANCE) return -1;
+    return FindPart(deck_.keywords[static_cast<std::size_t>(block.begin)].Value("part"));
+}
+
+int drd_Names::MeshBlock(int block) const {
+    if (deck_.blocks[static_cast<std::size_t>(block)].mesh >= 0) return block;
+    const int part = PartOf(block);
+    return part >= 0 ? part : block;
+}
+
+const drd_LabelIndex* drd_Names::Nodes(int block) const {
+    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)]);
+    if (mesh == nullptr) return nullptr;
+    auto& index = nodes_[block];
+    if (index == nullptr) index = std::make_unique<drd_LabelIndex>(mesh->nodes);
+    return index.get();
+}
+
+const drd_LabelIndex* drd_Names::Elements(int block) const {
+    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)]);
+    if (mesh == nullptr) return nullptr;
+    auto& index = elements_[block];
+    if (index == nullptr) index = std::make_unique<drd_LabelIndex>(mesh->elements);
+    return index.get();
+}
+
+int drd_Names::FindScoped(drd_KindEnm kind, const std::string& folded, int block) const {
+    const auto found = index_.find(KeyOf(kind, block, folded));
+    if (found != index_.end()) return found->second;
+    const int part = PartOf(block);
+    return part >= 0 ? FindScoped(kind, folded, part) : -1;
+}
+
+/// In the assembly and outside all blocks.
+int drd_Names::FindAbove(drd_KindEnm kind, const std::string& folded) const {
+    const int inAssembly = assembly_ >= 0 ? FindScoped(kind, folded, assembly_) : -1;
+    return inAssembly >= 0 ? inAssembly : FindScoped(kind, folded, 0);
+}
+
+drd_Target drd_Names::TargetOf(drd_KindEnm kind, int index) const {
+    drd_Target target;
+    (IsSet(kind) ? target.set : target.keyword) = index;
+    return target;
+}
+
+drd_Target drd_Names::FindInInstances(drd_KindEnm kind, const std::string& folded) const {
+    // Names of instances may have dots too, so that every dot can be the one.
+    for (std::size_t dot = folded.find('.'); dot != std::string::npos; dot = folded.find('.', dot + 1)) {
+        const auto instance = instances_.find(folded.substr(0, dot));
+        if (instance == instances_.end()) continue;
+        const int index = FindScoped(kind, folded.substr(dot + 1), instance->second);
+        if (index < 0) continue;
+        drd_Target target = TargetOf(kind, index);
+        target.instance = instance->second;
+        return target;
+    }
+    return {};
+}
+
+drd_Target drd_Names::Find(drd_KindEnm kind, std::string_view name, int block) const {
+    const std::string folded = drd_FoldName(name);
+    if (folded.empty()) return {};
+    if (!IsScoped(kind)) {
+        const auto found = index_.find(KeyOf(kind, -1, folded));
+        return found == index_.end() ? drd_Target() : TargetOf(kind, found->second);
+    }
+    int index = FindScoped(kind, folded, block);
+    const drd_BlockEnm blockKind = deck_.blocks[static_cast<std::size_t>(block)].kind;
+    const bool isInside = blockKind == drd_BlockEnm::PART || blockKind == drd_BlockEnm::INSTANCE;
+    if (index < 0 && (!isInside || kind == drd_KindEnm::ORIENTATION)) index = FindAbove(kind, folded);
+    if (index >= 0) return TargetOf(kind, index);
+    return isInside ? drd_Target() : FindInInstances(kind, folded);
+}
+
+bool drd_Names::HasLabel(drd_KindEnm kind, int label, int block) const {
+    const int meshBlock = MeshBlock(block);
+    const drd_LabelIndex* index = kind == drd_KindEnm::NODE_SET ? Nodes(meshBlock) : Elements(meshBlock);
+    return index != nullptr && index->Find(label) >= 0;
+}
+
+bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block, drd_Target& target) const {
+    int label = 0;
+    if (drd_ReadInt(folded, label)) {
+        const drd_BlockEnm blockKind = deck_.blocks[static_cast<std::size_t>(block)].kind;
+        const bool isInside = blockKind == drd_BlockEnm::PART || blockKind == drd_BlockEnm::INSTANCE;
+        for (const int owner : {block, isInside ? -1 : assembly_, isInside ? -1 : 0}) {
+            if (owner < 0 || !HasLabel(kind, label, owner)) continue;
+            target.label = label;
+            target.block = owner;
+            break;
+        }
+        return true;
+    }
+    const std::size_t dot = folded.rfind('.');
+    if (dot == std::string::npos || !drd_ReadInt(std::string_view(folded).substr(dot + 1), label))
+        return false;
+    const auto instance = instances_.find(folded.substr(0, dot));
+    if (instance == instances_.end()) return false;
+    if (HasLabel(kind, label, instance->second)) {
+        target.label = label;
+        target.instance = instance->second;
+        target.block = instance->second;
+    }
+    return true;
+}
+
+drd_Target drd_Names::Find(drd_RefEnm ref, drd_KindEnm kind, std::string_view name, int block) const {
+    drd_Target target = Find(kind, name, block);
+    if (target) return target;
+    switch (ref) {
+    case drd_RefEnm::NAME:
+    case drd_RefEnm::NAME_UNLESS_NUMBER:
+    case drd_RefEnm::NODES_UNLESS_NUMBER: break;
+    case drd_RefEnm::NODES:
+    case drd_RefEnm::ELEMENTS: FindLabel(kind, drd_FoldName(name), block, target); break;
+    case drd_RefEnm::SURFACE_OR_NODES: target = Find(drd_KindEnm::NODE_SET, name, block); break;
+    case drd_RefEnm::ELEMENTS_OR_NODES:
+        target = Find(drd_KindEnm::ELEMENT_SET, name, block);
+        if (!target && !FindLabel(drd_KindEnm::NODE_SET, drd_FoldName(name), block, target)) {
+            FindLabel(drd_KindEnm::ELEMENT_SET, drd_FoldName(name), block, target);
+        }
+        break;
+    }
+    return target;
+}
+
+std::string drd_Names::Nearest(drd_KindEnm kind, std::string_view name) const {
+    constexpr std::size_t kTried = 5000;
+    drd_Nearest nearest(drd_NameOf(name));
+    std::size_t tried = 0;
+    const auto tryIn = [&](int block, std::string_view known) {
+        const drd_Block& owner = deck_.blocks[static_cast<std::size_t>(block)];
+        const std::string whole =
+            owner.kind == drd_BlockEnm::INSTANCE ? owner.name + "." + std::string(known) : std::string(known);
+        nearest.Try(whole);
+        nearest.Try(known, whole);
+    };
+    if (IsSet(kind)) {
+        for (const drd_Set& set : sets_) {
+            if (set.kind == kind && ++tried < kTried) tryIn(set.block, set.name);
+        }
+        return nearest.Hint();
+    }
+    for (const drd_Keyword& keyword : deck_.keywords) {
+        if (keyword.row == nullptr || keyword.row->defines != kind || ++tried > kTried) continue;
+        const std::string known = drd_NameOf(keyword.Value(drd_NameParameter(*keyword.row)));
+        if (IsScoped(kind)) {
+            tryIn(keyword.block, known);
+        } else {
+            nearest.Try(known);
+        }
+    }
+    return nearest.Hint();
+}
+
+bool drd_Names::Expand(int set, std::vector<drd_Member>& members) const {
+    members.clear();
+    Seen seen;
+    const bool isWhole = Collect(set, -1, seen, members);
+    std::sort(members.begin(), members.end());
+    members.erase(std::unique(members.begin(), members.end()), members.end());
+    return isWhole;
+}
+
+bool drd_Names::Collect(int set, int instance, Seen& seen, std::vector<drd_Member>& members) const {
+    constexpr int kDeepest = 1000;
+    if (!seen.sets.emplace(std::int64_t{set} << 32U | static_cast<std::uint32_t>(instance)).second)
+        return true;
+    if (seen.depth == kDeepest) return false;
+    ++seen.depth;
+    bool isWhole = true;
+    for (const int part : sets_[static_cast<std::size_t>(set)].parts) {
+        isWhole &= CollectPart(deck_.setParts[static_cast<std::size_t>(part)], instance, seen, members);
+    }
+    --seen.depth;
+    return isWhole;
+}
+
+void drd_Names::CollectLabels(const drd_SetPart& part, int owner, std::vector<drd_Member>& members) const {
+    if (!part.isGenerated) {
+        for (const int label : deck_.labels.Part(part.first, part.count)) members.push_back({owner, label});
+        return;
+    }
+    for (std::uint64_t i = part.first; i + 2 < part.first + part.count; i += 3) {
+        for (std::int64_t label = deck_.labels[i]; label <= deck_.labels[i + 1];
+             label += deck_.labels[i + 2]) {
+            members.push_back({owner, static_cast<int>(label)});
+        }
+    }
+}
+
+bool drd_Names::CollectPart(const drd_SetPart& part, int instance, Seen& seen,
+                            std::vector<drd_Member>& members) const {
+    int owner = instance;
+    if (!part.instance.empty()) {
+        owner = FindInstance(part.instance);
+        if (owner < 0) return false;
+    }
+    CollectLabels(part, owner, members);
+    bool isWhole = CollectFromMesh(part, owner, seen, members);
+    for (const std::string& member : part.members) {
+        const int block = part.instance.empty() ? part.block : owner;
+        const bool isNodes = part.kind == drd_KindEnm::NODE_SET;
+        const drd_Target target =
+            Find(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member, block);
+        const int below = target.instance >= 0 ? target.instance : owner;
+        if (target.set >= 0) {
+            isWhole &= Collect(target.set, below, seen, members);
+        } else if (target.label > 0) {
+            members.push_back({below, target.label});
+        } else {
+            isWhole = false;
+        }
+    }
+    return isWhole;
+}
+
+/// What nodes and elements put into a set by their own keyword line, and "*Nset, elset=".
+bool drd_Names::CollectFromMesh(const drd_SetPart& part, int instance, Seen& seen,
+                                std::vector<drd_Member>& members) const {
+    if (part.keyword < 0) return true;
+    const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(part.keyword)];
+    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(MeshBlock(part.block))]);
+    const auto isAhead = [](const auto& run, int of) { return run.keyword < of; };
+    if (keyword.key == "node" && mesh != nullptr) {
+        auto run = std::lower_bound(mesh->nodeRuns.begin(), mesh->nodeRuns.end(), part.keyword, isAhead);
+        for (; run != mesh->nodeRuns.end() && run->keyword == part.keyword; ++run) {
+            for (const int label : mesh->nodes.Part(run->first, run->count))
+                members.push_back({instance, label});
+        }
+    } else if (keyword.key == "element" && mesh != nullptr) {
+        auto run =
+            std::lower_bound(mesh->elementRuns.begin(), mesh->elementRuns.end(), part.keyword, isAhead);
+        for (; run != mesh->elementRuns.end() && run->keyword == part.keyword; ++run) {
+            for (const int label : mesh->elements.Part(run->first, run->count))
+                members.push_back({instance, label});
+        }
+    } else if (keyword.key == "nset" && keyword.Find("elset") != nullptr) {
+        return CollectNodesOfElements(part, instance, seen, members);
+    }
+    return true;
+}
+
+bool drd_Names::CollectNodesOfElements(const drd_SetPart& part, int instance, Seen& seen,
+                                       std::vector<drd_Member>& members) const {
+    const std::string_view name = deck_.keywords[static_cast<std::size_t>(part.keyword)].Value("elset");
+    const drd_Target elements = Find(drd_KindEnm::ELEMENT_SET, name, part.block);
+    const int block = MeshBlock(part.block);
+    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)]);
+    if (elements.set < 0 || mesh == nullptr) return false;
+    std::vector<drd_Member> found;
+    const bool isWhole = Collect(elements.set, instance, seen, found);
+    for (const drd_Member& element : found) {
+        const std::int64_t place = Elements(block)->Find(element.label);
+        const auto run = std::upper_bound(
+            mesh->elementRuns.begin(), mesh->elementRuns.end(), place,
+            [](std::int64_t at, const drd_ElementRun& r) { return at < static_cast<std::int64_t>(r.first); });
+        if (place < 0 || run == mesh->elementRuns.begin()) continue;
+        const drd_ElementRun& own = *(run - 1);
+        const std::uint64_t first = own.firstNode + (static_cast<std::uint64_t>(place) - own.first) *
+                                                        static_cast<std::uint64_t>(own.nodes);
+        for (const int node : mesh->connectivity.Part(first, static_cast<std::size_t>(own.nodes))) {
+            members.push_back({element.instance, node});
+        }
+    }
+    return isWhole;
+}
+
+bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword) {
+    if (ref.onlyWith.empty()) return true;
+    const std::size_t equals = ref.onlyWith.find('=');
+    const drd_Parameter* parameter = keyword.Find(ref.onlyWith.substr(0, equals));
+    if (parameter == nullptr) return false;
+    return equals == std::string_view::npos ||
+           drd_FoldKey(parameter->value) == drd_FoldKey(ref.onlyWith.substr(equals + 1));
+}

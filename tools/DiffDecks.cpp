@@ -1,0 +1,197 @@
+#include "deck/oif_Writer.h"
+#include "deck_reader/drd_Diff.h"
+#include "deck_reader/drd_Text.h"
+#include "foundation/nex_Exception.h"
+#include "foundation/qio_Device.h"
+#include "model_file/mdf_ModelFile.h"
+#include "tools/DeckCommands.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <filesystem>
+
+#include <unistd.h>
+
+using nlohmann::ordered_json;
+
+namespace {
+
+/// A fresh folder that goes with the object.
+class ScratchFolder {
+public:
+    ScratchFolder() {
+        std::error_code error;
+        path_ = std::filesystem::temp_directory_path(error).string() + "/qrxdeck-XXXXXX";
+        made_ = ::mkdtemp(path_.data()) != nullptr;
+    }
+    ScratchFolder(const ScratchFolder&) = delete;
+    ScratchFolder& operator=(const ScratchFolder&) = delete;
+    ~ScratchFolder() {
+        std::error_code error;
+        if (made_) std::filesystem::remove_all(path_, error);
+    }
+    bool IsMade() const { return made_; }
+    std::string Job() const { return path_ + "/deck"; }
+
+private:
+    std::string path_;
+    bool made_ = false;
+};
+
+/// Reads the deck of a model.
+bool ReadDeckOfModel(const std::string& path, drd_Deck& deck, RunReport& report) {
+    mdf_Report found;
+    found.fileName = path;
+    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
+    if (odb == nullptr || found.HasErrors()) {
+        report.AddAll(found);
+        return false;
+    }
+    const ScratchFolder folder;
+    if (!folder.IsMade()) {
+        report.Error(path, "no folder can be made for its deck");
+        return false;
+    }
+    try {
+        oif_Writer(*odb).WriteInputFile(folder.Job().c_str());
+    } catch (const QRXBasException& failure) {
+        report.WriterError(failure.what(), failure.Context());
+        return false;
+    }
+    drd_Findings findings;
+    deck = ReadDeck(folder.Job() + ".inp", {}, findings);
+    const bool isWhole = qio_LastReport().opened && qio_LastReport().error == 0;
+    if (!isWhole) report.Error(path, "its deck can't be written");
+    deck.files[0].name = "deck of " + path;
+    return isWhole;
+}
+
+constexpr std::size_t kShownComments = 10;
+
+ordered_json PlaceOf(const drd_Deck& deck, drd_Place place) {
+    if (place.file < 0) return nullptr;
+    return {{"file", deck.FileName(place)}, {"line", place.line}};
+}
+
+std::string Shown(const drd_Deck& deck, drd_Place place) {
+    return place.file < 0 ? "-" : deck.FileName(place) + ":" + std::to_string(place.line);
+}
+
+class Colours {
+public:
+    explicit Colours(bool on) : on_(on) {}
+    std::string Of(drd_ChangeEnm change, const std::string& text) const {
+        if (!on_) return text;
+        constexpr const char* kCodes[] = {"32", "31", "33", "36", "35"};
+        return "\033[" + std::string(kCodes[static_cast<std::size_t>(change)]) + "m" + text + "\033[0m";
+    }
+    std::string Dim(const std::string& text) const { return on_ ? "\033[2m" + text + "\033[0m" : text; }
+
+private:
+    bool on_;
+};
+
+std::string SummaryOf(const drd_DiffResult& result) {
+    std::string text;
+    for (const auto& [kind, changes] : result.summary) {
+        for (const auto& [change, count] : changes) {
+            text += "  " + kind + ": " + std::to_string(count) + " " + std::string(drd_WordOf(change)) + "\n";
+        }
+    }
+    return text;
+}
+
+void PrintComments(const drd_DiffResult& result, RunReport& report) {
+    if (result.commentsRemoved.empty() && result.commentsAdded.empty()) return;
+    report.Print("comments, which make no difference:\n");
+    const auto print = [&report](const std::vector<std::string>& comments, const char* sign) {
+        for (std::size_t i = 0; i < std::min(comments.size(), kShownComments); ++i) {
+            report.Print(std::string("  ") + sign + " " + comments[i] + "\n");
+        }
+        if (comments.size() > kShownComments) {
+            report.Print(std::string("  ") + sign + " and " +
+                         std::to_string(comments.size() - kShownComments) + " more\n");
+        }
+    };
+    print(result.commentsRemoved, "-");
+    print(result.commentsAdded, "+");
+}
+
+void Print(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& second, RunReport& report) {
+    const char* noColor = std::getenv("NO_COLOR");
+    const Colours colours(::isatty(STDOUT_FILENO) == 1 && (noColor == nullptr || *noColor == '\0'));
+    for (const drd_Difference& difference : result.differences) {
+        report.Print(
+            colours.Of(difference.change, difference.text) + "\n" +
+            colours.Dim("    " + Shown(first, difference.first) + "  " + Shown(second, difference.second)) +
+            "\n");
+    }
+    if (!result.IsEqual()) report.Print("in all:\n" + SummaryOf(result));
+    PrintComments(result, report);
+}
+
+void Fill(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& second, RunReport& report) {
+    ordered_json& root = report.Member("differences") = ordered_json::array();
+    for (const drd_Difference& difference : result.differences) {
+        root.push_back({{"change", drd_WordOf(difference.change)},
+                        {"kind", difference.kind},
+                        {"text", difference.text},
+                        {"first", PlaceOf(first, difference.first)},
+                        {"second", PlaceOf(second, difference.second)}});
+    }
+    ordered_json& summary = report.Member("summary") = ordered_json::object();
+    for (const auto& [kind, changes] : result.summary) {
+        for (const auto& [change, count] : changes) summary[kind][std::string(drd_WordOf(change))] = count;
+    }
+    report.Member("comments") = {{"removed", result.commentsRemoved}, {"added", result.commentsAdded}};
+}
+
+bool ReadSide(const std::string& path, drd_Deck& deck, const DeckRequest& request, RunReport& report) {
+    if (!IsDeck(path)) return ReadDeckOfModel(path, deck, report);
+    drd_Findings findings;
+    deck = ReadDeck(path, request, findings);
+    if (!findings.HasErrors()) return true;
+    // A deck with faults in its text can be compared as far as it was read; one that isn't there can't.
+    AddFindings(deck, findings, report);
+    return !findings.Counts().contains("deck-unreadable") && !findings.Counts().contains("not-a-deck");
+}
+
+} // namespace
+
+bool ReadDeckOrModel(const std::string& path, drd_Deck& deck, const DeckRequest& request, RunReport& report) {
+    return ReadSide(path, deck, request, report);
+}
+
+int RunDiff(const DiffRequest& request, RunReport& report) {
+    drd_DiffOptions options;
+    options.tolerance = request.tolerance;
+    for (const std::string& word : request.ignore) {
+        bool* flag = word == "comments" ? &options.ignoreComments
+                     : word == "names"  ? &options.ignoreNames
+                     : word == "order"  ? &options.ignoreOrder
+                     : word == "titles" ? &options.ignoreTitles
+                     : word == "output" ? &options.ignoreOutput
+                                        : nullptr;
+        if (flag == nullptr) {
+            report.Error("qrxdeck", "there is nothing called '" + word +
+                                        "' to ignore; there are comments, names, order, titles and output");
+            return 2;
+        }
+        *flag = true;
+    }
+    if (!(options.tolerance >= 0.0)) {
+        report.Error("qrxdeck", "a tolerance is a number from 0");
+        return 2;
+    }
+    drd_Deck first;
+    drd_Deck second;
+    const bool firstIsRead = ReadSide(request.first, first, request.deck, report);
+    if (!ReadSide(request.second, second, request.deck, report) || !firstIsRead) return 2;
+    const drd_DiffResult result = drd_Diff(first, second, options);
+    if (report.AsJson()) {
+        Fill(result, first, second, report);
+    } else {
+        Print(result, first, second, report);
+    }
+    return result.IsEqual() ? 0 : 1;
+}
