@@ -387,6 +387,8 @@ std::size_t mdf_Builder::FindToken(const char*& expected) const {
     };
     constexpr const char* aValue = "a value";
     constexpr const char* aName = "a member name in double quotes";
+    constexpr const char* noComma = "no comma behind the last one";
+    const auto closes = [&](char sign) { return at < text.size() && text[at] == sign; };
     switch (lastEvent_) {
     case Event::Start:
     case Event::BeginArray: expected = aValue; break;
@@ -397,9 +399,9 @@ std::size_t mdf_Builder::FindToken(const char*& expected) const {
         if (frames_.empty()) {
             expected = "the end of the file";
         } else if (!rowOpen_ && frames_.back().IsObject()) {
-            expected = passed(',') ? aName : "',' or '}'";
+            expected = !passed(',') ? "',' or '}'" : closes('}') ? noComma : aName;
         } else {
-            expected = passed(',') ? aValue : "',' or ']'";
+            expected = !passed(',') ? "',' or ']'" : closes(']') ? noComma : aValue;
         }
         break;
     }

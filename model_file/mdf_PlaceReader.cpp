@@ -20,10 +20,16 @@ bool mdf_PlaceReader::ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, con
 
 void mdf_PlaceReader::ReportNoInstance(const std::string& name, const fnd_Path& path) {
     if (references_.IsWrong(name)) return;
+    std::string hint = fnd_DidYouMean(diagnostics_, name, [this](fnd_Nearest& nearest) {
+        for (const auto& [known, entry] : model_.Instances()) nearest.Try(known.View());
+    });
+    if (hint.empty() && diagnostics_.WantsHint()) {
+        std::vector<std::string> known;
+        for (const auto& [each, entry] : model_.Instances()) known.emplace_back(each.View());
+        hint = fnd_ThereAre(known);
+    }
     diagnostics_.Add("no-such-name", path, "found instance " + fnd_Quoted(name), "the name of an instance",
-                     fnd_DidYouMean(diagnostics_, name, [this](fnd_Nearest& nearest) {
-                         for (const auto& [known, entry] : model_.Instances()) nearest.Try(known.View());
-                     }));
+                     std::move(hint));
 }
 
 bool mdf_PlaceReader::ReadDottedNames(Names& names, const mdf_Value& text, const fnd_Path& path) {
@@ -71,6 +77,21 @@ rgnC_Region mdf_PlaceReader::ReadRegion(const mdf_Value& value, const fnd_Path& 
     return region;
 }
 
+std::string mdf_PlaceReader::OwnerOf(const Names& names) const {
+    const cow_String set(names.set);
+    if (!names.instance.empty()) {
+        if (model_.FindAssemblySet(set) < 0) return {};
+        return "it is a set of the assembly: write " + fnd_Quoted(names.set);
+    }
+    for (const auto& [name, instance] : model_.Instances()) {
+        const auto mesh = instance->Mesh();
+        if (mesh.IsNull() || mesh->FindSet(set) < 0) continue;
+        const std::string owner(name.View());
+        return "it is a set of " + owner + ": write " + fnd_Quoted(owner + "." + names.set);
+    }
+    return {};
+}
+
 void mdf_PlaceReader::ReportNoSet(const Names& names, const fnd_Path& path) {
     const odiK_Instance* owner = model_.FindInstance(cow_String(names.instance));
     if (!names.instance.empty() && owner == nullptr) {
@@ -81,10 +102,13 @@ void mdf_PlaceReader::ReportNoSet(const Names& names, const fnd_Path& path) {
     static const std::vector<cow_CountedHld<odiK_Set>> none;
     const auto mesh = owner == nullptr ? cow_CountedHld<odiK_Mesh>() : owner->Mesh();
     const auto& sets = owner == nullptr ? model_.AssemblySets() : mesh.IsNull() ? none : mesh->Sets();
+    const std::string elsewhere = OwnerOf(names);
     diagnostics_.Add("no-such-set", path, "found set " + fnd_Quoted(names.set),
                      "the name of a set of " +
                          (owner == nullptr ? "the assembly" : "instance " + fnd_Quoted(names.instance)),
-                     fnd_DidYouMean(diagnostics_, names.set, [&sets](fnd_Nearest& nearest) {
-                         for (const auto& set : sets) nearest.Try(set->name.View());
-                     }));
+                     !elsewhere.empty()
+                         ? elsewhere
+                         : fnd_DidYouMean(diagnostics_, names.set, [&sets](fnd_Nearest& nearest) {
+                               for (const auto& set : sets) nearest.Try(set->name.View());
+                           }));
 }

@@ -22,6 +22,8 @@ private:
 
     bool ReadNames(Names& names, const mdf_Value& value, const fnd_Path& path);
     bool ReadDottedNames(Names& names, const mdf_Value& text, const fnd_Path& path);
+    /// The hint for a set that stands with another owner; empty where none has it.
+    std::string OwnerOf(const Names& names) const;
     void ReportNoSet(const Names& names, const fnd_Path& path);
 
     odiK_Model& model_;

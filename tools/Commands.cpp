@@ -167,14 +167,6 @@ bool Replace(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready
     return true;
 }
 
-/// The same for a text, of which there is nothing to say.
-bool ReplaceByText(const std::string& target, const char* thing, std::string_view text, RunReport& report) {
-    DeckFile file(target, DeckFileSystem::Standard(), thing);
-    const auto write = [text](qio_ostream& device) { device.Write(text.data(), text.size()); };
-    return Replace(
-        file, write, [](long long) {}, report);
-}
-
 double SecondsSince(std::chrono::steady_clock::time_point start) {
     return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
 }
@@ -296,11 +288,20 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         report.Print(formatted.str());
         return ExitCode::DONE;
     }
-    return WriteWholeFile(request.output, formatted.str(), report);
+    return WriteWholeFile(request.output, "model file", formatted.str(), report);
 }
 
-ExitCode WriteWholeFile(const std::string& path, const std::string& text, RunReport& report) {
-    return ReplaceByText(path, "model file", text, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
+bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,
+                 RunReport& report) {
+    DeckFile file(target, DeckFileSystem::Standard(), thing);
+    return Replace(
+        file, write, [](long long) {}, report);
+}
+
+ExitCode WriteWholeFile(const std::string& path, const char* thing, const std::string& text,
+                        RunReport& report) {
+    const auto write = [&text](qio_ostream& device) { device.Write(text.data(), text.size()); };
+    return ReplaceFile(path, thing, write, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
 }
 
 ExitCode RunVariables(const std::string& stepType, RunReport& report) {
@@ -322,6 +323,5 @@ ExitCode RunSchema(const std::string& output, RunReport& report) {
         report.Print(schema.str());
         return ExitCode::DONE;
     }
-    return ReplaceByText(output, "schema", schema.view(), report) ? ExitCode::DONE
-                                                                  : ExitCode::FILE_SYSTEM_REFUSED;
+    return WriteWholeFile(output, "schema", schema.str(), report);
 }

@@ -1,8 +1,8 @@
 #include "deck_reader/drd_Emitter.h"
 #include "deck_reader/drd_Flatten.h"
 #include "foundation/qio_Device.h"
+#include "tools/Commands.h"
 #include "tools/DeckCommands.h"
-#include "tools/DeckFile.h"
 
 #include <functional>
 
@@ -17,19 +17,7 @@ bool WriteOut(const std::string& output, const std::function<void(qio_ostream&)>
         report.Print(text.Text());
         return true;
     }
-    try {
-        DeckFile(output).Replace([&write](const char* job) {
-            qio_ios device;
-            std::FILE* file = qio_OpenFile((std::string(job) + ".inp").c_str(), "wb");
-            if (file == nullptr) return;
-            device.attach(file, true);
-            write(device);
-        });
-    } catch (const DeckFileError& failure) {
-        report.Error(output, failure.what());
-        return false;
-    }
-    return true;
+    return ReplaceFile(output, "deck", write, report);
 }
 
 } // namespace

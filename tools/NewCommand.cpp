@@ -197,7 +197,7 @@ ExitCode RunNew(const NewRequest& request, RunReport& report) {
         report.AddAll(again);
         return ExitCode::INTERNAL_FAILURE;
     }
-    const ExitCode code = WriteWholeFile(output.string(), text, report);
+    const ExitCode code = WriteWholeFile(output.string(), "model file", text, report);
     if (code != ExitCode::DONE) return code;
     report.Member("new") = {{"file", output.string()}, {"sets", origin.sets.size()}};
     report.Print(output.string() + ": a model of " + request.mesh + " with " +

@@ -90,3 +90,13 @@ std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>
     for (const std::string& candidate : known) nearest.Try(candidate);
     return nearest.Hint();
 }
+
+std::string fnd_ThereAre(const std::vector<std::string>& known) {
+    if (known.empty()) return "there is none";
+    constexpr std::size_t kShown = 10;
+    std::string list = known.size() == 1 ? "there is " : "there are ";
+    for (std::size_t i = 0; i < known.size() && i < kShown; ++i) {
+        list += (i == 0 ? "" : ", ") + fnd_Quoted(known[i]);
+    }
+    return known.size() > kShown ? list + ", ..." : list;
+}

@@ -38,4 +38,7 @@ std::string fnd_DidYouMean(fnd_Sink& sink, std::string_view name, const TryAll& 
     return nearest.Hint();
 }
 
+/// The first of the names that there are: "there are 'a', 'b', ...", or "there is none".
+std::string fnd_ThereAre(const std::vector<std::string>& known);
+
 #endif

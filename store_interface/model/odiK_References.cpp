@@ -57,10 +57,15 @@ void odiK_References::Check(const cls_Field& field, const std::string& name, con
     }
     const bool startsWithVowel = std::string_view("aeiou").find(kind.front()) != std::string_view::npos;
     sink.Add("no-such-name", place, "found " + fnd_Quoted(name),
-             std::string("the name of ") + (startsWithVowel ? "an " : "a ") + kind,
-             fnd_DidYouMean(sink, name, [&names](fnd_Nearest& nearest) {
-                 for (const std::string& known : names.inOrder) nearest.Try(known);
-             }));
+             std::string("the name of ") + (startsWithVowel ? "an " : "a ") + kind, Hint(names, name, sink));
+}
+
+std::string odiK_References::Hint(const Names& names, const std::string& name, fnd_Sink& sink) {
+    if (!sink.WantsHint()) return {};
+    const std::string nearest = fnd_DidYouMean(sink, name, [&names](fnd_Nearest& known) {
+        for (const std::string& each : names.inOrder) known.Try(each);
+    });
+    return nearest.empty() ? fnd_ThereAre(names.inOrder) : nearest;
 }
 
 void odiK_References::CheckClass(const cls_Field& field, const std::string& name, const std::string& place,

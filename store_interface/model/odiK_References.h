@@ -25,6 +25,8 @@ private:
         std::set<std::string, std::less<>> lookup;
     };
     const Names& NamesOfKind(const std::string& kind);
+    /// The name that was meant, or those that there are.
+    static std::string Hint(const Names& names, const std::string& name, fnd_Sink& sink);
     /// What is said of an object that is there but of a class that the field doesn't take.
     void CheckClass(const cls_Field& field, const std::string& name, const std::string& place,
                     fnd_Sink& sink) const;

@@ -45,8 +45,8 @@ std::string CaseName(const testing::TestParamInfo<SyntaxCase>& param) {
 const SyntaxCase syntaxCases[] = {
     {"EmptyText", "", "1:1: found the end of the file, expected a value"},
     {"CommentOnly", "// a\n", "2:1: found the end of the file, expected a value"},
-    {"CommaBeforeClosingBracket", "[1,\n 2,\n]", "3:1: found ']', expected a value"},
-    {"CommaBeforeClosingBrace", "{\"a\": 1, }", "1:10: found '}', expected a member name in double quotes"},
+    {"CommaBeforeClosingBracket", "[1,\n 2,\n]", "3:1: found ']', expected no comma behind the last one"},
+    {"CommaBeforeClosingBrace", "{\"a\": 1, }", "1:10: found '}', expected no comma behind the last one"},
     {"TwoCommas", "[1,,2]", "1:4: found ',', expected a value"},
     {"LeadingComma", "[,1]", "1:2: found ',', expected a value"},
     {"MissingCommaBetweenNumbers", "[1 23]", "1:4: found '23', expected ',' or ']'"},
