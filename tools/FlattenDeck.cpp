@@ -3,6 +3,7 @@
 #include "foundation/qio_Device.h"
 #include "tools/DeckCommands.h"
 #include "tools/DeckFile.h"
+#include "tools/OutOfMemory.h"
 
 #include <functional>
 
@@ -18,13 +19,9 @@ bool WriteOut(const std::string& output, const std::function<void(qio_ostream&)>
         return true;
     }
     try {
-        DeckFile(output).Replace([&write](const char* job) {
-            qio_ios device;
-            std::FILE* file = qio_OpenFile((std::string(job) + ".inp").c_str(), "wb");
-            if (file == nullptr) return;
-            device.attach(file, true);
-            write(device);
-        });
+        DeckFile(output).Replace(write);
+        report.MarkWritten();
+        OutOfMemory::MarkWritten();
     } catch (const DeckFileError& failure) {
         report.Error(output, failure.what());
         return false;
