@@ -14,6 +14,21 @@ target_compile_options(qrx_precompiled INTERFACE
     $<$<AND:$<CXX_COMPILER_ID:GNU>,$<VERSION_LESS:$<CXX_COMPILER_VERSION>,13>>:-Wno-array-bounds
         -Wno-stringop-overflow -Wno-stringop-overread>)
 
+# How release builds of the libraries and the program guard themselves: checked calls of the C library, guarded
+# stacks, marked targets of jumps where the processor knows them, addresses that differ from run to run, and
+# tables of addresses that are filled and locked before the program begins.
+include(CheckCXXCompilerFlag)
+include(CheckPIESupported)
+check_pie_supported(LANGUAGES CXX)
+check_cxx_compiler_flag(-fcf-protection=full QRX_HAS_CF_PROTECTION)
+check_cxx_compiler_flag(-fstack-clash-protection QRX_HAS_STACK_CLASH_PROTECTION)
+add_library(qrx_hardened INTERFACE)
+target_compile_options(qrx_hardened INTERFACE
+    $<$<CONFIG:Release>:-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-protector-strong
+        $<$<BOOL:${QRX_HAS_CF_PROTECTION}>:-fcf-protection=full>
+        $<$<BOOL:${QRX_HAS_STACK_CLASH_PROTECTION}>:-fstack-clash-protection>>)
+target_link_options(qrx_hardened INTERFACE $<$<CONFIG:Release>:LINKER:-z,relro,-z,now>)
+
 # What the second build of each library is made with, that the tests are linked to as well. Optimising would cost
 # more time than it saves the tests.
 add_library(qrx_sanitizers INTERFACE)
@@ -54,6 +69,9 @@ function(qrx_library name type)
         target_include_directories(${variant} PUBLIC
             $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>
             $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src>)
+        if(variant STREQUAL name)
+            list(APPEND private $<BUILD_INTERFACE:qrx_hardened>)
+        endif()
         target_link_libraries(${variant} PUBLIC ${public} PRIVATE $<BUILD_INTERFACE:qrx_flags> ${private})
         if(QRX_PRECOMPILED_HEADERS AND ARG_PRECOMPILE)
             target_precompile_headers(${variant} PRIVATE ${ARG_PRECOMPILE})

@@ -25,7 +25,9 @@ std::set<std::string> ElementSetsOf(const odiK_Model& model) {
     add("", model.AssemblySets());
     for (const auto& [name, instance] : model.Instances()) {
         const auto mesh = instance->Mesh();
-        if (!mesh.IsNull()) add(Text(name) + ".", mesh->Sets());
+        if (mesh.IsNull()) continue;
+        add(Text(name) + ".", mesh->Sets());
+        add("\"" + Text(name) + "\".", mesh->Sets());
     }
     return names;
 }

@@ -1,5 +1,7 @@
 #include "model_file/mdf_Members.h"
 
+#include "store_interface/records/cls_ClassRegistrar.h"
+
 #include <algorithm>
 
 std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields, const std::vector<std::string>& others) {
@@ -31,4 +33,9 @@ std::string mdf_MeaningWord(const cls_IntMeaning& meaning) {
     word.erase(std::min(word.find_first_of("(,:"), word.size()));
     while (!word.empty() && word.back() == ' ') word.pop_back();
     return word;
+}
+
+std::string_view mdf_ShortClassName(const cls_ClassEntry& entry) {
+    const std::string_view name(entry.info.name);
+    return name.substr(name.find('_') + 1);
 }

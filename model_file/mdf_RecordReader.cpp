@@ -69,20 +69,33 @@ bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, con
     return true;
 }
 
+const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
+    const auto [place, isNew] = choices_.try_emplace(base);
+    Choice& choice = place->second;
+    if (!isNew) return choice;
+    choice.classes = cls_Classes().ConcreteClasses(base);
+    for (const cls_ClassEntry* entry : choice.classes) {
+        choice.names.emplace_back(entry->info.name);
+        // By a short name that two have, neither is known.
+        const auto [known, isFirst] = choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
+        if (!isFirst) known->second = nullptr;
+    }
+    for (const cls_ClassEntry* entry : choice.classes) choice.byName[fnd_LowerCase(entry->info.name)] = entry;
+    return choice;
+}
+
 std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const mdf_Value& object,
                                                          const fnd_Path& path) {
     if (!object.IsObject()) {
         diagnostics_.Expected(path, object, "an object");
         return nullptr;
     }
-    const auto classes = cls_Classes().ConcreteClasses(base);
-    std::vector<std::string> names;
-    names.reserve(classes.size());
-    for (const cls_ClassEntry* entry : classes) names.emplace_back(entry->info.name);
+    const Choice& choice = ChoiceOf(base);
+    const std::vector<std::string>& names = choice.names;
     const mdf_Value* name = object.Find("class");
     const fnd_Path place(path, "class");
     if (name == nullptr) {
-        if (classes.size() == 1) return std::unique_ptr<cls_Record>(classes.front()->create());
+        if (choice.classes.size() == 1) return std::unique_ptr<cls_Record>(choice.classes.front()->create());
         diagnostics_.Add("missing-field", place, "found nothing",
                          (names.empty() ? std::string("no object here") : fnd_OneOf(names)));
         return nullptr;
@@ -91,11 +104,14 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
         diagnostics_.Expected(place, *name, "the name of a class");
         return nullptr;
     }
-    for (const cls_ClassEntry* entry : classes) {
-        if (name->String() == entry->info.name) return std::unique_ptr<cls_Record>(entry->create());
+    const auto entry = choice.byName.find(fnd_LowerCase(name->String()));
+    if (entry != choice.byName.end() && entry->second != nullptr) {
+        return std::unique_ptr<cls_Record>(entry->second->create());
     }
     diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names)),
-                          fnd_DidYouMean(name->String(), names));
+                          fnd_DidYouMean(diagnostics_, name->String(), [&names](fnd_Nearest& nearest) {
+                              for (const std::string& each : names) nearest.Try(each);
+                          }));
     return nullptr;
 }
 

@@ -3,6 +3,9 @@
 
 #include "model_file/mdf_Members.h"
 #include "model_file/mdf_PlaceReader.h"
+#include "store_interface/records/cls_ClassRegistrar.h"
+
+#include <unordered_map>
 
 /// Reads records of any class from JSON objects by their field tables. Parts, instances, sets and datums of
 /// the model must be there; the names of other objects are looked up at
@@ -32,6 +35,15 @@ public:
     mdf_PlaceReader& Places() { return places_; }
 
 private:
+    /// The classes that a record may be of where one derived from a base stands.
+    struct Choice {
+        std::vector<const cls_ClassEntry*> classes;
+        std::vector<std::string> names;
+        // By the whole name and by the short one, in small letters; null where a short name tells two.
+        std::unordered_map<std::string, const cls_ClassEntry*> byName;
+    };
+    const Choice& ChoiceOf(unsigned base);
+
     bool ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json, const fnd_Path& path,
                    const cls_Field& field, bool mayBeUnset);
     bool ReadInt(int& value, const mdf_Value& json, const fnd_Path& path, const cls_Field& field,
@@ -64,6 +76,7 @@ private:
     mdf_Diagnostics& diagnostics_;
     mdf_References references_;
     mdf_PlaceReader places_;
+    std::unordered_map<unsigned, Choice> choices_;
 };
 
 #endif

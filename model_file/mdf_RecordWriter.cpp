@@ -21,6 +21,15 @@ bool SameZeros(const cls_Record& a, const cls_Record& b) {
     return true;
 }
 
+bool SameZeros(const cow_2DArray<double>& a, const cow_2DArray<double>& b) {
+    for (int i = 0; i < a.NumRows(); ++i) {
+        for (int j = 0; j < a.NumColumns(); ++j) {
+            if (!SameSign(a.ConstGet(i, j), b.ConstGet(i, j))) return false;
+        }
+    }
+    return true;
+}
+
 bool SameZeros(const cls_FieldType& type, const void* a, const void* b) {
     switch (type.Kind()) {
     case cls_FieldKind::Double:
@@ -38,6 +47,28 @@ bool SameZeros(const cls_FieldType& type, const void* a, const void* b) {
         const auto& first = *static_cast<const omi_complex*>(a);
         const auto& second = *static_cast<const omi_complex*>(b);
         return SameSign(first.real, second.real) && SameSign(first.imag, second.imag);
+    }
+    case cls_FieldKind::Segment: {
+        const auto& first = *static_cast<const gsl_ModelSegment*>(a);
+        const auto& second = *static_cast<const gsl_ModelSegment*>(b);
+        const cls_FieldType& point = cls_TypeOf<gsl_Point>::Instance();
+        return SameZeros(point, &first.Start(), &second.Start()) &&
+               SameZeros(point, &first.End(), &second.End());
+    }
+    case cls_FieldKind::Table: {
+        const auto& table = static_cast<const cls_TableType&>(type);
+        return SameZeros(table.Get(a), table.Get(b));
+    }
+    case cls_FieldKind::Map: {
+        const auto& map = static_cast<const cls_MapType&>(type);
+        for (const cow_String& key : map.Keys(a)) {
+            if (!SameZeros(map.ItemType(), map.Item(a, key), map.Item(b, key))) return false;
+        }
+        return true;
+    }
+    case cls_FieldKind::Attribute: {
+        const auto& attribute = static_cast<const cls_AttributeType&>(type);
+        return SameZeros(attribute.ValueType(), attribute.Value(a), attribute.Value(b));
     }
     case cls_FieldKind::List: {
         const auto& list = static_cast<const cls_ListType&>(type);

@@ -248,12 +248,22 @@ private:
         return choices.empty() ? Json(false) : Json{{"oneOf", choices}};
     }
 
+    /// The whole name for those who complete it; the short one is taken too.
+    static Json ClassOf(const cls_ClassEntry& entry) {
+        const std::string shortName = PatternOf(std::string(mdf_ShortClassName(entry)));
+        const std::string whole = PatternOf(entry.info.name);
+        return {{"description", "the class of the record"},
+                {"anyOf",
+                 {{{"const", entry.info.name}},
+                  {{"type", "string"}, {"pattern", "^(" + whole + "|" + shortName + ")$"}}}}};
+    }
+
     static Json RecordOf(const cls_ClassEntry& entry) {
         const std::unique_ptr<cls_Record> byDefault(entry.create());
         Json properties = Json::object();
         Json required = Json::array();
         // "class" may be left out where only one class is possible.
-        properties["class"] = {{"description", "the class of the record"}, {"const", entry.info.name}};
+        properties["class"] = ClassOf(entry);
         if (cls_Classes().InheritanceCheck(entry.info.Id(), kprC_Step::TypeId())) {
             properties["name"] = Reference("NAME");
             properties["name"]["description"] = "the name of the step";

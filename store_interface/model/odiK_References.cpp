@@ -18,6 +18,16 @@ const odiK_Repository* RepositoryOfKind(std::string_view kind) {
     return nullptr;
 }
 
+/// Whether the text names a set of an instance whose name stands in double quotes: "A.B".x is set x of
+/// instance A.B.
+bool IsQuotedSet(const odiK_Model& model, std::string_view text) {
+    const std::size_t end = text.starts_with('"') ? text.find("\".", 1) : std::string_view::npos;
+    if (end == std::string_view::npos) return false;
+    const odiK_Instance* instance = model.FindInstance(cow_String(text.substr(1, end - 1)));
+    const auto mesh = instance == nullptr ? cow_CountedHld<odiK_Mesh>() : instance->Mesh();
+    return !mesh.IsNull() && mesh->FindSet(cow_String(text.substr(end + 2))) >= 0;
+}
+
 void AppendSets(const odiK_Model& model, std::vector<std::string>& names) {
     for (const auto& set : model.AssemblySets()) names.push_back(Text(set->name));
     for (const auto& [instanceName, instance] : model.Instances()) {
@@ -50,6 +60,7 @@ void odiK_References::Check(const cls_Field& field, const std::string& name, con
     const std::string kind = field.refersTo;
     const Names& names = NamesOfKind(kind);
     if (names.lookup.count(name) != 0) return CheckClass(field, name, place, sink);
+    if (kind == "set" && IsQuotedSet(model_, name)) return;
     // Orientations and filters may be defined elsewhere in the deck.
     if (kind == "orientation" || kind == "filter") {
         sink.Add("not-defined", place, "found " + fnd_Quoted(name) + ", which the model doesn't define");

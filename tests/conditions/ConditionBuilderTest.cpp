@@ -13,7 +13,7 @@ public:
         oif_InteractionOpStatus opStatus;
         opStatus.Configure(Model().Interactions(), steps.Keys());
         const oif_ObjectsOfSteps<kinC_Interaction> written(
-            "interaction", Model().Interactions(), steps,
+            "interaction", Model().Interactions(), steps, opStatus,
             [&](const kinC_Interaction& interaction, const cow_String& step, bool) {
                 return interaction.HasStep(step) || opStatus.OpNew(interaction.DynTypeId(), step);
             });

@@ -92,7 +92,7 @@ TEST(ObjectsOfSteps, EachStep_HasThoseThatPassTheTestInTheOrderOfTheirNames) {
     const kprC_StepContainer steps = sample::StepsOf("IGG");
     const auto loads = Container<kloC_Load>({{"B", &one}, {"A", &other}, {"C", &other}}, steps);
     const oif_ObjectsOfSteps<kloC_Load> given(
-        "load", loads, steps,
+        "load", loads, steps, LoadStatus({{"B", &one}, {"A", &other}, {"C", &other}}, "IGG"),
         [](const kloC_Load& load, const cow_String& step, bool) { return load.HasStep(step); });
     const auto names = [&](int step) {
         std::string text;
@@ -116,8 +116,36 @@ TEST(ObjectsOfSteps, Test_RunsInTheContextOfStepAndObject) {
         if (step == "S1") context = nex_Context::Text();
         return false;
     };
-    oif_ObjectsOfSteps<kloC_Load>("load", loads, steps, test);
+    oif_ObjectsOfSteps<kloC_Load>("load", loads, steps, LoadStatus({{"L", &load}}, "IG"), test);
     EXPECT_EQ(context.View(), "step 'S1', load 'L'");
+}
+
+// The steps in which nothing changes are asked for once for all that agree in op=NEW and load cases.
+TEST(WrittenSteps, AreThoseOfAWalkOverAllSteps) {
+    const auto carried = Given<AnyLoad<kPressure>>(".s........");
+    const auto changed = Given<AnyLoad<kPressure>>("..s..s.d..");
+    const auto ends = Given<AnyLoad<kPressure>>(".s..d.....");
+    const auto force = Given<AnyLoad<kBodyForce>>("...s.....s");
+    const char* kinds = "IGGPGGGPGG";
+    const kprC_StepContainer steps = sample::StepsOf(kinds);
+    const oif_LoadOpStatus status =
+        LoadStatus({{"Carried", &carried}, {"Changed", &changed}, {"Ends", &ends}, {"Force", &force}}, kinds);
+    const auto loads = Container<kloC_Load>(
+        {{"Carried", &carried}, {"Changed", &changed}, {"Ends", &ends}, {"Force", &force}}, steps);
+    oif_WrittenSteps written(steps, status);
+    for (const auto& [name, load] : loads) {
+        int asked = 0;
+        const auto test = [&](const kloC_Load& each, const cow_String& step, bool) {
+            ++asked;
+            return status.Writes(each, step);
+        };
+        std::vector<int> expected;
+        for (int i = 0; i < steps.Size(); ++i) {
+            if (status.Writes(load, steps.NameAt(i))) expected.push_back(i);
+        }
+        EXPECT_EQ(written.Of("load", name, load, test), expected) << name;
+        EXPECT_LE(asked, 12) << name;
+    }
 }
 
 TEST(OpStatus, LoadThatEnds_SetsItsFamilysFlagInThatStepOnly) {

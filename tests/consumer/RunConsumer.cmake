@@ -20,6 +20,15 @@ run(${CMAKE_COMMAND} --install ${BUILD_DIR} --prefix ${installed} ${config})
 # An installed tree must not know the place that it was installed to.
 file(RENAME ${installed} ${prefix})
 
+# What others wrote and the program contains comes with their notices.
+if(EXISTS ${prefix}/bin/qrxdeck)
+    foreach(package nlohmann-json3-dev libcli11-dev)
+        if(NOT EXISTS ${prefix}/share/doc/qrxdeck/notices/${package})
+            message(FATAL_ERROR "the installed tree has no notice of ${package}")
+        endif()
+    endforeach()
+endif()
+
 if(WAY STREQUAL "find_package")
     run(${CMAKE_COMMAND} -S ${SOURCE_DIR} -B ${WORK_DIR}/build -G ${GENERATOR}
         -D CMAKE_PREFIX_PATH=${prefix} -D CMAKE_BUILD_TYPE=${CONFIG} -D CMAKE_CXX_COMPILER=${COMPILER}

@@ -122,6 +122,15 @@ std::string StepsWith(const std::string& description) {
                  description + "\"}]");
 }
 
+std::string SetsOf(const std::string& names) {
+    return Model(R"("parts": {"P": {"mesh": {"nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
+                                             "sets": [{"name": "N", "kind": "node", "labels": [1]}]}}},
+        "assembly": {"instances": {"A.B": {"part": "P"}}},
+        "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
+                  {"name": "S", "class": "FREQUENCYSTEP", "residualModeSets": [)" +
+                 names + "]}]");
+}
+
 const std::string kKeywordAt = "warning @/steps/1/description: found the line ";
 
 const FindingCase cases[] = {
@@ -138,6 +147,9 @@ const FindingCase cases[] = {
      StepsWith("*Static"),
      {kKeywordAt + "'*Static', which will be read as a keyword"}},
     {"DescriptionWithAComment", StepsWith("pull\\n** it"), {}},
+    {"SetOfAnInstanceInQuotes",
+     SetsOf(R"("\"A.B\".N", "A.B.N", "\"A.B\".x")"),
+     {"@/steps/1/residualModeSets/2: found '\"A.B\".x', expected the name of a set"}},
     {"ElementType",
      Mesh(R"("nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
              "elements": [{"type": "MASS\n*STEP", "labels": [1], "connectivity": [[1]]}])"),

@@ -73,7 +73,7 @@ TEST(ModelFileSchema, ListsWithDefaults_TakeNullItemsAndOthersDoNot) {
     };
     const Json number = {{"type", "number"}};
     EXPECT_EQ(items("kprC_TypicalControls", "lineSearch"), (Json{{"anyOf", {number, {{"type", "null"}}}}}));
-    EXPECT_EQ(items("kprC_FrequencyStep", "residualModeSets"), (Json{{"type", "string"}}));
+    EXPECT_EQ(items("kprC_FrequencyStep", "residualModeSets"), (Json{{"$ref", "#/$defs/LINE"}}));
 }
 
 TEST(ModelFileSchema, EveryReference_HasItsDefinition) {

@@ -78,4 +78,16 @@ TEST(OutputChain, EndInARun_IsAnEndOfTheGeneralStatus) {
     EXPECT_FALSE(request.HasStep("S3"));
 }
 
+TEST(OutputChain, RequestThatNoStepCreates_HasTheDefaultsOfAGeneralStaticStep) {
+    korC_FieldOutput request;
+    request.Give("S1").status = Status::PROPAGATED;
+    request.Propagate(StepsOf("IP"));
+    const auto& state = static_cast<const korC_FieldOutputState&>(request.ConstGetState("S1"));
+    const korC_FieldOutputState expected(kStatic);
+    EXPECT_EQ(state.frequency.ConstGet(), expected.frequency.ConstGet());
+    EXPECT_EQ(state.numberInterval.ConstGet(), expected.numberInterval.ConstGet());
+    EXPECT_EQ(state.timeMarks.ConstGet(), expected.timeMarks.ConstGet());
+    EXPECT_EQ(state.variablesType.ConstGet(), expected.variablesType.ConstGet());
+}
+
 } // namespace

@@ -12,8 +12,18 @@ oif_ModelInfo::oif_ModelInfo(const ddb_Model& model)
 
 void oif_ModelInfo::Numbering::Enter(const cow_String& instance, int count) {
     total += count;
-    offsets.Insert(instance, 0);
-    counters.Insert(instance, count);
+    last[instance] = count;
+}
+
+int& oif_ModelInfo::Numbering::Last(const cow_String& instance) {
+    const auto place = last.find(instance);
+    if (place == last.end()) cow_RaiseNoSuchKey("cow_Map", instance);
+    return place->second;
+}
+
+int oif_ModelInfo::Numbering::Offset(const cow_String& instance) const {
+    if (last.count(instance) == 0) cow_RaiseNoSuchKey("cow_Map", instance);
+    return 0;
 }
 
 int oif_ModelInfo::Numbering::GetNew(const cow_String& instance, bool commit, bool v6Format) {
@@ -22,18 +32,18 @@ int oif_ModelInfo::Numbering::GetNew(const cow_String& instance, bool commit, bo
         if (commit) ++extra;
         return label;
     }
-    const int label = counters.ConstGet(instance) + 1;
-    if (commit) counters.Get(instance) = label;
+    int& given = Last(instance);
+    const int label = given + 1;
+    if (commit) given = label;
     return label;
 }
 
 int oif_ModelInfo::Numbering::Increment(const cow_String& instance, int count, bool v6Format) {
     if (!v6Format) {
-        const int last = total + extra + count;
         extra += count;
-        return last;
+        return total + extra;
     }
-    return counters.Get(instance) += count;
+    return Last(instance) += count;
 }
 
 void oif_ModelInfo::EnterMesh(const cow_String& instance, const ddb_Mesh& mesh) {
@@ -65,11 +75,11 @@ void oif_ModelInfo::SetStepData() {
 }
 
 int oif_ModelInfo::AssyElementOffsets(const cow_String& instance) const {
-    return elements_.offsets.ConstGet(instance);
+    return elements_.Offset(instance);
 }
 
 int oif_ModelInfo::AssyNodeOffsets(const cow_String& instance) const {
-    return nodes_.offsets.ConstGet(instance);
+    return nodes_.Offset(instance);
 }
 
 int oif_ModelInfo::GetNewNodeIndex(const cow_String& instance, bool commit) {

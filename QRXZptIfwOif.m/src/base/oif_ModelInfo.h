@@ -6,6 +6,8 @@
 #include "foundation/omi_IntTable.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 
+#include <map>
+
 /// The run information over the store. The constructor reads the meshes and steps; only the label counters
 /// change later. Labels are handed out per instance ("" is the assembly's own mesh), beginning behind the
 /// number of its nodes or elements.
@@ -36,12 +38,15 @@ protected:
 private:
     // The numbering of nodes, or of elements.
     struct Numbering {
-        cow_Map<cow_String, int> offsets;
-        cow_Map<cow_String, int> counters;
+        std::map<cow_String, int> last; // the highest label given so far, by instance
         int total = 0;
         int extra = 0;
 
         void Enter(const cow_String& instance, int count);
+        /// An unknown instance raises.
+        int& Last(const cow_String& instance);
+        /// Each instance counts from 0.
+        int Offset(const cow_String& instance) const;
         int GetNew(const cow_String& instance, bool commit, bool v6Format);
         int Increment(const cow_String& instance, int count, bool v6Format);
     };
