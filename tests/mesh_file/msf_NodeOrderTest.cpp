@@ -218,8 +218,8 @@ TEST(NodeOrder, NodesOfFacesAndCentre_OfABrickOf27_AreCentreThenFacesInTheDecksO
     }
 }
 
-TEST(NodeOrder, Codes_OfOneFormat_StandOnce) {
+TEST(NodeOrder, CodesAndNumbersOfNodes_OfOneFormat_StandOnce) {
     for (const msf_NodeOrder& row : msf_NodeOrders())
-        EXPECT_EQ(msf_FindNodeOrder(row.format, row.code), &row) << RowText(row);
+        EXPECT_EQ(msf_FindNodeOrder(row.format, row.code, row.nodes), &row) << RowText(row);
     EXPECT_EQ(msf_FindNodeOrder(Format::MSH, 21), nullptr);
 }
