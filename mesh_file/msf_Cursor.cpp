@@ -83,14 +83,15 @@ double msf_Cursor::Real(const char* expected) {
         return value;
     }
     // Fortran writes "1.5D+02", and tiny numbers may lie below what a double holds.
-    std::string word(Word(expected));
+    const std::string_view given = Word(expected);
+    std::string word(given);
     std::replace(word.begin(), word.end(), 'D', 'e');
     std::replace(word.begin(), word.end(), 'd', 'e');
     const char* const first = word.data() + (word.front() == '+' ? 1 : 0);
     const char* const last = word.data() + word.size();
     const auto [rest, problem] = std::from_chars(first, last, value);
     const bool tiny = problem == std::errc::result_out_of_range && word.find("e-") != std::string::npos;
-    if (rest != last || (problem != std::errc() && !tiny)) FailAtWord("found " + msf_Shown(word), expected);
+    if (rest != last || (problem != std::errc() && !tiny)) FailAtWord("found " + msf_Shown(given), expected);
     return tiny ? 0.0 : value;
 }
 

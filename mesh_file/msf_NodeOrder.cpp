@@ -57,6 +57,7 @@ constexpr msf_NodeOrder kOrders[] = {
     {Format::UNV, Kind::LINE2, 11, 2, {0, 1}},
     {Format::UNV, Kind::LINE2, 21, 2, {0, 1}},
     {Format::UNV, Kind::LINE2, 22, 2, {0, 1}},
+    {Format::UNV, Kind::LINE3, 22, 3, {0, 2, 1}},
     {Format::UNV, Kind::LINE3, 24, 3, {0, 2, 1}},
     {Format::UNV, Kind::TRIANGLE3, 41, 3, {0, 1, 2}},
     {Format::UNV, Kind::TRIANGLE3, 51, 3, {0, 1, 2}},
@@ -120,9 +121,12 @@ std::span<const msf_NodeOrder> msf_NodeOrders() {
     return kOrders;
 }
 
-const msf_NodeOrder* msf_FindNodeOrder(msf_FormatEnm format, long long code) {
+const msf_NodeOrder* msf_FindNodeOrder(msf_FormatEnm format, long long code, long long nodes) {
+    const msf_NodeOrder* first = nullptr;
     for (const msf_NodeOrder& row : kOrders) {
-        if (row.format == format && row.code == code) return &row;
+        if (row.format != format || row.code != code) continue;
+        if (row.nodes == nodes) return &row;
+        if (first == nullptr) first = &row;
     }
-    return nullptr;
+    return first;
 }

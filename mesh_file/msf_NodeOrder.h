@@ -26,7 +26,7 @@ struct msf_NodeOrder {
 
 /// All rows.
 std::span<const msf_NodeOrder> msf_NodeOrders();
-/// The row of a format's code, or null.
-const msf_NodeOrder* msf_FindNodeOrder(msf_FormatEnm format, long long code);
+/// The row of a format's code, or null. Of several rows the one with that number of nodes, or else the first.
+const msf_NodeOrder* msf_FindNodeOrder(msf_FormatEnm format, long long code, long long nodes = 0);
 
 #endif

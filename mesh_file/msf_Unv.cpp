@@ -168,7 +168,7 @@ void UnvReader::ReadElement(const std::vector<long long>& head) {
     const long long type = head[1];
     const long long count = head.back();
     const bool noCell = type > 0 && type < 1000 && IsOneOf(static_cast<int>(type), kNoCells);
-    const msf_NodeOrder* order = msf_FindNodeOrder(msf_FormatEnm::UNV, type);
+    const msf_NodeOrder* order = msf_FindNodeOrder(msf_FormatEnm::UNV, type, count);
     if (order == nullptr && !noCell) {
         at_.FailAtWord("found an element of type " + std::to_string(type),
                        "a line, triangle, quadrangle, tetrahedron, wedge or brick of first or second order");

@@ -114,7 +114,8 @@ void VtuReader::Read() {
         grid_.cellArrays.back().name = name;
         grid_.cellArrays.back().components = std::max(1, node.attribute("NumberOfComponents").as_int(1));
     }
-    builder_.Mesh().format = std::string("VTU, ") + form_ + (compressed_ ? ", compressed" : "");
+    builder_.Mesh().format = std::string("VTU, ") + form_ +
+                             (compressed_ && std::string_view(form_) != "ASCII" ? ", compressed" : "");
     msf_FillFromVtk(grid_, options_, builder_);
 }
 

@@ -1,12 +1,10 @@
 #!/usr/bin/env python3
-"""Make bracket.json: an L-shaped mounting bracket, meshed with quadratic tetrahedra.
+"""Make bracket.msh: an L-shaped mounting bracket, meshed with quadratic tetrahedra, its faces in named groups.
 
-The model file is kept in the repository, so this script runs only when the part changes:
+The mesh file is kept in the repository beside the model file, so this script runs only when the part changes:
 
     apt-get install gmsh python3-gmsh
     /usr/bin/python3 examples/bracket/make_bracket.py
-
-    make_bracket.py --check FILE    checks a model file against the geometry, without the mesher
 
 Lengths are in mm. The wall stands in the plane x = 0 and is bolted through two holes; the base lies
 in the plane z = 0 and carries a load on its upper side, around a bore. The mesher runs on one thread
@@ -14,8 +12,8 @@ with a fixed seed: one version of it gives one mesh.
 """
 
 import argparse
-import json
 import math
+import struct
 import sys
 from pathlib import Path
 
@@ -55,57 +53,11 @@ def on_bolt_hole(name):
     return lambda p: abs(math.hypot(p[1] - y, p[2] - z) - BOLT_RADIUS) < TOLERANCE
 
 
-NODE_SETS = {"CLAMPED-FACE": on_wall_back, **{name: on_bolt_hole(name) for name in BOLT_HOLES}}
-SURFACES = {"LOADED-FACE": on_base_top, "BORE": on_bore}
-
-# The bracket is loaded, then watched in small motions about that state: bent both ways, its modes, the
-# response to a shaking machine and to a sudden stop. Forces are in N, times in s, so masses are in t.
-DAMPING = {"directDamping": {"rows": [{"firstMode": 1, "lastMode": 12, "value": 0.02}]}}
-STEPS = [
-    {"name": "Initial", "class": "kprC_InitialStep"},
-    {"name": "Tighten", "class": "kprC_StaticStep", "description": "Large displacements, in increments of a tenth",
-     "nlgeom": "ON", "initialInc": 0.1, "maxInc": 0.2, "restart": {"class": "kprC_StandardRestart", "frequency": 5},
-     "monitor": {"class": "kprC_StandardMonitor", "region": "TIP", "dof": 3}},
-    {"name": "Bend", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {
-        "Down": {"loads": {"Push": 1.0}}, "Sideways": {"loads": {"Pull": 1.0, "Push": 0.1}}}},
-    {"name": "Modes", "class": "kprC_FrequencyStep", "numEigen": 12},
-    {"name": "Shake", "class": "kprC_SteadyStateModalStep",
-     "frequencies": [{"lower": 10, "upper": 2000, "points": 40}], **DAMPING},
-    {"name": "Stop", "class": "kprC_ModalDynamicsStep", "timePeriod": 0.05, "timeIncrement": 1e-4, **DAMPING},
-]
-PHYSICS = {
-    "materials": {"Aluminium": {
-        "elastic": {"table": [[70000, 0.33]]}, "density": {"table": [[2.7e-09]]}}},
-    "sections": {"Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Aluminium"}},
-    "amplitudes": {
-        "Rise": {"class": "kamC_Tabular", "table": [[0, 0], [1, 1]]},
-        "Knock": {"class": "kamC_Tabular", "table": [[0, 1], [0.005, 1], [0.006, 0]]}},
-    "boundaryConditions": {
-        "Bolted": {"class": "kbcC_DisplacementBC", "region": "BOLTS",
-                   "states": {"Initial": {"u1": 0, "u2": 0, "u3": 0}}},
-        "Wall": {"class": "kbcC_DisplacementBC", "region": "BRACKET-1.CLAMPED-FACE",
-                 "states": {"Initial": {"u2": 0}}}},
-    "loads": {
-        "Weight on the pad": {"class": "kloC_Pressure", "region": "PAD",
-                              "states": {"Tighten": {"magnitude": 0.5, "amplitude": "Rise"}}},
-        "Push": {"class": "kloC_ConcentratedForce", "region": "TIP", "states": {"Bend": {"component3": -100}}},
-        "Pull": {"class": "kloC_ConcentratedForce", "region": "TIP", "states": {"Bend": {"component1": 100}}},
-        "Shaker": {"class": "kloC_ConcentratedForce", "region": "TIP", "complex": True,
-                   "complexComponent3": [20, 5], "states": {"Shake": {"component3": 20}}},
-        "Jolt": {"class": "kloC_ConcentratedForce", "region": "TIP",
-                 "states": {"Stop": {"component2": 250, "amplitude": "Knock"}}}},
-    "fieldOutputRequests": {
-        "Stresses": {"class": "korC_FieldOutput",
-                     "states": {"Tighten": {"variables": ["S", "U", "RF"], "frequencyType": "TIME_INTERVAL",
-                                            "timeInterval": 0.25}}},
-        "Shapes": {"class": "korC_FieldOutput",
-                   "states": {"Bend": {}, "Modes": {"frequencyType": "MODE_LIST"},
-                              "Shake": {"frequencyType": "FREQUENCY", "frequency": 1}}}},
-    "historyOutputRequests": {
-        "Tip": {"class": "korC_HistoryOutput", "region": "TIP",
-                "states": {"Tighten": {"variables": ["U3"]}, "Shake": {"variables": ["U1", "U2", "U3"]}}},
-        "Energies": {"class": "korC_HistoryOutput", "states": {"Tighten": {}}}},
-}
+# Faces of the part, and the groups that each is in: the holes are in one of their own and in BOLTS.
+FACES_OF_PART = {"CLAMPED-FACE": on_wall_back, **{name: on_bolt_hole(name) for name in BOLT_HOLES},
+                 "LOADED-FACE": on_base_top, "BORE": on_bore}
+GROUPS = ["CLAMPED-FACE", *BOLT_HOLES, "BOLTS", "LOADED-FACE", "BORE"]
+GROUPS_OF_FACE = {name: [name] + (["BOLTS"] if name in BOLT_HOLES else []) for name in FACES_OF_PART}
 
 
 def exact_measures():
@@ -214,47 +166,17 @@ def facets_on(nodes, elements, predicate):
     on = [predicate(p) for p in nodes]
     facets = []
     for label, row in enumerate(elements, 1):
-        for face, corners in enumerate(FACES, 1):
+        for corners in FACES:
             if all(on[n - 1] for n in face_nodes(row, corners)):
-                facets.append([label, f"S{face}"])
+                facets.append((label, corners))
     return facets
 
 
 def face_nodes(row, corners):
-    pairs = [set(pair) for pair in zip(corners, corners[1:] + corners[:1])]
-    return [row[i] for i in corners] + [row[4 + MIDSIDES.index(m)] for m in MIDSIDES if set(m) in pairs]
-
-
-def model_of(nodes, elements):
-    sets = [{"name": "ALL", "kind": "element", "labels": {"from": 1, "to": len(elements)}}]
-    node_sets = {name: [i for i, p in enumerate(nodes, 1) if predicate(p)]
-                 for name, predicate in NODE_SETS.items()}
-    surfaces = {name: facets_on(nodes, elements, predicate) for name, predicate in SURFACES.items()}
-    sets += [{"name": name, "kind": "node", "labels": labels} for name, labels in node_sets.items()]
-    sets += [{"name": name, "kind": "surface", "facets": facets} for name, facets in surfaces.items()]
-
-    def member(**what):
-        return [{"instance": "BRACKET-1", **what}]
-
-    tip = min(range(len(nodes)), key=lambda i: math.dist(nodes[i], (LENGTH, WIDTH / 2, THICKNESS))) + 1
-    bolts = sorted(set().union(*(node_sets[name] for name in BOLT_HOLES)))
-    mesh = {"nodes": {"labels": {"from": 1, "to": len(nodes)}, "coordinates": nodes},
-            "elements": [{"type": "C3D10", "labels": {"from": 1, "to": len(elements)},
-                          "connectivity": elements}],
-            "sets": sets}
-    return {"format": "qrx-model/1", "models": {"Default Model": {
-        "description": "An L-shaped mounting bracket: two bolt holes in the wall, a bore in the base; lengths in mm. "
-                       "Made by make_bracket.py.",
-        "topLevelSolverInput": ["*Heading", "Mounting bracket, quadratic tetrahedra, lengths in mm"],
-        "parts": {"BRACKET": {"mesh": mesh,
-                              "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"}]}},
-        "assembly": {
-            "instances": {"BRACKET-1": {"part": "BRACKET", "translation": [250, 40, 0],
-                                        "rotation": [0, 0, round(math.pi / 2, DIGITS)]}},
-            "sets": [{"name": "BOLTS", "kind": "node", "members": member(labels=bolts)},
-                     {"name": "TIP", "kind": "node", "members": member(labels=[tip])},
-                     {"name": "PAD", "kind": "surface", "members": member(facets=surfaces["LOADED-FACE"])}]},
-        "steps": STEPS, **PHYSICS}}}
+    """Corners, then the midside nodes of the edges from each to the next."""
+    edges = [set(pair) for pair in zip(corners, corners[1:] + corners[:1])]
+    middles = [next(row[4 + i] for i, m in enumerate(MIDSIDES) if set(m) == edge) for edge in edges]
+    return [row[i] for i in corners] + middles
 
 
 def triangle(points):
@@ -262,19 +184,12 @@ def triangle(points):
     return [0.5 * c for c in cross(subtract(points[2], points[0]), subtract(points[1], points[0]))]
 
 
-def check(document):
+def check(nodes, elements, facets):
     """The mesh's figures, or an exit with the first thing that is wrong."""
     def require(condition, message):
         if not condition:
             sys.exit(f"make_bracket: {message}")
 
-    model = document["models"]["Default Model"]
-    mesh = model["parts"]["BRACKET"]["mesh"]
-    nodes = mesh["nodes"]["coordinates"]
-    (block,) = mesh["elements"]
-    elements = block["connectivity"]
-    require(mesh["nodes"]["labels"] == {"from": 1, "to": len(nodes)}, "node labels do not fit the coordinates")
-    require(block["labels"] == {"from": 1, "to": len(elements)}, "element labels do not fit the connectivity")
     require(len(nodes) >= 10000, f"at least 10000 nodes expected, {len(nodes)} found")
     require(len({tuple(p) for p in nodes}) == len(nodes), "two nodes share one place")
     require({n for row in elements for n in row} == set(range(1, len(nodes) + 1)),
@@ -302,68 +217,66 @@ def check(document):
 
     exact_volume, exact_areas = exact_measures()
     require(abs(volume / exact_volume - 1.0) < 1e-3, f"volume {exact_volume:.2f} expected, {volume:.2f} found")
-
-    sets = {entry["name"]: entry for entry in mesh["sets"]}
-    require(len(sets) == len(mesh["sets"]), "two sets have one name")
-    require(sets["ALL"]["labels"] == block["labels"], "set ALL does not hold all elements")
-    for name, predicate in NODE_SETS.items():
-        labels = sets[name]["labels"]
-        require(labels and labels == sorted(set(labels)), f"set {name}: empty or out of order")
-        require(all(predicate(nodes[n - 1]) for n in labels), f"set {name}: a node is off its face")
-    for name, predicate in SURFACES.items():
+    for name, faces in facets.items():
         area = 0.0
-        for label, face in sets[name]["facets"]:
-            corners = FACES[int(face[1:]) - 1]
+        require(faces, f"{name} has no facets")
+        for label, corners in faces:
             row = elements[label - 1]
             points = [nodes[row[i] - 1] for i in corners]
-            require(facet_count[frozenset(row[i] for i in corners)] == 1, f"{name}: {label} {face} is inside")
-            require(all(predicate(nodes[n - 1]) for n in face_nodes(row, corners)),
-                    f"{name}: {label} {face} is off its face")
+            require(facet_count[frozenset(row[i] for i in corners)] == 1, f"{name}: element {label} is inside")
             normal = triangle(points)
             opposite = nodes[row[({0, 1, 2, 3} - set(corners)).pop()] - 1]
-            require(dot(normal, subtract(opposite, points[0])) < 0.0, f"{name}: {label} {face} points inwards")
-            if name == "LOADED-FACE":
-                require(normal[2] > 0.999 * math.hypot(*normal), f"{name}: {label} {face} does not look up")
+            require(dot(normal, subtract(opposite, points[0])) < 0.0, f"{name}: element {label} points inwards")
             area += math.hypot(*normal)
-        require(abs(area / exact_areas[name] - 1.0) < 1e-2,
-                f"{name}: area {exact_areas[name]:.2f} expected, {area:.2f} found")
-
-    require(model["steps"] == STEPS, "the steps are others than those of this script")
-    for name, content in PHYSICS.items():
-        require(model[name] == content, f"the {name} are others than those of this script")
-    for entry in model["assembly"]["sets"]:
-        for part in entry["members"]:
-            require(part["instance"] in model["assembly"]["instances"], f"{entry['name']}: unknown instance")
-    sizes = ", ".join(f"{name} {len(sets[name]['labels'])}" for name in NODE_SETS)
-    sizes += "".join(f", {name} {len(sets[name]['facets'])}" for name in SURFACES)
+        if name in exact_areas:
+            require(abs(area / exact_areas[name] - 1.0) < 1e-2,
+                    f"{name}: area {exact_areas[name]:.2f} expected, {area:.2f} found")
+    sizes = ", ".join(f"{name} {len(faces)}" for name, faces in facets.items())
     return (f"{len(nodes)} nodes, {len(elements)} elements, volume {volume:.2f} mm3 (exact {exact_volume:.2f}), "
-            f"lowest Jacobian ratio {worst:.3f}; {sizes}")
+            f"lowest Jacobian ratio {worst:.3f}; facets: {sizes}")
 
 
-def layout(value, depth=0):
-    """JSON with one node, element or facet per line and labels in rows."""
-    pad, inner = " " * depth, " " * (depth + 1)
-    if isinstance(value, dict) and any(isinstance(v, (dict, list)) for v in value.values()):
-        items = [f"{inner}{json.dumps(k)}: {layout(v, depth + 1)}" for k, v in value.items()]
-        return "{\n" + ",\n".join(items) + f"\n{pad}}}"
-    if isinstance(value, list) and value and isinstance(value[0], (dict, list)):
-        return "[\n" + ",\n".join(inner + layout(v, depth + 1) for v in value) + f"\n{pad}]"
-    if isinstance(value, list) and len(value) > 16:
-        rows = [", ".join(map(json.dumps, value[i:i + 16])) for i in range(0, len(value), 16)]
-        return "[\n" + ",\n".join(inner + row for row in rows) + f"\n{pad}]"
-    return json.dumps(value)
+def msh(nodes, elements, facets, tip):
+    """The bytes of a mesh file, MSH 4.1: the solid is volume 1, the faces are surfaces 1, 2, ..., the tip a point."""
+    names = list(facets)
+    low, high = ([min(p[k] for p in nodes) for k in range(3)], [max(p[k] for p in nodes) for k in range(3)])
+    out = [b"$MeshFormat\n4.1 1 8\n", struct.pack("<i", 1), b"\n$EndMeshFormat\n$PhysicalNames\n"]
+    out.append(f"{len(GROUPS) + 1}\n0 1 \"TIP\"\n".encode())
+    out += [f'2 {GROUPS.index(name) + 1} "{name}"\n'.encode() for name in GROUPS]
+    out += [b"$EndPhysicalNames\n$Entities\n", struct.pack("<4Q", 1, 0, len(names), 1)]
+    out.append(struct.pack("<i3dQi", 1, *nodes[tip - 1], 1, 1))
+    for number, name in enumerate(names, 1):
+        groups = [GROUPS.index(group) + 1 for group in GROUPS_OF_FACE[name]]
+        out.append(struct.pack("<i6dQ", number, *low, *high, len(groups)) + struct.pack(f"<{len(groups)}i", *groups))
+        out.append(struct.pack("<Q", 0))
+    out.append(struct.pack("<i6dQQ", 1, *low, *high, 0, len(names)) + struct.pack(f"<{len(names)}i", *range(1, len(names) + 1)))
+    out += [b"\n$EndEntities\n$Nodes\n", struct.pack("<4Q3iQ", 1, len(nodes), 1, len(nodes), 3, 1, 0, len(nodes))]
+    out.append(struct.pack(f"<{len(nodes)}Q", *range(1, len(nodes) + 1)))
+    out += [struct.pack("<3d", *p) for p in nodes]
+    blocks = [(3, 1, 11, [[row[k] for k in DECK_ORDER] for row in elements])]
+    blocks += [(2, number, 9, [face_nodes(elements[label - 1], corners) for label, corners in facets[name]])
+               for number, name in enumerate(names, 1)]
+    blocks.append((0, 1, 15, [[tip]]))
+    count = sum(len(rows) for *_, rows in blocks)
+    out += [b"\n$EndNodes\n$Elements\n", struct.pack("<4Q", len(blocks), count, 1, count)]
+    label = 0
+    for dimension, entity, kind, rows in blocks:
+        out.append(struct.pack("<3iQ", dimension, entity, kind, len(rows)))
+        for row in rows:
+            label += 1
+            out.append(struct.pack(f"<{len(row) + 1}Q", label, *row))
+    return b"".join(out) + b"\n$EndElements\n"
 
 
 def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
-    parser.add_argument("output", nargs="?", type=Path, default=Path(__file__).with_name("bracket.json"))
-    parser.add_argument("--check", action="store_true", help="check the file instead of making it")
+    parser.add_argument("output", nargs="?", type=Path, default=Path(__file__).with_name("bracket.msh"))
     arguments = parser.parse_args()
-    if not arguments.check:
-        document = model_of(*mesh_solid())
-        check(document)
-        arguments.output.write_text(layout(document) + "\n", encoding="utf-8")
-    print(check(json.loads(arguments.output.read_text(encoding="utf-8"))))
+    nodes, elements = mesh_solid()
+    facets = {name: facets_on(nodes, elements, predicate) for name, predicate in FACES_OF_PART.items()}
+    tip = min(range(len(nodes)), key=lambda i: math.dist(nodes[i], (LENGTH, WIDTH / 2, THICKNESS))) + 1
+    print(check(nodes, elements, facets))
+    arguments.output.write_bytes(msh(nodes, elements, facets, tip))
 
 
 if __name__ == "__main__":
