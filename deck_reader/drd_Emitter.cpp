@@ -46,7 +46,8 @@ std::string drd_Emitter::Real(double value, int digits) {
 
 void drd_Emitter::Keyword(std::string_view name, const std::vector<drd_Parameter>& parameters) {
     std::size_t begin = text_.size();
-    text_.append("*").append(name);
+    // Two stars would make a comment.
+    text_.append(name.starts_with("*") ? "* " : "*").append(name);
     for (const drd_Parameter& parameter : parameters) {
         text_.append(", ");
         if (text_.size() - begin > kKeywordBytes) {
