@@ -282,9 +282,11 @@ void Proof::Steps() {
 template <class Map>
 void Proof::Defined(std::initializer_list<drd_KindEnm> kinds, const Map& records) {
     for (const auto& [name, record] : records) {
-        const std::string quoted = "\"" + Text(name) + "\"";
+        // Names of gaskets stand bare, so that blanks around them get lost.
+        const std::string trimmed = "\"" + std::string(drd_Trim(name.View())) + "\"";
+        const std::string whole = "\"" + Text(name) + "\"";
         const bool isThere = std::any_of(kinds.begin(), kinds.end(), [&](drd_KindEnm kind) {
-            return static_cast<bool>(names_.Find(kind, quoted, 0));
+            return names_.Find(kind, whole, 0) || names_.Find(kind, trimmed, 0);
         });
         if (isThere) continue;
         Tell("the " + std::string(drd_WordOf(*kinds.begin())) + " " + Text(name) + " is not in the deck");
