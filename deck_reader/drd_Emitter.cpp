@@ -97,6 +97,11 @@ void drd_Emitter::Labels(std::span<const int> labels) {
     }
 }
 
+void drd_Emitter::Member(const std::string& name) {
+    // A star ahead would make it a keyword.
+    Line((name.starts_with("*") ? drd_QuotedName(drd_NameOf(name)) : name) + ",");
+}
+
 namespace {
 
 class Reformatter {
@@ -123,7 +128,7 @@ private:
             Bulk(keyword);
             return;
         }
-        const bool isText = keyword.key == "heading" || keyword.key == "step" || keyword.row == nullptr;
+        const bool isText = drd_HasText(keyword.key) || keyword.row == nullptr;
         for (std::uint64_t i = 0; i < keyword.lines; ++i) {
             const std::string_view line = deck_.DataLine(keyword, i);
             emitter_.Line(isText ? std::string(line) : Fields(line));
@@ -145,7 +150,8 @@ private:
         }
         while (!text.empty() && text.back() == ' ') text.pop_back();
         if (fields_.size() > 1 && !text.empty()) text.pop_back();
-        return text;
+        // A star ahead would make it a keyword.
+        return text.starts_with("*") ? " " + text : text;
     }
 
     void Bulk(const drd_Keyword& keyword) {
@@ -223,7 +229,7 @@ private:
                 emitter_.Labels(deck_.labels.Part(i, 3));
             }
         }
-        for (const std::string& member : part.members) emitter_.Line(member + ",");
+        for (const std::string& member : part.members) emitter_.Member(member);
     }
 
     const drd_Deck& deck_;
