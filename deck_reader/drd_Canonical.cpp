@@ -29,10 +29,6 @@ std::uint64_t HashOf(double number) {
 
 } // namespace
 
-bool drd_IsTitle(const drd_Keyword& keyword) {
-    return keyword.key == "heading" || keyword.key == "step";
-}
-
 bool drd_IsNear(double a, double b, double tolerance) {
     return a == b || std::fabs(a - b) <= tolerance * std::max(std::fabs(a), std::fabs(b));
 }
@@ -119,11 +115,11 @@ std::uint64_t drd_Canonical::OwnHash(const drd_Keyword& keyword, bool withName) 
 
 std::uint64_t drd_Canonical::DataHash(const drd_Keyword& keyword) const {
     std::uint64_t hash = 0;
-    if (drd_IsTitle(keyword) && ignoreTitles_) return hash;
+    if (drd_HasText(keyword.key) && ignoreTitles_) return hash;
     const std::uint64_t lines = LineCount(keyword);
     for (std::uint64_t i = 0; i < lines; ++i) {
         const std::string_view line = deck_.DataLine(keyword, i);
-        if (drd_IsTitle(keyword)) {
+        if (drd_HasText(keyword.key)) {
             hash = Mixed(hash, HashOf(drd_Trim(line)));
             continue;
         }

@@ -54,8 +54,6 @@ private:
     mutable std::vector<std::string_view> fields_;
 };
 
-/// Whether the lines of a keyword are text for people.
-bool drd_IsTitle(const drd_Keyword& keyword);
 /// Whether two numbers are equal within the tolerance.
 bool drd_IsNear(double a, double b, double tolerance);
 

@@ -276,6 +276,11 @@ std::vector<char> Check::CoveredElements(int block) const {
         const auto [first, last] = usersOf_.equal_range(block);
         for (auto user = first; user != last; ++user) cover(user->second);
     }
+    // A set's label stands for all elements that have it.
+    for (const std::uint64_t place : index.Repeated()) {
+        covered[place] = covered[static_cast<std::size_t>(
+            index.Find(deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)])->elements[place]))];
+    }
     return covered;
 }
 

@@ -287,10 +287,10 @@ void drd_Differ::CompareFields(std::string_view first, std::string_view second, 
 void drd_Differ::CompareLines(Pair keywords, const Context& context) {
     const drd_Keyword& first = FirstKeyword(keywords.first);
     const drd_Keyword& second = SecondKeyword(keywords.second);
-    if (drd_IsTitle(first) && options_.ignoreTitles) return;
+    if (drd_HasText(first.key) && options_.ignoreTitles) return;
     const std::uint64_t before = first_.LineCount(first);
     const std::uint64_t after = second_.LineCount(second);
-    if (before == after && !drd_IsTitle(first) && first.key != "surface") {
+    if (before == after && !drd_HasText(first.key) && first.key != "surface") {
         for (std::uint64_t i = 0; i < before; ++i) {
             CompareFields(First().DataLine(first, i), Second().DataLine(second, i), i, keywords, context);
         }
@@ -301,7 +301,7 @@ void drd_Differ::CompareLines(Pair keywords, const Context& context) {
         std::vector<std::string> lines;
         for (std::uint64_t i = 0; i < count; ++i) {
             std::string line(drd_Trim(deck.DataLine(keyword, i)));
-            lines.push_back(drd_IsTitle(keyword) ? line : drd_FoldName(line));
+            lines.push_back(drd_HasText(keyword.key) ? line : drd_FoldName(line));
         }
         return lines;
     };

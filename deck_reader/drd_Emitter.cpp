@@ -46,7 +46,8 @@ std::string drd_Emitter::Real(double value, int digits) {
 
 void drd_Emitter::Keyword(std::string_view name, const std::vector<drd_Parameter>& parameters) {
     std::size_t begin = text_.size();
-    text_.append("*").append(name);
+    // Two stars would make a comment.
+    text_.append(name.starts_with("*") ? "* " : "*").append(name);
     for (const drd_Parameter& parameter : parameters) {
         text_.append(", ");
         if (text_.size() - begin > kKeywordBytes) {
@@ -96,6 +97,11 @@ void drd_Emitter::Labels(std::span<const int> labels) {
     }
 }
 
+void drd_Emitter::Member(const std::string& name) {
+    // A star ahead would make it a keyword.
+    Line((name.starts_with("*") ? drd_QuotedName(drd_NameOf(name)) : name) + ",");
+}
+
 namespace {
 
 class Reformatter {
@@ -122,7 +128,7 @@ private:
             Bulk(keyword);
             return;
         }
-        const bool isText = keyword.key == "heading" || keyword.key == "step" || keyword.row == nullptr;
+        const bool isText = drd_HasText(keyword.key) || keyword.row == nullptr;
         for (std::uint64_t i = 0; i < keyword.lines; ++i) {
             const std::string_view line = deck_.DataLine(keyword, i);
             emitter_.Line(isText ? std::string(line) : Fields(line));
@@ -144,7 +150,8 @@ private:
         }
         while (!text.empty() && text.back() == ' ') text.pop_back();
         if (fields_.size() > 1 && !text.empty()) text.pop_back();
-        return text;
+        // A star ahead would make it a keyword.
+        return text.starts_with("*") ? " " + text : text;
     }
 
     void Bulk(const drd_Keyword& keyword) {
@@ -222,7 +229,7 @@ private:
                 emitter_.Labels(deck_.labels.Part(i, 3));
             }
         }
-        for (const std::string& member : part.members) emitter_.Line(member + ",");
+        for (const std::string& member : part.members) emitter_.Member(member);
     }
 
     const drd_Deck& deck_;

@@ -27,6 +27,8 @@ public:
     void Element(int label, std::span<const int> nodes);
     /// Labels, sixteen a line.
     void Labels(std::span<const int> labels);
+    /// The name of a set in a set, on a line of its own.
+    void Member(const std::string& name);
     void Flush();
 
     /// A real as decks have it, with so many digits.

@@ -429,9 +429,8 @@ void Flattener::Set(const drd_Keyword& keyword, const Place& place) {
     }
     const int instance = part.instance.empty() ? place.instance : owner;
     for (const std::string& member : part.members) {
-        emitter_.Line(FlatReference(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member,
-                                    keyword.block, instance) +
-                      ",");
+        emitter_.Member(FlatReference(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member,
+                                      keyword.block, instance));
     }
 }
 

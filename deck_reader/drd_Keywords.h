@@ -70,6 +70,11 @@ const drd_KeywordRow* drd_FindKeyword(std::string_view folded);
 /// The parameter that holds the name of what the keyword defines.
 std::string_view drd_NameParameter(const drd_KeywordRow& row);
 
+/// Whether the data lines of a keyword, folded, are text for people.
+inline bool drd_HasText(std::string_view folded) {
+    return folded == "heading" || folded == "step";
+}
+
 /// A kind of thing that a field or a parameter may name. Both kinds of a set or a label are looked for where
 /// a place takes either.
 enum class drd_RefEnm : std::uint8_t {

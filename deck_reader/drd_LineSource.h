@@ -26,8 +26,8 @@ public:
         if (isSimple_) [[likely]] {
             const auto rest = static_cast<std::size_t>(end_ - at_);
             const void* newline = std::memchr(at_, '\n', rest);
-            if (newline != nullptr) [[likely]] {
-                const char* ending = static_cast<const char*>(newline);
+            const char* ending = static_cast<const char*>(newline);
+            if (newline != nullptr && static_cast<std::size_t>(ending - at_) <= kLongestLine) [[likely]] {
                 line = {at_, static_cast<std::size_t>(ending - at_)};
                 at_ = ending + 1;
                 ++line_;

@@ -2,6 +2,7 @@
 
 #include "deck_reader/drd_Text.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <system_error>
@@ -169,6 +170,10 @@ void drd_Parser::Data(std::string_view line) {
             findings_.Add("data-before-keyword", Here(), drd_Shown(line), "a keyword line, with * in front");
         }
         return;
+    }
+    if (Last().row != nullptr && !drd_HasText(Last().key) &&
+        std::count(line.begin(), line.end(), '"') % 2 != 0) {
+        findings_.Add("quote-left-open", Here(), drd_Shown(line), "a second double quote");
     }
     deck_.lines.Add(Keep(line, Here()));
     ++Last().lines;

@@ -184,8 +184,10 @@ bool drd_Parser::ElementRecord(drd_Mesh& mesh, std::string_view line) {
         }
         const std::string_view text = drd_Trim(line);
         const auto nodes = static_cast<int>(mesh.connectivity.Size() - firstNode);
+        // Behind as many nodes as the type has, a comma is one too many; of a record that has more, it is one
+        // of its own.
         const bool goesOn =
-            !text.empty() && text.back() == ',' && (nodesOfType_ <= 0 || nodes < nodesOfType_);
+            !text.empty() && text.back() == ',' && (nodesOfType_ <= 0 || nodes != nodesOfType_);
         if (!goesOn) break;
         hasLines = NextDataLine(line);
         if (!hasLines) break;

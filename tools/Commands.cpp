@@ -10,6 +10,7 @@
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
 #include "store_interface/findings/fnd_Text.h"
+#include "tools/DeckCommands.h"
 #include "tools/DeckFile.h"
 #include "tools/MeshDescription.h"
 #include "tools/ModelDescription.h"
@@ -191,7 +192,9 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
     }
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code);
-    return odb == nullptr ? code : WriteDeck(*odb, request.model, target, report);
+    if (odb == nullptr) return code;
+    code = WriteDeck(*odb, request.model, target, report);
+    return code == ExitCode::DONE && request.verify ? VerifyDeck(*odb, target, report) : code;
 }
 
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,

@@ -15,6 +15,8 @@ struct WriteRequest {
     std::string job;
     /// Empty: the current one.
     std::string outputDir;
+    /// Reads the deck back and holds it against the store.
+    bool verify = false;
 };
 
 struct FormatRequest {

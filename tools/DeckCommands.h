@@ -5,7 +5,6 @@
 #include "tools/RunReport.h"
 
 #include <string>
-#include <vector>
 
 /// How decks are read.
 struct DeckRequest {
@@ -17,8 +16,8 @@ struct DiffRequest {
     std::string first;
     std::string second;
     double tolerance = 0.0;
-    /// Words for what makes no difference.
-    std::vector<std::string> ignore;
+    /// Words for what makes no difference, with commas between.
+    std::string ignore;
     DeckRequest deck;
 };
 
@@ -50,5 +49,8 @@ int RunDiff(const DiffRequest& request, RunReport& report);
 int RunTextOfDeck(const std::string& input, const DeckRequest& request, RunReport& report);
 /// Writes the deck without parts, instances and assembly.
 ExitCode RunFlatten(const FlattenRequest& request, RunReport& report);
+/// Reads a written deck back and holds it against the store; a deck that doesn't stand for the store is an
+/// internal failure.
+ExitCode VerifyDeck(const odb_Odb& odb, const std::string& target, RunReport& report);
 
 #endif

@@ -163,9 +163,15 @@ bool ReadDeckOrModel(const std::string& path, drd_Deck& deck, const DeckRequest&
 }
 
 int RunDiff(const DiffRequest& request, RunReport& report) {
+    if (request.second.empty()) {
+        report.Error("qrxdeck", "B is required: the deck or model to compare with");
+        return 2;
+    }
     drd_DiffOptions options;
     options.tolerance = request.tolerance;
-    for (const std::string& word : request.ignore) {
+    std::vector<std::string_view> words;
+    drd_SplitFields(request.ignore, words);
+    for (const std::string_view word : words) {
         bool* flag = word == "comments" ? &options.ignoreComments
                      : word == "names"  ? &options.ignoreNames
                      : word == "order"  ? &options.ignoreOrder
@@ -173,7 +179,7 @@ int RunDiff(const DiffRequest& request, RunReport& report) {
                      : word == "output" ? &options.ignoreOutput
                                         : nullptr;
         if (flag == nullptr) {
-            report.Error("qrxdeck", "there is nothing called '" + word +
+            report.Error("qrxdeck", "there is nothing called '" + std::string(word) +
                                         "' to ignore; there are comments, names, order, titles and output");
             return 2;
         }
