@@ -16,3 +16,7 @@ fi
 "$root/scripts/install-dependencies.sh" build
 "$root/scripts/build.sh" release qrxdeck -DQRX_BUILD_TESTS=OFF
 "$root/build/release/tools/qrxdeck" write "$model" --output-dir .
+
+see="build/release/tools/qrxdeck view $model --open"
+[ -d "$root/viewer/node_modules" ] || see="scripts/install-dependencies.sh viewer, quickstart.sh again, then $see"
+echo "To see the model: $see"

@@ -2,8 +2,23 @@
 #define QRX_KEYWORD_QKW_BUILDERCOMPONENT_H
 
 #include "foundation/cow_Map.h"
+#include "foundation/nex_Exception.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "keyword_layer/qkw_ModelInfo.h"
+
+#include <vector>
+
+/// A keyword, the object that it was made of, and where in the deck it was filed.
+struct qkw_Filed {
+    /// What contexts call the object's kind, such as "load"; it outlives the run.
+    const char* kind;
+    cow_String name;
+    /// Empty for a keyword of the model or the assembly.
+    cow_String step;
+    cow_String loadCase;
+    qkw_KeywordHandle keyword;
+};
+using qkw_FilingLog = std::vector<qkw_Filed>;
 
 /// One maker of keywords. Build() reads the model and stores finished keywords in the lists below, filed by
 /// the section of the deck that they belong to; the driver reads the lists when all components have built.
@@ -25,6 +40,8 @@ public:
     virtual qkw_KeywordList DesignAreaDefinition();
     virtual void Build() = 0;
     virtual qkw_BuilderComponent* Copy() const = 0;
+    /// From now on tells the log, which must outlive the building, whose keywords it files.
+    void LogTo(qkw_FilingLog& log) { log_ = &log; }
 
     qkw_KeywordList StepDefinition(const cow_String& stepName) {
         return StepDefinition(stepName, cow_String());
@@ -36,25 +53,64 @@ protected:
     qkw_BuilderComponent(const qkw_BuilderComponent&) = default;
     qkw_BuilderComponent& operator=(const qkw_BuilderComponent&) = default;
 
-    void AddModelDefinition(const qkw_Keyword& keyword) { modelDefinitions_.Append(keyword); }
-    void AddAssemblyDefinition(const qkw_Keyword& keyword) { assemblyDefinitions_.Append(keyword); }
+    /// While it lives, an object's keywords are being made: failures name it, and what is filed for the
+    /// model, the assembly or a step is logged as its own.
+    class Making {
+    public:
+        Making(qkw_BuilderComponent& component, const char* kind, const cow_String& name)
+            : context_(kind, name), kind_(kind), name_(&name), component_(component),
+              outer_(component.making_) {
+            component_.making_ = this;
+        }
+        Making(const Making&) = delete;
+        Making& operator=(const Making&) = delete;
+        ~Making() { component_.making_ = outer_; }
+
+    private:
+        friend class qkw_BuilderComponent;
+        nex_Context context_;
+        const char* kind_;
+        const cow_String* name_;
+        qkw_BuilderComponent& component_;
+        const Making* outer_;
+    };
+    /// Logs a keyword that several objects share as one of this object's.
+    void LogAs(const char* kind, const cow_String& name, const cow_String& step,
+               const qkw_KeywordHandle& keyword, const cow_String& loadCase = {}) {
+        if (log_ != nullptr) log_->push_back({kind, name, step, loadCase, keyword});
+    }
+
+    void AddModelDefinition(const qkw_KeywordHandle& keyword) {
+        modelDefinitions_.Append(keyword);
+        Log({}, keyword);
+    }
+    void AddModelDefinition(const qkw_Keyword& keyword) { AddModelDefinition(qkw_KeywordHandle(keyword)); }
+    void AddAssemblyDefinition(const qkw_KeywordHandle& keyword) {
+        assemblyDefinitions_.Append(keyword);
+        Log({}, keyword);
+    }
+    void AddAssemblyDefinition(const qkw_Keyword& keyword) {
+        AddAssemblyDefinition(qkw_KeywordHandle(keyword));
+    }
     void AddPartDefinition(const cow_String& partName, const qkw_Keyword& keyword) {
         partDefinitions_.GetOrInsert(partName).Append(keyword);
     }
     void AddInstanceDefinition(const cow_String& instanceName, const qkw_Keyword& keyword) {
         instanceDefinitions_.GetOrInsert(instanceName).Append(keyword);
     }
-    void AddStepDefinition(const cow_String& stepName, const qkw_Keyword& keyword,
-                           const cow_String& secondKey) {
-        stepDefinitions_.GetOrInsert(stepName).GetOrInsert(secondKey).Append(keyword);
-    }
-    void AddStepDefinition(const cow_String& stepName, const qkw_Keyword& keyword) {
-        AddStepDefinition(stepName, keyword, cow_String());
-    }
     /// For a keyword that stands in many places: the lists share it.
     void AddStepDefinition(const cow_String& stepName, const qkw_KeywordHandle& keyword,
                            const cow_String& secondKey = {}) {
-        stepDefinitions_.GetOrInsert(stepName).GetOrInsert(secondKey).Append(keyword);
+        StepList(stepName, secondKey).Append(keyword);
+        Log(stepName, keyword, secondKey);
+    }
+    void AddStepDefinition(const cow_String& stepName, const qkw_Keyword& keyword,
+                           const cow_String& secondKey = {}) {
+        AddStepDefinition(stepName, qkw_KeywordHandle(keyword), secondKey);
+    }
+    /// The banner ahead of a step's keywords of one kind, which is no object's own.
+    void AddStepBanner(const cow_String& stepName, const qkw_KeywordHandle& banner) {
+        StepList(stepName, {}).Append(banner);
     }
     void AddAtomOptionDefinition(const qkw_Keyword& keyword) { atomOptionDefinitions_.Append(keyword); }
     void AddSingleTermDefinition(const qkw_Keyword& keyword) { singleTermDefinitions_.Append(keyword); }
@@ -67,6 +123,13 @@ protected:
 private:
     using ListsByName = cow_Map<cow_String, qkw_KeywordList>;
 
+    qkw_KeywordList& StepList(const cow_String& stepName, const cow_String& secondKey) {
+        return stepDefinitions_.GetOrInsert(stepName).GetOrInsert(secondKey);
+    }
+    void Log(const cow_String& step, const qkw_KeywordHandle& keyword, const cow_String& loadCase = {}) {
+        if (making_ != nullptr) LogAs(making_->kind_, *making_->name_, step, keyword, loadCase);
+    }
+
     const qkw_Model* model_;
     qkw_ModelInfo* modelInfo_;
     qkw_KeywordList modelDefinitions_;
@@ -78,6 +141,8 @@ private:
     qkw_KeywordList singleTermDefinitions_;
     qkw_KeywordList combinedTermDefinitions_;
     qkw_KeywordList designAreaDefinitions_;
+    qkw_FilingLog* log_ = nullptr;
+    const Making* making_ = nullptr;
 };
 
 /// Made from a component, it holds a copy of it.

@@ -4,12 +4,14 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
   bench   build, and what the benchmarks need
   dev     all of these, and the clang tools
+  viewer  build, and what the page of "qrxdeck view" is built and tested with: node, a browser, and the packages
+          of viewer/package-lock.json
 END
 }
 
@@ -18,7 +20,12 @@ test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonsche
 bench=(libbenchmark-dev libfmt-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
+viewer=(chromium)
+# Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
+command -v node >/dev/null && command -v npm >/dev/null || viewer+=(nodejs npm)
+
 [ $# -gt 0 ] || set -- build
+with_page=false
 packages=("${build[@]}")
 for task in "$@"; do
     case $task in
@@ -26,13 +33,24 @@ for task in "$@"; do
         test) packages+=("${test[@]}") ;;
         bench) packages+=("${bench[@]}") ;;
         dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
+        viewer) packages+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;
     esac
 done
 
+# What is pinned in the lock file, and nothing when that is there already.
+install_page_packages() {
+    local viewer_dir
+    viewer_dir=$(cd "$(dirname "${BASH_SOURCE[0]}")/../viewer" && pwd)
+    if [ "$viewer_dir/node_modules/.package-lock.json" -nt "$viewer_dir/package-lock.json" ]; then return; fi
+    npm ci --prefix "$viewer_dir" --no-audit --no-fund
+    touch "$viewer_dir/node_modules/.package-lock.json"
+}
+
 if ! command -v dpkg-query >/dev/null; then
     echo "install-dependencies: not a Debian system; make sure that these are there: ${packages[*]}" >&2
+    if $with_page && command -v npm >/dev/null; then install_page_packages; fi
     exit 0
 fi
 
@@ -41,7 +59,10 @@ for package in "${packages[@]}"; do
     status=$(dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null || true)
     [ "$status" = installed ] || missing+=("$package")
 done
-[ ${#missing[@]} -gt 0 ] || exit 0
+if [ ${#missing[@]} -eq 0 ]; then
+    if $with_page; then install_page_packages; fi
+    exit 0
+fi
 
 as_root=()
 if [ "$(id -u)" -ne 0 ]; then
@@ -59,3 +80,4 @@ apt() {
 echo "installing: ${missing[*]}"
 apt update
 apt install -y --no-install-recommends "${missing[@]}"
+if $with_page; then install_page_packages; fi

@@ -10,6 +10,7 @@
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
 #include "store_interface/findings/fnd_Text.h"
+#include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
 #include "tools/DeckFile.h"
 #include "tools/MeshDescription.h"
@@ -33,24 +34,6 @@ namespace {
 
 std::string ReasonText(int error) {
     return std::generic_category().message(error == 0 ? EIO : error);
-}
-
-/// The store of a model file that is right; else null, with the code.
-std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
-                                   std::list<mdf_MeshOrigin>* origins = nullptr) {
-    mdf_Report found;
-    found.fileName = path;
-    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
-    report.AddAll(found);
-    code = ExitCode::DONE;
-    if (found.unreadable) {
-        code = ExitCode::FILE_SYSTEM_REFUSED;
-    } else if (found.HasErrors() || odb == nullptr) {
-        code = ExitCode::MODEL_IS_WRONG;
-    }
-    if (code != ExitCode::DONE) odb.reset();
-    if (origins != nullptr) *origins = std::move(found.meshOrigins);
-    return odb;
 }
 
 /// The path of the deck; empty for a job name that names no file.
@@ -137,10 +120,31 @@ void Summarise(const std::string& target, long long bytes, double seconds,
 /// The standard output takes nothing; the reason has been told.
 class OutputIsLost {};
 
-/// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
-/// there is to say of it, for which everything that can fail is done before the file stands. What `write`
-/// raises beyond that comes through.
-bool Replace(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell, RunReport& report) {
+double SecondsSince(std::chrono::steady_clock::time_point start) {
+    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+}
+
+} // namespace
+
+std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
+                                   std::list<mdf_MeshOrigin>* origins) {
+    mdf_Report found;
+    found.fileName = path;
+    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
+    report.AddAll(found);
+    code = ExitCode::DONE;
+    if (found.unreadable) {
+        code = ExitCode::FILE_SYSTEM_REFUSED;
+    } else if (found.HasErrors() || odb == nullptr) {
+        code = ExitCode::MODEL_IS_WRONG;
+    }
+    if (code != ExitCode::DONE) odb.reset();
+    if (origins != nullptr) *origins = std::move(found.meshOrigins);
+    return odb;
+}
+
+bool ReplaceFile(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell,
+                 RunReport& report) {
     DeckFile::Result result;
     const auto ready = [&](long long bytes) {
         tell(bytes);
@@ -167,12 +171,6 @@ bool Replace(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready
     }
     return true;
 }
-
-double SecondsSince(std::chrono::steady_clock::time_point start) {
-    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
-}
-
-} // namespace
 
 ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
     const std::string target = TargetOf(request);
@@ -219,7 +217,7 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
             for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
             Summarise(target, bytes, SecondsSince(start), counts, leftOut, report);
         };
-        return Replace(deck, write, tell, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
+        return ReplaceFile(deck, write, tell, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
     } catch (const QRXBasException& failure) {
         report.WriterError(failure.what(), failure.Context());
         return ExitCode::CANNOT_BE_EXPRESSED;
@@ -297,7 +295,7 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
 bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,
                  RunReport& report) {
     DeckFile file(target, DeckFileSystem::Standard(), thing);
-    return Replace(
+    return ReplaceFile(
         file, write, [](long long) {}, report);
 }
 

@@ -1,10 +1,8 @@
 #ifndef QRX_TOOLS_COMMANDS_H
 #define QRX_TOOLS_COMMANDS_H
 
-#include "foundation/qio_Device.h"
 #include "tools/RunReport.h"
 
-#include <functional>
 #include <string>
 #include <vector>
 
@@ -58,13 +56,6 @@ ExitCode RunVariables(const std::string& stepType, RunReport& report);
 ExitCode RunMesh(const MeshRequest& request, RunReport& report);
 /// Makes a model file for a mesher's file.
 ExitCode RunNew(const NewRequest& request, RunReport& report);
-/// Replaces the file as a whole by what `write` gives, or leaves it as it was; false when the file system
-/// refuses. Messages call the file by the word `thing`.
-bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,
-                 RunReport& report);
-/// The same for a text.
-ExitCode WriteWholeFile(const std::string& path, const char* thing, const std::string& text,
-                        RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.
 ExitCode RunSchema(const std::string& output, RunReport& report);
 

@@ -1,7 +1,7 @@
 #include "deck_reader/drd_Emitter.h"
 #include "deck_reader/drd_Flatten.h"
 #include "foundation/qio_Device.h"
-#include "tools/Commands.h"
+#include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
 
 #include <functional>

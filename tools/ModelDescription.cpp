@@ -4,6 +4,7 @@
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
+#include "store_interface/records/steps/kprC_StepWords.h"
 #include "tools/TextTable.h"
 
 #include <cstdio>
@@ -54,29 +55,17 @@ ordered_json DescribeInstance(const odiK_Instance& instance) {
     return entry;
 }
 
-/// "kprC_StaticLinearPerturbationStep" as "static linear perturbation".
-std::string ProcedureOf(const kprC_Step& step) {
-    std::string name = Text(cls_Classes().NameOf(step.DynTypeId()));
-    if (name.starts_with("kprC_")) name.erase(0, 5);
-    if (name.ends_with("Step")) name.erase(name.size() - 4);
-    std::string words;
-    for (const char c : name) {
-        const bool isCapital = c >= 'A' && c <= 'Z';
-        if (isCapital && !words.empty()) words += ' ';
-        words += isCapital ? static_cast<char>(c - 'A' + 'a') : c;
-    }
-    return words;
-}
-
 ordered_json DescribeSteps(const kprC_StepContainer& steps) {
     ordered_json list = ordered_json::array();
     for (int i = 0; i < steps.Size(); ++i) {
         const kprC_Step& step = steps.StepAt(i);
         const auto* analysis = dynamic_cast<const kprC_AnalysisStep*>(&step);
-        ordered_json entry = {
-            {"name", Text(steps.NameAt(i))},  {"class", Text(cls_Classes().NameOf(step.DynTypeId()))},
-            {"procedure", ProcedureOf(step)}, {"perturbation", step.Perturbation()},
-            {"explicit", step.Explicit()},    {"suppressed", step.suppressed}};
+        ordered_json entry = {{"name", Text(steps.NameAt(i))},
+                              {"class", Text(cls_Classes().NameOf(step.DynTypeId()))},
+                              {"procedure", kprC_ProcedureWords(step)},
+                              {"perturbation", step.Perturbation()},
+                              {"explicit", step.Explicit()},
+                              {"suppressed", step.suppressed}};
         if (analysis != nullptr) {
             const kprC_StepTimes times(step);
             entry["nlgeom"] = step.Nlgeom() == kprC_Step::NlgeomEnm::ON;

@@ -4,6 +4,7 @@
 #include "conditions/oif_BoundaryConditionBuilder.h"
 #include "deck_checks/dck_Text.h"
 #include "store_interface/model/odiK_Repositories.h"
+#include "store_interface/propagation/mdl_StatusWords.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "tools/TextTable.h"
 
@@ -60,13 +61,9 @@ bool HasHistory(const odiK_Repository& repository) {
     return repository.IsPropagating() && repository.ReachesDeck();
 }
 
-/// "BUILT_INTO_BASE_STATE" as "built into base state"; a dash before an object begins.
+/// The words of a status; a dash before an object begins.
 std::string StatusText(const std::string& status) {
-    if (status == "NOT_YET_ACTIVE") return "-";
-    std::string text;
-    for (const char c : status)
-        text += c == '_' ? ' ' : static_cast<char>(c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c);
-    return text;
+    return status == "NOT_YET_ACTIVE" ? "-" : mdl_StatusWords(status);
 }
 
 /// The marks of the conditions, by the member of their repository.

@@ -1,5 +1,6 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/ddb_ElementTypes.h"
+#include "tools/CommandParts.h"
 #include "tools/Commands.h"
 
 #include <algorithm>

@@ -5,6 +5,7 @@
 #include "tools/OutOfMemory.h"
 #include "tools/SignalCleanUp.h"
 #include "tools/StandardStreams.h"
+#include "tools/ViewCommand.h"
 
 #include <CLI/CLI.hpp>
 
@@ -36,6 +37,7 @@ struct CommandLine {
     CLI::App app{kAbout, "qrxdeck"};
     WriteRequest write;
     FormatRequest format;
+    ViewRequest view;
     MeshRequest mesh;
     NewRequest newModel;
     DeckRequest deck;
@@ -57,6 +59,7 @@ struct CommandLine {
     CLI::App* meshCommand = app.add_subcommand("mesh", "Tell of a mesher's file: cells, groups, quality");
     CLI::App* newCommand = app.add_subcommand("new", "Make a model file for a mesher's file, to go on from");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
+    CLI::App* viewCommand = app.add_subcommand("view", "Write a page that shows a model, step by step");
     CLI::App* variablesCommand =
         app.add_subcommand("variables", "List the variables that output requests can ask for");
     CLI::App* schemaCommand =
@@ -118,6 +121,7 @@ struct CommandLine {
             ->add_flag("--check", format.check,
                        "Write nothing; exit with 1 and name the file when it isn't in that form")
             ->excludes(output);
+        AddView();
         variablesCommand
             ->add_option("--step-type", stepType,
                          "Only those of one procedure, by the class of its step, such as StaticStep")
@@ -150,6 +154,7 @@ struct CommandLine {
         if (*meshCommand) return RunMesh(mesh, report);
         if (*newCommand) return RunNew(newModel, report);
         if (*formatCommand) return RunFormat(format, report);
+        if (*viewCommand) return RunView(view, report);
         if (*variablesCommand) return RunVariables(stepType, report);
         return RunSchema(schemaOutput, report);
     }
@@ -164,6 +169,18 @@ private:
             ->required()
             ->type_name("");
         AddJson(command);
+    }
+    void AddView() {
+        AddModel(viewCommand, view.model, "Model file, JSON; or a mesher's file");
+        viewCommand
+            ->add_option("-o,--output", view.output,
+                         "The page (default: the model file's name with .html, in the current folder)")
+            ->type_name("FILE");
+        viewCommand
+            ->add_option("--vtu", view.vtu,
+                         "Also write the mesh with sections, materials and sets as a VTU file")
+            ->type_name("FILE");
+        viewCommand->add_flag("--open", view.open, "Show the page in the browser");
     }
     void AddDiff() {
         diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");

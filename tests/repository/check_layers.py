@@ -21,7 +21,8 @@ ALLOWED = {
     "mesh_file": ["foundation"],
     "deck_reader": ["foundation"],
     "model_file": ["foundation", "store_interface", "mesh_file"],
-    "tools": CORE + ["mesh_file", "model_file", "deck_reader"],
+    "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
+    "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
@@ -51,6 +52,7 @@ ROOMS = {
 LIBRARIES = {
     "mesh_file": ["pugixml.hpp", "zlib.h", "hdf5.h"],
     "model_file": ["nlohmann/"],
+    "view_page": ["nlohmann/"],
     "tools": ["nlohmann/", "CLI/"],
 }
 
@@ -66,7 +68,7 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"fcntl.h", "unistd.h", "sys/mman.h", "sys/stat.h", "sys/types.h"}
+SYSTEM = {"fcntl.h", "unistd.h", "sys/mman.h", "sys/stat.h", "sys/types.h", "sys/wait.h"}
 SYSTEM_LAYERS = {"foundation", "mesh_file", "tools"}
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')

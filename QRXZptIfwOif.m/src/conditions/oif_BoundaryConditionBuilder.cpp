@@ -12,6 +12,8 @@
 
 namespace {
 
+constexpr char kKind[] = "boundary condition";
+
 const kbcC_ConnectorBC* ConnectorCondition(const kbcC_BC& bc) {
     return nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc);
 }
@@ -28,7 +30,7 @@ void oif_BoundaryConditionBuilder::Build() {
     const kprC_StepContainer& steps = Model().Steps();
     const oif_BCOpStatus opStatus = OpStatusOf(Model().BCs(), Model().Loads(), steps);
     const oif_ObjectsOfSteps<kbcC_BC> conditions(
-        "boundary condition", Model().BCs(), steps, opStatus,
+        kKind, Model().BCs(), steps, opStatus,
         [&](const kbcC_BC& bc, const cow_String& step, bool inLoadCase) {
             return opStatus.Writes(bc, step, inLoadCase);
         });
@@ -94,7 +96,7 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const oif_BCCard& card,
     }
     const oif_Boundary boundary(card, Model().ShellToSolid(), initialStep);
     if (boundary.IsBCSubmodel()) {
-        return submodels.Append(card.step, oif_Boundary::FixBCNameHack(card.name), boundary);
+        return submodels.Append(card.step, card.name, boundary);
     }
     AddComment(card, entry);
     Add(card, boundary);
@@ -159,8 +161,12 @@ void oif_BoundaryConditionBuilder::CreateSubmodelKwds(const oif_BoundarySubmodel
     }
     for (const oif_Submodel& submodel : submodels) AddAssemblyDefinition(submodel);
     for (const auto& [stepName, step] : Model().Steps()) {
-        for (const qkw_KeywordHandle& keyword : boundaries.Keywords(stepName)) {
-            AddStepDefinition(stepName, keyword);
+        const qkw_KeywordList keywords = boundaries.Keywords(stepName);
+        for (const qkw_KeywordHandle& keyword : keywords) AddStepDefinition(stepName, keyword);
+        const cow_List<cow_String> owners = boundaries.Owners(stepName);
+        for (int i = 0; i < owners.Length(); ++i) {
+            // The comment and the keyword line are all boundaries', then each has its own lines.
+            for (const int place : {0, 1, i + 2}) LogAs(kKind, owners[i], stepName, keywords[place]);
         }
     }
 }

@@ -71,7 +71,7 @@ protected:
         const cow_String& stepName = steps.NameAt(step);
         const nex_Context stepContext("step", stepName);
         for (auto* entry : written.In(step)) {
-            const nex_Context context(written.Kind(), entry->name);
+            const typename oif_ConditionBuilder::Making making(*this, written.Kind(), entry->name);
             if (entry->shared.IsNull()) {
                 entry->shared = mdl_ObjCow<T>(entry->object);
                 if constexpr (requires { entry->object.region; }) {
@@ -83,7 +83,7 @@ protected:
             for (const auto& [loadCase, scale] :
                  placesOf(steps.StepAt(step), entry->name, entry->object.Status(stepName))) {
                 const bool inLoadCase = !loadCase.IsEmpty();
-                if (!inLoadCase) this->AddStepDefinition(stepName, banner_.StepHeader(stepName));
+                if (!inLoadCase) this->AddStepBanner(stepName, banner_.StepHeader(stepName));
                 make(oif_CardOf<T>{entry->name, entry->shared, entry->setName, stepName,
                                    opOf(entry->object, stepName, inLoadCase), loadCase, scale},
                      *entry);

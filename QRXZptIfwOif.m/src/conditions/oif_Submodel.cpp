@@ -34,17 +34,24 @@ void oif_BoundarySubmodelList::Append(const cow_String& stepName, const cow_Stri
     // All boundaries of a step share the first one's line, whatever theirs would be.
     if (keywords.IsEmpty()) keywords.Append(oif_RawKeyword(boundary.BCSubmodelKwd()));
     keywords.Append(boundary);
-    names_.GetOrInsert(stepName).Append(name);
+    owners_.GetOrInsert(stepName).Append(name);
 }
 
 qkw_KeywordList oif_BoundarySubmodelList::Keywords(const cow_String& stepName) const {
     const qkw_KeywordList* kept = keywords_.Find(stepName);
     if (kept == nullptr) return {};
+    cow_List<cow_String> names;
+    for (const cow_String& owner : owners_.ConstGet(stepName))
+        names.Append(oif_Boundary::FixBCNameHack(owner));
     qkw_KeywordList keywords;
-    keywords.Append(
-        oif_Comment(cow_String("Name: ") + Joined(names_.ConstGet(stepName)) + " Type: Submodel"));
+    keywords.Append(oif_Comment(cow_String("Name: ") + Joined(names) + " Type: Submodel"));
     keywords.Concatenate(*kept);
     return keywords;
+}
+
+cow_List<cow_String> oif_BoundarySubmodelList::Owners(const cow_String& stepName) const {
+    const cow_List<cow_String>* owners = owners_.Find(stepName);
+    return owners == nullptr ? cow_List<cow_String>() : *owners;
 }
 
 cow_String oif_BoundarySubmodelList::Joined(const cow_List<cow_String>& names) {

@@ -34,11 +34,13 @@ public:
     /// The comment with all names, the first boundary's keyword line, then the boundaries; nothing for a step
     /// without any.
     qkw_KeywordList Keywords(const cow_String& stepName) const;
+    /// The names of the conditions whose boundaries these are, in their order.
+    cow_List<cow_String> Owners(const cow_String& stepName) const;
     static cow_String Joined(const cow_List<cow_String>& names);
 
 private:
     cow_Map<cow_String, qkw_KeywordList> keywords_;
-    cow_Map<cow_String, cow_List<cow_String>> names_;
+    cow_Map<cow_String, cow_List<cow_String>> owners_;
 };
 
 #endif

@@ -14,12 +14,12 @@ void oif_ConstraintBuilder::Build() {
                                                    sector.GetNumberOfSectors()));
     }
     for (const auto& [name, constraint] : Model().Constraints()) {
-        const nex_Context context("constraint", name);
+        const Making making(*this, "constraint", name);
         AddAssemblyDefinition(oif_Comment(cow_String("Constraint: ") + name));
         const oif_ConstraintRow* row = oif_FindConstraintRow(constraint.DynTypeId());
         if (row == nullptr) nex_Raise(oif_kConstraintError);
         for (const qkw_KeywordHandle& keyword : row->make(ModelInfo(), name, constraint)) {
-            AddAssemblyDefinition(keyword.ConstGet());
+            AddAssemblyDefinition(keyword);
         }
     }
 }

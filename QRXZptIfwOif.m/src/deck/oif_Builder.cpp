@@ -2,13 +2,6 @@
 
 #include "foundation/qio_Device.h"
 
-namespace {
-
-constexpr int kLineLimit = 131;
-constexpr int kPrecision = 6;
-
-} // namespace
-
 oif_Builder::oif_Builder(oif_ModelInfo& modelInfo)
     : jobKeywords_(modelInfo), instance_(modelInfo), amplitude_(modelInfo), material_(modelInfo),
       transform_(modelInfo), boundaryCondition_(modelInfo), step_(modelInfo), load_(modelInfo),
@@ -28,7 +21,7 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
 }
 
 void oif_Builder::WriteInput(qio_ostream& device) {
-    utl_Stream stream(device, kLineLimit, kPrecision, kPrecision);
+    utl_Stream stream(device, LineLimit, Precision, Precision);
     BuildComponents();
     qkw_ComponentList components = WriteList();
     WriteInput(stream, jobKeywords_.ModelDefinition());
@@ -38,6 +31,14 @@ void oif_Builder::WriteInput(qio_ostream& device) {
     WriteOtherModelDefinitions(stream, components);
     WriteStepDefinitions(stream, components);
     stream.Flush();
+}
+
+qkw_FilingLog oif_Builder::BuildLogged() {
+    qkw_FilingLog log;
+    qkw_BuilderComponent* const made[] = {&constraint_, &boundaryCondition_, &load_, &field_, &interaction_};
+    for (qkw_BuilderComponent* component : made) component->LogTo(log);
+    BuildComponents();
+    return log;
 }
 
 // Later components use what earlier ones stored in the model info: labels first, regions behind instances and

@@ -27,10 +27,17 @@ public:
     oif_Builder& operator=(const oif_Builder&) = delete;
 
     /// Deletes an old file of the name and writes the deck. False when the file can't be opened; whether all
-    /// bytes arrived tells qio_LastReport(). May be called once.
+    /// bytes arrived tells qio_LastReport().
     bool WriteInputFile(const cow_String& fileName);
-    /// Writes the deck to a device. One of the two may be called, and once.
+    /// Writes the deck to a device.
     void WriteInput(qio_ostream& device);
+    /// Builds as for a deck, writes nothing, and gives the keywords of single objects. One of the three may
+    /// be called, and once.
+    qkw_FilingLog BuildLogged();
+
+    /// The measures of a deck's stream.
+    static constexpr int LineLimit = 131;
+    static constexpr int Precision = 6;
 
 private:
     void BuildComponents();

@@ -29,7 +29,7 @@ void oif_InteractionBuilder::CreateInteractionProperties() {
 void oif_InteractionBuilder::CreateInteractionHistory() {
     for (const auto& [name, interaction] : Model().Interactions()) {
         if (interaction.suppressed) continue;
-        const nex_Context context("interaction", name);
+        const Making making(*this, "interaction", name);
         const oif_InteractionRow* row = oif_FindInteractionRow(interaction.DynTypeId());
         if (row != nullptr && row->history != nullptr) row->history(*this, name, interaction);
     }

@@ -20,12 +20,13 @@ public:
     // What the histories of the interactions see of the builder.
     using oif_ComponentOf::AddModelDefinition;
     using oif_ComponentOf::AddStepDefinition;
+    using oif_ComponentOf::Making;
     using oif_ComponentOf::Model;
     using oif_ComponentOf::ModelInfo;
     /// The banner of the step, then these.
     template <class... Keywords>
     void AddBlock(const cow_String& step, const Keywords&... keywords) {
-        AddStepDefinition(step, stepBlockHeader_.StepHeader(step));
+        AddStepBanner(step, stepBlockHeader_.StepHeader(step));
         (AddStepDefinition(step, keywords), ...);
     }
     /// The banner of properties, then the keyword.

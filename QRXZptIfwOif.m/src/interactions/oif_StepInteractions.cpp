@@ -89,7 +89,7 @@ void oif_CreateOpInteractions(oif_InteractionBuilder& builder) {
         }
         const bool isGeneral = !model.Steps().ConstGet(step).Perturbation();
         for (StepInteraction& interaction : interactions) {
-            const nex_Context context("interaction", interaction.name);
+            const oif_InteractionBuilder::Making making(builder, "interaction", interaction.name);
             // Three of the classes have no family to ask for, and raise here.
             const bool opNew = opStatus.OpNew(interaction.row->typeId, step);
             const std::optional<cow_String> told =

@@ -1,0 +1,28 @@
+#ifndef QRX_TOOLS_COMMANDPARTS_H
+#define QRX_TOOLS_COMMANDPARTS_H
+
+#include "tools/DeckFile.h"
+#include "tools/RunReport.h"
+
+#include <list>
+#include <memory>
+
+// What commands are put together from.
+
+/// The store of a model file that is right; else null, with the code.
+std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
+                                   std::list<mdf_MeshOrigin>* origins = nullptr);
+/// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
+/// there is to say of it, for which everything that can fail is done before the file stands. What `write`
+/// raises beyond that comes through.
+bool ReplaceFile(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell,
+                 RunReport& report);
+/// Replaces the file as a whole by what `write` gives, or leaves it as it was; false when the file system
+/// refuses. Messages call the file by the word `thing`.
+bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,
+                 RunReport& report);
+/// The same for a text.
+ExitCode WriteWholeFile(const std::string& path, const char* thing, const std::string& text,
+                        RunReport& report);
+
+#endif

@@ -1,0 +1,121 @@
+#include "tools/ViewCommand.h"
+
+#include "foundation/nex_Exception.h"
+#include "foundation/qio_Device.h"
+#include "store_interface/findings/fnd_Text.h"
+#include "tools/CommandParts.h"
+#include "tools/DeckCommands.h"
+#include "view_page/vpg_Html.h"
+#include "view_page/vpg_Vtu.h"
+
+#include <filesystem>
+#include <fstream>
+
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace {
+
+constexpr char kNoPage[] = "this qrxdeck was built without the page that shows models: run "
+                           "scripts/install-dependencies.sh viewer in its sources and build it again";
+
+std::string TargetOf(const ViewRequest& request) {
+    if (!request.output.empty()) return request.output;
+    return std::filesystem::path(request.model).stem().string() + ".html";
+}
+
+/// Whether the file begins as JSON does, a comment ahead of it or not.
+bool IsModelFile(const std::string& path) {
+    std::ifstream file(path, std::ios::binary);
+    char first = '\0';
+    return !(file >> first) || first == '{' || first == '/' || first == '\xEF';
+}
+
+/// The store of a model whose one part has the mesh of a mesher's file.
+std::unique_ptr<odb_Odb> ReadMesh(const std::string& path, RunReport& report, ExitCode& code) {
+    const nlohmann::json mesh = {{"file", std::filesystem::absolute(path).string()}};
+    const std::string part = std::filesystem::path(path).stem().string();
+    const nlohmann::json model = {
+        {"format", mdf_kFormat},
+        {"models", {{odb_Odb::DefaultModelName(), {{"parts", {{part, {{"mesh", mesh}}}}}}}}}};
+    mdf_Report found;
+    auto odb =
+        mdf_ReadModelText(model.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace), path, found);
+    for (const fnd_Finding& finding : found.findings)
+        report.Add(path, {finding.code, {}, finding.found, finding.expected, finding.hint});
+    code = odb != nullptr     ? ExitCode::DONE
+           : found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED
+                              : ExitCode::MODEL_IS_WRONG;
+    return odb;
+}
+
+/// Lets the desktop open the file; false when it has no program for it.
+bool Open(const std::string& file) {
+    const std::string path = std::filesystem::absolute(file).string();
+    const pid_t child = fork();
+    if (child < 0) return false;
+    if (child == 0) {
+        for (const char* program : {"xdg-open", "open"}) execlp(program, program, path.c_str(), nullptr);
+        _exit(127);
+    }
+    int status = 0;
+    return waitpid(child, &status, 0) == child && WIFEXITED(status) && WEXITSTATUS(status) == 0;
+}
+
+/// Writes the file as a whole, and tells of it as a member of the report.
+bool Write(const std::string& target, const char* thing, const char* member, const DeckFile::Write& write,
+           RunReport& report) {
+    DeckFile file(target, DeckFileSystem::Standard(), thing);
+    const auto tell = [&](long long bytes) {
+        report.Print(fnd_Visible(target) + ": " + std::to_string(bytes) + " bytes\n");
+        report.Member(member) = {{"target", target}, {"bytes", bytes}};
+    };
+    return ReplaceFile(file, write, tell, report);
+}
+
+bool WriteVtu(const odb_Odb& odb, const std::string& target, RunReport& report) {
+    const auto write = [&odb](qio_ostream& device) {
+        vpg_WriteVtu(odb, [&device](std::string_view bytes) { device.Write(bytes.data(), bytes.size()); });
+    };
+    return Write(target, "mesh file", "mesh", write, report);
+}
+
+ExitCode WritePage(const odb_Odb& odb, const ViewRequest& request, RunReport& report) {
+    const std::string target = TargetOf(request);
+    const std::string title = std::filesystem::path(request.model).stem().string();
+    const std::string html = vpg_Html(vpg_DataOf(odb, title), title);
+    const auto write = [&html](qio_ostream& device) { device.Write(html.data(), html.size()); };
+    if (!Write(target, "page", "page", write, report)) return ExitCode::FILE_SYSTEM_REFUSED;
+    if (request.open && !Open(target)) {
+        report.Warning(target, "there is no program that opens it; any browser shows it");
+    }
+    return ExitCode::DONE;
+}
+
+} // namespace
+
+ExitCode RunView(const ViewRequest& request, RunReport& report) {
+    ExitCode code;
+    if (IsDeck(request.model)) {
+        report.Error(request.model, "it is a deck; the page shows model files and meshers' files");
+        return ExitCode::WRONG_USAGE;
+    }
+    const std::unique_ptr<odb_Odb> odb = IsModelFile(request.model) ? ReadModel(request.model, report, code)
+                                                                    : ReadMesh(request.model, report, code);
+    if (odb == nullptr) return code;
+    if (odb->FindModel(odb_Odb::DefaultModelName()) == nullptr) {
+        report.Error(request.model,
+                     std::string("there is no model named \"") + odb_Odb::DefaultModelName() + "\" to show");
+        return ExitCode::MODEL_IS_WRONG;
+    }
+    try {
+        if (!request.vtu.empty() && !WriteVtu(*odb, request.vtu, report))
+            return ExitCode::FILE_SYSTEM_REFUSED;
+        if (!vpg_PageText().empty()) return WritePage(*odb, request, report);
+    } catch (const QRXBasException& failure) {
+        report.WriterError(failure.what(), failure.Context());
+        return ExitCode::CANNOT_BE_EXPRESSED;
+    }
+    report.Error("qrxdeck", kNoPage);
+    return ExitCode::WRONG_USAGE;
+}
