@@ -143,8 +143,8 @@ TEST(WrittenSteps, AreThoseOfAWalkOverAllSteps) {
         for (int i = 0; i < steps.Size(); ++i) {
             if (status.Writes(load, steps.NameAt(i))) expected.push_back(i);
         }
-        EXPECT_EQ(written.Of("load", name, load, test), expected) << name;
-        EXPECT_LE(asked, 12) << name;
+        EXPECT_EQ(written.Of("load", name, load, test), expected) << name.View();
+        EXPECT_LE(asked, 12) << name.View();
     }
 }
 
