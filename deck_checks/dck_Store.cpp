@@ -144,16 +144,46 @@ void CheckAttributes(const odiK_AttributeInputs& inputs, RecordWalk& walk, const
     }
 }
 
+void CheckSets(const std::vector<cow_CountedHld<odiK_Set>>& sets, RecordWalk& walk, const fnd_Path& owner) {
+    const fnd_Path path(owner, "sets");
+    for (std::size_t i = 0; i < sets.size(); ++i) {
+        const fnd_Path set(path, i);
+        walk.Name(sets[i]->name, fnd_Path(set, "name"));
+    }
+}
+
+void CheckMesh(const cow_CountedHld<odiK_Mesh>& mesh, RecordWalk& walk, const fnd_Path& owner) {
+    if (mesh.IsNull()) return;
+    const fnd_Path path(owner, "mesh");
+    const fnd_Path elements(path, "elements");
+    for (std::size_t i = 0; i < mesh->Classes().size(); ++i) {
+        const fnd_Path each(elements, i);
+        walk.Name(mesh->Classes()[i].type, fnd_Path(each, "type"));
+    }
+    CheckSets(mesh->Sets(), walk, path);
+}
+
 void CheckParts(const odiK_Model& model, RecordWalk& walk, const fnd_Path& place) {
     const fnd_Path parts(place, "parts");
     for (const auto& [name, part] : model.Parts()) {
         const fnd_Path each(parts, name.View());
         walk.Name(name, each);
+        CheckMesh(part->mesh, walk, each);
         CheckAttributes(part->attributes, walk, each);
     }
     const fnd_Path assembly(place, "assembly");
     const fnd_Path instances(assembly, "instances");
-    for (const auto& [name, instance] : model.Instances()) walk.Name(name, fnd_Path(instances, name.View()));
+    for (const auto& [name, instance] : model.Instances()) {
+        const fnd_Path each(instances, name.View());
+        walk.Name(name, each);
+        CheckMesh(instance->ownMesh, walk, each);
+    }
+    walk.Record(model.AssemblyObject(), assembly);
+    CheckMesh(model.ConstAssemblyMesh(), walk, assembly);
+    CheckSets(model.AssemblySets(), walk, assembly);
+    const fnd_Path datums(place, "datums");
+    for (std::size_t i = 0; i < model.Datums().size(); ++i)
+        walk.Record(model.Datums()[i], fnd_Path(datums, i));
 }
 
 void CheckSteps(const odiK_Model& model, RecordWalk& walk, const fnd_Path& place, fnd_Sink& sink) {

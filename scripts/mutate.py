@@ -162,11 +162,11 @@ def take_sample(count, seed):
     return mutants[:count]
 
 
-def run(program, number, timeout=300):
+def run(program, number, *arguments, timeout=300):
     """Whether the program fails with the mutant awake."""
     environment = {**os.environ, "QRX_MUTANT": str(number)}
     try:
-        return subprocess.run([program, "--gtest_brief=1", "--gtest_fail_fast"], cwd=program.parent, env=environment,
+        return subprocess.run([program, "--gtest_brief=1", "--gtest_fail_fast", *arguments], cwd=program.parent, env=environment,
                               stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL, timeout=timeout).returncode != 0
     except subprocess.TimeoutExpired:
         return True
@@ -201,7 +201,10 @@ def main():
     killers = {}
     living = []
     for number, name, line, description in mutants:
-        killer = next((program.name for program in [decks, *others] if run(program, number)), None)
+        # Of the six ways of each deck the plain one sees nearly all.
+        plainly = run(decks, number, "--gtest_filter=*Plainly*")
+        killer = decks.name if plainly else next(
+            (program.name for program in [decks, *others] if run(program, number)), None)
         if killer is None:
             living.append(f"{name}:{line}: {description}")
             print("lives:", living[-1], flush=True)

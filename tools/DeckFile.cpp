@@ -14,7 +14,7 @@
 #include <fcntl.h>
 #include <sys/file.h>
 #include <unistd.h>
-#if __has_include(<sys/xattr.h>)
+#ifdef __linux__
 #include <sys/xattr.h>
 #endif
 
@@ -53,6 +53,18 @@ std::string FolderOf(const std::string& path) {
     return folder.empty() ? "." : folder;
 }
 
+/// Whether somebody else may have put the link there to lead us astray: in a folder where all may write, only
+/// the user's own links and those of the folder's owner are followed, as the kernel does.
+bool IsForeign(const std::filesystem::path& link, const DeckFileSystem& system) {
+    struct stat found = {};
+    struct stat folder = {};
+    const std::string here = FolderOf(link.string()) + "/.";
+    if (ErrorOf([&] { return system.inspect(AT_FDCWD, link.c_str(), &found); }) != 0) return false;
+    if (ErrorOf([&] { return system.inspect(AT_FDCWD, here.c_str(), &folder); }) != 0) return false;
+    const bool isOpenToAll = (folder.st_mode & S_ISVTX) != 0 && (folder.st_mode & S_IWOTH) != 0;
+    return isOpenToAll && found.st_uid != ::geteuid() && found.st_uid != folder.st_uid;
+}
+
 /// The path at the end of the chain of links that begins at the path; there may be nothing there.
 std::string EndOfLinks(const std::string& path, const DeckFileSystem& system) {
     constexpr int longestChain = 40;
@@ -64,6 +76,10 @@ std::string EndOfLinks(const std::string& path, const DeckFileSystem& system) {
             [&] { return static_cast<int>(length = system.readlink(end.c_str(), target, sizeof target)); });
         // No link; what else may be wrong with it shows when it is looked at.
         if (error != 0) return end.string();
+        if (IsForeign(end, system)) {
+            throw DeckFileError("the link in its place is another user's, in a folder where all may write",
+                                EACCES);
+        }
         const std::filesystem::path next(std::string(target, static_cast<std::size_t>(length)));
         end = next.is_absolute() ? next : end.parent_path() / next;
     }
@@ -99,7 +115,7 @@ std::optional<struct stat> FindOld(int folder, const std::string& name, const De
 
 /// Gives the new file the access control list of the old one; false when it has one that can't be given.
 bool CopyAccessList(int file, const std::string& old) {
-#if __has_include(<sys/xattr.h>)
+#ifdef __linux__
     constexpr const char* list = "system.posix_acl_access";
     const ssize_t size = ::lgetxattr(old.c_str(), list, nullptr, 0);
     if (size <= 0) return true;

@@ -57,6 +57,35 @@ TEST(Check, StoreFilledInMemory_IsHeldAgainstTheRulesOfModelFiles) {
             "step-times /steps/1/initialInc: found 2.0, expected timePeriod (1.0) or less"}));
 }
 
+TEST(Check, NamesOfAStore_AreHeldAgainstTheRulesOfNames) {
+    TestStore store;
+    odiK_Part& part = store.model.AddPart("P\n*PART");
+    part.mesh.Reset(new odiK_Mesh());
+    part.mesh->SetNodes({1}, {0, 0, 0});
+    part.mesh->AddElements("MASS\n*STEP", {1}, 1, {1});
+    part.mesh->AddNodeSet("N\n*SET", {1});
+    store.model.AddInstance("I\n*INSTANCE", "P\n*PART");
+    const int labels[] = {1};
+    const odiK_MemberInput members[] = {{"I\n*INSTANCE", labels, {}}};
+    store.model.AddAssemblySet("A\n*SET", res_SetTypeEnm::NODES, members);
+    store.model.AssemblyObject().name = "A\n*ASSEMBLY";
+    odiK_Datum datum;
+    datum.name = "D\n*DATUM";
+    store.model.AddDatum(datum);
+    Texts places;
+    for (const std::string& found : Found(store.odb)) {
+        if (found.starts_with("name-in-deck")) places.push_back(found.substr(0, found.find(": ")));
+    }
+    const Texts expected = {"name-in-deck /parts/P\n*PART",
+                            "name-in-deck /parts/P\n*PART/mesh/elements/0/type",
+                            "name-in-deck /parts/P\n*PART/mesh/sets/0/name",
+                            "name-in-deck /assembly/instances/I\n*INSTANCE",
+                            "name-in-deck /assembly/name",
+                            "name-in-deck /assembly/sets/0/name",
+                            "name-in-deck /datums/0/name"};
+    EXPECT_EQ(places, expected);
+}
+
 TEST(Check, InitialStepInAnotherPlaceThanTheFirst_IsAnError) {
     TestStore store;
     store.model.steps.Append("Pull", kprC_StaticStep());

@@ -290,6 +290,26 @@ TEST_F(DeckFileTest, LinksInARing_AreRefused) {
     EXPECT_EQ(error_, ELOOP);
 }
 
+TEST_F(DeckFileTest, LinkOfAnotherUserWhereAllMayWrite_IsNotFollowed) {
+    folder_.Put("precious", kOldDeck);
+    std::filesystem::create_symlink("precious", folder_.Path("job.inp"));
+    static bool isSticky = false;
+    DeckFileSystem files = Real();
+    files.inspect = [](int at, const char* name, struct stat* found) {
+        const int result = Real().inspect(at, name, found);
+        if (S_ISLNK(found->st_mode)) found->st_uid = 4711;
+        if (S_ISDIR(found->st_mode)) found->st_mode |= isSticky ? 01002 : 0;
+        return result;
+    };
+    isSticky = true;
+    EXPECT_FALSE(Write(files, realDevice));
+    EXPECT_EQ(error_, EACCES);
+    EXPECT_EQ(folder_.Text("precious"), kOldDeck);
+    isSticky = false;
+    EXPECT_TRUE(Write(files, realDevice));
+    EXPECT_EQ(folder_.Text("precious"), WholeDeck());
+}
+
 TEST_F(DeckFileTest, OtherHardLinks_KeepTheOldDeck) {
     folder_.Put("job.inp", kOldDeck);
     std::filesystem::create_hard_link(folder_.Path("job.inp"), folder_.Path("other"));
