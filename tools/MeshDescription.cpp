@@ -1,6 +1,7 @@
 #include "tools/MeshDescription.h"
 
 #include "foundation/mq_MeshQuality.h"
+#include "store_interface/findings/fnd_Text.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
@@ -82,7 +83,7 @@ ordered_json DescribeMeshFile(const msf_Mesh& mesh, const mq_Quality& quality) {
 }
 
 std::string TextOfMeshFile(const std::string& path, const ordered_json& mesh) {
-    std::string text = path + ": " + mesh["format"].get<std::string>() + "\n  " +
+    std::string text = fnd_Visible(path) + ": " + mesh["format"].get<std::string>() + "\n  " +
                        std::to_string(mesh["nodes"].get<long long>()) + " nodes, from " +
                        PointText(mesh["box"]["min"]) + " to " + PointText(mesh["box"]["max"]) + "\n";
     constexpr const char* kSizeWords[] = {"", "length ", "area ", "volume "};
@@ -98,7 +99,8 @@ std::string TextOfMeshFile(const std::string& path, const ordered_json& mesh) {
     TextTable groups;
     for (const ordered_json& group : mesh["groups"]) {
         const auto count = group["cells"].get<long long>();
-        groups.Row({kDimensionWords[group["dimension"].get<std::size_t>()], group["name"],
+        groups.Row({kDimensionWords[group["dimension"].get<std::size_t>()],
+                    fnd_Visible(group["name"].get<std::string>()),
                     count > 0 ? std::to_string(count) + " cells"
                               : std::to_string(group["nodes"].get<long long>()) + " nodes",
                     sizeText(group)});
@@ -130,13 +132,13 @@ ordered_json DescribeOrigins(const std::list<mdf_MeshOrigin>& origins) {
 std::string TextOfOrigins(const ordered_json& origins) {
     std::string text = "mesh files\n";
     for (const ordered_json& origin : origins) {
-        text += "  " + origin["file"].get<std::string>() + " (" + origin["format"].get<std::string>() +
-                "), for " + origin["pointer"].get<std::string>() + "\n";
+        text += "  " + fnd_Visible(origin["file"].get<std::string>()) + " (" +
+                origin["format"].get<std::string>() + "), for " + origin["pointer"].get<std::string>() + "\n";
         TextTable sets;
         for (const ordered_json& set : origin["sets"]) {
             const std::string group = set["group"];
-            const std::string from =
-                std::string(kDimensionWords[set["dimension"].get<std::size_t>()]) + " group '" + group + "'";
+            const std::string from = std::string(kDimensionWords[set["dimension"].get<std::size_t>()]) +
+                                     " group '" + fnd_Visible(group) + "'";
             sets.Row({set["name"],
                       set["kind"].get<std::string>() == "surface" ? "surface"
                                                                   : set["kind"].get<std::string>() + " set",

@@ -12,7 +12,7 @@ import sys
 
 from check_layers import DECK_WRITER
 
-FOLDERS = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "model_file"]
+FOLDERS = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "mesh_file", "model_file"]
 
 
 def headers(root):
