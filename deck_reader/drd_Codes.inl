@@ -7,6 +7,7 @@
 {"quote-left-open", drd_SeverityEnm::ERROR, "a double quote has no partner on its line"},
 {"data-before-keyword", drd_SeverityEnm::ERROR, "data stand before the first keyword"},
 {"keyword-without-name", drd_SeverityEnm::ERROR, "a keyword line has no keyword"},
+{"parameter-without-name", drd_SeverityEnm::ERROR, "a parameter of a keyword line has no name"},
 {"keyword-left-open", drd_SeverityEnm::WARNING, "a keyword line ends with a comma, and no parameter follows"},
 {"comma-ahead", drd_SeverityEnm::WARNING, "a keyword line goes on with a comma at the head of the next line"},
 {"line-over-limit", drd_SeverityEnm::WARNING, "a line is longer than the language allows"},

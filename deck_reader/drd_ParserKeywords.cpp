@@ -98,6 +98,9 @@ bool drd_Parser::ParseHeader(std::string_view header, drd_Keyword& keyword) {
         drd_Parameter parameter;
         parameter.name.assign(drd_Trim(field.substr(0, equals)));
         parameter.key = drd_FoldKey(parameter.name);
+        if (parameter.key.empty()) {
+            findings_.Add("parameter-without-name", keyword.place, drd_Shown(field), "NAME=value");
+        }
         parameter.hasValue = equals != std::string_view::npos;
         if (parameter.hasValue) parameter.value.assign(drd_Trim(field.substr(equals + 1)));
         keyword.parameters.push_back(std::move(parameter));

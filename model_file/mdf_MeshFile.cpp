@@ -1,6 +1,7 @@
 #include "model_file/mdf_MeshFile.h"
 
 #include "mesh_file/msf_MeshFile.h"
+#include "model_file/mdf_DeckMesh.h"
 #include "model_file/mdf_MeshImport.h"
 
 #include <cmath>
@@ -18,6 +19,20 @@ bool mdf_MeshFileReader::Read(odiK_Mesh& mesh, const mdf_Value& json, const fnd_
     mdf_MeshFileRequest request;
     if (!ReadRequest(request, json, path)) return false;
     const fnd_Path place(path, "file");
+    if (mdf_DeckMesh::IsDeck(request.path)) {
+        std::error_code error;
+        if (!std::filesystem::is_regular_file(request.path, error)) {
+            diagnostics_.Add("unreadable-file", place, request.path + ": there is no such file");
+            diagnostics_.SetUnreadable();
+            return false;
+        }
+        mdf_MeshOrigin& origin = diagnostics_.AddMeshOrigin();
+        origin.place = path.Text();
+        origin.given = json;
+        origin.path = request.path;
+        fnd_Below problems(diagnostics_, path);
+        return mdf_DeckMesh(request, origin, problems).Fill(mesh);
+    }
     msf_Mesh source;
     msf_Problem problem;
     if (!msf_ReadMeshFile(request.path, request.options, source, problem)) {

@@ -17,16 +17,16 @@ using nlohmann::ordered_json;
 namespace {
 
 /// A fresh folder that goes with the object.
-class ScratchFolder {
+class TemporaryDeck {
 public:
-    ScratchFolder() {
+    TemporaryDeck() {
         std::error_code error;
         path_ = std::filesystem::temp_directory_path(error).string() + "/qrxdeck-XXXXXX";
         made_ = ::mkdtemp(path_.data()) != nullptr;
     }
-    ScratchFolder(const ScratchFolder&) = delete;
-    ScratchFolder& operator=(const ScratchFolder&) = delete;
-    ~ScratchFolder() {
+    TemporaryDeck(const TemporaryDeck&) = delete;
+    TemporaryDeck& operator=(const TemporaryDeck&) = delete;
+    ~TemporaryDeck() {
         std::error_code error;
         if (made_) std::filesystem::remove_all(path_, error);
     }
@@ -47,7 +47,7 @@ bool ReadDeckOfModel(const std::string& path, drd_Deck& deck, RunReport& report)
         report.AddAll(found);
         return false;
     }
-    const ScratchFolder folder;
+    const TemporaryDeck folder;
     if (!folder.IsMade()) {
         report.Error(path, "no folder can be made for its deck");
         return false;

@@ -20,7 +20,7 @@ ALLOWED = {
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "mesh_file": ["foundation"],
     "deck_reader": ["foundation"],
-    "model_file": ["foundation", "store_interface", "mesh_file"],
+    "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
     "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page"],
 }
