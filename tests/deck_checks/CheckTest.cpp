@@ -49,6 +49,7 @@ TEST(Check, StoreFilledInMemory_IsHeldAgainstTheRulesOfModelFiles) {
     EXPECT_EQ(
         Found(store.odb),
         (Texts{
+            "empty-material /materials/Steel: found no option, expected one at least",
             "no-such-name /sections/Solid/materialName: found 'Stell', expected the name of a material; did "
             "you mean 'Steel'?",
             "name-in-deck /amplitudes/a \"name\": found a name with a double quote, expected a name that can "

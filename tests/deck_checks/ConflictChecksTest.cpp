@@ -46,8 +46,8 @@ TEST(ConflictChecks, EqualValuesOtherNodesOrOtherComponents_AreNone) {
 }
 
 TEST(ConflictChecks, ConditionThatHasEnded_IsNoConflict) {
-    EXPECT_EQ(Found(Conditions(Moved("A", "N12", R"("Step-1": {"u1": 0}, "Step-2": "inactive")") + ", " +
-                               Moved("B", "N2", R"("Step-2": {"u1": 1})"))),
+    EXPECT_EQ(Found(Conditions(Moved("A", "N12", R"("Step-1": {"u1": 0}, "Step-2": {"deactivated": true})") +
+                               ", " + Moved("B", "N2", R"("Step-2": {"u1": 1})"))),
               Texts{});
 }
 

@@ -6,9 +6,10 @@ const std::string kPlace = "/constraints/A~1B";
 
 Texts Found(const std::string& className, const std::string& members, const std::string& model = "",
             const std::vector<std::string>& procedures = {}) {
-    return FindingsIn(StepsOf(procedures) + R"(, "constraints": {"A/B": {"class": ")" + className + "\", " +
-                          members + "}}" + model,
-                      "/constraints");
+    return FindingsOf<dck_CheckConstraints>(ShellModel(StepsOf(procedures) +
+                                                       R"(, "constraints": {"A/B": {"class": ")" + className +
+                                                       "\", " + members + "}}" + model),
+                                            "/constraints");
 }
 
 std::string Wrong(const std::string& member, const std::string& set, const std::string& kind,

@@ -56,10 +56,10 @@ inline Texts DeckFindings(const std::string& members, const std::string& place =
         members, place);
 }
 
-/// The same in a model of an instance I of one shell with the node set N, the element set E and the surface
+/// The members of a model with an instance I of one shell, the node set N, the element set E and the surface
 /// S; its steps are among the members.
-inline Texts FindingsIn(const std::string& members, const std::string& place) {
-    return DeckFindings(R"(
+inline std::string ShellModel(const std::string& members) {
+    return R"(
         "parts": {"P": {"mesh": {
             "nodes": {"labels": [1, 2, 3], "coordinates": [[0, 0, 0], [1, 0, 0], [0, 1, 0]]},
             "elements": [{"type": "S3", "labels": [1], "connectivity": [[1, 2, 3]]}],
@@ -67,8 +67,12 @@ inline Texts FindingsIn(const std::string& members, const std::string& place) {
                      {"name": "E", "kind": "element", "labels": [1]},
                      {"name": "S", "kind": "surface", "facets": [[1, "SPOS"]]}]}}},
         "assembly": {"instances": {"I": {"part": "P"}}}, )" +
-                            members,
-                        place);
+           members;
+}
+
+/// What all checks find in it.
+inline Texts FindingsIn(const std::string& members, const std::string& place) {
+    return DeckFindings(ShellModel(members), place);
 }
 
 /// The steps of a model: the initial one, then "Step-1" and so on of these procedures, each with further

@@ -39,8 +39,9 @@ TEST(LossChecks, NodesOfTheAssembly_AreNamedWithTheirSets) {
     EXPECT_EQ(
         Found(R"("assembly": {"mesh": {"nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]}},
                   "sets": [{"name": "RP", "kind": "node", "members": [{"labels": [2]}]}]})"),
-        Texts{"/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
-              "'RP'; make each a part of one node, and an instance of it"});
+        (Texts{"/assembly: nothing uses 1 of the sets: RP",
+               "/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
+               "'RP'; make each a part of one node, and an instance of it"}));
 }
 
 TEST(LossChecks, SetsThatNothingNames_AreCountedByMesh) {

@@ -49,7 +49,7 @@ TEST(StateChecks, OutputIntervalsOfAnotherType_DoNotCount) {
     EXPECT_EQ(Found(R"("fieldOutputRequests": {"O": {"states": {
                   "Step-1": {"timeInterval": 0.1, "frequencyType": "FREQUENCY", "frequency": 2}}}})"),
               Texts{"/fieldOutputRequests/O/states/Step-1/timeInterval: found a value, and frequencyType is "
-                    "frequency, so it doesn't count"});
+                    "FREQUENCY, so it doesn't count"});
     EXPECT_EQ(Found(R"("fieldOutputRequests": {"O": {"states": {
                   "Step-1": {"timeInterval": 0.1, "frequencyType": "TIME_INTERVAL"}}}})"),
               Texts{});

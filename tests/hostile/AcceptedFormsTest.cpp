@@ -216,13 +216,6 @@ TEST(AcceptedForms, UnknownElementType_IsWarnedOf) {
             "element"});
 }
 
-TEST(AcceptedForms, AssemblyNodes_AreWarnedOfWithTheirCount) {
-    EXPECT_EQ(
-        Findings(Model(
-            R"("assembly": {"mesh": {"nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]}}})")),
-        Lines{"warning @/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck"});
-}
-
 TEST(AcceptedForms, IdleSector_IsWarnedOfAndNullIsNone) {
     EXPECT_EQ(Findings(Model(R"("cyclicSymmetry": {"numberOfSectors": 4})")),
               Lines{"warning @/cyclicSymmetry: the sector definition is idle, since symmetryType is NONE"});

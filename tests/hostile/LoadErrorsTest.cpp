@@ -68,7 +68,7 @@ const FindingCase loadCases[] = {
      {"warning @/loads/L/dof: found 0, expected 11 or more"}},
     {"AmplitudeThatIsNotThere",
      Load("Moment", R"("states": {"S": {"amplitude": "A"}})"),
-     {"@/loads/L/states/S/amplitude: found 'A', expected the name of an amplitude"}},
+     {"@/loads/L/states/S/amplitude: found 'A', expected the name of an amplitude; there is none"}},
     {"TemperatureOfANamedField",
      Field("Temperature", R"("distributionType": "FIELD")"),
      {"warning @/fields/F/distributionType: found FIELD, which fields of this class have no form for"}},

@@ -286,7 +286,9 @@ const FindingCase meshCases[] = {
      {"@/assembly/mesh/sets: found sets, expected them in the member \"sets\" of the assembly"}},
     {"EndInNoInstance",
      Connector(R"("I.1", "K.2")"),
-     {"@/assembly/mesh/elements/0/connectivity/0/1: found instance 'K', expected the name of an instance"}},
+     {"@/assembly/mesh/elements/0/connectivity/0/1: found instance 'K', expected the name of an instance; "
+      "there are 'E', "
+      "'I', 'J'"}},
     {"EndInAnEntryThatIsNoInstance",
      Connector(R"("I.1", "E.2")"),
      {"@/assembly/mesh/elements/0/connectivity/0/1: found 'E', which is no part instance, expected one"}},
@@ -315,7 +317,9 @@ const FindingCase meshCases[] = {
 
     {"AssemblySetInNoInstance",
      AssemblySet(R"({"instance": "K", "labels": [1]})"),
-     {"@/assembly/sets/0/members/0/instance: found instance 'K', expected the name of an instance"}},
+     {"@/assembly/sets/0/members/0/instance: found instance 'K', expected the name of an instance; there are "
+      "'E', "
+      "'I', 'J'"}},
     {"AssemblySetInstanceNull",
      AssemblySet(R"({"instance": null, "labels": [1]})"),
      {"@/assembly/sets/0/members/0/instance: found null, expected the name of an instance"}},

@@ -55,7 +55,8 @@ const FindingCase referenceCases[] = {
       "you mean 'WIRES'?"}},
     {"RegionOfNoInstance",
      Region(R"("K.ALL")"),
-     {"@/assembly/sectionAssignments/0/region: found instance 'K', expected the name of an instance"}},
+     {"@/assembly/sectionAssignments/0/region: found instance 'K', expected the name of an instance; there "
+      "are 'E', 'I', 'J'"}},
     {"RegionOfNoInstanceSet",
      Region(R"("I.AL")"),
      {"@/assembly/sectionAssignments/0/region: found set 'AL', expected the name of a set of instance 'I'; "

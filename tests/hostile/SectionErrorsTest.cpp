@@ -6,9 +6,10 @@ class SectionErrors : public testing::TestWithParam<FindingCase> {};
 
 /// A model with a material M, a profile P and a section S of these.
 std::string Section(const std::string& className, const std::string& members) {
-    return Model(R"("materials": {"M": {}}, "beamProfiles": {"P": {"class": "kbpC_CircularProfile", "r": 1}},
+    return Model(
+        R"("materials": {"M": {"damping": {}}}, "beamProfiles": {"P": {"class": "kbpC_CircularProfile", "r": 1}},
                     "sections": {"S": {"class": "kseC_)" +
-                 className + "\", " + members + "}}");
+        className + "\", " + members + "}}");
 }
 
 std::string GeneralBeam(const std::string& members) {
@@ -58,10 +59,16 @@ const FindingCase sectionCases[] = {
       "shear modulus, 2147483646 field variables"}},
     {"BeamDependenciesNegative",
      GeneralBeam(R"("dependencies": -1)"),
-     {"@/sections/S/dependencies: found -1, expected 0 or more"}},
+     {"@/sections/S/dependencies: found -1, expected 0 or more",
+      "warning @/sections/S/materialTable: found no row, expected Young's modulus, torsional shear modulus: "
+      "a "
+      "section integrated before the analysis takes no others"}},
     {"SectionPointsOfThreeColumns",
      GeneralBeam(R"("sectionPoints": [[1, 2, 3]])"),
-     {"@/sections/S/sectionPoints: found rows of 3, expected rows of 2: x, y"}},
+     {"@/sections/S/sectionPoints: found rows of 3, expected rows of 2: x, y",
+      "warning @/sections/S/materialTable: found no row, expected Young's modulus, torsional shear modulus: "
+      "a "
+      "section integrated before the analysis takes no others"}},
     {"IntegratedBeamWithoutMaterial",
      Section("BeamSection", R"("profileName": "P")"),
      {"@/sections/S/materialName: found nothing, expected the material of a section integrated during the "
@@ -71,7 +78,7 @@ const FindingCase sectionCases[] = {
      {"@/sections/S/profileName: found nothing, expected key in the model's profile map"}},
     {"BeamOfUnknownProfile",
      Section("BeamSection", R"("materialName": "M", "profileName": "Q")"),
-     {"@/sections/S/profileName: found 'Q', expected the name of a profile"}},
+     {"@/sections/S/profileName: found 'Q', expected the name of a profile; there is 'P'"}},
 
     {"ArbitraryProfileOfTwoColumns",
      ArbitraryProfile(R"(, "table": [[0, 0], [1, 0]])"),
@@ -116,8 +123,8 @@ const FindingCase sectionCases[] = {
       "@/interactions/A/variables: found -2, expected 0 or more"}},
 
     // What decks can carry, however odd, is nobody's business here.
-    {"OddValuesPass",
-     Model(R"("materials": {"M": {}}, "beamProfiles": {
+    {"OddValues_AreWarnedOfAndPass",
+     Model(R"("materials": {"M": {"damping": {}}}, "beamProfiles": {
                 "P": {"class": "kbpC_ArbitraryProfile", "table": [[0, 0, 0], [0, 0, 0]]},
                 "I": {"class": "kbpC_IbeamProfile"}, "G": {"class": "kbpC_GeneralizedProfile"}},
               "sections": {
@@ -130,7 +137,17 @@ const FindingCase sectionCases[] = {
                           "integrationPoints": 0, "thicknessModulus": -1, "rebars": {}},
                 "Truss": {"class": "kseC_TrussSection", "area": 0, "materialName": "M"},
                 "Point": {"class": "kseC_PointSection", "mass": -1}})"),
-     {}},
+     {"warning @/sections/General/materialTable: found no row, expected Young's modulus, torsional shear "
+      "modulus, the cell of temperatureDependency: a section integrated before the analysis takes no others",
+      "warning @/sections/Shell/thickness: found -1.0, expected more than 0",
+      "warning @/sections/Truss/area: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/h: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/b1: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/b2: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/t1: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/t2: found 0.0, expected more than 0",
+      "warning @/beamProfiles/I/t3: found 0.0, expected more than 0",
+      "warning @/beamProfiles/G/area: found 0.0, expected more than 0"}},
 };
 
 } // namespace

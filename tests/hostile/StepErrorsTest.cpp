@@ -180,10 +180,12 @@ const FindingCase stepCases[] = {
     {"ResidualSetOfNothing",
      Step("FrequencyStep", R"("residualModeSets": ["I.NODE", "NODES"])"),
      {"@/steps/1/residualModeSets/0: found 'I.NODE', expected the name of a set; did you mean 'I.NODES'?",
-      "@/steps/1/residualModeSets/1: found 'NODES', expected the name of a set"}},
+      "@/steps/1/residualModeSets/1: found 'NODES', expected the name of a set; there are 'E.ALL', "
+      "'E.NODES', 'E.TOP', 'E.A.B', 'I.ALL', 'I.NODES', 'I.TOP', 'I.A.B', 'J.ALL', 'J.NODES', ..."}},
     {"SpectrumOfNothing",
      Step("ResponseSpectrumStep", R"("components": [{"spectrumName": "quake"}])"),
-     {"@/steps/1/components/0/spectrumName: found 'quake', expected the name of an amplitude"}},
+     {"@/steps/1/components/0/spectrumName: found 'quake', expected the name of an amplitude; there is "
+      "none"}},
     {"FrequenciesTheWrongWayRound",
      Step("SteadyStateDirectStep", R"("frequencies": [{"lower": 2, "upper": 1}, {"lower": 1, "upper": 2}])"),
      {"warning @/steps/1/frequencies/0/lower: found 2.0, expected upper (1.0) or less"}},

@@ -149,7 +149,7 @@ const FindingCase cases[] = {
     {"DescriptionWithAComment", StepsWith("pull\\n** it"), {}},
     {"SetOfAnInstanceInQuotes",
      SetsOf(R"("\"A.B\".N", "A.B.N", "\"A.B\".x")"),
-     {"@/steps/1/residualModeSets/2: found '\"A.B\".x', expected the name of a set"}},
+     {"@/steps/1/residualModeSets/2: found '\"A.B\".x', expected the name of a set; there is 'A.B.N'"}},
     {"ElementType",
      Mesh(R"("nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
              "elements": [{"type": "MASS\n*STEP", "labels": [1], "connectivity": [[1]]}])"),

@@ -19,6 +19,7 @@ cow_String oif_FirstInteraction(const cow_List<cow_String>& interactions);
 /// and what the procedure doesn't allow is replaced by what it usually gets.
 class oif_OutputCollector {
 public:
+    /// The model must outlive it.
     explicit oif_OutputCollector(const oif_Model& model);
 
     /// Whether the step can be written so often.
@@ -48,7 +49,7 @@ private:
     static void Merge(const Request& request, const cow_String& name, Channel& channel,
                       cow_List<cow_String>& names);
 
-    oif_Model model_;
+    const oif_Model& model_;
     cow_List<cow_String> remeshingSteps_;
     bool hasSimBasedStep_ = false;
 };

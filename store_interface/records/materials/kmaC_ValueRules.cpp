@@ -73,6 +73,7 @@ const Law* LawOf(const kmaC_MaterialOption& option) {
 /// The table's columns of data, without temperature and field variables.
 template <class Option>
 long long DataColumns(const Option& option) {
+    if (option.dependencies < 0) return 0; // told already
     return static_cast<long long>(option.table.NumColumns()) - (option.temperatureDependency ? 1 : 0) -
            option.dependencies;
 }
