@@ -65,7 +65,10 @@ std::int64_t drd_LabelIndex::Find(int label) const {
 namespace {
 
 std::string KeyOf(drd_KindEnm kind, int block, std::string_view folded) {
-    std::string key = std::to_string(static_cast<int>(kind)) + "/" + std::to_string(block) + "/";
+    std::string key;
+    key.reserve(1 + sizeof block + folded.size());
+    key.push_back(static_cast<char>(kind));
+    key.append(reinterpret_cast<const char*>(&block), sizeof block);
     return key.append(folded);
 }
 

@@ -84,8 +84,10 @@ TEST(DeckCheck, ReferencesThatLeadNowhere) {
     EXPECT_EQ(CodesWith("material=Steel", "material=Steel, orientation=O"), Strings({"undefined-name:15"}));
     EXPECT_EQ(CodesWith("part=P", "part=Q"),
               Strings({"undefined-name:19", "undefined-set:31", "undefined-set:32"}));
-    EXPECT_EQ(CodesBehind("*Static\n1., 1.\n", "*Sfilm\nI-1.FACE, F, 1., 2.\n"), Strings({"undefined-surface:31"}));
-    EXPECT_EQ(CodesBehind("*Static\n1., 1.\n", "*Sfilm\nI-1.END, F, 1., Oil\n"), Strings({"undefined-name:31"}));
+    EXPECT_EQ(CodesBehind("*Static\n1., 1.\n", "*Sfilm\nI-1.FACE, F, 1., 2.\n"),
+              Strings({"undefined-surface:31"}));
+    EXPECT_EQ(CodesBehind("*Static\n1., 1.\n", "*Sfilm\nI-1.END, F, 1., Oil\n"),
+              Strings({"undefined-name:31"}));
     EXPECT_EQ(CodesBehind("*Static\n1., 1.\n", "*Contact Pair, interaction=Dry\nI-1.END, I-1.END\n"),
               Strings({"undefined-name:30"}));
     EXPECT_EQ(CodesWith("ALL, END2", "NONE, END2"), Strings({"undefined-set:14"}));
