@@ -8,5 +8,5 @@ scratch=$(mktemp -d)
 trap 'rm -rf "$scratch"' EXIT
 
 "$qrxdeck" view "$root/examples/bracket/bracket.json" -o "$scratch/bracket.html"
-node "$root/viewer/picture.mjs" "$scratch/bracket.html#step=Tighten&select=loads/Weight+on+the+pad" "$root/docs/view.png" 1280x760
+node "$root/viewer/picture.mjs" "$scratch/bracket.html" "$root/docs/view.png" 1280x760
 node "$root/viewer/test/browser.mjs" "$qrxdeck" "$root" --pictures "pictures of all examples"

@@ -92,7 +92,7 @@ TEST(Objects, OfLoadCases_HaveTheirLinesInEach) {
     ASSERT_EQ(card.size(), 2U);
     EXPECT_EQ(card[1]["loadCase"], "B");
     EXPECT_EQ(card[1]["text"],
-              "** Name: Push   Type: Concentrated force   Scale factor: -2.\n*Cload\nI.TIP, 1, -10.\n");
+              "** Name: Push   Type: Concentrated force   Scale factor: -2\n*Cload\nI.TIP, 1, -10.\n");
     EXPECT_EQ(page.header["steps"][1]["loadCases"], (nlohmann::json{"A", "B"}));
 }
 

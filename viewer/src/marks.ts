@@ -37,7 +37,7 @@ export const kindColours: Record<string, string> = {
 const secondTint = "#c79a00";
 
 /** So many marks show one object at most; they are spread over its region. */
-const mostMarks = 160;
+const mostMarks = 120;
 
 type Shape = "arrow" | "double" | "cone" | "bar" | "dot" | "ball" | "ring";
 
@@ -252,7 +252,7 @@ export class Marks {
                 if (value === null) return;
                 const axis = at(axes, dof % 3);
                 if (value === 0) {
-                    marks.push(this.at(place, dof < 3 ? "cone" : "bar", dof < 3 ? colour : darker, axis, this.unit * (dof < 3 ? 0.7 : 0.6)));
+                    marks.push(this.at(place, dof < 3 ? "cone" : "bar", dof < 3 ? colour : darker, axis, this.unit * 0.5));
                 } else {
                     const direction = axis.clone().multiplyScalar(Math.sign(value));
                     marks.push(this.at(place, dof < 3 ? "arrow" : "double", darker, direction, this.unit * 1.5));

@@ -66,6 +66,7 @@ const tests = {
     },
 
     async "the pictures of all examples in all steps are as they were, and one missing mark would show"(tab) {
+        if (!rewrite && !existsSync(pictures)) return "skipped: no expected pictures; scripts/make-pictures.sh makes them";
         await tab.resize(1100, 620);
         if (rewrite) mkdirSync(pictures, { recursive: true });
         let marks = 0;
@@ -166,7 +167,7 @@ const tests = {
     },
 
     async "names with markup in them stay text"(tab) {
-        const bad = "</script><img src=x onerror=document.title='broken'>";
+        const bad = "</script><img src=x onerror=broken=1>";
         const model = {
             description: bad, parts: { [bad]: { mesh: { ...cubes(1), sets: [{ name: bad, kind: "node", labels: [1, 2] }, { name: "E", kind: "element", labels: [1] }] },
                 sectionAssignments: [{ region: "E", sectionName: bad }] } },
@@ -189,7 +190,7 @@ const tests = {
         assert.deepEqual(tab.said, []);
         assert.equal(await tab.value("document.images.length"), 0);
         assert.equal(await tab.value("document.scripts.length"), 3);
-        assert.equal(await tab.value("document.title"), "markup");
+        assert.equal(await tab.value("typeof broken"), "undefined");
         for (const place of ["#steps", "#sets", "#instances", "#legend", "#facts", "#happening"]) {
             assert.ok((await tab.value(`document.querySelector('${place}').textContent`)).includes(bad), place);
         }
@@ -325,8 +326,8 @@ try {
         const tab = await browser.newPage();
         const start = performance.now();
         try {
-            await test(tab);
-            console.log(`ok      ${name} (${Math.round(performance.now() - start)} ms)`);
+            const note = await test(tab);
+            console.log(`ok      ${note === undefined ? "" : note + " - "}${name} (${Math.round(performance.now() - start)} ms)`);
         } catch (error) {
             ++failed;
             console.log(`FAILED  ${name}\n${error.stack}`);

@@ -124,7 +124,7 @@ class Tab {
         const end = Date.now() + seconds * 1000;
         while (!(await this.value(expression).catch(() => false))) {
             if (Date.now() > end) throw new Error(`${expression} didn't come true; the page said: ${this.said.join("; ")}`);
-            await new Promise((done) => setTimeout(done, 25));
+            await new Promise((done) => setTimeout(done, 50));
         }
     }
 

@@ -35,9 +35,13 @@ public:
     explicit Run(const odb_Odb& odb)
         : info_(odb.ddb().model(odb_Odb::DefaultModelName())), builder_(info_), log_(builder_.BuildLogged()) {
         const cow_String initial = info_.Model().InitialStepName();
-        for (const qkw_Filed& filed : log_) {
-            const cow_String& step = filed.step.IsEmpty() ? initial : filed.step;
-            places_[{filed.kind, filed.name, step}].push_back(&filed);
+        // A deck has the model's section ahead of the initial step's.
+        for (const bool ofModel : {true, false}) {
+            for (const qkw_Filed& filed : log_) {
+                if (filed.step.IsEmpty() != ofModel) continue;
+                const cow_String& step = ofModel ? initial : filed.step;
+                places_[{filed.kind, filed.name, step}].push_back(&filed);
+            }
         }
     }
 
