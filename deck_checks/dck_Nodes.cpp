@@ -11,9 +11,11 @@ dck_Nodes::Key KeyOf(int meshIndex, int node) {
            static_cast<std::uint32_t>(node);
 }
 
-/// The places in an element's row of the nodes that a facet takes; all of them on a shell or a line.
+/// The places in an element's row of the nodes that a face takes; none for shells and lines, whose facets are
+/// not told apart.
 std::span<const std::int8_t> NodesOfFacet(const cel_Cell& cell, const ddb_ElementShape& shape, int facet) {
-    const bool isNumbered = ddb_FaceRuleOf(shape).rule == ddb_FaceRuleEnm::NUMBERED;
+    const bool isNumbered =
+        ddb_FaceRuleOf(shape).rule == ddb_FaceRuleEnm::NUMBERED && shape.topologicalDimension > 1;
     if (!isNumbered || facet < 0 || static_cast<std::size_t>(facet) >= cell.sides.size()) return {};
     const cel_Side& side = cell.sides[static_cast<std::size_t>(facet)];
     return {side.nodes.data(), static_cast<std::size_t>(cel_CellOf(side.kind).nodes)};

@@ -38,7 +38,8 @@ struct cel_Side {
     std::array<std::int8_t, 9> nodes{};
 };
 
-/// A cell's topology; the nodes stand in the deck's order, corners first.
+/// A cell's topology; the nodes stand in the deck's order, corners first. A line3 alone stands otherwise in decks:
+/// end, middle, end.
 struct cel_Cell {
     cel_KindEnm kind = cel_KindEnm::POINT1;
     /// As mesh people call it: "tetra10", "hexahedron20", "wedge15", "quad8", "triangle6", "line3", "vertex".
