@@ -74,8 +74,8 @@ struct Actor {
     Values In(const cow_String& step) const {
         return bc != nullptr ? ValuesOf(*bc, step) : ValuesOf(*load, step);
     }
-    bool HasStep(const cow_String& step) const {
-        return bc != nullptr ? bc->HasStep(step) : load->HasStep(step);
+    const std::vector<mdl_GivenState>& GivenStates() const {
+        return bc != nullptr ? bc->GivenStates() : load->GivenStates();
     }
     std::string Where() const { return Place(bc != nullptr ? "boundaryConditions" : "loads", name); }
 };
@@ -128,11 +128,15 @@ private:
         const Actor& a = actors_[static_cast<std::size_t>(first)];
         const Actor& b = actors_[static_cast<std::size_t>(second)];
         if (a.bc == nullptr || a.datum != b.datum) return;
-        for (int i = 0; i < model_.steps.Size(); ++i) {
-            const cow_String& step = model_.steps.NameAt(i);
-            // Elsewhere nothing changes.
-            if (!a.HasStep(step) && !b.HasStep(step)) continue;
-            if (Compare(a, b, step, node)) return;
+        // Elsewhere nothing changes.
+        std::set<int> steps;
+        for (const Actor* actor : {&a, &b}) {
+            for (const mdl_GivenState& given : actor->GivenStates()) {
+                steps.insert(model_.steps.IndexOf(given.stepName));
+            }
+        }
+        for (const int step : steps) {
+            if (step >= 0 && Compare(a, b, model_.steps.NameAt(step), node)) return;
         }
     }
 

@@ -12,7 +12,9 @@
 #include "store_interface/records/steps/kprC_Predicates.h"
 #include "store_interface/records/steps/kprC_ThermalSteps.h"
 
+#include <algorithm>
 #include <set>
+#include <vector>
 
 namespace {
 
@@ -122,18 +124,19 @@ struct Elements {
     cow_String thermalType;
 };
 
-bool HasGravity(const odiK_Model& model, const cow_String& step) {
+std::vector<const kloC_Load*> GravityLoads(const odiK_Model& model) {
+    std::vector<const kloC_Load*> loads;
     for (const auto& [name, load] : model.loads) {
-        if (load.DynTypeId() != kloC_Gravity::TypeId() || load.suppressed) continue;
-        if (kloC_Load::IsActive(load.Status(step))) return true;
+        if (load.DynTypeId() == kloC_Gravity::TypeId() && !load.suppressed) loads.push_back(&load);
     }
-    return false;
+    return loads;
 }
 
 class Check {
 public:
     Check(const odiK_Model& model, fnd_Sink& sink)
-        : model_(model), sink_(sink), materials_(MaterialsInUse(model)), elements_(model) {}
+        : model_(model), sink_(sink), materials_(MaterialsInUse(model)), elements_(model),
+          gravity_(GravityLoads(model)) {}
 
     void Run() {
         bool isExplicit = false;
@@ -149,7 +152,7 @@ public:
             }
             const std::string name = "step " + Quoted(model_.steps.NameAt(i));
             CheckMaterials(NeedsOf(step), name);
-            if (!Lacks(kDensity).told && HasGravity(model_, model_.steps.NameAt(i))) {
+            if (!Lacks(kDensity).told && HasGravity(model_.steps.NameAt(i))) {
                 CheckMaterials(kDensity, "gravity in " + name);
             }
             CheckElements(NeedsOf(step), "/steps/" + std::to_string(i), name);
@@ -163,6 +166,11 @@ private:
         bool (*isThere)(const kmaC_Material& material);
         bool told = false;
     };
+
+    bool HasGravity(const cow_String& step) const {
+        return std::ranges::any_of(
+            gravity_, [&](const kloC_Load* load) { return kloC_Load::IsActive(load->Status(step)); });
+    }
 
     Property& Lacks(unsigned need) {
         for (Property& property : properties_) {
@@ -210,6 +218,7 @@ private:
     fnd_Sink& sink_;
     std::set<cow_String> materials_;
     Elements elements_;
+    std::vector<const kloC_Load*> gravity_;
     bool told_ = false;
     std::set<std::string> toldOfElements_;
     // Each is told of the first step that needs it.

@@ -1,5 +1,5 @@
-// What small files may take. The limits are far above what it takes and far below what it took when something
-// was searched for once for each of its kind.
+// Small files of many objects of one kind, which took minutes or gigabytes when something was searched for
+// once for each of them. How the time grows is measured by bench_growth.
 #include "benchmarks/GrowthModels.h"
 #include "deck/oif_Writer.h"
 #include "deck_checks/dck_Check.h"
@@ -8,22 +8,15 @@
 
 #include <gtest/gtest.h>
 
-#include <ctime>
-
 namespace {
 
 class Growth : public testing::TestWithParam<growth::Task> {};
 
-double CpuSeconds() {
-    return static_cast<double>(std::clock()) / CLOCKS_PER_SEC;
-}
-
 } // namespace
 
-TEST_P(Growth, ModelOfManyOfOneKind_TakesSeconds) {
+TEST_P(Growth, ModelOfManyOfOneKind_IsReadCheckedAndWritten) {
     const growth::Task& task = GetParam();
     const std::string text = task.text(task.count);
-    const double start = CpuSeconds();
     mdf_Report report;
     const auto odb = mdf_ReadModelText(text, "m.json", report);
     if (odb != nullptr) {
@@ -34,7 +27,6 @@ TEST_P(Growth, ModelOfManyOfOneKind_TakesSeconds) {
     } else {
         EXPECT_EQ(report.findings.size(), 50U);
     }
-    EXPECT_LT(CpuSeconds() - start, 8.0);
 }
 
 INSTANTIATE_TEST_SUITE_P(Tasks, Growth, testing::ValuesIn(growth::kTasks),

@@ -25,6 +25,10 @@ def deck_of(program, model, folder, job):
 
 def problem_of(program, model, folder):
     """What is wrong with the formatted model; None when all is well."""
+    for mesh in model.parent.glob("*.*"):
+        # Paths of mesh files are relative to the model file.
+        if mesh.suffix in (".msh", ".unv") and not (folder / mesh.name).exists():
+            (folder / mesh.name).symlink_to(mesh)
     first = run(program, "format", model, cwd=folder)
     if first.returncode == 1:
         return None if run(program, "check", model, cwd=folder).returncode == 1 else "is right but not formatted"

@@ -142,7 +142,8 @@ class MeshTest(unittest.TestCase):
     def test_examples_with_mesh_files_have_decks(self):
         for name in ["bracket/bracket", "perforated_plate/perforated_plate", "bonded_blocks/bonded_blocks"]:
             run = self.run_program("write", PROJECT / "examples" / f"{name}.json")
-            self.assertEqual((run.returncode, run.stderr), (0, ""))
+            self.assertEqual(run.returncode, 0)
+            self.assertNotRegex(run.stderr, "warning|error")
         deck = (self.folder / "bonded_blocks.inp").read_text()
         self.assertIn("*Tie, name=Bond, adjust=yes\nBLOCKS-1.ABOVE, BLOCKS-1.BELOW\n", deck)
         self.assertIn("*Elset, elset=RUBBER", deck)
