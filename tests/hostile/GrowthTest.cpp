@@ -25,7 +25,7 @@ TEST_P(Growth, ModelOfManyOfOneKind_IsReadCheckedAndWritten) {
         oif_Writer(*odb).WriteInput(device);
         EXPECT_GT(device.Text().size(), text.size() / 20);
     } else {
-        EXPECT_EQ(report.findings.size(), 50U);
+        EXPECT_GE(report.findings.size(), 50U);
     }
 }
 
