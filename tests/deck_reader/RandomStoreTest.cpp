@@ -55,12 +55,11 @@ Labels FillMesh(odiK_Mesh& mesh) {
         const char* label;
         int nodes;
     };
-    constexpr Type kTypes[] = {{"C3D8", 8}, {"C3D20", 20}, {"S4", 4},   {"T3D2", 2},
-                               {"MASS", 1}, {"U16", 16},   {"SURF3", 4}};
+    constexpr Type kTypes[] = {{"C3D8", 8}, {"C3D20", 20}, {"S4", 4}, {"T3D2", 2}, {"MASS", 1}, {"U16", 16}};
     int last = 0;
     const int classes = Upto(4);
     for (int c = 0; c < classes; ++c) {
-        const Type type = kTypes[static_cast<std::size_t>(Upto(6))];
+        const Type type = kTypes[static_cast<std::size_t>(Upto(5))];
         std::vector<int> own;
         for (int i = Upto(6); i > 0; --i) own.push_back(last += 1 + Upto(9));
         std::vector<int> nodes;
