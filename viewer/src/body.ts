@@ -127,6 +127,8 @@ class InstanceBody {
     colour(colourOf: (cell: number) => string): void {
         for (const { object } of this.drawn) {
             this.group.remove(object);
+            // The positions are all objects' and stay on the graphics card.
+            object.geometry.deleteAttribute("position");
             object.geometry.dispose();
         }
         this.drawn = [];

@@ -44,11 +44,11 @@ type Shape = "arrow" | "double" | "cone" | "bar" | "dot" | "ball" | "ring";
 /** Shapes of length 1 along y, the arrows' points at the far end. */
 function makeShapes(): Record<Shape, BufferGeometry> {
     const cone = (radius: number, height: number, base: number) => new ConeGeometry(radius, height, 12).translate(0, base + height / 2, 0);
-    const shaft = (length: number) => new CylinderGeometry(0.035, 0.035, length, 8).translate(0, length / 2, 0);
+    const shaft = (length: number) => new CylinderGeometry(0.05, 0.05, length, 8).translate(0, length / 2, 0);
     const merged = (...parts: BufferGeometry[]) => mergeGeometries(parts.map((part) => part.toNonIndexed()));
     return {
-        arrow: merged(shaft(0.75), cone(0.11, 0.3, 0.7)),
-        double: merged(shaft(0.6), cone(0.11, 0.25, 0.5), cone(0.11, 0.25, 0.75)),
+        arrow: merged(shaft(0.75), cone(0.15, 0.32, 0.68)),
+        double: merged(shaft(0.6), cone(0.15, 0.25, 0.5), cone(0.15, 0.25, 0.75)),
         // Its point is at the origin, where it holds.
         cone: new ConeGeometry(0.26, 0.6, 10).translate(0, -0.3, 0),
         bar: merged(new CylinderGeometry(0.1, 0.1, 0.9, 8), new CylinderGeometry(0.26, 0.26, 0.1, 12)),
