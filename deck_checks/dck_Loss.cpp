@@ -54,11 +54,6 @@ public:
             Add(*fields[i].type, fields[i].In(record), fields[i].refersTo);
         }
     }
-    void AddSet(const odiK_Mesh& mesh, const cow_String& name) {
-        const int set = mesh.FindSet(name);
-        if (set >= 0) sets_.insert(mesh.Sets()[static_cast<std::size_t>(set)].Referent());
-    }
-    bool Has(const odiK_Set& set) const { return sets_.count(&set) != 0; }
     bool Has(const char* kind, const cow_String& name) const {
         const auto found = names_.find(std::string_view(kind));
         return found != names_.end() && found->second.count(name) != 0;
@@ -71,11 +66,6 @@ private:
         case cls_FieldKind::String:
             if (kind != nullptr) names_[std::string(kind)].insert(*static_cast<const cow_String*>(value));
             return;
-        case cls_FieldKind::Region: {
-            const rgnC_SetData& data = static_cast<const rgnC_Region*>(value)->ConstSet().Data();
-            if (!data.IsNull()) sets_.insert(&data.Object());
-            return;
-        }
         case cls_FieldKind::List: {
             const auto& list = static_cast<const cls_ListType&>(type);
             for (int i = 0; i < list.Length(value); ++i) Add(list.ItemType(), list.Item(value, i), kind);
@@ -98,37 +88,7 @@ private:
     }
 
     std::map<std::string, std::set<cow_String>, std::less<>> names_;
-    std::set<const odiK_Set*> sets_;
 };
-
-/// What parts and instances hang on sets, and what fields name as "INSTANCE.SET".
-void AddSets(const odiK_Model& model, Uses& uses) {
-    const auto addAll = [&uses](const cow_CountedHld<odiK_Mesh>& mesh,
-                                const std::vector<odiK_AttributeInput>& inputs) {
-        for (const odiK_AttributeInput& input : inputs) {
-            if (!mesh.IsNull()) uses.AddSet(*mesh, input.setName);
-        }
-    };
-    const auto addLists = [&addAll](const cow_CountedHld<odiK_Mesh>& mesh,
-                                    const odiK_AttributeInputs& lists) {
-        addAll(mesh, lists.sectionAssignments);
-        addAll(mesh, lists.materialOrientations);
-        addAll(mesh, lists.beamOrientations);
-    };
-    for (const auto& [name, part] : model.Parts()) addLists(part->mesh, part->attributes);
-    for (const auto& [name, instance] : model.Instances()) {
-        const auto mesh = instance->Mesh();
-        if (!instance->part.IsNull()) addLists(mesh, instance->part->attributes);
-        for (const auto* own : {&instance->ownSectionAssignments, &instance->ownMaterialOrientations,
-                                &instance->ownBeamOrientations}) {
-            if (*own) addAll(mesh, **own);
-        }
-        if (mesh.IsNull()) continue;
-        for (const auto& set : mesh->Sets()) {
-            if (uses.Has("set", name + "." + set->name)) uses.AddSet(*mesh, set->name);
-        }
-    }
-}
 
 void TellUnused(const std::vector<cow_String>& names, const char* plural, const std::string& place,
                 fnd_Sink& sink) {
@@ -153,25 +113,6 @@ void FindUnused(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
         }
         TellUnused(names, repository.plural, std::string("/") + repository.member, sink);
     }
-}
-
-void FindUnusedSets(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
-    const auto tell = [&](const std::vector<cow_CountedHld<odiK_Set>>& sets, const std::string& place) {
-        std::vector<cow_String> names;
-        for (const auto& set : sets) {
-            if (!set->internal && !uses.Has(*set) && !uses.Has("set", set->name)) names.push_back(set->name);
-        }
-        TellUnused(names, "sets", place, sink);
-    };
-    for (const auto& [name, part] : model.Parts()) {
-        if (!part->mesh.IsNull()) tell(part->mesh->Sets(), Place("parts", name) + "/mesh");
-    }
-    for (const auto& [name, instance] : model.Instances()) {
-        if (!instance->ownMesh.IsNull()) {
-            tell(instance->ownMesh->Sets(), "/assembly" + Place("instances", name) + "/mesh");
-        }
-    }
-    tell(model.AssemblySets(), "/assembly");
 }
 
 void FindAssemblyNodes(const odiK_Model& model, fnd_Sink& sink) {
@@ -202,8 +143,6 @@ void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink) {
                           lost.Visit(record, given, place);
                           uses.Visit(record, given);
                       });
-    AddSets(model, uses);
     FindUnused(model, uses, sink);
-    FindUnusedSets(model, uses, sink);
     FindAssemblyNodes(model, sink);
 }

@@ -231,8 +231,10 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     fnd_List list;
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
     dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
-    dck_Rehearse(*odb, std::vector<fnd_Finding>(list.findings), list);
     for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
+    fnd_List raised;
+    dck_Rehearse(*odb, report.Foretold(), raised);
+    for (const fnd_Finding& finding : raised.findings) report.Add(model, finding);
     report.Print(fnd_Visible(model) + ": no errors\n");
     const std::vector<dck_LeftOut> leftOut =
         dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));

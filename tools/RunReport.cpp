@@ -82,6 +82,7 @@ std::string RunReport::JsonText(ExitCode code) {
 }
 
 void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
+    if (finding.code->name == "cannot-be-written") foretold_.push_back(finding);
     if (!asJson_) {
         PutError(mdf_LineOf(file, finding));
         return;

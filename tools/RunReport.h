@@ -27,6 +27,8 @@ public:
     bool AsJson() const { return asJson_; }
     void AddAll(const mdf_Report& report);
     void Add(const std::string& file, const fnd_Finding& finding);
+    /// Those of the findings so far that foretell what writing raises.
+    const std::vector<fnd_Finding>& Foretold() const { return foretold_; }
     void Error(const std::string& file, const std::string& text);
     void Warning(const std::string& file, const std::string& text);
     /// A text exactly as the deck writer raised it, and what was being written.
@@ -52,6 +54,7 @@ private:
     std::string JsonText(ExitCode code);
 
     bool asJson_;
+    std::vector<fnd_Finding> foretold_;
     bool isWritten_ = false;
     bool isOutputLost_ = false;
     std::string pending_;  // printed, not yet written

@@ -123,7 +123,7 @@ TEST(ObjectsOfSteps, Test_RunsInTheContextOfStepAndObject) {
 // The steps in which nothing changes are asked for once for all that agree in op=NEW and load cases.
 TEST(WrittenSteps, AreThoseOfAWalkOverAllSteps) {
     const auto carried = Given<AnyLoad<kPressure>>(".s........");
-    const auto changed = Given<AnyLoad<kPressure>>("..s..s.d..");
+    const auto changed = Given<AnyLoad<kPressure>>("..s..sd...");
     const auto ends = Given<AnyLoad<kPressure>>(".s..d.....");
     const auto force = Given<AnyLoad<kBodyForce>>("...s.....s");
     const char* kinds = "IGGPGGGPGG";

@@ -39,17 +39,6 @@ TEST(LossChecks, NodesOfTheAssembly_AreNamedWithTheirSets) {
     EXPECT_EQ(
         Found(R"("assembly": {"mesh": {"nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]}},
                   "sets": [{"name": "RP", "kind": "node", "members": [{"labels": [2]}]}]})"),
-        (Texts{"/assembly: nothing uses 1 of the sets: RP",
-               "/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
+        (Texts{"/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
                "'RP'; make each a part of one node, and an instance of it"}));
-}
-
-TEST(LossChecks, SetsThatNothingNames_AreCountedByMesh) {
-    EXPECT_EQ(Found(StepsOf({}) +
-                    R"(, "parts": {"P": {"mesh": {"nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
-        "sets": [{"name": "A", "kind": "node", "labels": [1]}, {"name": "B", "kind": "node", "labels": [1]},
-                 {"name": "_C", "internal": true, "kind": "node", "labels": [1]}]}}},
-        "assembly": {"instances": {"I": {"part": "P"}}},
-        "boundaryConditions": {"Held": {"class": "kbcC_TypeBC", "region": "I.B"}})"),
-              Texts{"/parts/P/mesh: nothing uses 1 of the sets: A"});
 }
