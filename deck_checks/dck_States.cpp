@@ -22,6 +22,10 @@ constexpr OutputField kOutputFields[] = {
     {"timePoints", korC_TypeEnm::TIME_POINTS},
 };
 
+/// Numbers of states that add to others, or scale what comes from elsewhere.
+constexpr std::string_view kNoComponents[] = {"shellThicknessValue", "scaleParameter", "zeroPressureHeight",
+                                              "referencePressureHeight"};
+
 /// When the points of an amplitude end; none for a curve without an end, or one that ends at zero: that is
 /// how a load is taken away.
 std::optional<double> EndOf(const kamC_Amplitude& amplitude) {
@@ -126,6 +130,8 @@ private:
         bool hasNumbers = false;
         for (std::size_t i = 0; i < fields.size(); ++i) {
             if (fields[i].type != &cls_TypeOf<mdl_PropAttr<double>>::Instance()) continue;
+            if (std::ranges::find(kNoComponents, std::string_view(fields[i].name)) != std::end(kNoComponents))
+                continue;
             hasNumbers = true;
             if (given.marks[i] != mdl_GivenEnm::ABSENT && given.marks[i] != mdl_GivenEnm::CLEARED) return;
         }

@@ -202,8 +202,8 @@ TEST_F(MeshFiles, FileThatIsWrong_IsTheOneError) {
     folder_.Put("bad.msh", "$MeshFormat\n4.1 0 8\n");
     EXPECT_EQ(
         Refused(
-            R"({"file": "bad.msh", "sets": [{"name": "X", "kind": "node", "labels": [1]}]}, "sectionAssignments": [{"region": "ALL"}])"),
-        "error /models/Default Model/parts/P/mesh/file: bad.msh: line 3: found the end of the file, expected "
+            R"({"file": "bad.msh", "sets": [{"name": "X", "kind": "node", "labels": [1]}]}, "sectionAssignments": [{"region": "ALL", "sectionName": "S"}])"),
+        "error /models/Default Model/parts/P/mesh/file: bad.msh: line 2: found the end of the file, expected "
         "$EndMeshFormat\n");
     EXPECT_FALSE(report_.unreadable);
     EXPECT_EQ(Refused(R"({"file": "none.msh"})"), "error /models/Default Model/parts/P/mesh/file: none.msh: "
