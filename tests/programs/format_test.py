@@ -6,6 +6,7 @@ usage: format_test.py QRXDECK FOLDER ...
 
 import json
 import pathlib
+import shutil
 import subprocess
 import sys
 import tempfile
@@ -28,7 +29,7 @@ def problem_of(program, model, folder):
     for mesh in model.parent.glob("*.*"):
         # Paths of mesh files are relative to the model file.
         if mesh.suffix in (".msh", ".unv") and not (folder / mesh.name).exists():
-            (folder / mesh.name).symlink_to(mesh)
+            shutil.copy(mesh, folder)
     first = run(program, "format", model, cwd=folder)
     if first.returncode == 1:
         return None if run(program, "check", model, cwd=folder).returncode == 1 else "is right but not formatted"
