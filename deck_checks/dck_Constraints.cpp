@@ -8,7 +8,7 @@
 
 namespace {
 
-const char* Wanted(oif_RegionKind kind) {
+const char* WantedRegion(oif_RegionKind kind) {
     switch (kind) {
     case oif_RegionKind::NODES: return "a node set";
     case oif_RegionKind::ELEMENTS: return "an element set";
@@ -27,12 +27,12 @@ void FindOnRegions(const kcoC_Constraint& constraint, const std::string& place, 
             if (rule.isNeeded) {
                 sink.Add("no-region", member,
                          std::string("there is none; the deck will name nothing where it needs ") +
-                             Wanted(rule.kind));
+                             WantedRegion(rule.kind));
             }
         } else if (!oif_IsOfKind(region, rule.kind)) {
             sink.Add("wrong-region", member,
                      Quoted(region.SetName()) + " is " + KindOf(region) + ", and the constraint needs " +
-                         Wanted(rule.kind));
+                         WantedRegion(rule.kind));
         }
     }
 }

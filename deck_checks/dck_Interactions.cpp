@@ -18,10 +18,10 @@ namespace {
 using Status = mdl_PropagationStatusEnm;
 
 /// What is found at one interaction.
-class Check {
+class InteractionCheck {
 public:
-    Check(const odiK_Model& model, const std::string& place, const kinC_Interaction& interaction,
-          fnd_Sink& sink)
+    InteractionCheck(const odiK_Model& model, const std::string& place, const kinC_Interaction& interaction,
+                     fnd_Sink& sink)
         : model_(model), place_(place), interaction_(interaction), sink_(sink),
           row_(oif_FindInteractionRow(interaction.DynTypeId())) {}
 
@@ -142,6 +142,6 @@ private:
 void dck_CheckInteractions(const odiK_Model& model, fnd_Sink& sink) {
     for (const auto& [name, interaction] : model.interactions) {
         if (interaction.suppressed) continue;
-        Check(model, Place("interactions", name), interaction, sink).Run();
+        InteractionCheck(model, Place("interactions", name), interaction, sink).Run();
     }
 }

@@ -10,7 +10,7 @@ namespace {
 
 using Status = mdl_PropagationStatusEnm;
 
-const char* Wanted(oif_RegionKind kind) {
+const char* ActedOn(oif_RegionKind kind) {
     return kind == oif_RegionKind::NODES      ? "nodes"
            : kind == oif_RegionKind::ELEMENTS ? "elements"
                                               : "a surface";
@@ -24,7 +24,7 @@ void FindOnRegion(const rgnC_Region& region, oif_RegionKind expected, const std:
     } else if (region.FlagWord() != static_cast<int>(expected)) {
         sink.Add("wrong-region", place + "/region",
                  "found " + Quoted(region.SetName()) + ", which is " + KindOf(region) + "; the " + what +
-                     " acts on " + Wanted(expected));
+                     " acts on " + ActedOn(expected));
     }
 }
 

@@ -94,8 +94,8 @@ std::set<cow_String> MaterialsInUse(const odiK_Model& model) {
 }
 
 /// How many elements of the instances can't take part in what kind of procedure.
-struct Elements {
-    explicit Elements(const odiK_Model& model) {
+struct ElementCounts {
+    explicit ElementCounts(const odiK_Model& model) {
         for (const auto& [name, instance] : model.Instances()) {
             const auto mesh = instance->Mesh();
             if (mesh.IsNull() || !instance->isPartInstance) continue;
@@ -132,9 +132,9 @@ std::vector<const kloC_Load*> GravityLoads(const odiK_Model& model) {
     return loads;
 }
 
-class Check {
+class ProcedureCheck {
 public:
-    Check(const odiK_Model& model, fnd_Sink& sink)
+    ProcedureCheck(const odiK_Model& model, fnd_Sink& sink)
         : model_(model), sink_(sink), materials_(MaterialsInUse(model)), elements_(model),
           gravity_(GravityLoads(model)) {}
 
@@ -217,7 +217,7 @@ private:
     const odiK_Model& model_;
     fnd_Sink& sink_;
     std::set<cow_String> materials_;
-    Elements elements_;
+    ElementCounts elements_;
     std::vector<const kloC_Load*> gravity_;
     bool told_ = false;
     std::set<std::string> toldOfElements_;
@@ -232,5 +232,5 @@ private:
 } // namespace
 
 void dck_CheckProcedures(const odiK_Model& model, fnd_Sink& sink) {
-    Check(model, sink).Run();
+    ProcedureCheck(model, sink).Run();
 }

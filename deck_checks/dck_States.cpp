@@ -45,9 +45,9 @@ std::optional<double> EndOf(const kamC_Amplitude& amplitude) {
 }
 
 /// What is found in the states that were given.
-class Check {
+class StateCheck {
 public:
-    Check(const odiK_Model& model, fnd_Sink& sink) : model_(model), sink_(sink) {
+    StateCheck(const odiK_Model& model, fnd_Sink& sink) : model_(model), sink_(sink) {
         double total = 0.0;
         for (int i = 0; i < model.steps.Size(); ++i) {
             const kprC_StepTimes times(model.steps.StepAt(i));
@@ -153,7 +153,7 @@ private:
 } // namespace
 
 void dck_CheckStates(const odiK_Model& model, fnd_Sink& sink) {
-    Check check(model, sink);
+    StateCheck check(model, sink);
     const fnd_Path root;
     for (const odiK_Repository& repository : odiK_Repositories()) {
         if (!repository.IsPropagating() || !repository.ReachesDeck()) continue;

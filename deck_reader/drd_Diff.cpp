@@ -7,8 +7,6 @@
 
 namespace {
 
-constexpr drd_Place kNowhere{-1, 0};
-
 constexpr drd_BlockEnm kKindsOfBlocks[] = {drd_BlockEnm::PART, drd_BlockEnm::ASSEMBLY, drd_BlockEnm::INSTANCE,
                                            drd_BlockEnm::STEP, drd_BlockEnm::LOAD_CASE};
 
@@ -139,11 +137,11 @@ void drd_Differ::Blocks(Pair parents, const Context& context) {
         for (const int block : match.onlyFirst) {
             const drd_Block& only = First().blocks[static_cast<std::size_t>(block)];
             Tell(drd_ChangeEnm::REMOVED, LowerWord(kind), ContextOf(context, only) + "removed",
-                 FirstKeyword(only.begin).place, kNowhere);
+                 FirstKeyword(only.begin).place, drd_Nowhere);
         }
         for (const int block : match.onlySecond) {
             const drd_Block& only = Second().blocks[static_cast<std::size_t>(block)];
-            Tell(drd_ChangeEnm::ADDED, LowerWord(kind), ContextOf(context, only) + "added", kNowhere,
+            Tell(drd_ChangeEnm::ADDED, LowerWord(kind), ContextOf(context, only) + "added", drd_Nowhere,
                  SecondKeyword(only.begin).place);
         }
         if (kind == drd_BlockEnm::STEP) StepOrder(match, context);

@@ -5,8 +5,6 @@
 
 namespace {
 
-constexpr drd_Place kNowhere{-1, 0};
-
 constexpr drd_ConditionWord kConditions[] = {
     {"boundary", "boundary condition", 3},
     {"cload", "load", 2},
@@ -116,7 +114,7 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
                  condition.line < 0 ? FirstKeyword(condition.keyword).place
                                     : First().DataPlace(FirstKeyword(condition.keyword),
                                                         static_cast<std::uint64_t>(condition.line)),
-                 kNowhere);
+                 drd_Nowhere);
             continue;
         }
         CompareCondition(condition, after[found->second.back()], word, context);
@@ -132,7 +130,7 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
                 ": " +
                 std::string(drd_Trim(Second().DataLine(keyword, static_cast<std::uint64_t>(after[i].line))));
         }
-        Tell(drd_ChangeEnm::ADDED, std::string(word.word), std::move(text), kNowhere,
+        Tell(drd_ChangeEnm::ADDED, std::string(word.word), std::move(text), drd_Nowhere,
              after[i].line < 0 ? keyword.place
                                : Second().DataPlace(keyword, static_cast<std::uint64_t>(after[i].line)));
     }

@@ -5,8 +5,6 @@
 
 namespace {
 
-constexpr drd_Place kNowhere{-1, 0};
-
 bool HasName(const drd_Keyword& keyword) {
     return keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE &&
            keyword.Find(drd_NameParameter(*keyword.row)) != nullptr;
@@ -199,11 +197,11 @@ void drd_Differ::TellLonely(const Match& match, const Context& context) {
     for (const int item : match.onlyFirst) {
         const drd_Keyword& keyword = FirstKeyword(item);
         Tell(drd_ChangeEnm::REMOVED, kindOf(keyword), context + NameOfItem(keyword) + " removed",
-             keyword.place, kNowhere);
+             keyword.place, drd_Nowhere);
     }
     for (const int item : match.onlySecond) {
         const drd_Keyword& keyword = SecondKeyword(item);
-        Tell(drd_ChangeEnm::ADDED, kindOf(keyword), context + NameOfItem(keyword) + " added", kNowhere,
+        Tell(drd_ChangeEnm::ADDED, kindOf(keyword), context + NameOfItem(keyword) + " added", drd_Nowhere,
              keyword.place);
     }
 }

@@ -7,8 +7,6 @@
 
 namespace {
 
-constexpr drd_Place kNowhere{-1, 0};
-
 /// Labels to name a few of them.
 class Few {
 public:
@@ -80,7 +78,7 @@ const drd_Mesh& MeshOr(const drd_Deck& deck, int block) {
 }
 
 drd_Place BeginOf(const std::vector<drd_PlaceRun>& runs) {
-    return runs.empty() ? kNowhere : drd_Place{runs[0].file, static_cast<long>(runs[0].line)};
+    return runs.empty() ? drd_Nowhere : drd_Place{runs[0].file, static_cast<long>(runs[0].line)};
 }
 
 } // namespace
@@ -100,8 +98,8 @@ void drd_Differ::CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pai
     Few moved;
     Few removed;
     double greatest = 0.0;
-    drd_Place firstMoved = kNowhere;
-    drd_Place secondMoved = kNowhere;
+    drd_Place firstMoved = drd_Nowhere;
+    drd_Place secondMoved = drd_Nowhere;
     std::uint64_t found = 0;
     for (std::uint64_t i = 0; i < first.nodes.Size(); ++i) {
         std::int64_t place = static_cast<std::int64_t>(i);
@@ -190,8 +188,8 @@ void drd_Differ::CompareElements(const drd_Mesh& first, const drd_Mesh& second, 
     Few retyped;
     Few rewired;
     Few removed;
-    drd_Place firstPlace = kNowhere;
-    drd_Place secondPlace = kNowhere;
+    drd_Place firstPlace = drd_Nowhere;
+    drd_Place secondPlace = drd_Nowhere;
     for (std::uint64_t i = 0; i < first.elements.Size(); ++i) {
         const std::int64_t place = index == nullptr ? -1 : index->Find(first.elements[i]);
         if (place < 0) {
@@ -278,7 +276,7 @@ void drd_Differ::CompareSets() {
             Tell(drd_ChangeEnm::REMOVED, std::string(drd_WordOf(first[i].kind)),
                  std::string(drd_WordOf(first[i].kind)) + " " + BlockWords(First(), first[i].block) +
                      first[i].name + " removed",
-                 PlaceOfSet(First(), first[i]), kNowhere);
+                 PlaceOfSet(First(), first[i]), drd_Nowhere);
             continue;
         }
         isTaken[static_cast<std::size_t>(found->second)] = 1;
@@ -295,7 +293,7 @@ void drd_Differ::CompareSets() {
         Tell(drd_ChangeEnm::ADDED, std::string(drd_WordOf(second[i].kind)),
              std::string(drd_WordOf(second[i].kind)) + " " + BlockWords(Second(), second[i].block) +
                  second[i].name + " added",
-             kNowhere, PlaceOfSet(Second(), second[i]));
+             drd_Nowhere, PlaceOfSet(Second(), second[i]));
     }
 }
 

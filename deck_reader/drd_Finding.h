@@ -44,6 +44,7 @@ struct drd_Place {
     int file = 0;
     long line = 0;
 };
+inline constexpr drd_Place drd_Nowhere{-1, 0};
 
 struct drd_Finding {
     const drd_Code* code = nullptr;

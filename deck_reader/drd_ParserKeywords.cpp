@@ -22,7 +22,7 @@ struct BlockWord {
     drd_BlockEnm kind;
     bool ends;
 };
-constexpr BlockWord kBlockWords[] = {
+constexpr BlockWord kBlockPrefixes[] = {
     {"part", drd_BlockEnm::PART, false},          {"endpart", drd_BlockEnm::PART, true},
     {"instance", drd_BlockEnm::INSTANCE, false},  {"endinstance", drd_BlockEnm::INSTANCE, true},
     {"assembly", drd_BlockEnm::ASSEMBLY, false},  {"endassembly", drd_BlockEnm::ASSEMBLY, true},
@@ -152,9 +152,9 @@ void drd_Parser::AddKeyword(drd_Keyword keyword) {
 }
 
 void drd_Parser::PlaceInBlock(drd_Keyword& keyword) {
-    const auto word = std::find_if(std::begin(kBlockWords), std::end(kBlockWords),
+    const auto word = std::find_if(std::begin(kBlockPrefixes), std::end(kBlockPrefixes),
                                    [&keyword](const BlockWord& w) { return w.key == keyword.key; });
-    if (word == std::end(kBlockWords)) {
+    if (word == std::end(kBlockPrefixes)) {
         keyword.block = blockStack_.back();
         return;
     }

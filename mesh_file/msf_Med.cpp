@@ -30,10 +30,10 @@ struct CellType {
     const char* name;
     int code;
 };
-constexpr CellType kTypes[] = {{"PO1", 1},   {"SE2", 102}, {"SE3", 103}, {"TR3", 203}, {"TR6", 206},
-                               {"TR7", 207}, {"QU4", 204}, {"QU8", 208}, {"QU9", 209}, {"TE4", 304},
-                               {"T10", 310}, {"PY5", 305}, {"P13", 313}, {"PE6", 306}, {"P15", 315},
-                               {"P18", 318}, {"HE8", 308}, {"H20", 320}, {"H27", 327}};
+constexpr CellType kMedTypes[] = {{"PO1", 1},   {"SE2", 102}, {"SE3", 103}, {"TR3", 203}, {"TR6", 206},
+                                  {"TR7", 207}, {"QU4", 204}, {"QU8", 208}, {"QU9", 209}, {"TE4", 304},
+                                  {"T10", 310}, {"PY5", 305}, {"P13", 313}, {"PE6", 306}, {"P15", 315},
+                                  {"P18", 318}, {"HE8", 308}, {"H20", 320}, {"H27", 327}};
 
 /// A family: cells or nodes that are in the same groups. Those of cells have negative numbers, those of nodes
 /// positive.
@@ -229,9 +229,9 @@ void MedReader::ReadNodes(const std::string& mesh) {
 
 void MedReader::ReadCells(const std::string& mesh) {
     for (const std::string& name : Names(mesh + "/MAI")) {
-        const auto type = std::find_if(std::begin(kTypes), std::end(kTypes),
+        const auto type = std::find_if(std::begin(kMedTypes), std::end(kMedTypes),
                                        [&](const CellType& each) { return name == each.name; });
-        if (type == std::end(kTypes))
+        if (type == std::end(kMedTypes))
             msf_Fail(mesh + "/MAI", "found cells of type " + msf_Shown(name),
                      "points, segments, triangles, quadrangles, tetrahedra, hexahedra, prisms or pyramids of "
                      "first or second order");

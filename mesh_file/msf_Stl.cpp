@@ -7,14 +7,14 @@
 
 namespace {
 
-constexpr std::size_t kHead = 84;
+constexpr std::size_t kStlHead = 84;
 constexpr std::size_t kFacet = 50;
 
 bool IsBinary(std::string_view bytes) {
-    if (bytes.size() < kHead) return false;
+    if (bytes.size() < kStlHead) return false;
     std::uint32_t count = 0;
     std::memcpy(&count, bytes.data() + 80, sizeof count);
-    return bytes.size() == kHead + kFacet * static_cast<std::size_t>(count);
+    return bytes.size() == kStlHead + kFacet * static_cast<std::size_t>(count);
 }
 
 bool StartsWithWord(std::string_view text, std::string_view word) {

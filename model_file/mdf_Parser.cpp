@@ -17,14 +17,14 @@
 #include <system_error>
 #include <utility>
 
-namespace {
-
 /// How far the lexer has read.
-struct Cursor {
+struct mdf_Cursor {
     const char* begin;
     const char* at;
     const char* end;
 };
+
+namespace {
 
 /// All copies step along one cursor, which thus tells where the lexer is.
 class CursorIterator {
@@ -36,7 +36,7 @@ public:
     using reference = const char&;
 
     /// Without a cursor: the end.
-    explicit CursorIterator(Cursor* cursor) : cursor_(cursor) {}
+    explicit CursorIterator(mdf_Cursor* cursor) : cursor_(cursor) {}
     reference operator*() const { return *cursor_->at; }
     CursorIterator& operator++() {
         ++cursor_->at;
@@ -52,7 +52,7 @@ public:
 private:
     bool AtEnd() const { return cursor_ == nullptr || cursor_->at == cursor_->end; }
 
-    Cursor* cursor_;
+    mdf_Cursor* cursor_;
 };
 
 constexpr const char* foundNul = "found a NUL byte, expected text";
@@ -68,7 +68,7 @@ bool WrittenAsInteger(std::string_view number) {
 /// Makes the tree from the library's events.
 class mdf_Builder {
 public:
-    mdf_Builder(Cursor& cursor, mdf_Value& root, std::vector<fnd_Finding>& errors)
+    mdf_Builder(mdf_Cursor& cursor, mdf_Value& root, std::vector<fnd_Finding>& errors)
         : cursor_(cursor), root_(root), errors_(errors) {}
 
     bool null() { return Other(mdf_Value()); }
@@ -118,7 +118,7 @@ private:
         return {cursor_.begin, static_cast<std::size_t>(cursor_.end - cursor_.begin)};
     }
 
-    Cursor& cursor_;
+    mdf_Cursor& cursor_;
     mdf_Value& root_;
     std::vector<fnd_Finding>& errors_;
     /// The arrays and objects that are open, outermost first; the last member of an open object is the one
@@ -439,7 +439,7 @@ bool mdf_Builder::parse_error(std::size_t, const std::string&, const nlohmann::d
 bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors) {
     const std::size_t errorsBefore = errors.size();
     root = mdf_Value();
-    Cursor cursor{text.data(), text.data(), text.data() + text.size()};
+    mdf_Cursor cursor{text.data(), text.data(), text.data() + text.size()};
     mdf_Builder builder(cursor, root, errors);
     bool done = nlohmann::json::sax_parse(CursorIterator(&cursor), CursorIterator(nullptr), &builder,
                                           nlohmann::json::input_format_t::json, true, true);

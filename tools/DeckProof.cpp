@@ -1,5 +1,6 @@
 #include "tools/DeckProof.h"
 
+#include "deck_checks/dck_Text.h"
 #include "deck_reader/drd_Names.h"
 #include "deck_reader/drd_Text.h"
 #include "foundation/num_RealText.h"
@@ -23,10 +24,6 @@ struct Member {
     friend auto operator<=>(const Member&, const Member&) = default;
 };
 using Members = std::set<Member>;
-
-std::string Text(const cow_String& text) {
-    return std::string(text.View());
-}
 
 /// The number that a coordinate's text in a deck is.
 double AsWritten(float value) {

@@ -2,28 +2,16 @@
 
 #include "foundation/mq_MeshQuality.h"
 #include "store_interface/findings/fnd_Text.h"
+#include "tools/NumberText.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
-#include <cstdio>
 
 using nlohmann::ordered_json;
 
 namespace {
 
 constexpr const char* kDimensionWords[] = {"point", "edge", "surface", "volume"};
-
-std::string NumberText(double value) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.6g", value);
-    return text;
-}
-
-std::string PointText(const ordered_json& point) {
-    std::string text = "(";
-    for (std::size_t i = 0; i < 3; ++i) text += (i == 0 ? "" : ", ") + NumberText(point[i]);
-    return text + ")";
-}
 
 ordered_json Box(const msf_Mesh& mesh) {
     double box[2][3] = {};

@@ -5,9 +5,8 @@
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
 #include "store_interface/records/steps/kprC_StepWords.h"
+#include "tools/NumberText.h"
 #include "tools/TextTable.h"
-
-#include <cstdio>
 
 using nlohmann::ordered_json;
 
@@ -83,18 +82,6 @@ ordered_json DescribeSteps(const kprC_StepContainer& steps) {
     return list;
 }
 
-std::string NumberText(double value) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.6g", value);
-    return text;
-}
-
-std::string TripleText(const ordered_json& triple) {
-    std::string text = "(";
-    text.append(NumberText(triple[0])).append(", ").append(NumberText(triple[1])).append(", ");
-    return text.append(NumberText(triple[2])).append(")");
-}
-
 bool IsZero(const ordered_json& triple) {
     return triple[0] == 0.0F && triple[1] == 0.0F && triple[2] == 0.0F;
 }
@@ -105,9 +92,9 @@ std::string Heading(const char* kind, std::size_t count) {
 
 std::string Placement(const ordered_json& instance) {
     std::string text;
-    if (!IsZero(instance["translation"])) text += "moved by " + TripleText(instance["translation"]);
+    if (!IsZero(instance["translation"])) text += "moved by " + PointText(instance["translation"]);
     if (!IsZero(instance["rotation"])) {
-        text += (text.empty() ? "" : ", ") + ("turned by " + TripleText(instance["rotation"]));
+        text += (text.empty() ? "" : ", ") + ("turned by " + PointText(instance["rotation"]));
     }
     return text.empty() ? "in place" : text;
 }

@@ -13,7 +13,7 @@
 
 namespace {
 
-constexpr std::string_view kPrefix = ".qrxdeck-";
+constexpr std::string_view kScratchPrefix = ".qrxdeck-";
 constexpr int kFolderFlags = O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC;
 
 bool IsOurs(const struct stat& found) {
@@ -48,7 +48,8 @@ void ScratchFolder::RemoveLeavings(int folder, const DeckFileSystem& system) {
         return;
     }
     while (const dirent* entry = ::readdir(entries.get())) {
-        if (std::string_view(entry->d_name).starts_with(kPrefix)) RemoveIfLeft(folder, entry->d_name, system);
+        if (std::string_view(entry->d_name).starts_with(kScratchPrefix))
+            RemoveIfLeft(folder, entry->d_name, system);
     }
 }
 
@@ -66,7 +67,7 @@ std::string ScratchFolder::NewName() {
     constexpr int length = 12;
     std::random_device random;
     std::uniform_int_distribution<std::size_t> any(0, letters.size() - 1);
-    std::string name(kPrefix);
+    std::string name(kScratchPrefix);
     for (int i = 0; i < length; ++i) name += letters[any(random)];
     return name;
 }

@@ -15,10 +15,6 @@ namespace {
 /// Of a node set this many nodes are shown that nothing else shows.
 constexpr int kMaxInnerNodes = 1000;
 
-std::size_t Index(int index) {
-    return static_cast<std::size_t>(index);
-}
-
 gsl_Matrix PlacementOf(const odiK_Instance& instance) {
     const auto& t = instance.translation;
     const auto& r = instance.rotation;
@@ -123,7 +119,7 @@ std::vector<float> vpg_Layout::ForeignNodes(const odiK_Mesh& mesh) const {
             const odiK_Mesh& other = *instance->Mesh();
             const int node = other.FindNode(foreign.label);
             if (node >= 0) {
-                const float* xyz = other.Nodes().coordinates.data() + 3 * Index(node);
+                const float* xyz = other.Nodes().coordinates.data() + 3 * vpg_Index(node);
                 place = PlacementOf(*instance).Apply(gsl_Point(
                     static_cast<double>(xyz[0]), static_cast<double>(xyz[1]), static_cast<double>(xyz[2])));
             }
@@ -156,7 +152,7 @@ void vpg_Layout::ResolveSets() {
 void vpg_Layout::ShowNodes(Entry& entry, const std::vector<int>& nodes) {
     int added = 0;
     for (const int node : nodes) {
-        char& isShown = entry.shown[Index(node)];
+        char& isShown = entry.shown[vpg_Index(node)];
         if (isShown != 0 || added == kMaxInnerNodes) continue;
         isShown = 1;
         ++added;
@@ -165,9 +161,9 @@ void vpg_Layout::ShowNodes(Entry& entry, const std::vector<int>& nodes) {
 
 void vpg_Layout::ChooseNodes() {
     for (Entry& entry : meshes_) {
-        entry.shown.assign(Index(entry.mesh->NumNodes()), 0);
+        entry.shown.assign(vpg_Index(entry.mesh->NumNodes()), 0);
         for (const vpg_Block& block : entry.mesh->Blocks()) {
-            for (const int node : block.nodes) entry.shown[Index(node)] = 1;
+            for (const int node : block.nodes) entry.shown[vpg_Index(node)] = 1;
         }
         for (const vpg_SetPart& part : entry.sets) ShowNodes(entry, part.nodes);
     }
@@ -194,12 +190,12 @@ ordered_json vpg_Layout::MeshText(Entry& entry, vpg_Arrays& arrays) const {
     std::vector<float> places;
     std::vector<int> labels;
     for (int node = 0; node < entry.mesh->NumNodes(); ++node) {
-        if (entry.pageNodes[Index(node)] < 0) continue;
+        if (entry.pageNodes[vpg_Index(node)] < 0) continue;
         for (const float x : entry.mesh->Place(node)) places.push_back(x);
         labels.push_back(mesh.Nodes().Label(node));
     }
     std::vector<int> edges = vpg_FeatureEdges(*entry.mesh);
-    for (int& node : edges) node = entry.pageNodes[Index(node)];
+    for (int& node : edges) node = entry.pageNodes[vpg_Index(node)];
     ordered_json text = {{"nodes", mesh.Nodes().NumNodes()}, {"elements", mesh.NumElements()},
                          {"positions", arrays.Add(places)},  {"nodeLabels", arrays.Add(labels)},
                          {"edges", arrays.Add(edges)},       {"blocks", ordered_json::array()},
@@ -217,13 +213,13 @@ ordered_json vpg_Layout::MeshText(Entry& entry, vpg_Arrays& arrays) const {
 }
 
 ordered_json vpg_Layout::BlockText(const Entry& entry, const vpg_Block& block, vpg_Arrays& arrays) const {
-    const odiK_ElementClass& elements = entry.handle->Classes()[Index(block.classIndex)];
+    const odiK_ElementClass& elements = entry.handle->Classes()[vpg_Index(block.classIndex)];
     std::vector<int> nodes;
     nodes.reserve(block.nodes.size());
-    for (const int node : block.nodes) nodes.push_back(entry.pageNodes[Index(node)]);
+    for (const int node : block.nodes) nodes.push_back(entry.pageNodes[vpg_Index(node)]);
     std::vector<int> labels;
     labels.reserve(block.elements.size());
-    for (const int element : block.elements) labels.push_back(elements.labels[Index(element)]);
+    for (const int element : block.elements) labels.push_back(elements.labels[vpg_Index(element)]);
     const cel_Cell& cell = cel_CellOf(block.kind);
     ordered_json text = {{"role", vpg_WordOf(block.role)},  {"cell", cell.name},
                          {"corners", cell.corners},         {"nodes", cell.nodes},
@@ -240,7 +236,7 @@ ordered_json vpg_Layout::PartText(const Entry& entry, const vpg_SetPart& part, v
     if (!part.negative.empty()) text["negative"] = arrays.AddRuns(part.negative);
     std::vector<int> nodes;
     for (const int node : part.nodes) {
-        if (entry.pageNodes[Index(node)] >= 0) nodes.push_back(entry.pageNodes[Index(node)]);
+        if (entry.pageNodes[vpg_Index(node)] >= 0) nodes.push_back(entry.pageNodes[vpg_Index(node)]);
     }
     if (!nodes.empty()) text["nodes"] = arrays.AddRuns(nodes);
     if (!part.box.IsEmpty()) {
@@ -306,7 +302,7 @@ ordered_json vpg_Layout::InstanceText(const Shown& shown, vpg_Arrays& arrays) {
 
 std::vector<std::int16_t> vpg_Layout::SectionsOfElements(const Shown& shown) const {
     const vpg_Mesh& mesh = MeshOf(shown);
-    std::vector<std::int16_t> ofElement(Index(mesh.Mesh().NumElements()), -1);
+    std::vector<std::int16_t> ofElement(vpg_Index(mesh.Mesh().NumElements()), -1);
     const bool isAssembly = shown.kind == std::string_view("assembly");
     if (shown.attributes == nullptr && !isAssembly) return ofElement;
     std::map<cow_String, int> placeOf;
@@ -323,7 +319,7 @@ std::vector<std::int16_t> vpg_Layout::SectionsOfElements(const Shown& shown) con
         for (const rgnC_SubsetData& subset : set.Object().subsets) {
             if (isAssembly && subset.meshIndex != 0) continue;
             vpg_ForEachElement(mesh.Mesh(), std::span(&subset, 1), [&](int element) {
-                ofElement[Index(element)] = static_cast<std::int16_t>(section->second);
+                ofElement[vpg_Index(element)] = static_cast<std::int16_t>(section->second);
             });
         }
     }
@@ -335,7 +331,7 @@ std::vector<int> vpg_Layout::SectionsOfCells(const Shown& shown) const {
     const std::vector<std::int16_t> ofElement = SectionsOfElements(shown);
     if (std::ranges::all_of(ofElement, [](std::int16_t section) { return section < 0; })) return {};
     std::vector<int> ofCell = MeshOf(shown).ElementsOfCells();
-    for (int& cell : ofCell) cell = ofElement[Index(cell)];
+    for (int& cell : ofCell) cell = ofElement[vpg_Index(cell)];
     return ofCell;
 }
 

@@ -112,8 +112,8 @@ vpg_Mesh::vpg_Mesh(const odiK_Mesh& mesh, std::vector<float> foreign)
 
 std::array<float, 3> vpg_Mesh::Place(int node) const {
     const int own = mesh_.Nodes().NumNodes();
-    const float* xyz = node < own ? mesh_.Nodes().coordinates.data() + 3 * Index(node)
-                                  : foreign_.data() + 3 * Index(node - own);
+    const float* xyz = node < own ? mesh_.Nodes().coordinates.data() + 3 * vpg_Index(node)
+                                  : foreign_.data() + 3 * vpg_Index(node - own);
     return {xyz[0], xyz[1], xyz[2]};
 }
 
@@ -121,7 +121,7 @@ void vpg_Mesh::AddSkin() {
     const SolidSides sides(mesh_);
     std::vector<std::uint32_t> skin;
     vpg_GroupByNodes(
-        sides.Size(), Index(numNodes_), [&](std::size_t item) { return sides.CornersOf(item)[0]; },
+        sides.Size(), vpg_Index(numNodes_), [&](std::size_t item) { return sides.CornersOf(item)[0]; },
         [&](std::size_t item) { return sides.CornersOf(item); },
         [&](std::span<const std::uint32_t> same) {
             if (same.size() == 1) skin.push_back(same.front());
@@ -129,16 +129,16 @@ void vpg_Mesh::AddSkin() {
     std::ranges::sort(skin);
     for (const std::uint32_t item : skin) {
         const SolidSides::Place place = sides.PlaceOf(item);
-        const odiK_ElementClass& elements = mesh_.Classes()[Index(place.classIndex)];
-        const cel_Side& side = vpg_CellOf(elements)->sides[Index(place.side)];
+        const odiK_ElementClass& elements = mesh_.Classes()[vpg_Index(place.classIndex)];
+        const cel_Side& side = vpg_CellOf(elements)->sides[vpg_Index(place.side)];
         AddCell(BlockFor(vpg_RoleEnm::SOLID, side.kind, place.classIndex), place.element, place.side,
-                elements.connectivity.data() + Index(place.element) * Index(elements.nodesPerElement),
+                elements.connectivity.data() + vpg_Index(place.element) * vpg_Index(elements.nodesPerElement),
                 side.nodes.data());
     }
 }
 
 void vpg_Mesh::AddElements(int classIndex) {
-    const odiK_ElementClass& elements = mesh_.Classes()[Index(classIndex)];
+    const odiK_ElementClass& elements = mesh_.Classes()[vpg_Index(classIndex)];
     const cel_Cell* cell = vpg_CellOf(elements);
     if (elements.NumElements() == 0 || elements.nodesPerElement == 0) return;
     if (cell != nullptr && cell->dimension == 3) return;
@@ -179,12 +179,12 @@ void vpg_Mesh::Number() {
         block.firstCell = numCells_;
         numCells_ += block.NumCells();
     }
-    cellOf_.reserve(Index(numCells_));
+    cellOf_.reserve(vpg_Index(numCells_));
     for (const vpg_Block& block : blocks_) {
         const int first = FirstElement(block.classIndex);
         for (int i = 0; i < block.NumCells(); ++i) {
-            const int side = block.sides.empty() ? -1 : block.sides[Index(i)];
-            cellOf_.emplace_back(KeyOf(first + block.elements[Index(i)], side), block.firstCell + i);
+            const int side = block.sides.empty() ? -1 : block.sides[vpg_Index(i)];
+            cellOf_.emplace_back(KeyOf(first + block.elements[vpg_Index(i)], side), block.firstCell + i);
         }
     }
     std::ranges::sort(cellOf_);
@@ -198,7 +198,7 @@ int vpg_Mesh::FindCell(std::uint64_t key) const {
 }
 
 int vpg_Mesh::CellOfFacet(int classIndex, int element, int side) {
-    const odiK_ElementClass& elements = mesh_.Classes()[Index(classIndex)];
+    const odiK_ElementClass& elements = mesh_.Classes()[vpg_Index(classIndex)];
     const int place = FirstElement(classIndex) + element;
     if (ddb_FaceRuleOf(elements.shape).rule == ddb_FaceRuleEnm::SHELL) return FindCell(KeyOf(place, -1));
     const int known = FindCell(KeyOf(place, side));
@@ -206,16 +206,16 @@ int vpg_Mesh::CellOfFacet(int classIndex, int element, int side) {
 }
 
 int vpg_Mesh::AddFacet(int classIndex, int element, int side) {
-    const odiK_ElementClass& elements = mesh_.Classes()[Index(classIndex)];
+    const odiK_ElementClass& elements = mesh_.Classes()[vpg_Index(classIndex)];
     const cel_Cell* cell = vpg_CellOf(elements);
-    if (cell == nullptr || side < 0 || Index(side) >= cell->sides.size()) return -1;
-    const cel_Side& facet = cell->sides[Index(side)];
+    if (cell == nullptr || side < 0 || vpg_Index(side) >= cell->sides.size()) return -1;
+    const cel_Side& facet = cell->sides[vpg_Index(side)];
     // A block of its own for each run of facets, since cells are numbered when they come.
     const bool goesOn = !blocks_.empty() && blocks_.back().role == vpg_RoleEnm::FACET &&
                         blocks_.back().kind == facet.kind && blocks_.back().classIndex == classIndex;
     if (!goesOn) blocks_.push_back({vpg_RoleEnm::FACET, facet.kind, classIndex, numCells_, {}, {}, {}});
     AddCell(blocks_.back(), element, side,
-            elements.connectivity.data() + Index(element) * Index(elements.nodesPerElement),
+            elements.connectivity.data() + vpg_Index(element) * vpg_Index(elements.nodesPerElement),
             facet.nodes.data());
     facets_.emplace(KeyOf(FirstElement(classIndex) + element, side), numCells_);
     return numCells_++;
@@ -230,7 +230,7 @@ void vpg_Mesh::AppendCellsOf(int element, std::vector<int>& cells) const {
 
 std::vector<int> vpg_Mesh::ElementsOfCells() const {
     std::vector<int> elements;
-    elements.reserve(Index(numCells_));
+    elements.reserve(vpg_Index(numCells_));
     for (const vpg_Block& block : blocks_) {
         for (const int element : block.elements) elements.push_back(FirstElement(block.classIndex) + element);
     }
@@ -241,7 +241,7 @@ std::vector<std::pair<std::string, int>> vpg_Mesh::UnknownTypes() const {
     std::map<std::string, int> counts;
     for (const vpg_Block& block : blocks_) {
         if (block.role != vpg_RoleEnm::UNKNOWN) continue;
-        counts[std::string(mesh_.Classes()[Index(block.classIndex)].type.View())] += block.NumCells();
+        counts[std::string(mesh_.Classes()[vpg_Index(block.classIndex)].type.View())] += block.NumCells();
     }
     return {counts.begin(), counts.end()};
 }

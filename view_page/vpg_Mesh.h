@@ -24,6 +24,10 @@ enum class vpg_RoleEnm {
 };
 const char* vpg_WordOf(vpg_RoleEnm role);
 
+constexpr std::size_t vpg_Index(int index) {
+    return static_cast<std::size_t>(index);
+}
+
 /// Cells of the page that are alike: of one element class, role and kind.
 struct vpg_Block {
     vpg_RoleEnm role = vpg_RoleEnm::SOLID;
@@ -51,7 +55,9 @@ public:
     int NumCells() const { return numCells_; }
     int NumNodes() const { return numNodes_; }
     std::array<float, 3> Place(int node) const;
-    int FirstElement(int classIndex) const { return mesh_.Classes()[Index(classIndex)].firstElementIndex; }
+    int FirstElement(int classIndex) const {
+        return mesh_.Classes()[vpg_Index(classIndex)].firstElementIndex;
+    }
 
     /// The cell of an element's side (0, 1, ...), made when there is none yet; of an element that is drawn
     /// itself, its own cell where the side is one of a shell's. -1 when the element has no such side.
@@ -67,7 +73,6 @@ private:
     /// An element and 0, or its side from 1; and the cell.
     using Entry = std::pair<std::uint64_t, int>;
 
-    static std::size_t Index(int index) { return static_cast<std::size_t>(index); }
     static std::uint64_t KeyOf(int element, int side) {
         return static_cast<std::uint64_t>(element) << 4 | static_cast<unsigned>(side + 1);
     }

@@ -14,10 +14,6 @@ constexpr std::uint8_t kPoints = 2;
 /// The format's order where it isn't the deck's: the middles of the faces come before the body's.
 constexpr std::int8_t kHexahedron27[7] = {26, 24, 23, 25, 21, 22, 20};
 
-std::size_t Index(int index) {
-    return static_cast<std::size_t>(index);
-}
-
 std::string Attribute(std::string_view text) {
     std::string escaped;
     for (const char c : text) {
@@ -52,10 +48,10 @@ public:
         for (const vpg_Layout::Shown& shown : layout_.All()) {
             firstPoint_.push_back(points_);
             firstCell_.push_back(cells_);
-            points_ += Index(layout_.MeshOf(shown).NumNodes());
-            cells_ += Index(layout_.MeshOf(shown).Mesh().NumElements());
+            points_ += vpg_Index(layout_.MeshOf(shown).NumNodes());
+            cells_ += vpg_Index(layout_.MeshOf(shown).Mesh().NumElements());
             for (const odiK_ElementClass& elements : layout_.MeshOf(shown).Mesh().Classes()) {
-                ends_ += NodesOf(elements) * Index(elements.NumElements());
+                ends_ += NodesOf(elements) * vpg_Index(elements.NumElements());
             }
         }
         CollectSets();
@@ -101,7 +97,7 @@ private:
 
     static std::size_t NodesOf(const odiK_ElementClass& elements) {
         const cel_Cell* cell = vpg_CellOf(elements);
-        return Index(cell == nullptr ? elements.nodesPerElement : cell->nodes);
+        return vpg_Index(cell == nullptr ? elements.nodesPerElement : cell->nodes);
     }
     static int PlaceInRow(const cel_Cell* cell, int i) {
         const bool turned = cell != nullptr && cell->kind == cel_KindEnm::HEXAHEDRON27 && i >= 20;
@@ -219,7 +215,7 @@ private:
         ForEachClass([&](std::size_t, const odiK_ElementClass& elements) {
             const cel_Cell* cell = vpg_CellOf(elements);
             const std::uint8_t type = cell == nullptr ? kPoints : kTypes[static_cast<int>(cell->kind)];
-            types.append(Index(elements.NumElements()), static_cast<char>(type));
+            types.append(vpg_Index(elements.NumElements()), static_cast<char>(type));
         });
         return types;
     }
@@ -232,7 +228,7 @@ private:
     std::string Instances() const {
         std::vector<std::int32_t> places;
         ForEachClass([&](std::size_t shown, const odiK_ElementClass& elements) {
-            places.insert(places.end(), Index(elements.NumElements()), static_cast<std::int32_t>(shown));
+            places.insert(places.end(), vpg_Index(elements.NumElements()), static_cast<std::int32_t>(shown));
         });
         return BytesOf(places);
     }
@@ -257,7 +253,7 @@ private:
         }
         std::vector<std::int32_t> materials = Sections();
         for (std::int32_t& place : materials) {
-            if (place >= 0) place = ofSection[Index(place)];
+            if (place >= 0) place = ofSection[vpg_Index(place)];
         }
         return materials;
     }
@@ -280,13 +276,14 @@ private:
     void Mark(const Members& members, std::string& flags) const {
         const vpg_Mesh& mesh = layout_.MeshOf(layout_.All()[members.shown]);
         if (members.type != res_SetTypeEnm::NODES) {
-            vpg_ForEachElement(mesh.Mesh(), members.subsets,
-                               [&](int element) { flags[firstCell_[members.shown] + Index(element)] = 1; });
+            vpg_ForEachElement(mesh.Mesh(), members.subsets, [&](int element) {
+                flags[firstCell_[members.shown] + vpg_Index(element)] = 1;
+            });
             return;
         }
         for (const rgnC_SubsetData& subset : members.subsets) {
             for (int i = 0; i < subset.subset.Length(); ++i) {
-                flags[firstPoint_[members.shown] + Index(subset.subset.UncheckedConstGet(i))] = 1;
+                flags[firstPoint_[members.shown] + vpg_Index(subset.subset.UncheckedConstGet(i))] = 1;
             }
         }
     }

@@ -8,10 +8,6 @@
 
 namespace {
 
-char Lower(char c) {
-    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
-
 /// The characters that occur, as bits; some characters share one.
 unsigned long long LettersOf(const char* text, std::size_t length) {
     unsigned long long letters = 0;
@@ -24,7 +20,7 @@ unsigned long long LettersOf(const char* text, std::size_t length) {
 fnd_Nearest::fnd_Nearest(std::string_view name) {
     if (name.size() > kLongest) return;
     length_ = name.size();
-    std::transform(name.begin(), name.end(), name_, Lower);
+    std::transform(name.begin(), name.end(), name_, [](char c) { return fnd_LowerCase(c); });
     letters_ = LettersOf(name_, length_);
     // Something of the name must be left.
     least_ = std::min(std::max<std::size_t>(1, length_ / 3) + 1, length_);
@@ -34,7 +30,7 @@ void fnd_Nearest::Try(std::string_view candidate) {
     const std::size_t gap = std::max(candidate.size(), length_) - std::min(candidate.size(), length_);
     if (gap >= least_ || candidate.size() > kLongest) return;
     char lower[kLongest];
-    std::transform(candidate.begin(), candidate.end(), lower, Lower);
+    std::transform(candidate.begin(), candidate.end(), lower, [](char c) { return fnd_LowerCase(c); });
     // Each change takes away or brings at most one character.
     const unsigned long long letters = LettersOf(lower, candidate.size());
     const int lost = std::max(std::popcount(letters_ & ~letters), std::popcount(letters & ~letters_));

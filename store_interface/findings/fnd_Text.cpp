@@ -7,10 +7,6 @@ namespace {
 
 constexpr std::size_t kLongestName = 80;
 
-char Lower(char c) {
-    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
-
 bool IsControl(char c) {
     const auto byte = static_cast<unsigned char>(c);
     return byte < 0x20 || byte == 0x7f;
@@ -20,7 +16,7 @@ bool IsControl(char c) {
 
 std::string fnd_LowerCase(std::string_view text) {
     std::string lower(text);
-    std::transform(lower.begin(), lower.end(), lower.begin(), Lower);
+    for (char& c : lower) c = fnd_LowerCase(c);
     return lower;
 }
 

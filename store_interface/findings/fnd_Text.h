@@ -19,6 +19,9 @@ std::string fnd_Counted(long long count, const char* singular);
 std::string fnd_OneOf(const std::vector<std::string>& words);
 /// The text with A to Z as a to z.
 std::string fnd_LowerCase(std::string_view text);
+constexpr char fnd_LowerCase(char c) {
+    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
 
 /// Why the text can't stand in a deck as a name: what was found, and what is expected instead.
 struct fnd_NameProblem {

@@ -58,7 +58,7 @@ constexpr auto kSubmodel = [](const auto& keyword, auto& stream, const auto& bc)
     keyword.WriteSubmodel(stream, bc);
 };
 
-constexpr oif_BCRow kRows[] = {
+constexpr oif_BCRow kBCRows[] = {
     Boundary<kbcC_DisplacementBC>("Displacement/Rotation", kDisplacements),
     Boundary<kbcC_VelocityBC>("Velocity/Angular velocity", kVelocities),
     Boundary<kbcC_AccelerationBC>("Acceleration/Angular acceleration", kAccelerations),
@@ -80,5 +80,5 @@ constexpr oif_BCRow kRows[] = {
 } // namespace
 
 std::span<const oif_BCRow> oif_BCRows() {
-    return kRows;
+    return kBCRows;
 }

@@ -4,7 +4,7 @@
 #include "foundation/nex_Exception.h"
 #include "store_interface/records/steps/kprC_StaticSteps.h"
 
-using Distribution = kbcC_BC::DistribTypeEnum;
+using BoundaryDistribution = kbcC_BC::DistribTypeEnum;
 using Method = kloC_BoltLoad::MethodEnm;
 
 namespace {
@@ -28,7 +28,8 @@ oif_ConditionKeyword::oif_ConditionKeyword(const Style& style, const oif_BCCard&
 }
 
 void oif_ConditionKeyword::Write(utl_Stream& stream) const {
-    if (deactivated_) return WriteBoundaryCard(stream, Distribution::UNIFORM, false, IsBuckling() ? 1 : 0);
+    if (deactivated_)
+        return WriteBoundaryCard(stream, BoundaryDistribution::UNIFORM, false, IsBuckling() ? 1 : 0);
     const oif_BCRow* row = oif_FindBCRow(Condition().DynTypeId());
     if (row == nullptr || row->family != style_->family) nex_Raise(style_->failure);
     row->write(*this, stream);
@@ -46,14 +47,14 @@ bool oif_ConditionKeyword::IsBuckling() const {
     return Procedure() == kprC_BuckleStep::TypeId();
 }
 
-void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, Distribution distributionType, bool fixed,
-                                             int loadCase, const char* type) const {
+void oif_ConditionKeyword::WriteBoundaryCard(utl_Stream& stream, BoundaryDistribution distributionType,
+                                             bool fixed, int loadCase, const char* type) const {
     oif_KeywordLine line(stream, style_->keyword);
     line.Op(card_.op)
         .Amplitude(amplitude_)
         .BreakingIf(loadCase == 1 || loadCase == 2, "load case=", loadCase)
         .BreakingIf(fixed, "fixed")
-        .BreakingIf(distributionType == Distribution::USER_DEFINED, "user");
+        .BreakingIf(distributionType == BoundaryDistribution::USER_DEFINED, "user");
     WriteBaseName(line);
     line.BreakingIf(type != nullptr, type).End();
 }
@@ -71,7 +72,7 @@ void oif_ConditionKeyword::ForEachLoadCase(const Block& block) const {
 }
 
 void oif_ConditionKeyword::WriteDisplacements(utl_Stream& stream, bool fixed) const {
-    const Distribution distribution = Condition().distributionType;
+    const BoundaryDistribution distribution = Condition().distributionType;
     if (UsesComplex()) {
         for (const int loadCase : {1, 2}) {
             WriteBoundaryCard(stream, distribution, fixed, loadCase);

@@ -5,7 +5,7 @@
 
 #include <initializer_list>
 
-using Distribution = kpfC_Field::DistribTypeEnm;
+using FieldDistribution = kpfC_Field::DistribTypeEnm;
 using Interpolate = kpfC_InterpolateEnm;
 
 namespace {
@@ -44,16 +44,16 @@ oif_InitialConditions::oif_InitialConditions(const kinC_ActuatorSensor& actuator
 }
 
 bool oif_InitialConditions::IsFromFile() const {
-    return distributionType_ == Distribution::FROM_FILE ||
-           distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED;
+    return distributionType_ == FieldDistribution::FROM_FILE ||
+           distributionType_ == FieldDistribution::FROM_FILE_AND_USER_DEFINED;
 }
 
 bool oif_InitialConditions::HasDataLines() const {
-    return distributionType_ != Distribution::USER_DEFINED && !IsFromFile();
+    return distributionType_ != FieldDistribution::USER_DEFINED && !IsFromFile();
 }
 
 void oif_InitialConditions::WriteDistributionType(oif_KeywordLine& line, const cow_String* fileName) const {
-    line.FixedIf(distributionType_ == Distribution::USER_DEFINED, ", USER");
+    line.FixedIf(distributionType_ == FieldDistribution::USER_DEFINED, ", USER");
     if (IsFromFile() && fileName != nullptr) oif_FieldText::WriteFile(line, *fileName);
 }
 
@@ -91,7 +91,7 @@ void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Ve
 void oif_InitialConditions::WriteParameters(oif_KeywordLine& line, const kpfC_Stress& stress) const {
     line.Fixed(", type=STRESS");
     WriteDistributionType(line, &stress.fileName);
-    line.FixedIf(distributionType_ == Distribution::GEOSTATIC, ", GEOSTATIC")
+    line.FixedIf(distributionType_ == FieldDistribution::GEOSTATIC, ", GEOSTATIC")
         .FixedIf(IsFromFile() && stress.step != 0, ", step=", stress.step)
         .FixedIf(IsFromFile() && stress.increment != 0, ", inc=", stress.increment);
 }
@@ -166,7 +166,7 @@ void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Velocity& v
 
 void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Stress& stress) const {
     WriteInitialConditionsCard(stream);
-    if (distributionType_ == Distribution::GEOSTATIC) {
+    if (distributionType_ == FieldDistribution::GEOSTATIC) {
         stream << setName_ << ", ";
         WriteFunctionData(stream, stress.stressMagnitude1, stress.vCoordinate1, true);
         WriteFunctionData(stream, stress.stressMagnitude2, stress.vCoordinate2, true);
@@ -180,7 +180,7 @@ void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Stress& str
 
 void oif_InitialConditions::WriteForm(utl_Stream& stream, const kpfC_Hardening& hardening) const {
     WriteInitialConditionsCard(stream);
-    if (distributionType_ == Distribution::USER_DEFINED) return;
+    if (distributionType_ == FieldDistribution::USER_DEFINED) return;
     WriteSetMagnitudeData(stream, hardening.equivPlasticStrain);
     const cow_List<double>& backstress = hardening.backstress;
     if (!backstress.IsEmpty()) stream << ", ";

@@ -8,7 +8,7 @@
 #include <initializer_list>
 
 using AttributeState = mdl_PropAttributeStateEnm;
-using Distribution = kloC_Load::DistribTypeEnm;
+using LoadDistribution = kloC_Load::DistribTypeEnm;
 
 namespace {
 
@@ -42,8 +42,8 @@ double Part(const kloC_LoadValue& value, int part) {
     return part == 2 ? value.imag : value.real;
 }
 
-const char* UserSuffix(Distribution distribution) {
-    return distribution == Distribution::USER_DEFINED ? "NU" : "";
+const char* UserSuffix(LoadDistribution distribution) {
+    return distribution == LoadDistribution::USER_DEFINED ? "NU" : "";
 }
 
 } // namespace
@@ -223,7 +223,7 @@ oif_Dload::oif_Dload(const oif_LoadCard& card, const kloC_PipePressure& pipe, co
     : oif_Dload(card, setting, &oif_Dload::WritePipePressure) {
     const kloC_HydrostaticHeights& heights = pipe.StateIn(card.step);
     suffix_ = UserSuffix(pipe.distributionType);
-    hydrostatic_ = pipe.distributionType == Distribution::HYDROSTATIC;
+    hydrostatic_ = pipe.distributionType == LoadDistribution::HYDROSTATIC;
     label_ = cow_String(hydrostatic_ ? "H" : "") + (pipe.external ? "PE" : "PI") + suffix_;
     diameter_ = pipe.effectiveDiameter;
     heights_[0] = heights.zeroPressureHeight.ConstGet();
@@ -330,12 +330,12 @@ oif_Dsload::oif_Dsload(const oif_LoadCard& card, const kloC_Pressure& pressure,
                        const oif_LoadSetting& setting)
     : oif_Dsload(card, setting, &oif_Dsload::WritePressure) {
     const kloC_HydrostaticHeights& heights = pressure.StateIn(card.step);
-    const Distribution distribution = pressure.distributionType;
+    const LoadDistribution distribution = pressure.distributionType;
     refNode_ = oif_RegionName(pressure.distributionRegion, setting.modelInfo);
-    hydrostatic_ = distribution == Distribution::HYDROSTATIC;
+    hydrostatic_ = distribution == LoadDistribution::HYDROSTATIC;
     if (hydrostatic_) {
         label_ = "HP";
-    } else if (distribution == Distribution::UNIFORM || distribution == Distribution::USER_DEFINED) {
+    } else if (distribution == LoadDistribution::UNIFORM || distribution == LoadDistribution::USER_DEFINED) {
         label_ = cow_String("P") + UserSuffix(distribution);
     }
     heights_[0] = heights.zeroPressureHeight.ConstGet();

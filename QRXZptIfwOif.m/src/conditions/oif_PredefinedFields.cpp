@@ -3,7 +3,7 @@
 #include "base/oif_DataLines.h"
 #include "foundation/omu_PrimEnum.h"
 
-using Distribution = kpfC_Field::DistribTypeEnm;
+using FieldDistribution = kpfC_Field::DistribTypeEnm;
 using Interpolate = kpfC_InterpolateEnm;
 using Status = mdl_PropagationStatusEnm;
 
@@ -93,19 +93,19 @@ void oif_StepField::Write(utl_Stream& stream) const {
     WriteVariable(line);
     if (deactivated_) return line.End();
     switch (distributionType_) {
-    case Distribution::USER_DEFINED:
+    case FieldDistribution::USER_DEFINED:
         line.Fixed(", user").End();
         stream << setName_ << endl;
         return;
-    case Distribution::FROM_FILE:
-    case Distribution::FROM_FILE_AND_USER_DEFINED:
+    case FieldDistribution::FROM_FILE:
+    case FieldDistribution::FROM_FILE_AND_USER_DEFINED:
         if (const cow_String* fileName = FileName()) {
-            line.FixedIf(distributionType_ == Distribution::FROM_FILE_AND_USER_DEFINED, ", user");
+            line.FixedIf(distributionType_ == FieldDistribution::FROM_FILE_AND_USER_DEFINED, ", user");
             oif_FieldText::WriteFile(line, *fileName);
             WriteFileParameters(line);
         }
         return line.End();
-    case Distribution::UNIFORM: line.Amplitude(Amplitude()).End(); return WriteData(stream);
+    case FieldDistribution::UNIFORM: line.Amplitude(Amplitude()).End(); return WriteData(stream);
     default: return line.End();
     }
 }

@@ -5,7 +5,6 @@
 
 namespace {
 
-using Row = oif_ConnectorBehaviorRow;
 using Option = kbeC_ConnectorBehaviorOption;
 
 template <class R>
@@ -29,7 +28,7 @@ qkw_KeywordHandle MakeWithDerived(const Option& option, [[maybe_unused]] const q
     }
 }
 
-constexpr Row kRows[] = {
+constexpr oif_ConnectorBehaviorRow kBehaviorRows[] = {
     {kbeC_ConnectorElasticity::Class.Id(), Make<kbeC_ConnectorElasticity>},
     {kbeC_ConnectorDamping::Class.Id(), Make<kbeC_ConnectorDamping>},
     {kbeC_ConnectorStop::Class.Id(), Make<kbeC_ConnectorStop>},
@@ -44,7 +43,7 @@ constexpr Row kRows[] = {
 } // namespace
 
 std::span<const oif_ConnectorBehaviorRow> oif_ConnectorBehaviorRows() {
-    return kRows;
+    return kBehaviorRows;
 }
 
 qkw_KeywordList oif_ConnectorBehaviorKeywords(const cow_String& name, const kseC_ConnectorSection& section,
@@ -58,7 +57,7 @@ qkw_KeywordList oif_ConnectorBehaviorKeywords(const cow_String& name, const kseC
     oif_DerivedComponents derived;
     int index = 0;
     for (const auto& option : section.options) {
-        const Row* row = oif_FindRow(kRows, option.ConstGet().DynTypeId());
+        const oif_ConnectorBehaviorRow* row = oif_FindRow(kBehaviorRows, option.ConstGet().DynTypeId());
         if (row != nullptr) keywords.Append(row->make(option.ConstGet(), modelInfo, index, derived));
         ++index;
     }

@@ -94,7 +94,7 @@ constexpr oif_ConstraintRow RowOf(std::span<const Rule> regions) {
             }};
 }
 
-constexpr oif_ConstraintRow kRows[] = {
+constexpr oif_ConstraintRow kConstraintRows[] = {
     RowOf<kcoC_Equation>({}),
     RowOf<odiK_Tie>(kTieRegions),
     RowOf<kcoC_Coupling>(kCouplingRegions),
@@ -111,9 +111,9 @@ bool oif_IsCyclicModel(const oif_Model& model) {
 }
 
 std::span<const oif_ConstraintRow> oif_ConstraintRows() {
-    return kRows;
+    return kConstraintRows;
 }
 
 const oif_ConstraintRow* oif_FindConstraintRow(unsigned typeId) {
-    return oif_FindRow(kRows, typeId);
+    return oif_FindRow(kConstraintRows, typeId);
 }

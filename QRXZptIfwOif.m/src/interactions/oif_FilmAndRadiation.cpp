@@ -7,7 +7,7 @@
 namespace {
 
 // Where a film coefficient comes from.
-enum Definition { EMBEDDED = 0, PROPERTY = 1, USER = 2 };
+enum FilmDefinition { FILM_EMBEDDED = 0, FILM_PROPERTY = 1, FILM_USER = 2 };
 
 /// The range that stands for none.
 constexpr double kNoRange = 3.4028234663852886e38;
@@ -38,8 +38,8 @@ void oif_FilmInteraction::AddFilmAmplitudes(oif_KeywordLine& line) const {
     const auto& film = Record<kinC_FilmCondition>();
     const auto& state = film.ConstGetState(Step());
     // A film of the user's code has neither.
-    if (film.definition != USER) AddNamed(line, ", amplitude=", state.amplitude.ConstGet());
-    if (film.definition == EMBEDDED) {
+    if (film.definition != FILM_USER) AddNamed(line, ", amplitude=", state.amplitude.ConstGet());
+    if (film.definition == FILM_EMBEDDED) {
         AddNamed(line, ", film amplitude=", state.filmAmplitude.ConstGet());
     }
 }
@@ -53,14 +53,14 @@ void oif_Sfilm::WriteData(utl_Stream& stream) const {
     const auto& state = film.ConstGetState(Step());
     stream << SetName() << ", ";
     switch (film.definition) {
-    case EMBEDDED:
+    case FILM_EMBEDDED:
         stream << "F, " << state.sinkTemperature.ConstGet() << ", " << state.filmCoeff.ConstGet();
         break;
-    case PROPERTY:
+    case FILM_PROPERTY:
         stream << "F, " << state.sinkTemperature.ConstGet() << ", "
                << qkw_QuorixName(state.filmProperty.ConstGet(), false);
         break;
-    case USER:
+    case FILM_USER:
         stream << "FNU, " << state.sinkTemperature.ConstGet() << ", " << state.filmCoeff.ConstGet();
         break;
     default: break;
@@ -71,7 +71,7 @@ void oif_Cfilm::AddParameters(oif_KeywordLine& line) const {
     const auto& film = Record<kinC_ConcFilmCondition>();
     AddFilmAmplitudes(line);
     AddRegionType(line, film.regionType);
-    if (film.definition == USER) line.MayBreak().Fixed(", user");
+    if (film.definition == FILM_USER) line.MayBreak().Fixed(", user");
 }
 
 void oif_Cfilm::WriteData(utl_Stream& stream) const {
@@ -79,7 +79,7 @@ void oif_Cfilm::WriteData(utl_Stream& stream) const {
     const auto& state = film.ConstGetState(Step());
     stream << SetName() << ", " << state.nodalArea.ConstGet() << ", " << state.sinkTemperature.ConstGet()
            << ", ";
-    if (film.definition == PROPERTY) {
+    if (film.definition == FILM_PROPERTY) {
         stream << qkw_QuorixName(state.filmProperty.ConstGet(), false);
     } else {
         stream << state.filmCoeff.ConstGet();

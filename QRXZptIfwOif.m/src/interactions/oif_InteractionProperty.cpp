@@ -9,8 +9,6 @@
 
 namespace {
 
-using Row = oif_InteractionPropertyRow;
-
 void AddContactProperty(oif_InteractionBuilder& builder, const cow_String& name,
                         const kinC_InteractionProperty& property) {
     const auto& contact = static_cast<const kinC_ContactProperty&>(property);
@@ -32,7 +30,7 @@ void AddContactProperty(oif_InteractionBuilder& builder, const cow_String& name,
 
 /// A class with one keyword.
 template <class R, class Keyword>
-constexpr Row One() {
+constexpr oif_InteractionPropertyRow One() {
     return {R::Class.Id(),
             [](oif_InteractionBuilder& builder, const cow_String& name,
                const kinC_InteractionProperty& property) { builder.AddProperty(Keyword(name, property)); }};
@@ -40,24 +38,24 @@ constexpr Row One() {
 
 /// A class that no deck tells of.
 template <class R>
-constexpr Row Silent() {
+constexpr oif_InteractionPropertyRow NotInDeck() {
     return {R::Class.Id(), nullptr};
 }
 
-constexpr Row kRows[] = {
+constexpr oif_InteractionPropertyRow kPropertyRows[] = {
     {kinC_ContactProperty::Class.Id(), AddContactProperty},
     One<kinC_FilmConditionProp, oif_FilmProperty>(),
     One<kinC_AcousticImpedanceProp, oif_AcousticImpedanceProp>(),
-    Silent<kinC_IncidentWaveProperty>(),
-    Silent<kinC_ActuatorSensorProp>(),
+    NotInDeck<kinC_IncidentWaveProperty>(),
+    NotInDeck<kinC_ActuatorSensorProp>(),
 };
 
 } // namespace
 
 std::span<const oif_InteractionPropertyRow> oif_InteractionPropertyRows() {
-    return kRows;
+    return kPropertyRows;
 }
 
 const oif_InteractionPropertyRow* oif_FindInteractionPropertyRow(unsigned typeId) {
-    return oif_FindRow(kRows, typeId);
+    return oif_FindRow(kPropertyRows, typeId);
 }

@@ -13,7 +13,6 @@
 
 namespace {
 
-using Row = oif_InteractionRow;
 using Rule = oif_RegionRule<kinC_Interaction>;
 
 template <auto Member>
@@ -41,24 +40,24 @@ void HistoryOf(oif_InteractionBuilder& builder, const cow_String& name, const ki
 }
 
 template <class R, void (*add)(oif_InteractionBuilder&, const cow_String&, const R&)>
-constexpr Row History(std::span<const Rule> regions = {}) {
+constexpr oif_InteractionRow History(std::span<const Rule> regions = {}) {
     return {R::Class.Id(), regions, oif_ContactSolver::NONE, HistoryOf<R, add>};
 }
 
 template <class R, void (*add)(oif_InteractionBuilder&, const cow_String&, const R&)>
-constexpr Row Pair(oif_ContactSolver solver, std::span<const Rule> regions) {
+constexpr oif_InteractionRow Pair(oif_ContactSolver solver, std::span<const Rule> regions) {
     return {R::Class.Id(), regions, solver, HistoryOf<R, add>, oif_ContactPair::WriteAs<R>};
 }
 
 /// A keyword on the one region of the interaction.
 template <class Keyword, class R>
-qkw_KeywordHandle MakeOnSurface(const qkw_ModelInfo& modelInfo, const Row::Held& held, const cow_String& step,
-                                oif_Op op) {
+qkw_KeywordHandle MakeOnSurface(const qkw_ModelInfo& modelInfo, const oif_InteractionRow::Held& held,
+                                const cow_String& step, oif_Op op) {
     const R& record = static_cast<const R&>(held.ConstGet());
     return qkw_KeywordHandle(Keyword(held, step, op, oif_RegionName(record.surface, modelInfo)));
 }
 
-qkw_KeywordHandle MakeIncidentWave(const qkw_ModelInfo& modelInfo, const Row::Held& held,
+qkw_KeywordHandle MakeIncidentWave(const qkw_ModelInfo& modelInfo, const oif_InteractionRow::Held& held,
                                    const cow_String& step, oif_Op) {
     const auto& wave = static_cast<const kinC_IncidentWave&>(held.ConstGet());
     return qkw_KeywordHandle(oif_IncidentWave(wave, step, oif_RegionName(wave.source, modelInfo),
@@ -67,15 +66,15 @@ qkw_KeywordHandle MakeIncidentWave(const qkw_ModelInfo& modelInfo, const Row::He
 }
 
 template <class R, class Keyword, oif_RegionKind kinds>
-constexpr Row SaidOnSurface(oif_Saying saying = oif_Saying::CHANGES) {
-    Row row{R::Class.Id(), kSurfaceOf<R, kinds>};
+constexpr oif_InteractionRow SaidOnSurface(oif_Saying saying = oif_Saying::CHANGES) {
+    oif_InteractionRow row{R::Class.Id(), kSurfaceOf<R, kinds>};
     row.saying = saying;
     row.make = MakeOnSurface<Keyword, R>;
     return row;
 }
 
-constexpr Row IncidentWave() {
-    Row row{kinC_IncidentWave::Class.Id(), kWaveRegions};
+constexpr oif_InteractionRow IncidentWave() {
+    oif_InteractionRow row{kinC_IncidentWave::Class.Id(), kWaveRegions};
     row.saying = oif_Saying::CREATION;
     row.make = MakeIncidentWave;
     return row;
@@ -83,20 +82,20 @@ constexpr Row IncidentWave() {
 
 /// A class that no deck tells of.
 template <class R>
-constexpr Row Silent() {
+constexpr oif_InteractionRow Silent() {
     return {R::Class.Id(), {}};
 }
 
 /// An elastic foundation counts among the pairs, without a line.
-constexpr Row ElasticFoundation() {
-    Row row = Silent<kinC_ElasticFoundation>();
+constexpr oif_InteractionRow ElasticFoundation() {
+    oif_InteractionRow row = Silent<kinC_ElasticFoundation>();
     row.pair = [](utl_Stream&, const oif_ContactPair&, const kinC_Interaction&) {};
     return row;
 }
 
 using enum oif_ContactSolver;
 
-constexpr Row kRows[] = {
+constexpr oif_InteractionRow kInteractionRows[] = {
     Pair<kinC_SurfaceToSurfaceContactStd, oif_SurfaceToSurfaceContactStdHistory>(IMPLICIT, kPairRegions),
     Pair<kinC_SurfaceToSurfaceContactXpl, oif_SurfaceToSurfaceContactXplHistory>(EXPLICIT, kPairRegions),
     Pair<kinC_SelfContactStd, oif_SelfContactStdHistory>(IMPLICIT, kSelfRegions),
@@ -118,11 +117,11 @@ constexpr Row kRows[] = {
 } // namespace
 
 std::span<const oif_InteractionRow> oif_InteractionRows() {
-    return kRows;
+    return kInteractionRows;
 }
 
 const oif_InteractionRow* oif_FindInteractionRow(unsigned typeId) {
-    return oif_FindRow(kRows, typeId);
+    return oif_FindRow(kInteractionRows, typeId);
 }
 
 oif_ContactSolver oif_SolverOf(const kinC_Interaction& interaction) {

@@ -15,9 +15,9 @@ namespace {
 
 /// One contact on its way through the steps.
 template <class Contact>
-class History {
+class ContactSteps {
 public:
-    History(oif_InteractionBuilder& builder, const cow_String& name, const Contact& contact)
+    ContactSteps(oif_InteractionBuilder& builder, const cow_String& name, const Contact& contact)
         : builder_(builder), name_(name), held_(WithChangeableProperty(contact)),
           comment_(oif_InteractionComment(name)) {}
 
@@ -91,7 +91,7 @@ private:
 };
 
 template <class Contact>
-void History<Contact>::AddInterference(const cow_String& step) {
+void ContactSteps<Contact>::AddInterference(const cow_String& step) {
     const Status status = Record().GetPropStatus(step);
     if (status != Status::CREATED && status != Status::MODIFIED) return;
     const bool changesFriction = status == Status::MODIFIED && ChangesProperty(step);
@@ -114,7 +114,7 @@ void History<Contact>::AddInterference(const cow_String& step) {
 }
 
 template <class Contact>
-void History<Contact>::AddControls(const cow_String& step) {
+void ContactSteps<Contact>::AddControls(const cow_String& step) {
     const bool isNew = Record().GetPropStatus(step) == Status::CREATED;
     if (!Record().HasStep(step)) return;
     const auto& attribute = Record().ConstGetState(step).ContactControls;
@@ -140,7 +140,7 @@ void History<Contact>::AddControls(const cow_String& step) {
 
 void oif_SurfaceToSurfaceContactStdHistory(oif_InteractionBuilder& builder, const cow_String& name,
                                            const kinC_SurfaceToSurfaceContactStd& contact) {
-    History history(builder, name, contact);
+    ContactSteps history(builder, name, contact);
     history.AddPair();
     history.AddClearance();
     builder.ForEachAnalysisStep([&](const cow_String& step) {
@@ -152,7 +152,7 @@ void oif_SurfaceToSurfaceContactStdHistory(oif_InteractionBuilder& builder, cons
 
 void oif_SelfContactStdHistory(oif_InteractionBuilder& builder, const cow_String& name,
                                const kinC_SelfContactStd& contact) {
-    History history(builder, name, contact);
+    ContactSteps history(builder, name, contact);
     history.AddPair();
     builder.ForEachAnalysisStep([&](const cow_String& step) {
         history.AddEntranceOrExit(step);

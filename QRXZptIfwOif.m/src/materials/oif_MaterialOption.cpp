@@ -79,7 +79,7 @@ constexpr auto kFractionLine = [](auto& stream, const auto& o) {
 
 // In some keywords words are run together or capitals are uneven, and two effects share "*Kappa": that is how
 // the deck has them.
-constexpr Row kRows[] = {
+constexpr Row kMaterialRows[] = {
     Option<kmaC_AcousticBulkModulus>("*Acoustic Bulk Modulus"),
     Special<kmaC_AcousticMedium>("*Acoustic Medium"),
     Option<kmaC_AcousticVolumetricDrag>("*Acoustic Volumetric Drag"),
@@ -321,9 +321,9 @@ constexpr Row kRows[] = {
 
 void oif_WriteOption(utl_Stream& stream, const kmaC_MaterialOption& option) {
     const unsigned typeId = option.DynTypeId();
-    const Row* row =
-        std::find_if(std::begin(kRows), std::end(kRows), [&](const Row& r) { return r.typeId == typeId; });
-    if (row == std::end(kRows)) {
+    const Row* row = std::find_if(std::begin(kMaterialRows), std::end(kMaterialRows),
+                                  [&](const Row& r) { return r.typeId == typeId; });
+    if (row == std::end(kMaterialRows)) {
         const cow_String text = cow_String("oif_WriteOption: no keyword for ") + cls_Classes().NameOf(typeId);
         nex_Raise(atr_String(text.View()));
     }

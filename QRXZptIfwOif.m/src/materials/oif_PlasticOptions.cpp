@@ -2,19 +2,19 @@
 
 namespace {
 
-constexpr int kRateColumn = 2;
+constexpr int kColumnOfRate = 2;
 
 /// The rows of a table with rates, each formatted alone: `startBlock(rate)` wherever the rate changes.
 template <class R, class StartBlock>
 void WriteByRate(utl_Stream& stream, const R& option, const kmaC_MaterialTable& table,
                  const StartBlock& startBlock) {
     const int columns = table.NumColumns();
-    if (columns <= kRateColumn) return;
+    if (columns <= kColumnOfRate) return;
     for (int row = 0; row < table.NumRows(); ++row) {
-        const double rate = table.ConstGet(row, kRateColumn);
-        if (row == 0 || rate != table.ConstGet(row - 1, kRateColumn)) startBlock(rate);
+        const double rate = table.ConstGet(row, kColumnOfRate);
+        if (row == 0 || rate != table.ConstGet(row - 1, kColumnOfRate)) startBlock(rate);
         oif_MaterialTable line = oif_TableOfOneRow(
-            [&](int column) { return table.ConstGet(row, column < kRateColumn ? column : column + 1); },
+            [&](int column) { return table.ConstGet(row, column < kColumnOfRate ? column : column + 1); },
             columns - 1);
         oif_KeepFieldColumns(line, columns - 1, option.temperatureDependency, option.dependencies);
         stream << line;
@@ -24,10 +24,10 @@ void WriteByRate(utl_Stream& stream, const R& option, const kmaC_MaterialTable& 
 /// The rows in ascending order of their rates; those of one rate keep their order.
 kmaC_MaterialTable SortedByRate(kmaC_MaterialTable table) {
     const int last = table.NumColumns() - 1;
-    if (last < kRateColumn) return table;
-    table.SwapColumns(kRateColumn, last);
+    if (last < kColumnOfRate) return table;
+    table.SwapColumns(kColumnOfRate, last);
     table.Sort(1);
-    table.SwapColumns(kRateColumn, last);
+    table.SwapColumns(kColumnOfRate, last);
     return table;
 }
 

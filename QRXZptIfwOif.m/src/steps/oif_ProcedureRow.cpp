@@ -144,7 +144,7 @@ constexpr Line kExplicitLine{CHANGE, kNo, kNo, false, Never};
 constexpr Line kPerturbationLine{PERTURBATION, kNo, kNo, false, Never};
 constexpr Line kUnsymmetricPerturbationLine{PERTURBATION, kNo, kNo, false, Always};
 
-constexpr oif_ProcedureRow kRows[] = {
+constexpr oif_ProcedureRow kProcedureRows[] = {
     RowOf<kprC_AnnealStep, Plain<oif_Anneal>>(kExplicitLine),
     RowOf<kprC_BuckleStep, Plain<oif_Buckle>>(kPerturbationLine),
     RowOf<kprC_CoupledTempDisplacementStep, InFormat<oif_CoupledTempDisplacement>, Technique>(
@@ -188,9 +188,9 @@ constexpr oif_ProcedureRow kRows[] = {
 } // namespace
 
 std::span<const oif_ProcedureRow> oif_ProcedureRows() {
-    return kRows;
+    return kProcedureRows;
 }
 
 const oif_ProcedureRow* oif_FindProcedureRow(unsigned typeId) {
-    return oif_FindRow(kRows, typeId);
+    return oif_FindRow(kProcedureRows, typeId);
 }

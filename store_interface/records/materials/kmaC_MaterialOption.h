@@ -9,6 +9,10 @@ public:
     static constexpr cls_ClassInfo Class{"kmaC_MaterialOption", "one property or behaviour of a material"};
 };
 
+/// On how many directions the columns of a table depend, for all options that say so.
+inline constexpr omu_EnumRow kmaC_DirectionRows[] = {
+    {0, "ISOTROPIC", "ISOTROPIC"}, {1, "ORTHOTROPIC", "ORTHOTROPIC"}, {2, "ANISOTROPIC", "ANISOTROPIC"}};
+
 /// Base of the option class T whose table may depend on the temperature and on field variables.
 template <class T>
 class kmaC_DependentOption : public cls_RecordOf<T, kmaC_MaterialOption> {

@@ -6,9 +6,6 @@ namespace {
 
 constexpr omu_EnumRow kSorptionLawRows[] = {{0, "LOG", "LOG"}, {1, "TABULAR", "TABULAR"}};
 
-constexpr omu_EnumRow kDirectionRows[] = {
-    {0, "ISOTROPIC", "ISOTROPIC"}, {1, "ORTHOTROPIC", "ORTHOTROPIC"}, {2, "ANISOTROPIC", "ANISOTROPIC"}};
-
 } // namespace
 
 const cls_FieldTable& kmaC_SaturationDependence::Fields() {
@@ -28,7 +25,7 @@ const cls_FieldTable& kmaC_VelocityDependence::Fields() {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kmaC_Permeability::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_Permeability::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_Permeability::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 
@@ -138,7 +135,7 @@ const omu_EnumTable& omu_EnumTableOf(kmaC_Diffusivity::LawEnm) {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kmaC_Diffusivity::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_Diffusivity::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_Diffusivity::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 

@@ -2,15 +2,8 @@
 
 #include "store_interface/records/cls_ClassRegistrar.h"
 
-namespace {
-
-constexpr omu_EnumRow kDirectionRows[] = {
-    {0, "ISOTROPIC", "ISOTROPIC"}, {1, "ORTHOTROPIC", "ORTHOTROPIC"}, {2, "ANISOTROPIC", "ANISOTROPIC"}};
-
-} // namespace
-
 const omu_EnumTable& omu_EnumTableOf(kmaC_Conductivity::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_Conductivity::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_Conductivity::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 
@@ -26,7 +19,7 @@ const cls_FieldTable& kmaC_Conductivity::Fields() {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kmaC_Expansion::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_Expansion::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_Expansion::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 
@@ -78,7 +71,7 @@ const cls_FieldTable& kmaC_JouleHeatFraction::Fields() {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kmaC_ElectricalConductivity::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_ElectricalConductivity::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_ElectricalConductivity::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 
@@ -94,7 +87,7 @@ const cls_FieldTable& kmaC_ElectricalConductivity::Fields() {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kmaC_Dielectric::TypeEnm) {
-    static constexpr omu_EnumTable table{"kmaC_Dielectric::TypeEnm", kDirectionRows};
+    static constexpr omu_EnumTable table{"kmaC_Dielectric::TypeEnm", kmaC_DirectionRows};
     return table;
 }
 
