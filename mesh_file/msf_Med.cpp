@@ -1,3 +1,4 @@
+#include "mesh_file/msf_Apart.h"
 #include "mesh_file/msf_Builder.h"
 #include "mesh_file/msf_Readers.h"
 
@@ -321,7 +322,10 @@ const std::vector<std::string>* MedReader::GroupsOf(long long family) {
 } // namespace
 
 void msf_ReadMed(const msf_Input& input, const msf_Options& options, msf_Mesh& mesh) {
-    MedReader(input, options, mesh).Read();
+    const auto readHere = [](const msf_Input& file, const msf_Options& asked, msf_Mesh& read) {
+        MedReader(file, asked, read).Read();
+    };
+    msf_ReadApart(readHere, input, options, mesh);
 }
 
 #else
