@@ -32,7 +32,9 @@ target_link_options(qrx_hardened INTERFACE $<$<CONFIG:Release>:LINKER:-z,relro,-
 # What the second build of each library is made with, that the tests are linked to as well. Optimising would cost
 # more time than it saves the tests.
 add_library(qrx_sanitizers INTERFACE)
-set(QRX_SANITIZER_FLAGS -fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
+# Null pointers and the ends of objects are the address sanitizer's too; asking twice takes a quarter of the time.
+set(QRX_SANITIZER_FLAGS -fsanitize=address,undefined -fno-sanitize=null,object-size -fno-sanitize-recover=all
+    -fno-omit-frame-pointer)
 target_compile_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS} -O0 -g1)
 target_link_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS})
 

@@ -18,6 +18,7 @@ public:
     drd_Canonical(const drd_Deck& deck, bool ignoreTitles);
 
     const drd_Deck& Deck() const { return deck_; }
+    const drd_Keyword& Keyword(int index) const { return deck_.keywords[static_cast<std::size_t>(index)]; }
     const drd_Names& Names() const { return names_; }
     /// Works the signatures out, names replaced.
     void Sign(const Renames& renames);

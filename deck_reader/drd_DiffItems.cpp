@@ -99,19 +99,17 @@ void drd_Differ::CompareAlike(const Items& first, const Items& second, const Con
     TellLonely(match, context);
 }
 
-drd_Differ::Match drd_Differ::MatchByName(const Items& first, const Items& second) {
+template <class KeyOf>
+drd_Differ::Match drd_Differ::MatchByKey(const Items& first, const Items& second, const KeyOf& keyOf) const {
     Match match;
-    const auto nameOf = [](const drd_Canonical& deck, const drd_Keyword& keyword) {
-        return keyword.key + "/" + deck.Name(keyword.Value(drd_NameParameter(*keyword.row)));
-    };
     std::vector<int> taken;
-    std::unordered_map<std::string, std::vector<int>> byName;
+    std::unordered_map<decltype(keyOf(second_, 0)), std::vector<int>> byKey;
     for (auto item = second.rbegin(); item != second.rend(); ++item) {
-        byName[nameOf(second_, SecondKeyword(*item))].push_back(*item);
+        byKey[keyOf(second_, *item)].push_back(*item);
     }
     for (const int item : first) {
-        const auto found = byName.find(nameOf(first_, FirstKeyword(item)));
-        if (found == byName.end() || found->second.empty()) {
+        const auto found = byKey.find(keyOf(first_, item));
+        if (found == byKey.end() || found->second.empty()) {
             match.onlyFirst.push_back(item);
             continue;
         }
@@ -123,25 +121,16 @@ drd_Differ::Match drd_Differ::MatchByName(const Items& first, const Items& secon
     return match;
 }
 
+drd_Differ::Match drd_Differ::MatchByName(const Items& first, const Items& second) const {
+    return MatchByKey(first, second, [](const drd_Canonical& deck, int item) {
+        const drd_Keyword& keyword = deck.Keyword(item);
+        return keyword.key + "/" + deck.Name(keyword.Value(drd_NameParameter(*keyword.row)));
+    });
+}
+
 drd_Differ::Match drd_Differ::MatchBySignature(const Items& first, const Items& second) const {
-    Match match;
-    std::unordered_map<std::uint64_t, std::vector<int>> bySignature;
-    for (auto item = second.rbegin(); item != second.rend(); ++item) {
-        bySignature[second_.Signature(*item)].push_back(*item);
-    }
-    std::vector<int> taken;
-    for (const int item : first) {
-        const auto found = bySignature.find(first_.Signature(item));
-        if (found == bySignature.end() || found->second.empty()) {
-            match.onlyFirst.push_back(item);
-            continue;
-        }
-        match.pairs.push_back({item, found->second.back()});
-        taken.push_back(found->second.back());
-        found->second.pop_back();
-    }
-    match.onlySecond = Without(second, taken);
-    return match;
+    return MatchByKey(first, second,
+                      [](const drd_Canonical& deck, int item) { return deck.Signature(item); });
 }
 
 /// Of the things without partner those that differ in their name alone.

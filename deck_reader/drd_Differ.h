@@ -52,7 +52,10 @@ private:
     // Keywords (drd_DiffItems.cpp).
     void CompareItems(const Items& first, const Items& second, const Context& context);
     void CompareAlike(const Items& first, const Items& second, const Context& context);
-    Match MatchByName(const Items& first, const Items& second);
+    /// The items of one key each, in their order.
+    template <class KeyOf>
+    Match MatchByKey(const Items& first, const Items& second, const KeyOf& keyOf) const;
+    Match MatchByName(const Items& first, const Items& second) const;
     Match MatchBySignature(const Items& first, const Items& second) const;
     void MatchRenamed(Match& match, const Context& context);
     void TellMoved(std::vector<Pair> pairs, const Context& context);
@@ -97,12 +100,8 @@ private:
     void Tell(drd_ChangeEnm change, std::string kind, std::string text, drd_Place first, drd_Place second);
     const drd_Deck& First() const { return first_.Deck(); }
     const drd_Deck& Second() const { return second_.Deck(); }
-    const drd_Keyword& FirstKeyword(int index) const {
-        return First().keywords[static_cast<std::size_t>(index)];
-    }
-    const drd_Keyword& SecondKeyword(int index) const {
-        return Second().keywords[static_cast<std::size_t>(index)];
-    }
+    const drd_Keyword& FirstKeyword(int index) const { return first_.Keyword(index); }
+    const drd_Keyword& SecondKeyword(int index) const { return second_.Keyword(index); }
 
     drd_DiffOptions options_;
     drd_Canonical first_;

@@ -10,15 +10,7 @@ constexpr std::int64_t kMostGenerated = 200'000'000;
 
 /// An empty field: goes on behind its comma.
 bool PassEmptyField(const char*& at) {
-    const char* place = at;
-    while (drd_IsBlank(*place)) ++place;
-    if (*place == ',') {
-        at = place + 1;
-        return true;
-    }
-    if (*place != '\n' && *place != '\r' && *place != '\0') return false;
-    at = nullptr;
-    return true;
+    return drd_EndOfField(at, at);
 }
 
 /// The field at `at` as it stands, trimmed; `at` goes on behind its comma.

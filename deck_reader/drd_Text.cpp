@@ -86,8 +86,9 @@ constexpr std::array<double, 23> kPowersOfTen = {1e0,  1e1,  1e2,  1e3,  1e4,  1
                                                  1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
 constexpr std::uint64_t kExactMantissa = std::uint64_t{1} << 53;
 
-/// Behind the number: true when a comma or the end of the line follows, and `at` goes on behind it.
-bool EndOfField(const char* place, const char*& at) {
+} // namespace
+
+bool drd_EndOfField(const char* place, const char*& at) {
     while (drd_IsBlank(*place)) ++place;
     if (*place == ',') {
         at = place + 1;
@@ -97,8 +98,6 @@ bool EndOfField(const char* place, const char*& at) {
     at = nullptr;
     return true;
 }
-
-} // namespace
 
 bool drd_ScanInt(const char*& at, int& value) {
     const char* place = at;
@@ -112,7 +111,7 @@ bool drd_ScanInt(const char*& at, int& value) {
     }
     if (negative) number = -number;
     if (place == digits || drd_IsDigit(*place) || number != static_cast<std::int32_t>(number)) return false;
-    if (!EndOfField(place, at)) return false;
+    if (!drd_EndOfField(place, at)) return false;
     value = static_cast<int>(number);
     return true;
 }
@@ -124,7 +123,7 @@ bool ScanAnyReal(const char*& at, double& value) {
     const char* end = at;
     while (*end != ',' && *end != '\n' && *end != '\r' && *end != '\0') ++end;
     if (!drd_ReadReal(std::string_view(at, static_cast<std::size_t>(end - at)), value)) return false;
-    return EndOfField(end, at);
+    return drd_EndOfField(end, at);
 }
 
 } // namespace
@@ -163,7 +162,7 @@ bool drd_ScanReal(const char*& at, double& value) {
     } else {
         number *= kPowersOfTen[static_cast<std::size_t>(exponent)];
     }
-    if (!EndOfField(place, at)) return ScanAnyReal(at, value);
+    if (!drd_EndOfField(place, at)) return ScanAnyReal(at, value);
     value = negative ? -number : number;
     return true;
 }

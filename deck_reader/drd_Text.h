@@ -8,6 +8,10 @@
 
 // The small change of the deck language: blanks, capitals, fields, names, numbers.
 
+/// Whether only blanks stand between `place` and a comma or the end of the line; `at` is then behind the
+/// comma, or null.
+bool drd_EndOfField(const char* place, const char*& at);
+
 inline bool drd_IsBlank(char c) {
     return c == ' ' || c == '\t';
 }

@@ -5,6 +5,7 @@
 #include <cerrno>
 #include <cstdint>
 #include <cstring>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <system_error>
 #include <unistd.h>
@@ -142,6 +143,8 @@ void msf_ReadApart(void (*readHere)(const msf_Input& input, const msf_Options& o
     }
     if (child == 0) {
         close(ends[0]);
+        const rlimit noCore{0, 0};
+        setrlimit(RLIMIT_CORE, &noCore);
         Sender sender(ends[1]);
         try {
             readHere(input, options, mesh);

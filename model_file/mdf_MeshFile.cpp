@@ -3,6 +3,7 @@
 #include "mesh_file/msf_MeshFile.h"
 #include "model_file/mdf_DeckMesh.h"
 #include "model_file/mdf_MeshImport.h"
+#include "store_interface/findings/fnd_TextRules.h"
 
 #include <cmath>
 #include <filesystem>
@@ -120,9 +121,7 @@ void mdf_MeshFileReader::ReadElementTypes(mdf_MeshFileRequest& request, const md
             diagnostics_.Expected(place, member.value,
                                   "the label of an element type, or null for no elements");
         } else {
-            const fnd_NameProblem problem = fnd_ProblemOfName(member.value.String());
-            if (!problem.found.empty())
-                diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
+            fnd_CheckName(member.value.String(), place, diagnostics_);
             request.elementTypes[*kind] = member.value.String();
         }
     }
@@ -151,9 +150,7 @@ void mdf_MeshFileReader::ReadGroups(mdf_MeshFileRequest& request, const mdf_Valu
         } else if (!member.value.IsString()) {
             diagnostics_.Expected(place, member.value, "the name of a set, or null to leave the group out");
         } else {
-            const fnd_NameProblem problem = fnd_ProblemOfName(member.value.String());
-            if (!problem.found.empty())
-                diagnostics_.Add("name-in-deck", place, "found " + problem.found, problem.expected);
+            fnd_CheckName(member.value.String(), place, diagnostics_);
             request.groups.emplace_back(member.name, member.value.String());
         }
     }

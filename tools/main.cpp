@@ -71,21 +71,7 @@ struct CommandLine {
         app.footer(kExitCodes);
         app.get_formatter()->column_width(30);
 
-        AddModel(writeCommand, write.model);
-        writeCommand
-            ->add_option(
-                "--job", write.job,
-                "Name of the deck without \".inp\"; may hold a folder, relative to the output folder, "
-                "out of which \"../\" leads; an absolute path excludes --output-dir "
-                "(default: the model file's name without extension)")
-            ->type_name("NAME");
-        writeCommand
-            ->add_option("--output-dir", write.outputDir, "Folder of the deck (default: the current one)")
-            ->type_name("DIR");
-        writeCommand->add_flag(
-            "--verify", write.verify,
-            "Read the deck back and hold it against the model: nodes, elements, sets, surfaces, "
-            "materials, amplitudes, steps");
+        AddWrite();
         AddModel(checkCommand, model, "Model file, JSON; or a deck, .inp");
         checkCommand->add_flag("--no-includes", deck.keepIncludesShut,
                                "Of a deck: don't read the files that it includes");
@@ -96,31 +82,9 @@ struct CommandLine {
             "--history", history,
             "Also what conditions, loads, interactions and output requests are in each step, "
             "and what the step writes of them");
-        AddMeshFile(meshCommand, mesh.mesh);
-        meshCommand
-            ->add_option("--group-arrays", mesh.groupArrays,
-                         "Arrays of cells that are to become groups, of formats that have none (VTK, VTU)")
-            ->type_name("NAME");
-        meshCommand->add_option("--part", mesh.part, "The mesh to take of a file with several")
-            ->type_name("NAME");
-        AddMeshFile(newCommand, newModel.mesh);
-        newCommand
-            ->add_option("-o,--output", newModel.output,
-                         "Model file to write (default: the mesh file's name with \".json\", in the "
-                         "current folder)")
-            ->type_name("FILE");
-        newCommand->add_flag("--force", newModel.force, "Overwrite the file if it is there");
-        AddModel(formatCommand, format.model);
-        auto* output =
-            formatCommand
-                ->add_option("-o,--output", format.output,
-                             "File to write, which may be MODEL itself (default: the standard output); "
-                             "comments are left out, and on failure the old file stays as it was")
-                ->type_name("FILE");
-        formatCommand
-            ->add_flag("--check", format.check,
-                       "Write nothing; exit with 1 and name the file when it isn't in that form")
-            ->excludes(output);
+        AddMesh();
+        AddNew();
+        AddFormat();
         AddView();
         variablesCommand
             ->add_option("--step-type", stepType,
@@ -182,6 +146,58 @@ private:
             ->type_name("FILE");
         viewCommand->add_flag("--open", view.open, "Show the page in the browser");
     }
+    void AddWrite() {
+        AddModel(writeCommand, write.model);
+        writeCommand
+            ->add_option(
+                "--job", write.job,
+                "Name of the deck without \".inp\"; may hold a folder, relative to the output folder, "
+                "out of which \"../\" leads; an absolute path excludes --output-dir "
+                "(default: the model file's name without extension)")
+            ->type_name("NAME");
+        writeCommand
+            ->add_option("--output-dir", write.outputDir, "Folder of the deck (default: the current one)")
+            ->type_name("DIR");
+        writeCommand->add_flag(
+            "--verify", write.verify,
+            "Read the deck back and hold it against the model: nodes, elements, sets, surfaces, "
+            "materials, amplitudes, steps");
+    }
+
+    void AddMesh() {
+        AddMeshFile(meshCommand, mesh.mesh);
+        meshCommand
+            ->add_option("--group-arrays", mesh.groupArrays,
+                         "Arrays of cells that are to become groups, of formats that have none (VTK, VTU)")
+            ->type_name("NAME");
+        meshCommand->add_option("--part", mesh.part, "The mesh to take of a file with several")
+            ->type_name("NAME");
+    }
+
+    void AddNew() {
+        AddMeshFile(newCommand, newModel.mesh);
+        newCommand
+            ->add_option("-o,--output", newModel.output,
+                         "Model file to write (default: the mesh file's name with \".json\", in the "
+                         "current folder)")
+            ->type_name("FILE");
+        newCommand->add_flag("--force", newModel.force, "Overwrite the file if it is there");
+    }
+
+    void AddFormat() {
+        AddModel(formatCommand, format.model);
+        auto* output =
+            formatCommand
+                ->add_option("-o,--output", format.output,
+                             "File to write, which may be MODEL itself (default: the standard output); "
+                             "comments are left out, and on failure the old file stays as it was")
+                ->type_name("FILE");
+        formatCommand
+            ->add_flag("--check", format.check,
+                       "Write nothing; exit with 1 and name the file when it isn't in that form")
+            ->excludes(output);
+    }
+
     void AddDiff() {
         diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");
         auto* second = diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->type_name("");

@@ -2,6 +2,7 @@
 
 #include "view_page/vpg_Arrays.h"
 #include "view_page/vpg_Objects.h"
+#include "view_page/vpg_Values.h"
 
 using nlohmann::ordered_json;
 
@@ -10,20 +11,6 @@ namespace {
 constexpr std::string_view kTitleMark = "@TITLE@";
 constexpr std::string_view kHeaderMark = "@HEADER@";
 constexpr std::string_view kArraysMark = "@ARRAYS@";
-
-std::string Escaped(std::string_view text) {
-    std::string escaped;
-    for (const char c : text) {
-        switch (c) {
-        case '<': escaped += "&lt;"; break;
-        case '>': escaped += "&gt;"; break;
-        case '&': escaped += "&amp;"; break;
-        case '"': escaped += "&quot;"; break;
-        default: escaped += c;
-        }
-    }
-    return escaped;
-}
 
 /// JSON in which no name can end the element that it stands in.
 std::string WithoutTags(std::string json) {
@@ -69,7 +56,7 @@ std::string vpg_Html(const vpg_PageData& data, const std::string& title) {
         html.append(page.substr(place, found - place)).append(text);
         place = found + mark.size();
     };
-    fill(kTitleMark, Escaped(title));
+    fill(kTitleMark, vpg_Escaped(title));
     fill(kHeaderMark, WithoutTags(data.header));
     fill(kArraysMark, vpg_Base64(data.arrays));
     html.append(page.substr(place));

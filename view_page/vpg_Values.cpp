@@ -179,3 +179,17 @@ void vpg_ForEachRegion(const cls_Record& record, const RegionVisit& visit) {
         if (!field.notModelData) VisitRegions(field.name, *field.type, field.In(record), visit);
     }
 }
+
+std::string vpg_Escaped(std::string_view text) {
+    std::string escaped;
+    for (const char c : text) {
+        switch (c) {
+        case '<': escaped += "&lt;"; break;
+        case '>': escaped += "&gt;"; break;
+        case '&': escaped += "&amp;"; break;
+        case '"': escaped += "&quot;"; break;
+        default: escaped += c;
+        }
+    }
+    return escaped;
+}

@@ -21,5 +21,7 @@ void vpg_ForEachRegion(const cls_Record& record,
 inline std::string vpg_Text(const cow_String& text) {
     return std::string(text.View());
 }
+/// As it stands between tags, or in double quotes within one.
+std::string vpg_Escaped(std::string_view text);
 
 #endif

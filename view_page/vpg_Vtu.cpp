@@ -14,20 +14,6 @@ constexpr std::uint8_t kPoints = 2;
 /// The format's order where it isn't the deck's: the middles of the faces come before the body's.
 constexpr std::int8_t kHexahedron27[7] = {26, 24, 23, 25, 21, 22, 20};
 
-std::string Attribute(std::string_view text) {
-    std::string escaped;
-    for (const char c : text) {
-        switch (c) {
-        case '<': escaped += "&lt;"; break;
-        case '>': escaped += "&gt;"; break;
-        case '&': escaped += "&amp;"; break;
-        case '"': escaped += "&quot;"; break;
-        default: escaped += c;
-        }
-    }
-    return escaped;
-}
-
 template <class T>
 std::string BytesOf(const std::vector<T>& items) {
     return {reinterpret_cast<const char*>(items.data()), items.size() * sizeof(T)};
@@ -140,7 +126,7 @@ private:
                  std::vector<Array> arrays) {
         out(std::string("<") + name + ">\n");
         for (Array& array : arrays) {
-            out("<DataArray type=\"" + array.type + "\" Name=\"" + Attribute(array.name) +
+            out("<DataArray type=\"" + array.type + "\" Name=\"" + vpg_Escaped(array.name) +
                 "\" NumberOfComponents=\"" + std::to_string(array.components) +
                 "\" format=\"appended\" offset=\"" + std::to_string(offset_) + "\"/>\n");
             offset_ += array.bytes + sizeof array.bytes;

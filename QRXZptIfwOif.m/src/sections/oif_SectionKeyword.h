@@ -1,9 +1,24 @@
 #ifndef QRX_OIF_SECTIONKEYWORD_H
 #define QRX_OIF_SECTIONKEYWORD_H
 
+#include "base/oif_ClassRows.h"
 #include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "store_interface/records/sections/kseC_Section.h"
+
+/// How the keyword class K writes sections of one record class.
+template <class K>
+struct oif_SectionForm {
+    unsigned typeId;
+    void (*write)(const K& keyword, utl_Stream& stream, const kseC_Section& section);
+
+    template <class R, void (K::*Write)(utl_Stream&, const R&) const>
+    static constexpr oif_SectionForm Of() {
+        return {R::Class.Id(), [](const K& keyword, utl_Stream& stream, const kseC_Section& section) {
+                    (keyword.*Write)(stream, static_cast<const R&>(section));
+                }};
+    }
+};
 
 /// The section of one element set; the record is shared. Names of sets, orientations and controls are given
 /// in the form that the deck has them in; an orientation or controls of empty name are left out.

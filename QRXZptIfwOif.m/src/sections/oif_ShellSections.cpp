@@ -30,17 +30,16 @@ void WriteLayer(utl_Stream& stream, const kseC_CompositeShellLayer& layer, bool 
 } // namespace
 
 void oif_ShellSection::Write(utl_Stream& stream) const {
+    using Form = oif_SectionForm<oif_ShellSection>;
+    static constexpr Form forms[] = {
+        Form::Of<kseC_HomogenousShellSection, &oif_ShellSection::WriteHomogeneous>(),
+        Form::Of<kseC_CompositeShellSection, &oif_ShellSection::WriteComposite>(),
+        Form::Of<kseC_UserShellSection, &oif_ShellSection::WriteUser>(),
+    };
     const auto& shell = nex_canDynamicCastRef<kseC_ShellSection>(Section(), NEX_HERE);
-    if (shell.DynTypeId() == kseC_HomogenousShellSection::TypeId()) {
-        WriteHomogeneous(stream, nex_canDynamicCastRef<kseC_HomogenousShellSection>(shell, NEX_HERE));
-    } else if (shell.DynTypeId() == kseC_CompositeShellSection::TypeId()) {
-        WriteComposite(stream, nex_canDynamicCastRef<kseC_CompositeShellSection>(shell, NEX_HERE));
-    } else {
-        if (shell.DynTypeId() == kseC_UserShellSection::TypeId()) {
-            WriteUser(stream, nex_canDynamicCastRef<kseC_UserShellSection>(shell, NEX_HERE));
-        }
-        RaiseUnimplemented();
-    }
+    const Form* form = oif_FindRow(forms, shell.DynTypeId());
+    if (form == nullptr) RaiseUnimplemented();
+    form->write(*this, stream, shell);
 }
 
 void oif_ShellSection::WriteHomogeneous(utl_Stream& stream, const kseC_HomogenousShellSection& shell) const {
@@ -75,6 +74,7 @@ void oif_ShellSection::WriteUser(utl_Stream& stream, const kseC_UserShellSection
     line.Text(SetName());
     WriteControls(line);
     line.BreakingIf(!shell.symmetric, "unsymm");
+    RaiseUnimplemented();
 }
 
 oif_KeywordLine oif_ShellSection::KeywordLine(utl_Stream& stream,

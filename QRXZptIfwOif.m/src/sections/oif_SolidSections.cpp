@@ -3,19 +3,10 @@
 #include "base/oif_KeywordLine.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
-#include "store_interface/records/sections/kseC_SolidSections.h"
 
 namespace {
 
 using Material = qkw_QuorixName;
-
-void WriteTruss(utl_Stream& stream, const cow_String& setName, const kseC_TrussSection& truss) {
-    oif_KeywordLine(stream, "*Solid Section, elset=")
-        .Text(setName)
-        .Breaking("material=", Material(truss.materialName, false))
-        .End();
-    stream << truss.area << "," << endl;
-}
 
 /// Numbers have no point here, and the material's name no quotes.
 void WriteLayer(utl_Stream& stream, const kseC_CompositeSolidLayer& layer) {
@@ -34,29 +25,47 @@ void WriteLayers(utl_Stream& stream, const kseC_CompositeSolidSection& solid) {
 } // namespace
 
 void oif_SolidSection::Write(utl_Stream& stream) const {
-    const kseC_Section& section = Section();
-    if (section.DynTypeId() == kseC_TrussSection::TypeId()) {
-        WriteTruss(stream, SetName(), nex_canDynamicCastRef<kseC_TrussSection>(section, NEX_HERE));
-        return;
+    using Form = oif_SectionForm<oif_SolidSection>;
+    static constexpr Form forms[] = {
+        Form::Of<kseC_TrussSection, &oif_SolidSection::WriteTruss>(),
+        Form::Of<kseC_HomogenousSolidSection, &oif_SolidSection::WriteHomogeneous>(),
+        Form::Of<kseC_CompositeSolidSection, &oif_SolidSection::WriteComposite>(),
+    };
+    if (const Form* form = oif_FindRow(forms, Section().DynTypeId())) {
+        return form->write(*this, stream, Section());
     }
-    if (nex_canDynamicCastPtr<kseC_SolidSection>(&section) == nullptr) {
+    if (nex_canDynamicCastPtr<kseC_SolidSection>(&Section()) == nullptr) {
         nex_Raise("Neither solid nor truss section type");
     }
-    const bool isComposite = section.DynTypeId() == kseC_CompositeSolidSection::TypeId();
-    oif_KeywordLine line(stream, "*Solid Section, elset=");
-    line.Text(SetName()).BreakingIf(isComposite, "composite");
+    oif_KeywordLine line = KeywordLine(stream);
     WriteNames(line);
-    if (isComposite) {
-        line.End();
-        WriteLayers(stream, nex_canDynamicCastRef<kseC_CompositeSolidSection>(section, NEX_HERE));
-        return;
-    }
-    if (section.DynTypeId() != kseC_HomogenousSolidSection::TypeId()) {
-        nex_Raise("Unknown solid section type");
-    }
-    const auto& solid = nex_canDynamicCastRef<kseC_HomogenousSolidSection>(section, NEX_HERE);
+    nex_Raise("Unknown solid section type");
+}
+
+oif_KeywordLine oif_SolidSection::KeywordLine(utl_Stream& stream) const {
+    oif_KeywordLine line(stream, "*Solid Section, elset=");
+    line.Text(SetName());
+    return line;
+}
+
+void oif_SolidSection::WriteTruss(utl_Stream& stream, const kseC_TrussSection& truss) const {
+    KeywordLine(stream).Breaking("material=", Material(truss.materialName, false)).End();
+    stream << truss.area << "," << endl;
+}
+
+void oif_SolidSection::WriteHomogeneous(utl_Stream& stream, const kseC_HomogenousSolidSection& solid) const {
+    oif_KeywordLine line = KeywordLine(stream);
+    WriteNames(line);
     line.Breaking("material=", Material(solid.materialName, false)).End();
     stream << solid.thickness << "," << endl;
+}
+
+void oif_SolidSection::WriteComposite(utl_Stream& stream, const kseC_CompositeSolidSection& solid) const {
+    oif_KeywordLine line = KeywordLine(stream);
+    line.Breaking("composite");
+    WriteNames(line);
+    line.End();
+    WriteLayers(stream, solid);
 }
 
 void oif_MembraneSection::Write(utl_Stream& stream) const {

@@ -2,6 +2,7 @@
 #define QRX_OIF_SOLIDSECTIONS_H
 
 #include "sections/oif_SectionKeyword.h"
+#include "store_interface/records/sections/kseC_SolidSections.h"
 
 /// Continuum or truss elements:
 ///     *Solid Section, elset=SET, orientation=Ori-1, controls=EC-1, material=Steel
@@ -15,6 +16,12 @@ class oif_SolidSection final : public oif_SectionKeywordOf<oif_SolidSection> {
 public:
     using oif_SectionKeywordOf::oif_SectionKeywordOf;
     void Write(utl_Stream& stream) const override;
+
+private:
+    oif_KeywordLine KeywordLine(utl_Stream& stream) const;
+    void WriteTruss(utl_Stream& stream, const kseC_TrussSection& truss) const;
+    void WriteHomogeneous(utl_Stream& stream, const kseC_HomogenousSolidSection& solid) const;
+    void WriteComposite(utl_Stream& stream, const kseC_CompositeSolidSection& solid) const;
 };
 
 /// Membrane elements:

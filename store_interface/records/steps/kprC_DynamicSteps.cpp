@@ -1,6 +1,7 @@
 #include "store_interface/records/steps/kprC_DynamicSteps.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/steps/kprC_StepFields.h"
 
 const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::MassScalingTypeEnm) {
     static constexpr omu_EnumRow rows[] = {{0, "SEMI_AUTOMATIC", "SEMI_AUTOMATIC"},
@@ -80,26 +81,19 @@ const cls_FieldTable& kprC_ImplicitDynamicsStep::Fields() {
     using R = kprC_ImplicitDynamicsStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
-            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                 "0 automatic, 1 direct (fixed increments)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
-            .Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)")
-            .Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only")
-            .Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only")
+            .With(kprC_NlgeomField)
+            .With(kprC_AdiabaticField)
+            .With(kprC_TimePeriodField)
+            .With(kprC_TimeIncrementFields)
             .Field<&R::haftol>(
                 "haftol",
                 "half-increment residual tolerance (force); always written by any method but the direct one")
             .Field<&R::nohaf>("nohaf", "direct method only: no half-increment residual")
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
+            .With(kprC_StepAmplitudeField)
             .Field<&R::extrapolation>("extrapolation",
                                       "4 is not written; else 1 prints PARABOLIC, any other value NO")
             .Field<&R::alpha>("alpha", "numerical damping of the integration operator (no unit)")
-            .Field<&R::noStop>("noStop",
-                               "direct method only: accept the increment after the last allowed iteration")
+            .With(kprC_NoStopField)
             .Field<&R::initialConditions>("initialConditions",
                                           "2 none: the computation of initial accelerations is bypassed");
     return fields;
@@ -121,8 +115,8 @@ const cls_FieldTable& kprC_ExplicitDynamicsStep::Fields() {
             .Field<&R::timeIncrementationMethod>(
                 "timeIncrementationMethod",
                 "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
-            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
+            .With(kprC_AdiabaticField)
+            .With(kprC_TimePeriodField)
             .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
             .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
@@ -131,7 +125,7 @@ const cls_FieldTable& kprC_ExplicitDynamicsStep::Fields() {
             .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
                                                "quadratic bulk viscosity coefficient (no unit)")
             .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+            .With(kprC_NlgeomField);
     return fields;
 }
 
@@ -142,7 +136,7 @@ const cls_FieldTable& kprC_TempDisplacementDynamicsStep::Fields() {
             .Field<&R::timeIncrementationMethod>(
                 "timeIncrementationMethod",
                 "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
-            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
+            .With(kprC_TimePeriodField)
             .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
             .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
@@ -151,7 +145,7 @@ const cls_FieldTable& kprC_TempDisplacementDynamicsStep::Fields() {
             .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
                                                "quadratic bulk viscosity coefficient (no unit)")
             .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+            .With(kprC_NlgeomField);
     return fields;
 }
 
@@ -159,13 +153,12 @@ const cls_FieldTable& kprC_SubspaceDynamicsStep::Fields() {
     using R = kprC_SubspaceDynamicsStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
+            .With(kprC_NlgeomField)
             .Field<&R::vectors>("vectors", "number of modes used; 0 = all, then no *Select Eigenmodes")
-            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
+            .With(kprC_TimePeriodField)
             .Field<&R::initialInc>("initialInc", "fixed time increment (time)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written");
+            .With(kprC_MaxNumIncField)
+            .With(kprC_StepAmplitudeField);
     return fields;
 }
 

@@ -1,52 +1,33 @@
 #include "store_interface/records/steps/kprC_ModalSteps.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/steps/kprC_StepFields.h"
 
 const cls_FieldTable& kprC_RandomResponseFrequency::Fields() {
     using R = kprC_RandomResponseFrequency;
     static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
-            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
-            .Field<&R::points>("points", "number of points in the range, ends included")
-            .Field<&R::bias>("bias",
-                             "bias of the points towards the ends (no unit); written from 4 points on");
+        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateDirectFrequency::Fields() {
     using R = kprC_SteadyStateDirectFrequency;
     static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
-            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
-            .Field<&R::points>("points", "number of points in the range, ends included")
-            .Field<&R::bias>("bias",
-                             "bias of the points towards the ends (no unit); written from 4 points on");
+        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateModalFrequency::Fields() {
     using R = kprC_SteadyStateModalFrequency;
     static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
-            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
-            .Field<&R::points>("points", "number of points in the range, ends included")
-            .Field<&R::bias>("bias",
-                             "bias of the points towards the ends (no unit); written from 4 points on");
+        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateSubspaceFrequency::Fields() {
     using R = kprC_SteadyStateSubspaceFrequency;
     static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::upper>("upper", "upper limit (cycles per time), always written")
-            .Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
-            .Field<&R::points>("points", "number of points in the range, ends included")
-            .Field<&R::bias>("bias",
-                             "bias of the points towards the ends (no unit); written from 4 points on");
+        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
     return fields;
 }
 
@@ -150,39 +131,19 @@ const cls_FieldTable& kprC_ModalDynamicsStep::Fields() {
             .Field<&R::continueAnalysis>("continueAnalysis",
                                          "go on from the state of the step before, if that is a linear "
                                          "perturbation static or a modal dynamics step")
-            .Field<&R::timePeriod>("timePeriod", "time period of the step (time)")
+            .With(kprC_TimePeriodField)
             .Field<&R::timeIncrement>("timeIncrement", "fixed time increment (time)")
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
-            .Field<&R::compositeDamping>("compositeDamping",
-                                         "composite damping by mode; null or absent: none")
-            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
-            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
-            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "direct damping by frequency; null or absent: none")
-            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "Rayleigh damping by frequency; null or absent: none");
+            .With(kprC_StepAmplitudeField)
+            .With(kprC_ModalDampingFields);
     return fields;
 }
 
 const cls_FieldTable& kprC_RandomResponseStep::Fields() {
     using R = kprC_RandomResponseStep;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
-            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
-            .Field<&R::compositeDamping>("compositeDamping",
-                                         "composite damping by mode; null or absent: none")
-            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
-            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
-            .Field<&R::structuralDamping>("structuralDamping",
-                                          "structural damping by mode; null or absent: none")
-            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "direct damping by frequency; null or absent: none")
-            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "Rayleigh damping by frequency; null or absent: none")
-            .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
-                                                     "structural damping by frequency; null or absent: none");
+    static const cls_FieldTable fields = cls_Describe<R>(kprC_AnalysisStep::Fields())
+                                             .With(kprC_FrequenciesField)
+                                             .With(kprC_FrequencyScaleField)
+                                             .With(kprC_ModalDampingFields);
     return fields;
 }
 
@@ -207,50 +168,27 @@ const cls_FieldTable& kprC_ResponseSpectrumStep::Fields() {
             .Field<&R::comp>("comp", "1 algebraic, 2 SRSS, other values write nothing")
             .Field<&R::sum>("sum", "0 ABS, 1 CQC, 2 NRL, 3 SRSS, 4 TENP")
             .Field<&R::components>("components", "directions of excitation, one data line each")
-            .Field<&R::compositeDamping>("compositeDamping",
-                                         "composite damping by mode; null or absent: none")
-            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
-            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
-            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "direct damping by frequency; null or absent: none")
-            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "Rayleigh damping by frequency; null or absent: none");
+            .With(kprC_ModalDampingFields);
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateDirectStep::Fields() {
     using R = kprC_SteadyStateDirectStep;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::complex>("complex", "true: complex (damped) response; false: real only")
-            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
-            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
-            .Field<&R::subdivideUsingEigenfrequencies>(
-                "subdivideUsingEigenfrequencies",
-                "whether the ranges are divided at the natural frequencies");
+    static const cls_FieldTable fields = cls_Describe<R>(kprC_AnalysisStep::Fields())
+                                             .With(kprC_ComplexField)
+                                             .With(kprC_FrequenciesField)
+                                             .With(kprC_FrequencyScaleField)
+                                             .With(kprC_SubdivideField);
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateModalStep::Fields() {
     using R = kprC_SteadyStateModalStep;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
-            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
-            .Field<&R::subdivideUsingEigenfrequencies>(
-                "subdivideUsingEigenfrequencies", "whether the ranges are divided at the natural frequencies")
-            .Field<&R::compositeDamping>("compositeDamping",
-                                         "composite damping by mode; null or absent: none")
-            .Field<&R::directDamping>("directDamping", "direct damping by mode; null or absent: none")
-            .Field<&R::rayleighDamping>("rayleighDamping", "Rayleigh damping by mode; null or absent: none")
-            .Field<&R::structuralDamping>("structuralDamping",
-                                          "structural damping by mode; null or absent: none")
-            .Field<&R::directDampingByFrequency>("directDampingByFrequency",
-                                                 "direct damping by frequency; null or absent: none")
-            .Field<&R::rayleighDampingByFrequency>("rayleighDampingByFrequency",
-                                                   "Rayleigh damping by frequency; null or absent: none")
-            .Field<&R::structuralDampingByFrequency>("structuralDampingByFrequency",
-                                                     "structural damping by frequency; null or absent: none");
+    static const cls_FieldTable fields = cls_Describe<R>(kprC_AnalysisStep::Fields())
+                                             .With(kprC_FrequenciesField)
+                                             .With(kprC_FrequencyScaleField)
+                                             .With(kprC_SubdivideField)
+                                             .With(kprC_ModalDampingFields);
     return fields;
 }
 
@@ -268,12 +206,11 @@ const cls_FieldTable& kprC_SteadyStateSubspaceStep::Fields() {
     using R = kprC_SteadyStateSubspaceStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::complex>("complex", "true: complex (damped) response; false: real only")
-            .Field<&R::frequencies>("frequencies", "frequency ranges, one data line each")
-            .Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear")
+            .With(kprC_ComplexField)
+            .With(kprC_FrequenciesField)
+            .With(kprC_FrequencyScaleField)
             .Field<&R::frictionDamping>("frictionDamping", "add friction-induced damping")
-            .Field<&R::subdivideUsingEigenfrequencies>(
-                "subdivideUsingEigenfrequencies", "whether the ranges are divided at the natural frequencies")
+            .With(kprC_SubdivideField)
             .Field<&R::projection>("projection",
                                    "0 none, 1 constant, 2 eigenfrequency, 3 property change, 4 range")
             .Field<&R::dampingChange>(

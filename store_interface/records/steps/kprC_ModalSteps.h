@@ -7,7 +7,17 @@
 
 class cls_ClassRegistrar;
 
-class kprC_RandomResponseFrequency final : public cls_RecordOf<kprC_RandomResponseFrequency> {
+/// Base of the record class T: one range of frequencies of a step.
+template <class T, int Bias>
+class kprC_FrequencyRange : public cls_RecordOf<T> {
+public:
+    double upper = 0.0;
+    double lower = 0.0;
+    int points = 20;
+    double bias = Bias;
+};
+
+class kprC_RandomResponseFrequency final : public kprC_FrequencyRange<kprC_RandomResponseFrequency, 1> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_RandomResponseFrequency",
                                          "One frequency range of a random response step."};
@@ -20,7 +30,7 @@ public:
     static const cls_FieldTable& Fields();
 };
 
-class kprC_SteadyStateDirectFrequency final : public cls_RecordOf<kprC_SteadyStateDirectFrequency> {
+class kprC_SteadyStateDirectFrequency final : public kprC_FrequencyRange<kprC_SteadyStateDirectFrequency, 1> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateDirectFrequency",
                                          "One frequency range of a direct steady-state dynamics step."};
@@ -33,7 +43,7 @@ public:
     static const cls_FieldTable& Fields();
 };
 
-class kprC_SteadyStateModalFrequency final : public cls_RecordOf<kprC_SteadyStateModalFrequency> {
+class kprC_SteadyStateModalFrequency final : public kprC_FrequencyRange<kprC_SteadyStateModalFrequency, 3> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateModalFrequency",
                                          "One frequency range of a modal steady-state dynamics step."};
@@ -46,7 +56,8 @@ public:
     static const cls_FieldTable& Fields();
 };
 
-class kprC_SteadyStateSubspaceFrequency final : public cls_RecordOf<kprC_SteadyStateSubspaceFrequency> {
+class kprC_SteadyStateSubspaceFrequency final
+    : public kprC_FrequencyRange<kprC_SteadyStateSubspaceFrequency, 3> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateSubspaceFrequency",
                                          "One frequency range of a subspace steady-state dynamics step."};

@@ -1,12 +1,10 @@
 #include "store_interface/records/steps/kprC_StaticSteps.h"
 
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "store_interface/records/steps/kprC_StepFields.h"
 
 const omu_EnumTable& omu_EnumTableOf(kprC_StaticStep::StabilizationEnm) {
-    static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"},
-                                           {1, "DISSIPATED_ENERGY_FRACTION", "DISSIPATED_ENERGY_FRACTION"},
-                                           {2, "DAMPING_FACTOR", "DAMPING_FACTOR"}};
-    static constexpr omu_EnumTable table{"kprC_StaticStep::StabilizationEnm", rows};
+    static constexpr omu_EnumTable table{"kprC_StaticStep::StabilizationEnm", kprC_StabilizationRows};
     return table;
 }
 
@@ -14,33 +12,18 @@ const cls_FieldTable& kprC_StaticStep::Fields() {
     using R = kprC_StaticStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
-            .Field<&R::stabilizationMethod>(
-                "stabilizationMethod",
-                "0 none, 1 by dissipated energy fraction, 2 by damping factor; other values write nothing")
-            .Field<&R::stabilizationMagnitude>(
-                "stabilizationMagnitude",
-                "dissipated energy fraction (no unit) or damping factor, by the method")
-            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                 "0 automatic, 1 direct (fixed increments)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
-            .Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)")
-            .Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only")
-            .Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only")
+            .With(kprC_NlgeomField)
+            .With(kprC_AdiabaticField)
+            .With(kprC_PseudoTimePeriodField)
+            .With(kprC_StabilizationMethodField)
+            .With(kprC_StabilizationMagnitudeField)
+            .With(kprC_TimeIncrementFields)
             .Field<&R::amplitude>("amplitude",
                                   "course of loads without an amplitude: 0 step, 1 ramp; 1 is not written")
-            .Field<&R::extrapolation>("extrapolation",
-                                      "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::noStop>("noStop",
-                               "direct method only: accept the increment after the last allowed iteration")
-            .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
-                                                     "own spelling (written as it stands); empty = none")
-            .Field<&R::solutionTechnique>(
-                "solutionTechnique",
-                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+            .With(kprC_ExtrapolationField)
+            .With(kprC_NoStopField)
+            .With(kprC_FullyPlasticField)
+            .With(kprC_UnwrittenTechniqueField);
     return fields;
 }
 
@@ -48,42 +31,33 @@ const cls_FieldTable& kprC_StaticRiksStep::Fields() {
     using R = kprC_StaticRiksStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work")
-            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                 "0 automatic, 1 direct (fixed increments)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
+            .With(kprC_NlgeomField)
+            .With(kprC_AdiabaticField)
+            .With(kprC_TimeIncrementationField)
+            .With(kprC_MaxNumIncField)
             .Field<&R::initialArcInc>("initialArcInc", "first (or fixed) increment of arc length (no unit)")
             .Field<&R::totalArc>("totalArc", "arc length scale of the step (no unit)")
             .Field<&R::minArcInc>("minArcInc", "smallest arc length increment, automatic method only")
             .Field<&R::maxArcInc>("maxArcInc",
                                   "largest arc length increment, automatic method only; 1e36 is not written")
             .Field<&R::maxLPF>("maxLPF", "load proportionality factor that ends the step (no unit)")
-            .Field<&R::extrapolation>("extrapolation",
-                                      "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::noStop>("noStop",
-                               "direct method only: accept the increment after the last allowed iteration")
-            .Field<&R::fullyPlastic>("fullyPlastic", "element set watched for full plasticity, in the deck's "
-                                                     "own spelling (written as it stands); empty = none")
+            .With(kprC_ExtrapolationField)
+            .With(kprC_NoStopField)
+            .With(kprC_FullyPlasticField)
             .Field<&R::nodeMonitored>("nodeMonitored", "whether a displacement of region ends the step")
             .Field<&R::region>("region", "node set that is monitored")
             .Field<&R::dof>("dof", "degree of freedom monitored, 1 to 6")
             .Field<&R::dofValue>("dofValue", "displacement (length) or rotation (radians) that ends the step")
             .Field<&R::longTerm>("longTerm", "long-term (fully relaxed) response of time-dependent materials")
-            .Field<&R::solutionTechnique>(
-                "solutionTechnique",
-                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+            .With(kprC_UnwrittenTechniqueField);
     return fields;
 }
 
 const cls_FieldTable& kprC_GeostaticStep::Fields() {
     using R = kprC_GeostaticStep;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
-            .Field<&R::solutionTechnique>(
-                "solutionTechnique",
-                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+    static const cls_FieldTable fields = cls_Describe<R>(kprC_AnalysisStep::Fields())
+                                             .With(kprC_NlgeomField)
+                                             .With(kprC_UnwrittenTechniqueField);
     return fields;
 }
 
@@ -95,10 +69,7 @@ const omu_EnumTable& omu_EnumTableOf(kprC_SoilsStep::ResponseEnm) {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kprC_SoilsStep::StabilizationMethodEnm) {
-    static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"},
-                                           {1, "DISSIPATED_ENERGY_FRACTION", "DISSIPATED_ENERGY_FRACTION"},
-                                           {2, "DAMPING_FACTOR", "DAMPING_FACTOR"}};
-    static constexpr omu_EnumTable table{"kprC_SoilsStep::StabilizationMethodEnm", rows};
+    static constexpr omu_EnumTable table{"kprC_SoilsStep::StabilizationMethodEnm", kprC_StabilizationRows};
     return table;
 }
 
@@ -106,35 +77,20 @@ const cls_FieldTable& kprC_SoilsStep::Fields() {
     using R = kprC_SoilsStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
+            .With(kprC_NlgeomField)
             .Field<&R::response>("response", "0 transient consolidation, otherwise steady state")
-            .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; unset = "
-                                   "the step ends with its period")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
-            .Field<&R::stabilizationMethod>(
-                "stabilizationMethod",
-                "0 none, 1 by dissipated energy fraction, 2 by damping factor; other values write nothing")
-            .Field<&R::stabilizationMagnitude>(
-                "stabilizationMagnitude",
-                "dissipated energy fraction (no unit) or damping factor, by the method")
-            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                 "0 automatic, 1 direct (fixed increments)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
-            .Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)")
-            .Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only")
-            .Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only")
+            .With(kprC_EndField)
+            .With(kprC_PseudoTimePeriodField)
+            .With(kprC_StabilizationMethodField)
+            .With(kprC_StabilizationMagnitudeField)
+            .With(kprC_TimeIncrementFields)
             .Field<&R::creep>("creep", "false writes creep=none")
             .Field<&R::cetol>("cetol", "largest creep strain error per increment (no unit), written above 0")
             .Field<&R::utol>("utol", "largest pore pressure change per increment (stress); above 0 written, "
                                      "else the text utol=1.0")
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
-            .Field<&R::extrapolation>("extrapolation",
-                                      "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::solutionTechnique>(
-                "solutionTechnique",
-                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+            .With(kprC_StepAmplitudeField)
+            .With(kprC_ExtrapolationField)
+            .With(kprC_UnwrittenTechniqueField);
     return fields;
 }
 
@@ -145,10 +101,7 @@ const omu_EnumTable& omu_EnumTableOf(kprC_ViscoStep::CreepIntegrationEnm) {
 }
 
 const omu_EnumTable& omu_EnumTableOf(kprC_ViscoStep::StabilizationMethodEnm) {
-    static constexpr omu_EnumRow rows[] = {{0, "NONE", "NONE"},
-                                           {1, "DISSIPATED_ENERGY_FRACTION", "DISSIPATED_ENERGY_FRACTION"},
-                                           {2, "DAMPING_FACTOR", "DAMPING_FACTOR"}};
-    static constexpr omu_EnumTable table{"kprC_ViscoStep::StabilizationMethodEnm", rows};
+    static constexpr omu_EnumTable table{"kprC_ViscoStep::StabilizationMethodEnm", kprC_StabilizationRows};
     return table;
 }
 
@@ -156,32 +109,18 @@ const cls_FieldTable& kprC_ViscoStep::Fields() {
     using R = kprC_ViscoStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off")
+            .With(kprC_NlgeomField)
             .Field<&R::creepIntegration>("creepIntegration", "0 automatic, 1 explicit")
             .Field<&R::cetol>(
                 "cetol",
                 "largest creep strain error per increment (no unit); always written by the automatic method")
-            .Field<&R::timePeriod>("timePeriod",
-                                   "time period of the step (time; a pseudo-time in static procedures)")
-            .Field<&R::stabilizationMethod>(
-                "stabilizationMethod",
-                "0 none, 1 by dissipated energy fraction, 2 by damping factor; other values write nothing")
-            .Field<&R::stabilizationMagnitude>(
-                "stabilizationMagnitude",
-                "dissipated energy fraction (no unit) or damping factor, by the method")
-            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                 "0 automatic, 1 direct (fixed increments)")
-            .Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written")
-            .Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)")
-            .Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only")
-            .Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only")
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written")
-            .Field<&R::extrapolation>("extrapolation",
-                                      "0 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::solutionTechnique>(
-                "solutionTechnique",
-                "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+            .With(kprC_PseudoTimePeriodField)
+            .With(kprC_StabilizationMethodField)
+            .With(kprC_StabilizationMagnitudeField)
+            .With(kprC_TimeIncrementFields)
+            .With(kprC_StepAmplitudeField)
+            .With(kprC_ExtrapolationField)
+            .With(kprC_UnwrittenTechniqueField);
     return fields;
 }
 
@@ -190,7 +129,7 @@ const cls_FieldTable& kprC_AnnealStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::refTemp>("refTemp", "temperature at which the model is annealed (temperature)")
-            .Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+            .With(kprC_NlgeomField);
     return fields;
 }
 
