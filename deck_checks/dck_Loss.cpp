@@ -1,6 +1,7 @@
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 #include "deck_checks/dck_Walk.h"
+#include "sections/oif_DatumCsys.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
@@ -44,13 +45,34 @@ private:
     std::map<unsigned, std::unique_ptr<cls_Record>> usual_;
 };
 
-/// Which objects others refer to, by the kind that fields tell.
+constexpr char kSet[] = "set";
+
+/// Says of datums that are no coordinate systems where one is needed.
+void FindWrongDatums(const odiK_Model& model, const cls_Record& record, const fnd_Path& place,
+                     fnd_Sink& sink) {
+    for (const cls_Field& field : record.DynFields().All()) {
+        if (field.type->Kind() != cls_FieldKind::Datum) continue;
+        const int id = static_cast<const dtmC_DatumRef*>(field.In(record))->Id();
+        if (id < 1 || id > static_cast<int>(model.Datums().size())) continue;
+        const odiK_Datum& datum = model.Datums()[static_cast<std::size_t>(id - 1)];
+        if (datum.type == dtu_DatumType::CSYS) continue;
+        sink.Add("cannot-be-written", fnd_Path(place, field.name),
+                 std::string("writing fails with \"") + oif_kDatumError + "\": " + Quoted(datum.name) +
+                     " is no coordinate system");
+    }
+}
+
+/// Which objects others refer to, by the kind that fields tell. Sets of one name count as one.
 class Uses {
 public:
     void Visit(const cls_Record& record, const mdl_GivenState* given) {
         const auto& fields = record.DynFields().All();
         for (std::size_t i = 0; i < fields.size(); ++i) {
             if (fields[i].type->Kind() == cls_FieldKind::Tree || !dck_IsGiven(given, i)) continue;
+            if (fields[i].verbatim && fields[i].type->Kind() == cls_FieldKind::String) {
+                hasVerbatim_ =
+                    hasVerbatim_ || !static_cast<const cow_String*>(fields[i].In(record))->IsEmpty();
+            }
             Add(*fields[i].type, fields[i].In(record), fields[i].refersTo);
         }
     }
@@ -58,13 +80,18 @@ public:
         const auto found = names_.find(std::string_view(kind));
         return found != names_.end() && found->second.count(name) != 0;
     }
+    /// Whether some text goes into the deck as it stands, which may name anything.
+    bool HasVerbatim() const { return hasVerbatim_; }
 
 private:
     /// `kind` is null for a field that names nothing.
     void Add(const cls_FieldType& type, const void* value, const char* kind) {
         switch (type.Kind()) {
         case cls_FieldKind::String:
-            if (kind != nullptr) names_[std::string(kind)].insert(*static_cast<const cow_String*>(value));
+            if (kind != nullptr) AddName(kind, static_cast<const cow_String*>(value)->View());
+            return;
+        case cls_FieldKind::Region:
+            names_[kSet].insert(static_cast<const rgnC_Region*>(value)->SetName());
             return;
         case cls_FieldKind::List: {
             const auto& list = static_cast<const cls_ListType&>(type);
@@ -87,7 +114,18 @@ private:
         }
     }
 
+    /// A set may be given with its instance.
+    void AddName(const char* kind, std::string_view name) {
+        std::set<cow_String>& names = names_[std::string(kind)];
+        names.insert(cow_String(name));
+        const std::size_t dot = name.rfind('.');
+        if (kind == std::string_view(kSet) && dot != std::string_view::npos) {
+            names.insert(cow_String(name.substr(dot + 1)));
+        }
+    }
+
     std::map<std::string, std::set<cow_String>, std::less<>> names_;
+    bool hasVerbatim_ = false;
 };
 
 void TellUnused(const std::vector<cow_String>& names, const char* plural, const std::string& place,
@@ -113,6 +151,25 @@ void FindUnused(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
         }
         TellUnused(names, repository.plural, std::string("/") + repository.member, sink);
     }
+}
+
+void FindUnusedSets(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
+    if (uses.HasVerbatim()) return;
+    std::vector<cow_String> names;
+    const auto add = [&](const cow_String& owner, const std::vector<cow_CountedHld<odiK_Set>>& sets) {
+        for (const auto& set : sets) {
+            if (set->internal || uses.Has(kSet, set->name)) continue;
+            names.push_back(owner.IsEmpty() ? set->name : owner + "." + set->name);
+        }
+    };
+    for (const auto& [name, part] : model.Parts()) {
+        if (!part->mesh.IsNull()) add(name, part->mesh->Sets());
+    }
+    for (const auto& [name, instance] : model.Instances()) {
+        if (!instance->ownMesh.IsNull()) add(name, instance->ownMesh->Sets());
+    }
+    add({}, model.AssemblySets());
+    TellUnused(names, "sets", {}, sink);
 }
 
 void FindAssemblyNodes(const odiK_Model& model, fnd_Sink& sink) {
@@ -141,8 +198,10 @@ void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink) {
     dck_ForEachRecord(model,
                       [&](const cls_Record& record, const mdl_GivenState* given, const fnd_Path& place) {
                           lost.Visit(record, given, place);
+                          FindWrongDatums(model, record, place, sink);
                           uses.Visit(record, given);
                       });
     FindUnused(model, uses, sink);
+    FindUnusedSets(model, uses, sink);
     FindAssemblyNodes(model, sink);
 }

@@ -1,6 +1,7 @@
 #include "deck_checks/dck_Checks.h"
 #include "deck_checks/dck_Text.h"
 #include "materials/oif_Material.h"
+#include "sections/oif_ShellSections.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -71,6 +72,14 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
         }
     }
 
+    for (const auto& [section, name] : names) {
+        const auto* shell = nex_canDynamicCastPtr<kseC_ShellSection>(section);
+        if (shell == nullptr || oif_HasShellLines(*shell)) continue;
+        if (std::ranges::find(sectionOf, section) == sectionOf.end()) continue;
+        sink.Add("cannot-be-written", Place("sections", name),
+                 std::string("writing fails with \"") + oif_kShellError + "\": " + place.substr(1) +
+                     " has elements of this section");
+    }
     int without = 0;
     for (const odiK_ElementClass& elements : mesh.Classes()) {
         std::map<cow_String, std::pair<const cls_Record*, int>> misfits;

@@ -39,6 +39,29 @@ TEST(LossChecks, NodesOfTheAssembly_AreNamedWithTheirSets) {
     EXPECT_EQ(
         Found(R"("assembly": {"mesh": {"nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [1, 0, 0]]}},
                   "sets": [{"name": "RP", "kind": "node", "members": [{"labels": [2]}]}]})"),
-        (Texts{"/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
+        (Texts{": nothing uses 1 of the sets: RP",
+               "/assembly/mesh/nodes: the assembly's own 2 nodes reach no deck; they stand in the sets "
                "'RP'; make each a part of one node, and an instance of it"}));
+}
+
+TEST(LossChecks, SetsThatNothingNames_AreCounted) {
+    const auto found = [](const std::string& more) { return Found(ShellModel(StepsOf({"Static"}) + more)); };
+    EXPECT_EQ(found(""), Texts{": nothing uses 3 of the sets: P.N, P.E, P.S"});
+    EXPECT_EQ(found(R"(, "loads": {"L": {"class": "kloC_Moment", "region": "I.N"}})"),
+              Texts{": nothing uses 2 of the sets: P.E, P.S"});
+    // Texts that go into the deck as they stand may name any.
+    EXPECT_EQ(found(R"(, "solverInput": "*Nset, nset=X\nI.N,")"), Texts{});
+}
+
+TEST(LossChecks, DatumThatIsNoSystem_IsToldWhereItIsNamed) {
+    const auto found = [](const std::string& type) {
+        return FindingsOf<dck_CheckLoss>(
+            ShellModel(R"("datums": [{"name": "D", "type": ")" + type + R"("}], )" + StepsOf({"Static"}) +
+                       R"(, "loads": {"L": {"class": "kloC_ConcentratedForce", "region": "I.N", "datum": "D",
+                                            "states": {"Step-1": {"component1": 1}}}})"),
+            "/loads");
+    };
+    EXPECT_EQ(found("point"), Texts{"/loads/L/datum: writing fails with \"Wrong datum type during input "
+                                    "generation\": 'D' is no coordinate system"});
+    EXPECT_EQ(found("csys"), Texts{});
 }

@@ -68,7 +68,7 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/single_threaded.h", "sys/stat.h",
+SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h", "sys/stat.h",
           "sys/types.h", "sys/wait.h", "sys/xattr.h"}
 SYSTEM_LAYERS = {"foundation", "mesh_file", "tools"}
 

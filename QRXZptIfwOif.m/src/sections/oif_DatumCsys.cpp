@@ -6,7 +6,7 @@
 oif_DatumCsys::oif_DatumCsys(const ddb_Model& model, const dtmC_DatumRef& reference, gsl_Matrix placement) {
     if (reference.Id() == 0) return;
     ddb_Datum datum = model.datum(reference.Id());
-    if (datum.GetDatumType() != dtu_DatumType::CSYS) nex_Raise("Wrong datum type during input generation");
+    if (datum.GetDatumType() != dtu_DatumType::CSYS) nex_Raise(oif_kDatumError);
     if (!placement.IsIdentity()) datum.TransformData(placement);
     const ddb_DatumCsys csys = datum.CvtDatumCsys();
     origin_ = csys.GetOrigin();

@@ -4,6 +4,9 @@
 #include "foundation/utl_Stream.h"
 #include "store_interface/model/ddb_Model.h"
 
+/// What a datum that is no coordinate system raises where a deck needs one.
+inline constexpr char oif_kDatumError[] = "Wrong datum type during input generation";
+
 /// A coordinate system of the model as the deck states it. A rectangular one is given by its x and y axis as
 /// vectors, a cylindrical or spherical one by two points of its z axis.
 class oif_DatumCsys {

@@ -12,7 +12,7 @@ qkw_QuorixName Printed(const cow_String& name) {
 }
 
 [[noreturn]] void RaiseUnimplemented() {
-    nex_Raise("Shell general section unimplemented");
+    nex_Raise(oif_kShellError);
 }
 
 void WriteLayer(utl_Stream& stream, const kseC_CompositeShellLayer& layer, bool isGeneral) {
@@ -29,6 +29,11 @@ void WriteLayer(utl_Stream& stream, const kseC_CompositeShellLayer& layer, bool 
 
 } // namespace
 
+bool oif_HasShellLines(const kseC_Section& section) {
+    return section.DynTypeId() == kseC_HomogenousShellSection::TypeId() ||
+           section.DynTypeId() == kseC_CompositeShellSection::TypeId();
+}
+
 void oif_ShellSection::Write(utl_Stream& stream) const {
     using Form = oif_SectionForm<oif_ShellSection>;
     static constexpr Form forms[] = {
@@ -38,8 +43,8 @@ void oif_ShellSection::Write(utl_Stream& stream) const {
     };
     const auto& shell = nex_canDynamicCastRef<kseC_ShellSection>(Section(), NEX_HERE);
     const Form* form = oif_FindRow(forms, shell.DynTypeId());
-    if (form == nullptr) RaiseUnimplemented();
-    form->write(*this, stream, shell);
+    if (form != nullptr) form->write(*this, stream, shell);
+    if (!oif_HasShellLines(shell)) RaiseUnimplemented();
 }
 
 void oif_ShellSection::WriteHomogeneous(utl_Stream& stream, const kseC_HomogenousShellSection& shell) const {
@@ -74,7 +79,6 @@ void oif_ShellSection::WriteUser(utl_Stream& stream, const kseC_UserShellSection
     line.Text(SetName());
     WriteControls(line);
     line.BreakingIf(!shell.symmetric, "unsymm");
-    RaiseUnimplemented();
 }
 
 oif_KeywordLine oif_ShellSection::KeywordLine(utl_Stream& stream,

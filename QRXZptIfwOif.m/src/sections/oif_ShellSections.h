@@ -5,6 +5,11 @@
 #include "store_interface/records/sections/kseC_BeamSection.h"
 #include "store_interface/records/sections/kseC_ShellSections.h"
 
+/// What a section without data lines raises.
+inline constexpr char oif_kShellError[] = "Shell general section unimplemented";
+/// Whether decks have data lines for a shell section: not for those of a user's code and general ones.
+bool oif_HasShellLines(const kseC_Section& section);
+
 /// Shell elements, and below them their rebar layers:
 ///     *Shell Section, elset=SET, orientation=Ori-1, material=Steel, offset=0.5
 ///     0.01, 5

@@ -5,25 +5,25 @@
 namespace {
 
 // Fields that several behaviours have.
-constexpr auto kDependencies = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kDependenciesField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::dependencies>("dependencies", "number of field variables of the table");
 };
-constexpr auto kTemperatureDependency = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kTemperatureDependencyField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::temperatureDependency>("temperatureDependency",
                                                      "the table has a temperature column");
 };
-constexpr auto kRegularization = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kRegularizationField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::options>("options", "regularization group");
 };
-constexpr auto kBehavior = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kBehaviorField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::behavior>("behavior", "how force depends on motion");
 };
-constexpr auto kFrequencyDependency = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kFrequencyDependencyField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::frequencyDependency>(
         "frequencyDependency",
         "the table of a linear behaviour has a frequency column (cycles per time) behind its data");
 };
-constexpr auto kComponents = []<class R>(cls_Describe<R>& fields) {
+constexpr auto kComponentsField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::components>("components", "connector components 1 to 6, in the user's order");
 };
 
@@ -92,14 +92,14 @@ const cls_FieldTable& kbeC_CDCTerm::Fields() {
             .Field<&R::sign>("sign", "the sign of the term")
             .Field<&R::independentGiven>("independentGiven", "the table depends on components")
             .Field<&R::independentKind>("independentKind", "on which values of components the table depends")
-            .With(kDependencies)
-            .With(kTemperatureDependency)
+            .With(kDependenciesField)
+            .With(kTemperatureDependencyField)
             .Field<&R::components>("components",
                                    "the components that the term is made of, 1 to 6, in the user's order")
             .Field<&R::table>("table",
                               "one scale factor per component, then the independent variable's columns if "
                               "given, temperature if temperatureDependency, field variables")
-            .With(kRegularization);
+            .With(kRegularizationField);
     return fields;
 }
 
@@ -154,12 +154,12 @@ const cls_FieldTable& kbeC_ConnectorElasticity::Fields() {
     using R = kbeC_ConnectorElasticity;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .With(kBehavior)
+            .With(kBehaviorField)
             .Field<&R::coupling>(
                 "coupling", "how components depend on each other; on positions only in a nonlinear behaviour")
-            .With(kDependencies)
-            .With(kTemperatureDependency)
-            .With(kFrequencyDependency)
+            .With(kDependenciesField)
+            .With(kTemperatureDependencyField)
+            .With(kFrequencyDependencyField)
             .Field<&R::table>(
                 "table",
                 "linear uncoupled: one stiffness per entry of `components`, in that order; linear coupled: "
@@ -169,8 +169,8 @@ const cls_FieldTable& kbeC_ConnectorElasticity::Fields() {
                 "Then frequency, temperature, field variables as the flags say")
             .Field<&R::independentComponents>("independentComponents",
                                               "components on which a coupled nonlinear table depends")
-            .With(kComponents)
-            .With(kRegularization);
+            .With(kComponentsField)
+            .With(kRegularizationField);
     return fields;
 }
 
@@ -192,12 +192,12 @@ const cls_FieldTable& kbeC_ConnectorDamping::Fields() {
     using R = kbeC_ConnectorDamping;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .With(kBehavior)
+            .With(kBehaviorField)
             .Field<&R::coupling>(
                 "coupling", "how components depend on each other; on positions only in a nonlinear behaviour")
-            .With(kDependencies)
-            .With(kTemperatureDependency)
-            .With(kFrequencyDependency)
+            .With(kDependenciesField)
+            .With(kTemperatureDependencyField)
+            .With(kFrequencyDependencyField)
             .Field<&R::table>(
                 "table",
                 "linear uncoupled: one damping coefficient per entry of `components`, in that order; linear "
@@ -207,8 +207,8 @@ const cls_FieldTable& kbeC_ConnectorDamping::Fields() {
                 "motions. Then frequency, temperature, field variables as the flags say")
             .Field<&R::independentComponents>("independentComponents",
                                               "components on which a coupled nonlinear table depends")
-            .With(kComponents)
-            .With(kRegularization);
+            .With(kComponentsField)
+            .With(kRegularizationField);
     return fields;
 }
 
@@ -219,7 +219,7 @@ const cls_FieldTable& kbeC_ConnectorStop::Fields() {
             .Field<&R::minMotion>("minMotion",
                                   "length, or angle in radians for components 4 to 6; unset: blank")
             .Field<&R::maxMotion>("maxMotion", "length, or angle in radians; unset: blank")
-            .With(kComponents);
+            .With(kComponentsField);
     return fields;
 }
 
@@ -233,7 +233,7 @@ const cls_FieldTable& kbeC_ConnectorFailure::Fields() {
             .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
             .Field<&R::minForce>("minForce", "force or moment; unset: blank")
             .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
-            .With(kComponents);
+            .With(kComponentsField);
     return fields;
 }
 
@@ -247,7 +247,7 @@ const cls_FieldTable& kbeC_ConnectorLock::Fields() {
             .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
             .Field<&R::minForce>("minForce", "force or moment; unset: blank")
             .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
-            .With(kComponents);
+            .With(kComponentsField);
     return fields;
 }
 
@@ -272,7 +272,7 @@ const cls_FieldTable& kbeC_TangentialBehavior::Fields() {
             .Field<&R::slipRateDependency>("slipRateDependency", "the table has a slip rate column.")
             .Field<&R::pressureDependency>("pressureDependency", "the table has a contact force column.")
             .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
-            .With(kDependencies)
+            .With(kDependenciesField)
             .Field<&R::testData>("testData", "1: the exponential decay is given by test data")
             .Field<&R::shearStressLimit>("shearStressLimit",
                                          "limit of shear stress or force, with a table of coefficients")
@@ -328,8 +328,8 @@ const cls_FieldTable& kbeC_ConnectorFriction::Fields() {
                                               "user-defined: component of the contact force, 1 to 6")
             .Field<&R::contactForceDerived>("contactForceDerived",
                                             "user-defined: the derived component that is the contact force")
-            .With(kDependencies)
-            .With(kTemperatureDependency)
+            .With(kDependenciesField)
+            .With(kTemperatureDependencyField)
             .Field<&R::contactArea>(
                 "contactArea",
                 "the table of user-defined friction has a column of contact areas ahead of the temperature")
