@@ -50,7 +50,18 @@ bool mdf_DeckMesh::Fail(std::string found, std::string expected, std::string hin
 }
 
 bool mdf_DeckMesh::Fill(odiK_Mesh& mesh) {
-    if (!CheckRequest() || !ReadDeck() || !ChooseBlock()) return false;
+    return CheckRequest() && ReadDeck() && ChooseBlock() && FillMesh(mesh);
+}
+
+bool mdf_DeckMesh::FillFrom(const drd_Deck& deck, const drd_Names& names, int block, odiK_Mesh& mesh) {
+    deck_ = &deck;
+    names_ = &names;
+    block_ = block;
+    source_ = deck.MeshOf(deck.blocks[static_cast<std::size_t>(block)]);
+    return FillMesh(mesh);
+}
+
+bool mdf_DeckMesh::FillMesh(odiK_Mesh& mesh) {
     AddNodes(mesh);
     if (!AddElements(mesh)) return false;
     AddSets(mesh);
@@ -78,23 +89,25 @@ bool mdf_DeckMesh::ReadDeck() {
     drd_ReadOptions options;
     options.typeInfo = &InfoOf;
     drd_Findings findings;
-    deck_ = drd_ReadDeck(request_.path, options, findings);
+    ownDeck_ = drd_ReadDeck(request_.path, options, findings);
+    deck_ = &ownDeck_;
     for (const drd_Finding& finding : findings.List()) {
         if (finding.code->severity != drd_SeverityEnm::ERROR) continue;
-        return Fail(deck_.FileName(finding.place) + ":" + std::to_string(finding.place.line) + ": found " +
+        return Fail(deck_->FileName(finding.place) + ":" + std::to_string(finding.place.line) + ": found " +
                         finding.found,
                     finding.expected);
     }
-    names_ = std::make_unique<drd_Names>(deck_);
+    ownNames_ = std::make_unique<drd_Names>(ownDeck_);
+    names_ = ownNames_.get();
     return true;
 }
 
 bool mdf_DeckMesh::ChooseBlock() {
     std::vector<std::string> known;
     std::vector<int> blocks;
-    for (std::size_t i = 0; i < deck_.blocks.size(); ++i) {
-        const drd_Block& block = deck_.blocks[i];
-        const drd_Mesh* mesh = deck_.MeshOf(block);
+    for (std::size_t i = 0; i < deck_->blocks.size(); ++i) {
+        const drd_Block& block = deck_->blocks[i];
+        const drd_Mesh* mesh = deck_->MeshOf(block);
         if (mesh == nullptr || mesh->nodes.IsEmpty() || block.kind == drd_BlockEnm::ASSEMBLY) continue;
         blocks.push_back(static_cast<int>(i));
         known.push_back(block.name);
@@ -111,7 +124,7 @@ bool mdf_DeckMesh::ChooseBlock() {
                                                   : "found no mesh " + fnd_Quoted(request_.options.part),
                     "\"part\": " + fnd_OneOf(known));
     }
-    source_ = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block_)]);
+    source_ = deck_->MeshOf(deck_->blocks[static_cast<std::size_t>(block_)]);
     origin_.format = "deck";
     if (!source_->owners.IsEmpty())
         return Fail("found elements on nodes of instances", "elements on nodes of the part");
@@ -137,7 +150,7 @@ bool mdf_DeckMesh::AddElements(odiK_Mesh& mesh) {
     };
     std::vector<Elements> classes;
     for (const drd_ElementRun& run : source_->elementRuns) {
-        const std::string& type = deck_.types[static_cast<std::size_t>(run.type)];
+        const std::string& type = deck_->types[static_cast<std::size_t>(run.type)];
         auto found = std::ranges::find_if(
             classes, [&](const Elements& each) { return each.type == type && each.nodes == run.nodes; });
         if (found == classes.end()) found = classes.insert(classes.end(), {type, run.nodes, {}, {}});
@@ -189,9 +202,9 @@ bool mdf_DeckMesh::NameOf(const std::string& group, drd_KindEnm kind, std::strin
 /// The sets of faces that belong to a surface are made anew with it.
 bool mdf_DeckMesh::IsSideOfSurface(const drd_Set& set) const {
     return std::ranges::all_of(set.parts, [this](int part) {
-        const drd_SetPart& of = deck_.setParts[static_cast<std::size_t>(part)];
+        const drd_SetPart& of = deck_->setParts[static_cast<std::size_t>(part)];
         return of.kind == drd_KindEnm::ELEMENT_SET && of.name.starts_with("_") &&
-               deck_.keywords[static_cast<std::size_t>(of.keyword)].Find("internal") != nullptr;
+               deck_->keywords[static_cast<std::size_t>(of.keyword)].Find("internal") != nullptr;
     });
 }
 
@@ -230,7 +243,7 @@ void mdf_DeckMesh::AddSets(odiK_Mesh& mesh) {
 }
 
 void mdf_DeckMesh::AddSurfaces(odiK_Mesh& mesh) {
-    for (const drd_Keyword& keyword : deck_.keywords) {
+    for (const drd_Keyword& keyword : deck_->keywords) {
         if (keyword.key == "surface" && keyword.block == block_) AddSurface(mesh, keyword);
     }
 }
@@ -247,7 +260,7 @@ void mdf_DeckMesh::AddSurface(odiK_Mesh& mesh, const drd_Keyword& keyword) {
     std::vector<std::string> faces(keyword.lines);
     std::size_t without = 0;
     for (std::uint64_t line = 0; line < keyword.lines; ++line) {
-        const std::string_view text = deck_.DataLine(keyword, line);
+        const std::string_view text = deck_->DataLine(keyword, line);
         const drd_Target target =
             names_->Find(drd_RefEnm::ELEMENTS, drd_KindEnm::ELEMENT_SET, drd_Field(text, 0), block_);
         std::string& face = faces[line] = drd_NameOf(drd_Field(text, 1));

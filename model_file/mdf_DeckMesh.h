@@ -15,10 +15,13 @@ public:
     static bool IsDeck(const std::string& path);
     /// False when an error hinders it.
     bool Fill(odiK_Mesh& mesh);
+    /// The same of one block of a deck that has been read.
+    bool FillFrom(const drd_Deck& deck, const drd_Names& names, int block, odiK_Mesh& mesh);
 
 private:
     bool ReadDeck();
     bool ChooseBlock();
+    bool FillMesh(odiK_Mesh& mesh);
     bool CheckRequest();
     void AddNodes(odiK_Mesh& mesh);
     bool AddElements(odiK_Mesh& mesh);
@@ -34,8 +37,10 @@ private:
     const mdf_MeshFileRequest& request_;
     mdf_MeshOrigin& origin_;
     fnd_Sink& problems_;
-    drd_Deck deck_;
-    std::unique_ptr<drd_Names> names_;
+    drd_Deck ownDeck_;
+    std::unique_ptr<drd_Names> ownNames_;
+    const drd_Deck* deck_ = nullptr;
+    const drd_Names* names_ = nullptr;
     int block_ = -1;
     const drd_Mesh* source_ = nullptr;
 };

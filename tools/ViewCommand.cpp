@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
+#include "tools/DeckView.h"
 #include "view_page/vpg_Html.h"
 #include "view_page/vpg_Vtu.h"
 
@@ -13,6 +14,8 @@
 
 #include <sys/wait.h>
 #include <unistd.h>
+
+using nlohmann::ordered_json;
 
 namespace {
 
@@ -80,10 +83,42 @@ bool WriteVtu(const odb_Odb& odb, const std::string& target, RunReport& report) 
     return Write(target, "mesh file", "mesh", write, report);
 }
 
-ExitCode WritePage(const odb_Odb& odb, const ViewRequest& request, RunReport& report) {
+/// A deck, and the store that its meshes are shown from.
+class ShownDeck {
+public:
+    explicit ShownDeck(const std::string& path) : deck_(ReadDeck(path, {}, findings_)), names_(deck_) {}
+
+    std::unique_ptr<odb_Odb> Store(RunReport& report, ExitCode& code) const {
+        code = ExitCode::DONE;
+        if (findings_.HasErrors()) {
+            AddFindings(deck_, findings_, report);
+            const bool unreadable = findings_.Counts().contains("deck-unreadable");
+            code = unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
+            return nullptr;
+        }
+        std::unique_ptr<odb_Odb> odb = StoreOfDeck(deck_, names_, report);
+        if (odb == nullptr) code = ExitCode::MODEL_IS_WRONG;
+        return odb;
+    }
+    /// The header with the deck's steps.
+    std::string Header(const std::string& ofMeshes) const {
+        ordered_json header = ordered_json::parse(ofMeshes);
+        DescribeDeck(deck_, header);
+        return header.dump(-1, ' ', false, ordered_json::error_handler_t::replace);
+    }
+
+private:
+    drd_Findings findings_;
+    drd_Deck deck_;
+    drd_Names names_;
+};
+
+ExitCode WritePage(const odb_Odb& odb, const ShownDeck* deck, const ViewRequest& request, RunReport& report) {
     const std::string target = TargetOf(request);
     const std::string title = std::filesystem::path(request.model).stem().string();
-    const std::string html = vpg_Html(vpg_DataOf(odb, title), title);
+    vpg_PageData data = vpg_DataOf(odb, title);
+    if (deck != nullptr) data.header = deck->Header(data.header);
+    const std::string html = vpg_Html(data, title);
     const auto write = [&html](qio_ostream& device) { device.Write(html.data(), html.size()); };
     if (!Write(target, "page", "page", write, report)) return ExitCode::FILE_SYSTEM_REFUSED;
     if (request.open && !Open(target)) {
@@ -96,12 +131,15 @@ ExitCode WritePage(const odb_Odb& odb, const ViewRequest& request, RunReport& re
 
 ExitCode RunView(const ViewRequest& request, RunReport& report) {
     ExitCode code;
+    std::unique_ptr<ShownDeck> deck;
+    std::unique_ptr<odb_Odb> odb;
     if (IsDeck(request.model)) {
-        report.Error(request.model, "it is a deck; the page shows model files and meshers' files");
-        return ExitCode::WRONG_USAGE;
+        deck = std::make_unique<ShownDeck>(request.model);
+        odb = deck->Store(report, code);
+    } else {
+        odb = IsModelFile(request.model) ? ReadModel(request.model, report, code)
+                                         : ReadMesh(request.model, report, code);
     }
-    const std::unique_ptr<odb_Odb> odb = IsModelFile(request.model) ? ReadModel(request.model, report, code)
-                                                                    : ReadMesh(request.model, report, code);
     if (odb == nullptr) return code;
     if (odb->FindModel(odb_Odb::DefaultModelName()) == nullptr) {
         report.Error(request.model,
@@ -111,7 +149,7 @@ ExitCode RunView(const ViewRequest& request, RunReport& report) {
     try {
         if (!request.vtu.empty() && !WriteVtu(*odb, request.vtu, report))
             return ExitCode::FILE_SYSTEM_REFUSED;
-        if (!vpg_PageText().empty()) return WritePage(*odb, request, report);
+        if (!vpg_PageText().empty()) return WritePage(*odb, deck.get(), request, report);
     } catch (const QRXBasException& failure) {
         report.WriterError(failure.what(), failure.Context());
         return ExitCode::CANNOT_BE_EXPRESSED;

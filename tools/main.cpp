@@ -135,7 +135,7 @@ private:
         AddJson(command);
     }
     void AddView() {
-        AddModel(viewCommand, view.model, "Model file, JSON; or a mesher's file");
+        AddModel(viewCommand, view.model, "Model file, JSON; a mesher's file; or a deck, .inp");
         viewCommand
             ->add_option("-o,--output", view.output,
                          "The page (default: the model file's name with .html, in the current folder)")

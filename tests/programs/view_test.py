@@ -29,6 +29,44 @@ MODEL = {
         }
     },
 }
+# The second instance is moved by (1, 2, 3), then turned a quarter about an axis along z through (1, 0, 0).
+DECK = """*Part, name=ROD
+*Node
+1, 0., 0., 0.
+2, 1., 0., 0.
+*Element, type=T3D2
+1, 1, 2
+*Nset, nset=ENDS
+1, 2
+*End Part
+*Assembly, name=A
+*Instance, name=ROD-1, part=ROD
+*End Instance
+*Instance, name=ROD-2, part=ROD
+1., 2., 3.
+1., 0., 0., 1., 0., 1., 90.
+*End Instance
+*Nset, nset=FAR, instance=ROD-2
+2,
+*End Assembly
+*Boundary
+ROD-1.ENDS, PINNED
+*Step, name=Pull
+*Static
+*Cload
+FAR, 1, 5.
+FAR, 2, -3.
+*End Step
+*Step, name=Shake, perturbation
+*Frequency
+*End Step
+*Step, name=Rest
+*Static
+*Boundary
+ROD-1.ENDS, 1, 2, 0.5
+*Cload, op=NEW
+*End Step
+"""
 NO_PAGE = ("qrxdeck: error: this qrxdeck was built without the page that shows models: run "
            "scripts/install-dependencies.sh viewer in its sources and build it again\n")
 
@@ -103,6 +141,45 @@ class View(unittest.TestCase):
                          (4, "Unimplemented load type conversion\nstep 'Step-1', load 'Odd'\n"))
         self.assertEqual((self.folder / "rod.html").read_bytes(), old)
         self.assertEqual(self.entries(), ["rod.html", "rod.json"])
+
+    def header(self, name):
+        page = (self.folder / name).read_text()
+        return json.loads(page.split('id="header">')[1].split("</script>")[0])
+
+    def test_Deck_IsShownWithItsInstancesStepsAndLines(self):
+        (self.folder / "job.inp").write_text(DECK)
+        run = self.view_with_page("job.inp")
+        self.assertEqual((run.returncode, run.stderr), (0, ""))
+        header = self.header("job.html")
+        self.assertEqual([(i["name"], i["part"]) for i in header["instances"]], [("ROD-1", "ROD"), ("ROD-2", "ROD")])
+        placement = header["instances"][1]["placement"]
+        for found, expected in zip(placement, [0, -1, 0, -1, 1, 0, 0, 0, 0, 0, 1, 3], strict=True):
+            self.assertAlmostEqual(found, expected, places=5)
+        self.assertEqual([(step["name"], step["procedure"], step["perturbation"]) for step in header["steps"]][1:],
+                         [("Pull", "Static", False), ("Shake", "Frequency", True), ("Rest", "Static", False)])
+        held, pulled = header["objects"]
+        status = {entry["name"]: place for place, entry in enumerate(header["statuses"])}
+        self.assertEqual((held["kind"], held["name"], held["regions"]),
+                         ("boundaryConditions", "ROD-1.ENDS", [{"role": "region", "instance": 0, "set": 0}]))
+        self.assertEqual([place[0] for place in held["steps"]],
+                         [status["CREATED"], status["PROPAGATED"], status["PROPAGATED_FROM_BASE_STATE"],
+                          status["MODIFIED"]])
+        self.assertEqual([state["components"] for state in held["states"]],
+                         [[0, 0, 0, None, None, None], [0.5, 0.5, None, None, None, None]])
+        self.assertEqual((pulled["kind"], pulled["name"], pulled["regions"]),
+                         ("loads", "FAR", [{"role": "region", "instance": -1, "set": 0}]))
+        self.assertEqual([place[0] for place in pulled["steps"]],
+                         [status["NOT_YET_ACTIVE"], status["CREATED"], status["PROPAGATED_FROM_BASE_STATE"],
+                          status["DEACTIVATED"]])
+        self.assertEqual(pulled["states"][0]["components"], [5, -3, 0])
+        self.assertEqual(pulled["cards"][0], [{"loadCase": "", "text": "*Cload\nFAR, 1, 5.\nFAR, 2, -3.\n"}])
+
+    def test_DeckWithErrors_HasNoPage(self):
+        (self.folder / "job.inp").write_text("*Node\n1, 0., zero, 0.\n")
+        run = self.view("job.inp")
+        self.assertEqual(run.returncode, 1)
+        self.assertIn("job.inp:2", run.stderr)
+        self.assertEqual(self.entries(), ["job.inp", "rod.json"])
 
     def test_FolderThatIsNotThere_IsCodeThree(self):
         run = self.view_with_page("rod.json", "-o", "none/rod.html")
