@@ -5,6 +5,7 @@
 #include "model_file/mdf_TreeBuilder.h"
 #include "model_file/mdf_Utf8.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <filesystem>
@@ -346,12 +347,15 @@ bool DocumentReader::Fail(const char* begin, const char* expected) {
     const std::size_t offset = OffsetOf(begin);
     const std::size_t end = mdf_EndOfToken(text, offset);
     const mdf_TokenProblem problem = mdf_ProblemOf(text, offset, end);
-    if (!problem.insideString && end > offset && text[end - 1] == '\0') {
-        SyntaxError(end - 1, "found a NUL byte, expected text");
+    const std::string_view seen = offset >= text.size() ? std::string_view() : mdf_TokenAt(text, offset, end);
+    const std::size_t nul = begin == end_ || *begin == '"'
+                                ? std::string_view::npos
+                                : text.substr(0, std::max(end, offset + seen.size())).find('\0', offset);
+    if (nul != std::string_view::npos) {
+        SyntaxError(nul, "found a NUL byte, expected text");
         return false;
     }
-    const std::string token = offset >= text.size() ? std::string("the end of the file")
-                                                    : mdf_QuotedToken(mdf_TokenAt(text, offset, end));
+    const std::string token = seen.empty() ? std::string("the end of the file") : mdf_QuotedToken(seen);
     std::string words = problem.reason.empty() ? std::string() : problem.reason + "; ";
     if (problem.insideString) {
         const std::string_view tail = mdf_Utf8End(text.substr(offset, end - offset), kLongestTail);
