@@ -1,6 +1,7 @@
 #include "foundation/thr_InOrder.h"
 
 #include <algorithm>
+#include <atomic>
 #include <condition_variable>
 #include <exception>
 #include <memory>
@@ -87,12 +88,13 @@ private:
     bool stopped_ = false;
 };
 
-/// Stops the line and waits for its threads, however the work ends.
+/// Further threads at one work; it waits for all of them, however the own part of it ends.
 class Helpers {
 public:
-    Helpers(BlockLine& line, int count) : line_(line) {
+    template <class Work>
+    Helpers(std::size_t count, const Work& work, std::function<void()> stop) : stop_(std::move(stop)) {
         try {
-            for (int i = 0; i < count; ++i) threads_.emplace_back([&line] { line.Work(); });
+            for (std::size_t i = 0; i < count; ++i) threads_.emplace_back(work);
         } catch (const std::system_error&) { // the others do the work
         } catch (...) {
             End();
@@ -105,11 +107,11 @@ public:
 
 private:
     void End() {
-        line_.Stop();
+        stop_();
         for (std::thread& thread : threads_) thread.join();
     }
 
-    BlockLine& line_;
+    std::function<void()> stop_;
     std::vector<std::thread> threads_;
 };
 
@@ -125,6 +127,18 @@ void thr_TextBlocks::Run(int threads, const Make& make, const Take& take) const 
     const std::size_t used = std::min(static_cast<std::size_t>(thr_NumThreads(threads)), count);
     if (used == 0) return;
     BlockLine line(*this, 2 * used, make);
-    const Helpers helpers(line, static_cast<int>(used) - 1);
+    const Helpers helpers(
+        used - 1, [&line] { line.Work(); }, [&line] { line.Stop(); });
     line.HandOn(take);
+}
+
+void thr_ForEach(int threads, std::size_t count, const std::function<void(std::size_t)>& task) {
+    const std::size_t used = std::min(static_cast<std::size_t>(thr_NumThreads(threads)), count);
+    if (used == 0) return;
+    std::atomic<std::size_t> next = 0;
+    const auto work = [&] {
+        for (std::size_t i = next++; i < count; i = next++) task(i);
+    };
+    const Helpers helpers(used - 1, work, [] {});
+    work();
 }

@@ -7,6 +7,10 @@
 /// The threads that a task may use when it is asked to use `wanted`; 0 stands for one a core.
 int thr_NumThreads(int wanted);
 
+/// Calls `task(i)` for each i below `count`, in several threads at once, and returns when all are done; in
+/// the calling thread alone where no further one can be had. The tasks raise nothing.
+void thr_ForEach(int threads, std::size_t count, const std::function<void(std::size_t)>& task);
+
 /// Makes the texts of the blocks 0 to `count` - 1 in several threads, and hands them on in order.
 struct thr_TextBlocks {
     /// Makes the text of a block at `out`, where `bytes` are free, and gives its end. Several threads call it

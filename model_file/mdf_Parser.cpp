@@ -1,5 +1,6 @@
 #include "model_file/mdf_Parser.h"
 
+#include "model_file/mdf_BulkReader.h"
 #include "model_file/mdf_Locate.h"
 #include "model_file/mdf_Token.h"
 #include "model_file/mdf_TreeBuilder.h"
@@ -15,6 +16,7 @@
 
 namespace {
 
+constexpr std::size_t kFewNumbers = 4096;
 constexpr std::size_t kLongestTail = 40;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
@@ -66,6 +68,7 @@ private:
     void CloseObject();
     bool OpenArray();
     bool MayNest();
+    bool MayReadInBulk(const mdf_Numbers& numbers, std::size_t more);
     bool Add(mdf_Numbers& numbers, const mdf_Number& number, int depth);
     bool Fail(const char* begin, const char* expected);
     void SyntaxError(std::size_t offset, std::string text);
@@ -89,6 +92,9 @@ private:
     std::vector<std::size_t> objects_;
     /// The text of a string that has escapes or other characters than those of ASCII.
     std::string buffer_;
+    /// The numbers that were read in bulk last, and whether they were integers then.
+    std::pair<const mdf_Numbers*, bool> triedInBulk_{nullptr, false};
+    int threads_ = 0;
 };
 
 bool DocumentReader::Read() {
@@ -244,10 +250,17 @@ bool DocumentReader::ReadNumber() {
     return true;
 }
 
+/// Whether so many numbers have no room left that it pays to look how many follow. In one array that is done
+/// once for integers and once for reals.
+inline bool DocumentReader::MayReadInBulk(const mdf_Numbers& numbers, std::size_t more) {
+    if (numbers.HasRoomFor(more) || numbers.Size() < kFewNumbers) return false;
+    const std::pair key(&numbers, numbers.allInts);
+    return std::exchange(triedInBulk_, key) != key;
+}
+
 /// Adds a number that begins here; false, with the error told, when it is none.
 inline bool DocumentReader::Add(mdf_Numbers& numbers, const mdf_Number& number, int depth) {
-    constexpr std::size_t small = 4096;
-    if (numbers.Full() && numbers.Size() >= small) [[unlikely]]
+    if (numbers.Full() && numbers.Size() >= kFewNumbers) [[unlikely]]
         numbers.Reserve(numbers.Size() + NumbersAhead(at_, end_, depth));
     if (number.kind == mdf_Number::Kind::INT) {
         numbers.AddInt(number.whole);
@@ -263,6 +276,10 @@ inline bool DocumentReader::Add(mdf_Numbers& numbers, const mdf_Number& number, 
 /// Reads on as long as numbers follow one another.
 bool DocumentReader::ReadNumbers(mdf_Numbers& numbers, int depth) {
     do {
+        if (depth == 0 && MayReadInBulk(numbers, 1)) {
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadNumbers(numbers);
+            if (!behindComma_ || !IsAtNumber()) break;
+        }
         if (!Add(numbers, mdf_ReadNumber(at_, end_), depth)) return false;
         Skip();
         behindComma_ = Passes(',');
@@ -276,6 +293,10 @@ bool DocumentReader::ReadNumbers(mdf_Numbers& numbers, int depth) {
 bool DocumentReader::ReadRows(mdf_Rows& rows) {
     if (!MayNest()) return false;
     do {
+        if (rows.ends.empty() && rows.length > 0 && MayReadInBulk(rows.numbers, rows.length)) {
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadRows(rows);
+            if (!behindComma_ || Peek() != '[') break;
+        }
         builder_.BeginRow(rows);
         ++at_;
         Skip();

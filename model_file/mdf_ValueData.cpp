@@ -15,6 +15,24 @@ void mdf_Numbers::Reserve(std::size_t size) {
         reals.reserve(size);
 }
 
+void mdf_Bits::MarkAll(const mdf_Bits& other, std::size_t offset) {
+    if (other.words_.empty()) return;
+    const std::size_t first = offset / 64;
+    const std::size_t shift = offset % 64;
+    if (words_.size() < first + other.words_.size() + 1) words_.resize(first + other.words_.size() + 1);
+    for (std::size_t i = 0; i < other.words_.size(); ++i) {
+        words_[first + i] |= other.words_[i] << shift;
+        if (shift > 0) words_[first + i + 1] |= other.words_[i] >> (64 - shift);
+    }
+}
+
+void mdf_Numbers::AddMarks(const Marks& more, std::size_t offset) {
+    if (more.isInt.IsEmpty() && more.isLarge.IsEmpty()) return;
+    if (!marks) marks = std::make_unique<Marks>();
+    marks->isInt.MarkAll(more.isInt, offset);
+    marks->isLarge.MarkAll(more.isLarge, offset);
+}
+
 void mdf_Numbers::BecomeReal() {
     allInts = false;
     firstReal = ints.size();

@@ -23,12 +23,16 @@ public:
     bool IsMarked(std::size_t place) const {
         return place / 64 < words_.size() && (words_[place / 64] >> place % 64 & 1) != 0;
     }
+    /// Marks what the other marks, `offset` places further.
+    void MarkAll(const mdf_Bits& other, std::size_t offset);
     /// Forgets the marks from `size` on.
     void Truncate(std::size_t size) {
         if (size / 64 >= words_.size()) return;
         words_.resize(size / 64 + 1);
         words_.back() &= (std::uint64_t{1} << size % 64) - 1;
     }
+
+    bool IsEmpty() const { return words_.empty(); }
 
 private:
     std::vector<std::uint64_t> words_;
@@ -53,7 +57,10 @@ struct mdf_Numbers {
     mdf_Numbers(mdf_Numbers&& other) = default;
 
     std::size_t Size() const { return allInts ? ints.size() : reals.size(); }
-    bool Full() const { return allInts ? ints.size() == ints.capacity() : reals.size() == reals.capacity(); }
+    bool HasRoomFor(std::size_t more) const {
+        return allInts ? ints.capacity() - ints.size() >= more : reals.capacity() - reals.size() >= more;
+    }
+    bool Full() const { return !HasRoomFor(1); }
     void Reserve(std::size_t size);
     void AddInt(int value) {
         if (allInts) {
@@ -73,6 +80,8 @@ struct mdf_Numbers {
     mdf_Value At(std::size_t index) const;
     /// An IntArray or RealArray of the numbers from `begin` to before `end`.
     mdf_Value Slice(std::size_t begin, std::size_t end) const;
+    /// Marks numbers that are there, those of `more` being the first from `offset` on.
+    void AddMarks(const Marks& more, std::size_t offset);
     /// Forgets the numbers from `size` on.
     void Truncate(std::size_t size);
 
