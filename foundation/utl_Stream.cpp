@@ -1,5 +1,7 @@
 #include "foundation/utl_Stream.h"
 
+#include "foundation/thr_InOrder.h"
+
 #include <algorithm>
 #include <atomic>
 
@@ -44,10 +46,42 @@ std::size_t utl_Stream::SetDefaultBufferSize(std::size_t bytes) {
 void utl_Stream::Flush() {
     const auto pending = static_cast<std::size_t>(current_ - buffer_.get());
     if (pending == 0) return;
-    const Tail tail = TailOf(buffer_.get(), current_);
-    carriedColumn_ = tail.hasNewline ? tail.bytes : carriedColumn_ + tail.bytes;
+    NoteColumn(buffer_.get(), pending);
     current_ = buffer_.get();
     device_.Write(current_, pending);
+}
+
+/// Where the text that the device gets leaves the current line.
+void utl_Stream::NoteColumn(const char* text, std::size_t bytes) {
+    const Tail tail = TailOf(text, text + bytes);
+    carriedColumn_ = tail.hasNewline ? tail.bytes : carriedColumn_ + tail.bytes;
+}
+
+void utl_Stream::PrintItems(std::size_t count, std::size_t room, const LayOut& layOut) {
+    // Blocks stay in a core's cache, and fewer than a few of them are not worth a thread.
+    constexpr std::size_t blockBytes = std::size_t{1} << 20;
+    const std::size_t itemsOfBlock = std::max<std::size_t>(blockBytes / room, 1);
+    if (count >= 8 * itemsOfBlock && thr_NumThreads(threads_) > 1) {
+        Flush();
+        const thr_TextBlocks blocks{(count - 1) / itemsOfBlock + 1, itemsOfBlock * room};
+        blocks.Run(
+            threads_,
+            [&](std::size_t block, char* out) {
+                return layOut(block * itemsOfBlock, std::min((block + 1) * itemsOfBlock, count), out);
+            },
+            [this](const char* text, std::size_t bytes) {
+                NoteColumn(text, bytes);
+                device_.Write(text, bytes);
+            });
+        return;
+    }
+    for (std::size_t begin = 0; begin < count;) {
+        char* out = Reserve(room);
+        const std::size_t free = static_cast<std::size_t>(limit_ - out) + kSlack;
+        const std::size_t end = std::min(count, begin + free / room);
+        Commit(layOut(begin, end, out));
+        begin = end;
+    }
 }
 
 void utl_Stream::AppendLong(const char* text, std::size_t bytes) {
@@ -57,8 +91,7 @@ void utl_Stream::AppendLong(const char* text, std::size_t bytes) {
         return;
     }
     Flush();
-    const Tail tail = TailOf(text, text + bytes);
-    carriedColumn_ = tail.hasNewline ? tail.bytes : carriedColumn_ + tail.bytes;
+    NoteColumn(text, bytes);
     device_.Write(text, bytes);
 }
 

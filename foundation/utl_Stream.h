@@ -8,6 +8,7 @@
 #include <cmath>
 #include <cstddef>
 #include <cstring>
+#include <functional>
 #include <memory>
 #include <string_view>
 
@@ -66,6 +67,15 @@ public:
             Flush();
     }
 
+    /// Lays out the items from `begin` to before `end` at `out` and gives the end of the text. Reads only, as
+    /// several threads may call it at once.
+    using LayOut = std::function<char*(std::size_t begin, std::size_t end, char* out)>;
+    /// Prints `count` items, none of which needs more than `room` bytes. Many of them are laid out by several
+    /// threads; the device gets their text from this one, in order.
+    void PrintItems(std::size_t count, std::size_t room, const LayOut& layOut);
+    /// How many threads PrintItems() may use; 0, as at first, stands for one a core.
+    void SetThreads(int threads) { threads_ = threads; }
+
     /// Passes all pending text on to the device.
     void Flush();
 
@@ -90,6 +100,7 @@ private:
     }
     void AppendLong(const char* text, std::size_t bytes);
     void MakeRoom(std::size_t bytes);
+    void NoteColumn(const char* text, std::size_t bytes);
     bool IsPastLimit() const;
 
     // Between operations current_ < limit_, and kSlack bytes stand behind limit_.
@@ -103,6 +114,7 @@ private:
     int lineLimit_;
     int doublePrecision_;
     int floatPrecision_;
+    int threads_ = 0;
 };
 
 inline utl_Stream& operator<<(utl_Stream& stream, const char* text) {

@@ -1,5 +1,6 @@
 #include "model_file/mdf_Diagnostics.h"
 
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_Utf8.h"
 
 #include <algorithm>
@@ -56,6 +57,10 @@ void mdf_CapitalsCheck::Enter(const std::string& name, const fnd_Path& path, con
 
 bool mdf_Report::HasErrors() const {
     return std::ranges::any_of(findings, [](const fnd_Finding& finding) { return finding.IsError(); });
+}
+
+void mdf_Report::Locate(std::span<fnd_Finding> located) const {
+    if (text != nullptr) text->Locate(located);
 }
 
 std::string mdf_Report::Line(const fnd_Finding& finding) const {

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelFile.h"
 
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelReader.h"
 #include "model_file/mdf_Parser.h"
 #include "store_interface/findings/fnd_TextRules.h"
@@ -10,7 +11,8 @@ namespace {
 
 /// Hands on what the parser found; false after an error of syntax.
 bool IsDocument(std::vector<fnd_Finding>& errors, mdf_Diagnostics& diagnostics) {
-    const bool syntax = std::ranges::any_of(errors, [](const fnd_Finding& error) { return error.line > 0; });
+    const bool syntax =
+        std::ranges::any_of(errors, [](const fnd_Finding& error) { return error.code->name == "syntax"; });
     for (fnd_Finding& error : errors) diagnostics.Take(std::move(error));
     return !syntax;
 }
@@ -63,6 +65,7 @@ std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>&
 
 std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report) {
     report.fileName = path;
+    const auto file = std::make_shared<mdf_FileText>(path);
     std::string text;
     fnd_Finding error;
     if (!mdf_ReadFile(path, text, error)) {
@@ -74,8 +77,15 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
     // The text has gone into the document; of a large file there is no room for both beside the store.
-    std::string().swap(text);
-    return ReadDocument(root, errors, report);
+    if (file->CanBeReadAgain())
+        std::string().swap(text);
+    else
+        file->Keep(std::move(text));
+    std::unique_ptr<odb_Odb> odb = ReadDocument(root, errors, report);
+    root = mdf_Value();
+    report.text = file;
+    report.Locate(report.findings);
+    return odb;
 }
 
 std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
@@ -84,5 +94,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
-    return ReadDocument(root, errors, report);
+    std::unique_ptr<odb_Odb> odb = ReadDocument(root, errors, report);
+    mdf_Locate(text, report.findings);
+    return odb;
 }

@@ -8,6 +8,7 @@
 #include <iosfwd>
 #include <list>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -15,6 +16,7 @@
 /// What model files say that they are.
 inline constexpr char mdf_kFormat[] = "qrx-model/1";
 
+class mdf_FileText;
 class odiK_Mesh;
 
 /// Where a mesh came from that the model file only names: {"file": ...}.
@@ -45,17 +47,22 @@ struct mdf_MeshOrigin {
     mdf_Value given;
 };
 
-/// Everything that was found in one file, in the order of reading. Errors of syntax have a line and a column.
-/// Errors beyond the fiftieth are not kept.
+/// Everything that was found in one file, in the order of reading, with lines and columns. Errors beyond the
+/// fiftieth are not kept.
 struct mdf_Report {
     std::string fileName;
     std::vector<fnd_Finding> findings;
     /// The file, or one that it names, could not be read; a finding says why.
     bool unreadable = false;
     std::list<mdf_MeshOrigin> meshOrigins;
+    /// The file, for Locate().
+    std::shared_ptr<const mdf_FileText> text;
 
+    /// Gives findings on the file's content, whoever found them, their lines and columns, where they have
+    /// none. A file that has changed meanwhile gives none. mdf_Locate does the same for a text.
+    void Locate(std::span<fnd_Finding> findings) const;
     bool HasErrors() const;
-    /// "model.json:3:14: error: text", or "model.json: error: /models/A: text".
+    /// "model.json:3:14: error: /models/A: text", or without a line or place that isn't known.
     std::string Line(const fnd_Finding& finding) const;
 };
 /// The same of any file.

@@ -1,455 +1,406 @@
 #include "model_file/mdf_Parser.h"
 
+#include "model_file/mdf_BulkReader.h"
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_Token.h"
+#include "model_file/mdf_TreeBuilder.h"
 #include "model_file/mdf_Utf8.h"
-#include "model_file/mdf_ValueData.h"
-
-#include <nlohmann/json.hpp>
 
 #include <algorithm>
 #include <cerrno>
-#include <cstdint>
 #include <cstdio>
 #include <filesystem>
-#include <iterator>
-#include <limits>
 #include <memory>
 #include <system_error>
 #include <utility>
 
-/// How far the lexer has read.
-struct mdf_Cursor {
-    const char* begin;
-    const char* at;
-    const char* end;
-};
-
 namespace {
 
-/// All copies step along one cursor, which thus tells where the lexer is.
-class CursorIterator {
-public:
-    using iterator_category = std::input_iterator_tag;
-    using value_type = char;
-    using difference_type = std::ptrdiff_t;
-    using pointer = const char*;
-    using reference = const char&;
-
-    /// Without a cursor: the end.
-    explicit CursorIterator(mdf_Cursor* cursor) : cursor_(cursor) {}
-    reference operator*() const { return *cursor_->at; }
-    CursorIterator& operator++() {
-        ++cursor_->at;
-        return *this;
-    }
-    CursorIterator operator++(int) {
-        ++cursor_->at;
-        return *this;
-    }
-    bool operator==(const CursorIterator& other) const { return AtEnd() == other.AtEnd(); }
-    bool operator!=(const CursorIterator& other) const { return !(*this == other); }
-
-private:
-    bool AtEnd() const { return cursor_ == nullptr || cursor_->at == cursor_->end; }
-
-    mdf_Cursor* cursor_;
-};
-
-constexpr const char* foundNul = "found a NUL byte, expected text";
+constexpr std::size_t kFewNumbers = 4096;
 constexpr std::size_t kLongestTail = 40;
-constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
-bool WrittenAsInteger(std::string_view number) {
-    return number.find_first_not_of("-0123456789") == std::string_view::npos;
+constexpr const char* kValue = "a value";
+constexpr const char* kName = "a member name in double quotes";
+constexpr const char* kNoComma = "no comma behind the last one";
+
+/// How many numbers follow in an array of numbers, or with `depth` 1 in one of rows, of which one is open; as
+/// many as are seen where other things are met. Counting makes the array's memory once, at its final size.
+std::size_t NumbersAhead(const char* at, const char* end, int depth) {
+    std::size_t commas = 0;
+    for (; at != end; ++at) {
+        const char c = *at;
+        if (c == ',') {
+            ++commas;
+        } else if (c == '[') {
+            ++depth;
+        } else if (c == ']') {
+            if (--depth < 0) break;
+        } else if (c == '"' || c == '/' || c == '{') {
+            break;
+        }
+    }
+    return commas + 1;
 }
 
-} // namespace
-
-/// Makes the tree from the library's events.
-class mdf_Builder {
+/// Goes through a document once, from token to token.
+class DocumentReader {
 public:
-    mdf_Builder(mdf_Cursor& cursor, mdf_Value& root, std::vector<fnd_Finding>& errors)
-        : cursor_(cursor), root_(root), errors_(errors) {}
+    DocumentReader(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors)
+        : begin_(text.data()), at_(begin_), end_(begin_ + text.size()), builder_(root), errors_(errors) {}
 
-    bool null() { return Other(mdf_Value()); }
-    bool boolean(bool value) { return Other(mdf_Value(value)); }
-    bool number_integer(std::int64_t value) {
-        if (value < std::numeric_limits<int>::min() || value > std::numeric_limits<int>::max())
-            return Real(static_cast<double>(value), true);
-        return Int(static_cast<int>(value));
-    }
-    bool number_unsigned(std::uint64_t value) {
-        if (value > static_cast<std::uint64_t>(std::numeric_limits<int>::max()))
-            return Real(static_cast<double>(value), true);
-        return Int(static_cast<int>(value));
-    }
-    bool number_float(double value, const std::string& text) { return Real(value, WrittenAsInteger(text)); }
-    bool string(std::string& text);
-    bool binary(nlohmann::json::binary_t&) { return false; }
-    bool start_object(std::size_t);
-    bool key(std::string& name);
-    bool end_object();
-    bool start_array(std::size_t);
-    bool end_array();
-    bool parse_error(std::size_t position, const std::string& token,
-                     const nlohmann::detail::exception& failure);
-
-    void SyntaxError(std::size_t offset, std::string text);
-    std::size_t Offset() const { return static_cast<std::size_t>(cursor_.at - cursor_.begin); }
+    /// False after an error of syntax.
+    bool Read();
 
 private:
-    enum class Event { Start, BeginObject, Key, BeginArray, Number, Value };
+    /// What comes next.
+    enum class Next { VALUE, NAME, BEHIND_VALUE };
 
-    bool Int(int value);
-    bool Real(double value, bool isLarge);
-    bool Other(mdf_Value value);
-    void Place(mdf_Value value);
-    mdf_Numbers* OpenNumbers();
-    void MakeRoom(mdf_Numbers& numbers) const;
-    bool AddFacetName(const std::string& text);
-    void DemoteRow();
+    bool ReadValue();
+    bool ReadName();
+    bool ReadBehindValue();
+    bool ReadNumber();
+    bool ReadNumbers(mdf_Numbers& numbers, int depth);
+    bool ReadRows(mdf_Rows& rows);
+    bool ReadLiteral(std::string_view literal);
+    bool ReadString(std::string_view& text);
+    bool OpenObject();
+    void CloseObject();
+    bool OpenArray();
     bool MayNest();
-    void Note(Event event);
-    std::size_t EndOfNumber() const;
-    std::size_t FindToken(const char*& expected) const;
-    mdf_Value& Top() { return frames_.back(); }
+    bool MayReadInBulk(const mdf_Numbers& numbers, std::size_t more);
+    bool Add(mdf_Numbers& numbers, const mdf_Number& number, int depth);
+    bool Fail(const char* begin, const char* expected);
+    void SyntaxError(std::size_t offset, std::string text);
 
-    std::string_view Text() const {
-        return {cursor_.begin, static_cast<std::size_t>(cursor_.end - cursor_.begin)};
-    }
+    void Skip();
+    bool Passes(char sign);
+    char Peek() const { return at_ != end_ ? *at_ : '\0'; }
+    bool IsAtNumber() const { return at_ != end_ && mdf_BeginsNumber(*at_); }
+    std::string_view Text() const { return {begin_, static_cast<std::size_t>(end_ - begin_)}; }
+    std::size_t OffsetOf(const char* at) const { return static_cast<std::size_t>(at - begin_); }
 
-    mdf_Cursor& cursor_;
-    mdf_Value& root_;
+    const char* begin_;
+    const char* at_;
+    const char* end_;
+    mdf_Builder builder_;
     std::vector<fnd_Finding>& errors_;
-    /// The arrays and objects that are open, outermost first; the last member of an open object is the one
-    /// whose value is being read.
-    std::vector<mdf_Value> frames_;
-    /// The innermost open array is a row, and its items go straight into the Matrix or FacetArray on top.
-    bool rowOpen_ = false;
-    std::size_t rowBegin_ = 0;
-    /// The last event, and where the lexer was after it.
-    Event lastEvent_ = Event::Start;
-    std::size_t lastOffset_ = 0;
+    Next next_ = Next::VALUE;
+    /// A comma stands ahead of what comes next.
+    bool behindComma_ = false;
+    /// Where the open objects begin.
+    std::vector<std::size_t> objects_;
+    /// The text of a string that has escapes or other characters than those of ASCII.
+    std::string buffer_;
+    /// The numbers that were read in bulk last, and whether they were integers then.
+    std::pair<const mdf_Numbers*, bool> triedInBulk_{nullptr, false};
+    int threads_ = 0;
 };
 
-/// The numbers of the row or array that is open, with room for one more; null when it holds other things.
-mdf_Numbers* mdf_Builder::OpenNumbers() {
-    if (frames_.empty()) return nullptr;
-    mdf_Value& top = Top();
-    mdf_Numbers* numbers = rowOpen_ ? &top.As<mdf_Rows>()->numbers : top.As<mdf_Numbers>();
-    if (numbers != nullptr) MakeRoom(*numbers);
-    return numbers;
-}
-
-void mdf_Builder::MakeRoom(mdf_Numbers& numbers) const {
-    constexpr std::size_t small = 4096;
-    const std::size_t size = numbers.Size();
-    if (size < small || !numbers.Full()) return;
-    // Counting the commas ahead makes the array's memory once, at its final size.
-    std::size_t ahead = 1;
-    int depth = rowOpen_ ? 1 : 0;
-    const char* at = cursor_.at - 1;
-    for (; at != cursor_.end; ++at) {
-        if (*at == '"' || *at == '/' || *at == '{') break;
-        if (*at == ',') ++ahead;
-        if (*at == '[') ++depth;
-        if (*at == ']' && --depth < 0) break;
-    }
-    const bool counted = depth < 0;
-    numbers.Reserve(size + (counted ? ahead : std::max(ahead, size)));
-}
-
-bool mdf_Builder::Int(int value) {
-    Note(Event::Number);
-    mdf_Facets* facets = rowOpen_ ? Top().As<mdf_Facets>() : nullptr;
-    if (facets != nullptr) {
-        std::vector<int>& pairs = facets->pairs;
-        if (pairs.size() - rowBegin_ < 2) {
-            pairs.push_back(value);
-            return true;
+bool DocumentReader::Read() {
+    if (Text().starts_with(kByteOrderMark)) at_ += kByteOrderMark.size();
+    bool good = true;
+    while (good) {
+        Skip();
+        switch (next_) {
+        case Next::VALUE: good = ReadValue(); break;
+        case Next::NAME: good = ReadName(); break;
+        case Next::BEHIND_VALUE:
+            if (builder_.Depth() > 0) {
+                good = ReadBehindValue();
+            } else if (at_ == end_) {
+                return true;
+            } else {
+                good = Fail(at_, "the end of the file");
+            }
+            break;
         }
-        DemoteRow();
     }
-    if (mdf_Numbers* numbers = OpenNumbers())
-        numbers->AddInt(value);
-    else
-        Place(mdf_Value(value));
+    return false;
+}
+
+/// Passes over blanks and comments. What can't be passed over, such as a comment that isn't closed, is a
+/// token that stands in the wrong place.
+inline void DocumentReader::Skip() {
+    while (at_ != end_ && mdf_IsBlank(*at_)) ++at_;
+    if (at_ == end_ || *at_ != '/') return;
+    const std::size_t from = OffsetOf(at_);
+    const std::size_t to = mdf_SkipBlanksAndComments(Text(), from);
+    const std::size_t nul = Text().substr(0, to).find('\0', from);
+    at_ = begin_ + (nul == std::string_view::npos ? to : nul);
+}
+
+/// Passes over the sign and what is behind it that is no token.
+inline bool DocumentReader::Passes(char sign) {
+    if (Peek() != sign || at_ == end_) return false;
+    ++at_;
+    Skip();
     return true;
 }
 
-bool mdf_Builder::Real(double value, bool isLarge) {
-    Note(Event::Number);
-    if (rowOpen_ && Top().As<mdf_Facets>() != nullptr) DemoteRow();
-    if (mdf_Numbers* numbers = OpenNumbers()) {
-        numbers->AddReal(value, isLarge);
-    } else {
-        Place(isLarge ? mdf_Value(mdf_Value::Data(mdf_Value::Large{value})) : mdf_Value(value));
-    }
-    return true;
-}
-
-bool mdf_Builder::string(std::string& text) {
-    if (rowOpen_ && AddFacetName(text)) {
-        Note(Event::Value);
+bool DocumentReader::ReadValue() {
+    switch (Peek()) {
+    case '[':
+        if (mdf_Rows* rows = builder_.OpenRows()) return ReadRows(*rows);
+        return OpenArray();
+    case '{': return OpenObject();
+    case '"': {
+        std::string_view text;
+        if (!ReadString(text)) return false;
+        builder_.String(text);
+        next_ = Next::BEHIND_VALUE;
         return true;
     }
-    // The lexer's buffer is copied, not taken: it has the capacity of the longest text so far.
-    return Other(mdf_Value(std::string_view(text)));
+    case 't': return ReadLiteral("true");
+    case 'f': return ReadLiteral("false");
+    case 'n': return ReadLiteral("null");
+    default:
+        if (IsAtNumber()) return ReadNumber();
+        return Fail(at_, behindComma_ && Peek() == ']' ? kNoComma : kValue);
+    }
 }
 
-bool mdf_Builder::AddFacetName(const std::string& text) {
-    mdf_Value& top = Top();
-    if (mdf_Rows* rows = top.As<mdf_Rows>()) {
-        const bool pairsSoFar =
-            rows->numbers.allInts && rows->ends.empty() && (rows->count == 0 || rows->length == 2);
-        if (!pairsSoFar || rows->numbers.Size() - rowBegin_ != 1) return false;
-        mdf_Facets facets;
-        facets.pairs = std::move(rows->numbers.ints);
-        top = mdf_Value::Of(std::move(facets));
-    } else if (top.As<mdf_Facets>()->pairs.size() - rowBegin_ != 1) {
-        return false;
-    }
-    top.As<mdf_Facets>()->AddName(text);
+bool DocumentReader::ReadName() {
+    if (Peek() != '"') return Fail(at_, behindComma_ && Peek() == '}' ? kNoComma : kName);
+    std::string_view name;
+    if (!ReadString(name)) return false;
+    builder_.Key(name);
+    Skip();
+    if (!Passes(':')) return Fail(at_, "':'");
+    behindComma_ = false;
+    next_ = Next::VALUE;
     return true;
 }
 
-/// Makes the array on top general, and the row that is open an array of its own on top of it.
-void mdf_Builder::DemoteRow() {
-    mdf_Value& top = Top();
-    mdf_Value row;
-    if (mdf_Rows* rows = top.As<mdf_Rows>()) {
-        mdf_Numbers& numbers = rows->numbers;
-        row = numbers.Slice(rowBegin_, numbers.Size());
-        numbers.Truncate(rowBegin_);
+bool DocumentReader::ReadBehindValue() {
+    const bool inObject = builder_.IsInObject();
+    if (Passes(',')) {
+        behindComma_ = true;
+        next_ = inObject ? Next::NAME : Next::VALUE;
+    } else if (inObject && Peek() == '}') {
+        CloseObject();
+    } else if (!inObject && Peek() == ']') {
+        ++at_;
+        builder_.EndArray();
     } else {
-        mdf_Facets& facets = *top.As<mdf_Facets>();
-        const std::size_t filled = facets.pairs.size() - rowBegin_;
-        if (filled == 2) {
-            row = top.Item(facets.Count() - 1);
-        } else {
-            mdf_Numbers label;
-            if (filled == 1) label.AddInt(facets.pairs.back());
-            row = label.Slice(0, filled);
-        }
-        facets.pairs.resize(rowBegin_);
+        return Fail(at_, inObject ? "',' or '}'" : "',' or ']'");
     }
-    top.Generalise();
-    frames_.push_back(std::move(row));
-    rowOpen_ = false;
-}
-
-bool mdf_Builder::Other(mdf_Value value) {
-    Note(Event::Value);
-    if (rowOpen_) DemoteRow();
-    Place(std::move(value));
     return true;
 }
 
-void mdf_Builder::Place(mdf_Value value) {
-    if (frames_.empty()) {
-        root_ = std::move(value);
-        return;
-    }
-    mdf_Value& top = Top();
-    if (mdf_ObjectData* object = top.As<mdf_ObjectData>()) {
-        object->members.back().value = std::move(value);
-        return;
-    }
-    top.Generalise();
-    top.Items().push_back(std::move(value));
-}
-
-bool mdf_Builder::MayNest() {
-    const std::size_t depth = frames_.size() + (rowOpen_ ? 1 : 0);
-    if (depth < static_cast<std::size_t>(mdf_maxDepth)) return true;
-    SyntaxError(Offset() - 1,
+bool DocumentReader::MayNest() {
+    if (builder_.Depth() < static_cast<std::size_t>(mdf_maxDepth)) return true;
+    SyntaxError(OffsetOf(at_),
                 "arrays and objects are nested deeper than " + std::to_string(mdf_maxDepth) + " levels");
     return false;
 }
 
-bool mdf_Builder::start_object(std::size_t) {
-    Note(Event::BeginObject);
+bool DocumentReader::OpenObject() {
     if (!MayNest()) return false;
-    if (rowOpen_) DemoteRow();
-    frames_.push_back(mdf_Value::Of(mdf_ObjectData()));
+    objects_.push_back(OffsetOf(at_));
+    builder_.BeginObject();
+    ++at_;
+    Skip();
+    behindComma_ = false;
+    next_ = Next::NAME;
+    if (Peek() == '}') CloseObject();
     return true;
 }
 
-bool mdf_Builder::key(std::string& name) {
-    Note(Event::Key);
-    Top().As<mdf_ObjectData>()->members.push_back({name, mdf_Value()});
-    return true;
-}
-
-bool mdf_Builder::end_object() {
-    std::vector<std::string> repeated = Top().As<mdf_ObjectData>()->Index();
-    mdf_Value object = std::move(Top());
-    frames_.pop_back();
-    if (!repeated.empty()) {
-        std::string pointer;
-        for (const mdf_Value& frame : frames_) {
-            if (frame.IsObject())
-                fnd_AppendPointer(pointer, frame.Members().back().name);
-            else
-                fnd_AppendPointer(pointer, std::to_string(frame.Size()));
-        }
-        for (const std::string& name : repeated) {
-            if (errors_.size() >= mdf_maxErrors) break;
-            fnd_Finding& error = errors_.emplace_back(fnd_Make(
-                "duplicate-member", pointer, "the member " + mdf_QuotedToken(name) + " stands more than once",
-                "names that differ"));
-            fnd_AppendPointer(error.place, name);
-        }
+void DocumentReader::CloseObject() {
+    ++at_;
+    std::string pointer;
+    const std::vector<std::string> repeated = builder_.EndObject(pointer);
+    next_ = Next::BEHIND_VALUE;
+    const std::size_t object = objects_.back();
+    objects_.pop_back();
+    if (repeated.empty() || errors_.size() >= mdf_maxErrors) return;
+    const std::vector<std::size_t> offsets = mdf_RepeatedMembers(Text().substr(0, OffsetOf(at_)), object);
+    for (std::size_t i = 0; i < repeated.size() && errors_.size() < mdf_maxErrors; ++i) {
+        fnd_Finding& error = errors_.emplace_back(fnd_Make(
+            "duplicate-member", pointer,
+            "the member " + mdf_QuotedToken(repeated[i]) + " stands more than once", "names that differ"));
+        fnd_AppendPointer(error.place, repeated[i]);
+        mdf_PutPosition(error, Text(), offsets[i]);
     }
-    return Other(std::move(object));
 }
 
-bool mdf_Builder::start_array(std::size_t) {
-    Note(Event::BeginArray);
+bool DocumentReader::OpenArray() {
     if (!MayNest()) return false;
-    if (rowOpen_) DemoteRow();
-    if (!frames_.empty()) {
-        mdf_Value& top = Top();
-        const mdf_Numbers* numbers = top.As<mdf_Numbers>();
-        if (numbers != nullptr && numbers->Size() == 0) top = mdf_Value::Of(mdf_Rows());
-        const mdf_Rows* rows = top.As<mdf_Rows>();
-        const mdf_Facets* facets = top.As<mdf_Facets>();
-        rowOpen_ = rows != nullptr || facets != nullptr;
-        if (rowOpen_) {
-            rowBegin_ = rows != nullptr ? rows->numbers.Size() : facets->pairs.size();
+    builder_.BeginArray();
+    ++at_;
+    Skip();
+    behindComma_ = false;
+    next_ = Next::VALUE;
+    if (Peek() != ']') return true;
+    ++at_;
+    builder_.EndArray();
+    next_ = Next::BEHIND_VALUE;
+    return true;
+}
+
+bool DocumentReader::ReadNumber() {
+    if (mdf_Numbers* numbers = builder_.OpenNumbers())
+        return ReadNumbers(*numbers, builder_.IsInRow() ? 1 : 0);
+    const mdf_Number number = mdf_ReadNumber(at_, end_);
+    if (number.kind >= mdf_Number::Kind::BROKEN) return Fail(at_, kValue);
+    builder_.Number(number);
+    at_ = number.end;
+    next_ = Next::BEHIND_VALUE;
+    return true;
+}
+
+/// Whether so many numbers have no room left that it pays to look how many follow. In one array that is done
+/// once for integers and once for reals.
+inline bool DocumentReader::MayReadInBulk(const mdf_Numbers& numbers, std::size_t more) {
+    if (numbers.HasRoomFor(more) || numbers.Size() < kFewNumbers) return false;
+    const std::pair key(&numbers, numbers.allInts);
+    return std::exchange(triedInBulk_, key) != key;
+}
+
+/// Adds a number that begins here; false, with the error told, when it is none.
+inline bool DocumentReader::Add(mdf_Numbers& numbers, const mdf_Number& number, int depth) {
+    if (numbers.Full() && numbers.Size() >= kFewNumbers) [[unlikely]]
+        numbers.Reserve(numbers.Size() + NumbersAhead(at_, end_, depth));
+    if (number.kind == mdf_Number::Kind::INT) {
+        numbers.AddInt(number.whole);
+    } else if (number.kind < mdf_Number::Kind::BROKEN) {
+        numbers.AddReal(number.value, number.kind == mdf_Number::Kind::LARGE);
+    } else {
+        return Fail(at_, kValue);
+    }
+    at_ = number.end;
+    return true;
+}
+
+/// Reads on as long as numbers follow one another.
+bool DocumentReader::ReadNumbers(mdf_Numbers& numbers, int depth) {
+    do {
+        if (depth == 0 && MayReadInBulk(numbers, 1)) {
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadNumbers(numbers);
+            if (!behindComma_ || !IsAtNumber()) break;
+        }
+        if (!Add(numbers, mdf_ReadNumber(at_, end_), depth)) return false;
+        Skip();
+        behindComma_ = Passes(',');
+    } while (behindComma_ && IsAtNumber());
+    next_ = behindComma_ ? Next::VALUE : Next::BEHIND_VALUE;
+    return true;
+}
+
+/// Reads on as long as rows of numbers follow one another. Where anything else is met, the row in which that
+/// is stays open.
+bool DocumentReader::ReadRows(mdf_Rows& rows) {
+    if (!MayNest()) return false;
+    do {
+        if (rows.ends.empty() && rows.length > 0 && MayReadInBulk(rows.numbers, rows.length)) {
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadRows(rows);
+            if (!behindComma_ || Peek() != '[') break;
+        }
+        builder_.BeginRow(rows);
+        ++at_;
+        Skip();
+        if (IsAtNumber()) {
+            if (!ReadNumbers(rows.numbers, 1)) return false;
+            if (behindComma_ || Peek() != ']') return true;
+        } else if (Peek() != ']') {
+            behindComma_ = false;
+            next_ = Next::VALUE;
             return true;
         }
-    }
-    frames_.push_back(mdf_Value::Of(mdf_Numbers()));
+        ++at_;
+        rows.CloseRow();
+        builder_.ForgetRow();
+        Skip();
+        behindComma_ = Passes(',');
+    } while (behindComma_ && Peek() == '[');
+    next_ = behindComma_ ? Next::VALUE : Next::BEHIND_VALUE;
     return true;
 }
 
-bool mdf_Builder::end_array() {
-    Note(Event::Value);
-    mdf_Rows* rows = rowOpen_ ? Top().As<mdf_Rows>() : nullptr;
-    if (rows != nullptr) {
-        rows->CloseRow();
-        rowOpen_ = false;
-        return true;
-    }
-    if (rowOpen_ && Top().As<mdf_Facets>()->pairs.size() - rowBegin_ == 2) {
-        rowOpen_ = false;
-        return true;
-    }
-    if (rowOpen_) DemoteRow();
-    mdf_Value array = std::move(Top());
-    frames_.pop_back();
-    return Other(std::move(array));
+bool DocumentReader::ReadLiteral(std::string_view literal) {
+    if (!Text().substr(OffsetOf(at_)).starts_with(literal)) return Fail(at_, kValue);
+    at_ += literal.size();
+    if (literal == "null")
+        builder_.Null();
+    else
+        builder_.Bool(literal == "true");
+    next_ = Next::BEHIND_VALUE;
+    return true;
 }
 
-void mdf_Builder::SyntaxError(std::size_t offset, std::string text) {
-    const std::string_view before = Text().substr(0, offset);
-    fnd_Finding& error = errors_.emplace_back(fnd_Make("syntax", {}, std::move(text)));
-    const std::size_t newline = before.rfind('\n');
-    std::size_t lineBegin = newline == std::string_view::npos ? 0 : newline + 1;
-    if (lineBegin == 0 && before.starts_with(byteOrderMark)) lineBegin = byteOrderMark.size();
-    error.line = 1 + static_cast<long>(std::count(before.begin(), before.end(), '\n'));
-    error.column = 1 + static_cast<long>(offset - lineBegin);
-}
-
-void mdf_Builder::Note(Event event) {
-    lastEvent_ = event;
-    lastOffset_ = Offset();
-}
-
-/// Where the text goes on behind the number that was the last event. The lexer reads one character beyond a
-/// number, if there is one.
-std::size_t mdf_Builder::EndOfNumber() const {
-    const std::string_view text = Text();
-    const auto isDigit = [&](std::size_t at) { return text[at] >= '0' && text[at] <= '9'; };
-    const std::size_t last = lastOffset_ - 1;
-    if (lastOffset_ < text.size() || !isDigit(last)) return last;
-    // A digit at the end of the text belongs to the number, unless that is a zero.
-    if (last == 0 || text[last - 1] != '0') return lastOffset_;
-    std::size_t begin = last - 1;
-    while (begin > 0 &&
-           (isDigit(begin - 1) || std::string_view("+-.eE").find(text[begin - 1]) != std::string_view::npos))
-        --begin;
-    const std::string_view number = text.substr(begin, last - begin);
-    return number == "0" || number == "-0" ? last : lastOffset_;
-}
-
-/// The token that the lexer or the parser stumbled at, and what could have stood there.
-std::size_t mdf_Builder::FindToken(const char*& expected) const {
-    const std::string_view text = Text();
-    std::size_t at = lastEvent_ == Event::Number ? EndOfNumber() : lastOffset_;
-    if (at == 0 && text.starts_with(byteOrderMark)) at = byteOrderMark.size();
-    at = mdf_SkipBlanksAndComments(text, at);
-    const auto passed = [&](char sign) {
-        if (at >= text.size() || text[at] != sign) return false;
-        at = mdf_SkipBlanksAndComments(text, at + 1);
-        return true;
+/// The text of a string, which may lie in the document or in the buffer.
+bool DocumentReader::ReadString(std::string_view& text) {
+    const auto isPlain = [](char c) {
+        return c != '"' && c != '\\' && static_cast<unsigned char>(c) >= 0x20 &&
+               static_cast<unsigned char>(c) < 0x80;
     };
-    constexpr const char* aValue = "a value";
-    constexpr const char* aName = "a member name in double quotes";
-    constexpr const char* noComma = "no comma behind the last one";
-    const auto closes = [&](char sign) { return at < text.size() && text[at] == sign; };
-    switch (lastEvent_) {
-    case Event::Start:
-    case Event::BeginArray: expected = aValue; break;
-    case Event::BeginObject: expected = aName; break;
-    case Event::Key: expected = passed(':') ? aValue : "':'"; break;
-    case Event::Number:
-    case Event::Value:
-        if (frames_.empty()) {
-            expected = "the end of the file";
-        } else if (!rowOpen_ && frames_.back().IsObject()) {
-            expected = !passed(',') ? "',' or '}'" : closes('}') ? noComma : aName;
-        } else {
-            expected = !passed(',') ? "',' or ']'" : closes(']') ? noComma : aValue;
-        }
-        break;
+    const char* const begin = at_;
+    const char* at = begin + 1;
+    while (at != end_ && isPlain(*at)) ++at;
+    if (at != end_ && *at == '"') {
+        text = {begin + 1, static_cast<std::size_t>(at - begin - 1)};
+        at_ = at + 1;
+        return true;
     }
-    return at;
+    buffer_.assign(begin + 1, at);
+    while (at != end_ && *at != '"') {
+        const std::string_view rest(at, static_cast<std::size_t>(end_ - at));
+        std::size_t length = 0;
+        if (*at == '\\') {
+            length = mdf_ReadEscape(rest, buffer_);
+        } else if (static_cast<unsigned char>(*at) >= 0x20) {
+            length = mdf_Utf8Length(rest);
+            buffer_.append(at, length);
+        }
+        if (length == 0) return Fail(begin, kValue);
+        at += length;
+    }
+    if (at == end_) return Fail(begin, kValue);
+    text = buffer_;
+    at_ = at + 1;
+    return true;
 }
 
-bool mdf_Builder::parse_error(std::size_t, const std::string&, const nlohmann::detail::exception& failure) {
+/// Tells of the token that begins here and can't stand here, or is none.
+bool DocumentReader::Fail(const char* begin, const char* expected) {
     const std::string_view text = Text();
-    const char* expected = "";
-    const std::size_t begin = FindToken(expected);
-    const mdf_TokenProblem problem = mdf_ProblemOf(text, begin, Offset());
-    if (!problem.insideString && Offset() > 0 && text[Offset() - 1] == '\0') {
-        SyntaxError(Offset() - 1, foundNul);
+    const std::size_t offset = OffsetOf(begin);
+    const std::size_t end = mdf_EndOfToken(text, offset);
+    const mdf_TokenProblem problem = mdf_ProblemOf(text, offset, end);
+    const std::string_view seen = offset >= text.size() ? std::string_view() : mdf_TokenAt(text, offset, end);
+    const std::size_t nul = begin == end_ || *begin == '"'
+                                ? std::string_view::npos
+                                : text.substr(0, std::max(end, offset + seen.size())).find('\0', offset);
+    if (nul != std::string_view::npos) {
+        SyntaxError(nul, "found a NUL byte, expected text");
         return false;
     }
-    const std::string token = begin >= text.size() ? std::string("the end of the file")
-                                                   : mdf_QuotedToken(mdf_TokenAt(text, begin, Offset()));
-    constexpr int numberOverflow = 406;
-    if (failure.id == numberOverflow) {
-        SyntaxError(begin, "the number " + token + " is beyond the range of double precision");
-        return false;
-    }
+    const std::string token = seen.empty() ? std::string("the end of the file") : mdf_QuotedToken(seen);
     std::string words = problem.reason.empty() ? std::string() : problem.reason + "; ";
     if (problem.insideString) {
-        const std::string_view tail = mdf_Utf8End(text.substr(begin, Offset() - begin), kLongestTail);
-        SyntaxError(Offset() - 1, words + "found " + mdf_QuotedToken(tail));
-        return false;
+        const std::string_view tail = mdf_Utf8End(text.substr(offset, end - offset), kLongestTail);
+        SyntaxError(end - 1, words + "found " + mdf_QuotedToken(tail));
+    } else if (problem.reason.empty() && expected == kValue && IsAtNumber()) {
+        SyntaxError(offset, "the number " + token + " is beyond the range of double precision");
+    } else {
+        words += "found " + token;
+        if (problem.isOfAnyKind) words.append(", expected ").append(expected);
+        SyntaxError(offset, std::move(words));
     }
-    words += "found " + token;
-    if (problem.isOfAnyKind) words.append(", expected ").append(expected);
-    SyntaxError(begin, std::move(words));
     return false;
 }
+
+void DocumentReader::SyntaxError(std::size_t offset, std::string text) {
+    mdf_PutPosition(errors_.emplace_back(fnd_Make("syntax", {}, std::move(text))), Text(), offset);
+}
+
+} // namespace
 
 bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors) {
     const std::size_t errorsBefore = errors.size();
     root = mdf_Value();
-    mdf_Cursor cursor{text.data(), text.data(), text.data() + text.size()};
-    mdf_Builder builder(cursor, root, errors);
-    bool done = nlohmann::json::sax_parse(CursorIterator(&cursor), CursorIterator(nullptr), &builder,
-                                          nlohmann::json::input_format_t::json, true, true);
-    // The lexer takes a NUL byte for the end of the text.
-    const std::size_t nul = done ? text.find('\0') : std::string_view::npos;
-    if (nul != std::string_view::npos) {
-        builder.SyntaxError(nul, foundNul);
-        done = false;
-    }
-    if (!done) root = mdf_Value();
+    if (!DocumentReader(text, root, errors).Read()) root = mdf_Value();
     return errors.size() == errorsBefore;
 }
 

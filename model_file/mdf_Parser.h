@@ -14,10 +14,10 @@ inline constexpr int mdf_maxDepth = 200;
 inline constexpr std::size_t mdf_maxErrors = 50;
 
 /// Reads a JSON document (UTF-8, // and /* */ comments allowed) in one pass.
-/// True when there was no error; errors are appended: those of syntax
-/// with line and column from 1 (the column in bytes, a byte order mark not counted), those of content with a
-/// JSON pointer. After an error of syntax (always the last one) `root` is Null; after errors of content it is
-/// the document, with the first of several members of one name.
+/// True when there was no error; errors are appended, with line and column from 1 (the column in bytes, a
+/// byte order mark not counted), those of content with a JSON pointer too. After an error of syntax (always
+/// the last one) `root` is Null; after errors of content it is the document, with the first of several
+/// members of one name.
 bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors);
 
 /// Reads a file into memory; false, with an error in the system's words, when it can't be read.

@@ -6,10 +6,19 @@
 
 // What messages say of the text of a document that is no JSON.
 
+inline bool mdf_IsBlank(char c) {
+    return c == ' ' || c == '\n' || c == '\r' || c == '\t';
+}
 /// Where the next token begins, or the text ends. A comment that isn't closed is a token.
 std::size_t mdf_SkipBlanksAndComments(std::string_view text, std::size_t at);
 /// Whether a document without errors has comments.
 bool mdf_HasComments(std::string_view text);
+
+/// Behind the token, or behind the byte at which it breaks off; the end of the text for one that it cuts.
+std::size_t mdf_EndOfToken(std::string_view text, std::size_t at);
+/// Appends the character that an escape at the beginning of the text stands for; gives the length of the
+/// escape, 0 when it is wrong.
+std::size_t mdf_ReadEscape(std::string_view text, std::string& out);
 
 /// The token as a person sees it: a bracket, a string up to `end`, else a run of other characters.
 std::string_view mdf_TokenAt(std::string_view text, std::size_t at, std::size_t end);

@@ -15,50 +15,38 @@ void mdf_Numbers::Reserve(std::size_t size) {
         reals.reserve(size);
 }
 
-namespace {
-
-void Mark(std::vector<bool>& bits, std::size_t index) {
-    if (bits.size() <= index) bits.resize(index + 1);
-    bits[index] = true;
-}
-
-bool IsMarked(const std::vector<bool>& bits, std::size_t index) {
-    return index < bits.size() && bits[index];
-}
-
-} // namespace
-
-void mdf_Numbers::AddInt(int value) {
-    if (allInts) {
-        ints.push_back(value);
-        return;
+void mdf_Bits::MarkAll(const mdf_Bits& other, std::size_t offset) {
+    if (other.words_.empty()) return;
+    const std::size_t first = offset / 64;
+    const std::size_t shift = offset % 64;
+    if (words_.size() < first + other.words_.size() + 1) words_.resize(first + other.words_.size() + 1);
+    for (std::size_t i = 0; i < other.words_.size(); ++i) {
+        words_[first + i] |= other.words_[i] << shift;
+        if (shift > 0) words_[first + i + 1] |= other.words_[i] >> (64 - shift);
     }
+}
+
+void mdf_Numbers::AddMarks(const Marks& more, std::size_t offset) {
+    if (more.isInt.IsEmpty() && more.isLarge.IsEmpty()) return;
     if (!marks) marks = std::make_unique<Marks>();
-    Mark(marks->isInt, reals.size());
-    reals.push_back(value);
+    marks->isInt.MarkAll(more.isInt, offset);
+    marks->isLarge.MarkAll(more.isLarge, offset);
 }
 
-void mdf_Numbers::AddReal(double value, bool isLarge) {
-    if (allInts) {
-        allInts = false;
-        firstReal = ints.size();
-        reals.reserve(std::max(ints.capacity(), firstReal + 1));
-        reals.assign(ints.begin(), ints.end());
-        ints = {};
-    }
-    if (isLarge) {
-        if (!marks) marks = std::make_unique<Marks>();
-        Mark(marks->isLarge, reals.size());
-    }
-    reals.push_back(value);
+void mdf_Numbers::BecomeReal() {
+    allInts = false;
+    firstReal = ints.size();
+    reals.reserve(std::max(ints.capacity(), firstReal + 1));
+    reals.assign(ints.begin(), ints.end());
+    ints = {};
 }
 
 mdf_Value mdf_Numbers::At(std::size_t index) const {
     if (allInts) return mdf_Value(ints[index]);
     const double value = reals[index];
-    if (index < firstReal || (marks && IsMarked(marks->isInt, index)))
+    if (index < firstReal || (marks && marks->isInt.IsMarked(index)))
         return mdf_Value(static_cast<int>(value));
-    if (marks && IsMarked(marks->isLarge, index)) return mdf_Value(mdf_Value::Data(mdf_Value::Large{value}));
+    if (marks && marks->isLarge.IsMarked(index)) return mdf_Value(mdf_Value::Data(mdf_Value::Large{value}));
     return mdf_Value(value);
 }
 
@@ -87,8 +75,8 @@ void mdf_Numbers::Truncate(std::size_t size) {
     if (size > firstReal) {
         reals.resize(size);
         if (!marks) return;
-        marks->isInt.resize(std::min(size, marks->isInt.size()));
-        marks->isLarge.resize(std::min(size, marks->isLarge.size()));
+        marks->isInt.Truncate(size);
+        marks->isLarge.Truncate(size);
         return;
     }
     ints.clear();
@@ -99,9 +87,8 @@ void mdf_Numbers::Truncate(std::size_t size) {
     marks.reset();
 }
 
-void mdf_Rows::CloseRow() {
+void mdf_Rows::CloseOtherRow(std::size_t end) {
     const std::size_t begin = count == 0 ? 0 : End(count - 1);
-    const std::size_t end = numbers.Size();
     if (count == 0) {
         length = end;
     } else if (!ends.empty()) {
@@ -115,7 +102,7 @@ void mdf_Rows::CloseRow() {
 }
 
 void mdf_Facets::AddName(std::string_view name) {
-    Mark(isNamed, Count());
+    isNamed.Mark(Count());
     auto found = indices.find(name);
     if (found == indices.end()) {
         found = indices.emplace(name, static_cast<int>(names.size())).first;

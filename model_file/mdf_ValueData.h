@@ -13,12 +13,37 @@
 
 /// What the values of compound kinds hold; for the parser, which fills them.
 
+/// Places that are marked; grows as far as it is.
+class mdf_Bits {
+public:
+    void Mark(std::size_t place) {
+        if (place / 64 >= words_.size()) words_.resize(place / 64 + 1);
+        words_[place / 64] |= std::uint64_t{1} << place % 64;
+    }
+    bool IsMarked(std::size_t place) const {
+        return place / 64 < words_.size() && (words_[place / 64] >> place % 64 & 1) != 0;
+    }
+    /// Marks what the other marks, `offset` places further.
+    void MarkAll(const mdf_Bits& other, std::size_t offset);
+    /// Forgets the marks from `size` on.
+    void Truncate(std::size_t size) {
+        if (size / 64 >= words_.size()) return;
+        words_.resize(size / 64 + 1);
+        words_.back() &= (std::uint64_t{1} << size % 64) - 1;
+    }
+
+    bool IsEmpty() const { return words_.empty(); }
+
+private:
+    std::vector<std::uint64_t> words_;
+};
+
 /// Numbers that are held as ints until the first one arrives that isn't.
 struct mdf_Numbers {
     /// How numbers beside the first Real were written; bits beyond the end are false.
     struct Marks {
-        std::vector<bool> isInt;
-        std::vector<bool> isLarge;
+        mdf_Bits isInt;
+        mdf_Bits isLarge;
     };
 
     bool allInts = true;
@@ -32,15 +57,41 @@ struct mdf_Numbers {
     mdf_Numbers(mdf_Numbers&& other) = default;
 
     std::size_t Size() const { return allInts ? ints.size() : reals.size(); }
-    bool Full() const { return allInts ? ints.size() == ints.capacity() : reals.size() == reals.capacity(); }
+    bool HasRoomFor(std::size_t more) const {
+        return allInts ? ints.capacity() - ints.size() >= more : reals.capacity() - reals.size() >= more;
+    }
+    bool Full() const { return !HasRoomFor(1); }
     void Reserve(std::size_t size);
-    void AddInt(int value);
-    void AddReal(double value, bool isLarge);
+    void AddInt(int value) {
+        if (allInts) {
+            ints.push_back(value);
+        } else {
+            AddMarked(value, &Marks::isInt);
+        }
+    }
+    void AddReal(double value, bool isLarge) {
+        if (allInts) BecomeReal();
+        if (isLarge) {
+            AddMarked(value, &Marks::isLarge);
+        } else {
+            reals.push_back(value);
+        }
+    }
     mdf_Value At(std::size_t index) const;
     /// An IntArray or RealArray of the numbers from `begin` to before `end`.
     mdf_Value Slice(std::size_t begin, std::size_t end) const;
+    /// Marks numbers that are there, those of `more` being the first from `offset` on.
+    void AddMarks(const Marks& more, std::size_t offset);
     /// Forgets the numbers from `size` on.
     void Truncate(std::size_t size);
+
+private:
+    void BecomeReal();
+    void AddMarked(double value, mdf_Bits Marks::*bits) {
+        if (!marks) marks = std::make_unique<Marks>();
+        ((*marks).*bits).Mark(reals.size());
+        reals.push_back(value);
+    }
 };
 
 struct mdf_Rows {
@@ -56,18 +107,28 @@ struct mdf_Rows {
     }
     std::size_t End(std::size_t row) const { return ends.empty() ? (row + 1) * length : ends[row]; }
     /// Makes a row of the numbers that came since the last one.
-    void CloseRow();
+    void CloseRow() {
+        const std::size_t end = numbers.Size();
+        if (ends.empty() && end == (count + 1) * length && count > 0) [[likely]] {
+            ++count;
+        } else {
+            CloseOtherRow(end);
+        }
+    }
+
+private:
+    void CloseOtherRow(std::size_t end);
 };
 
 struct mdf_Facets {
     /// Label, and id or position in `names`.
     std::vector<int> pairs;
-    std::vector<bool> isNamed;
+    mdf_Bits isNamed;
     std::vector<std::string> names;
     std::map<std::string, int, std::less<>> indices;
 
     std::size_t Count() const { return pairs.size() / 2; }
-    bool IsNamed(std::size_t row) const { return row < isNamed.size() && isNamed[row]; }
+    bool IsNamed(std::size_t row) const { return isNamed.IsMarked(row); }
     /// Makes `name` the second item of the row that has its label only.
     void AddName(std::string_view name);
 };

@@ -214,7 +214,7 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
         dck_CheckMeshes(odb, odb_Odb::DefaultModelName(), list);
         const auto write = [&odb](qio_ostream& device) { oif_Writer(odb).WriteInput(device); };
         const auto tell = [&](long long bytes) {
-            for (const fnd_Finding& finding : list.findings) report.Add(modelFile, finding);
+            report.AddAll(modelFile, list.findings);
             Summarise(target, bytes, SecondsSince(start), counts, leftOut, report);
         };
         return ReplaceFile(deck, write, tell, report) ? ExitCode::DONE : ExitCode::FILE_SYSTEM_REFUSED;
@@ -231,10 +231,10 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
     fnd_List list;
     dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
     dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
-    for (const fnd_Finding& finding : list.findings) report.Add(model, finding);
+    report.AddAll(model, list.findings);
     fnd_List raised;
     dck_Rehearse(*odb, report.Foretold(), raised);
-    for (const fnd_Finding& finding : raised.findings) report.Add(model, finding);
+    report.AddAll(model, raised.findings);
     report.Print(fnd_Visible(model) + ": no errors\n");
     const std::vector<dck_LeftOut> leftOut =
         dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));

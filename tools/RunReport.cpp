@@ -1,5 +1,6 @@
 #include "tools/RunReport.h"
 
+#include "model_file/mdf_Locate.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/StandardStreams.h"
 
@@ -26,6 +27,13 @@ RunReport::RunReport(bool asJson) : asJson_(asJson) {
 
 void RunReport::AddAll(const mdf_Report& report) {
     for (const fnd_Finding& finding : report.findings) Add(report.fileName, finding);
+    fileRead_ = report.fileName;
+    textRead_ = report.text;
+}
+
+void RunReport::AddAll(const std::string& file, std::vector<fnd_Finding> findings) {
+    if (file == fileRead_ && textRead_ != nullptr) textRead_->Locate(findings);
+    for (const fnd_Finding& finding : findings) Add(file, finding);
 }
 
 void RunReport::Error(const std::string& file, const std::string& text) {
@@ -93,9 +101,8 @@ void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
     if (finding.line > 0) {
         entry["line"] = finding.line;
         entry["column"] = finding.column;
-    } else {
-        entry["pointer"] = finding.place;
     }
+    if (finding.line == 0 || !finding.place.empty()) entry["pointer"] = finding.place;
     entry["text"] = finding.Text();
     entry["found"] = finding.found;
     if (!finding.expected.empty()) entry["expected"] = finding.expected;

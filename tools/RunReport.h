@@ -27,6 +27,8 @@ public:
     bool AsJson() const { return asJson_; }
     void AddAll(const mdf_Report& report);
     void Add(const std::string& file, const fnd_Finding& finding);
+    /// What was found in a file; with lines if it is the one whose report was added last.
+    void AddAll(const std::string& file, std::vector<fnd_Finding> findings);
     /// Those of the findings so far that foretell what writing raises.
     const std::vector<fnd_Finding>& Foretold() const { return foretold_; }
     void Error(const std::string& file, const std::string& text);
@@ -54,6 +56,8 @@ private:
     std::string JsonText(ExitCode code);
 
     bool asJson_;
+    std::string fileRead_;
+    std::shared_ptr<const mdf_FileText> textRead_;
     std::vector<fnd_Finding> foretold_;
     bool isWritten_ = false;
     bool isOutputLost_ = false;

@@ -36,7 +36,7 @@ struct fnd_Finding {
     /// What would be right, where that can be said shortly.
     std::string expected = {};
     std::string hint = {};
-    /// From 1; 0: unknown. Errors of syntax have them.
+    /// In the file that was read, from 1; 0: unknown.
     long line = 0;
     long column = 0;
 

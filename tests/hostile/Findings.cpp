@@ -18,8 +18,12 @@ std::vector<std::string> Findings(std::string_view text) {
         std::string finding = line.substr(head.size());
         constexpr std::string_view prefix = "/models/Default Model";
         if (finding.starts_with(prefix)) finding.replace(0, prefix.size(), "@");
-        if (!place.empty()) finding.insert(0, place + " ");
-        if (each.place.empty() && place.empty()) finding.insert(0, ": ");
+        if (each.code->name == "syntax") {
+            finding.insert(0, place + " ");
+        } else if (each.place.empty()) {
+            finding.insert(0, ": ");
+        }
+        EXPECT_TRUE(each.line > 0 || report.unreadable) << finding;
         findings.push_back((each.IsError() ? "" : kind + " ") + finding);
     }
     return findings;

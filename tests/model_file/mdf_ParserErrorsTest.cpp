@@ -151,11 +151,12 @@ TEST(ModelFileErrors, Members_OfOneName_AreReportedByPointerAndTheFirstStays) {
         mdf_Parse(R"({"a/b": [1, {"x~y": 1, "z": 2, "x~y": 3}], "a/b": 4, "c": 5, "a/b": 6})", root, errors));
     ASSERT_EQ(errors.size(), 3u);
     EXPECT_EQ(errors[0].place, "/a~1b/1/x~0y");
-    EXPECT_EQ(errors[0].line, 0);
+    EXPECT_EQ(errors[0].line, 1);
+    EXPECT_EQ(errors[0].column, 32);
     EXPECT_EQ(errors[0].Text(), "the member 'x~y' stands more than once, expected names that differ");
     EXPECT_EQ(errors[1].place, "/a~1b");
     EXPECT_EQ(Line("m.json", errors[2]),
-              "m.json: /a~1b: the member 'a/b' stands more than once, expected names that differ");
+              "m.json:1:62: /a~1b: the member 'a/b' stands more than once, expected names that differ");
     ASSERT_EQ(root.Size(), 2u);
     EXPECT_EQ(root.Find("a/b")->Items()[1].Find("x~y")->Int(), 1);
     EXPECT_EQ(root.Find("c")->Int(), 5);

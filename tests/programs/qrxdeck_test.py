@@ -72,6 +72,11 @@ def changed(change):
     return model
 
 
+def without_positions(text):
+    """Messages without the lines and columns behind their file names."""
+    return re.sub(r"^([^:\n]+):\d+:\d+: ", r"\1: ", text, flags=re.MULTILINE)
+
+
 def large_model(nodes):
     def enlarge(model):
         mesh = model["parts"]["ROD"]["mesh"]
@@ -228,7 +233,7 @@ class Refusals(ProgramTest):
             with self.subTest(command=command):
                 run = self.run_program(command, "model.json")
                 self.assert_refused(run, 1)
-                self.assertRegex(run.errors, r"^model\.json: error: "
+                self.assertRegex(without_positions(run.errors), r"^model\.json: error: "
                                  r"/models/Default Model/assembly/instances/ROD-1/part: .*RUD")
 
     def test_WrongModel_HasPointerInJson(self):
@@ -242,6 +247,33 @@ class Refusals(ProgramTest):
         self.assertEqual((message["severity"], message["file"], message["pointer"]),
                          ("error", "model.json", "/models/Default Model/parts"))
         self.assertTrue(message["text"])
+
+    def test_ErrorsAndWarnings_TellLineAndColumnOfTheMemberOrItem(self):
+        self.put("model.json", '''{ "format": "qrx-model/1",
+  "models": { "Default Model": {
+    // A comment: "loads"
+    "materials": { "Steel": { "elastic": { "table": [[210000, 0.3]] },
+                              "densitty": 7 } },
+
+    "steps": [ { "name": "Initial", "class": "kprC_InitialStep" },
+      { "name": "Pull", "class": "kprC_StaticStep",
+        "timePeriod": "long" } ] } } }''')
+        run = self.run_program("check", "model.json")
+        self.assertEqual((run.returncode, [line.split(" found ")[0] for line in run.errors.splitlines()]), (1, [
+            "model.json:5:31: error: /models/Default Model/materials/Steel/densitty:",
+            "model.json:9:9: error: /models/Default Model/steps/1/timePeriod:"]))
+        message = json.loads(self.run_program("check", "model.json", "--json").output)["messages"][1]
+        self.assertEqual((message["line"], message["column"], message["pointer"]),
+                         (9, 9, "/models/Default Model/steps/1/timePeriod"))
+
+    def test_FindingsOfTheDeck_TellTheirLinesToo(self):
+        self.put("model.json", changed(lambda model: model.update(
+            materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
+        with open(self.folder / "model.json", encoding="utf-8") as file:
+            text = file.read()
+        run = self.run_program("check", "model.json")
+        line, column = map(int, run.errors.split(":")[1:3])
+        self.assertTrue(text.splitlines()[line - 1][column - 1:].startswith('"membraneElastic"'))
 
     def test_SyntaxError_IsCodeOneWithLineAndColumn(self):
         self.put("model.json", '{\n  "format": oops\n}\n')
@@ -365,7 +397,7 @@ class CannotBeExpressed(ProgramTest):
         run = self.run_program("write", "model.json")
         self.assertEqual((run.returncode, run.output), (4, ""))
         lines = run.errors.splitlines()
-        self.assertRegex(lines[0], r"^model\.json: warning: .*/steps/2/class: found a complex frequency step")
+        self.assertRegex(lines[0], r"^model\.json:\d+:\d+: warning: .*/steps/2/class: found a complex frequency step")
         self.assertEqual(lines[1:], ["Unimplemented function to write out *Step card", "step 'Whirl'"])
         self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
         self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
@@ -606,7 +638,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(empty_set))
         run = self.run_program("check", "model.json")
         self.assertEqual(run.returncode, 0)
-        self.assertRegex(run.errors, r"^model\.json: warning: /models/Default Model/parts/ROD/mesh/sets/1")
+        self.assertRegex(run.errors, r"^model\.json:\d+:\d+: warning: /models/Default Model/parts/ROD/mesh/sets/1")
         result = json.loads(self.run_program("check", "model.json", "--json").output)
         self.assertEqual((result["exitCode"], [m["severity"] for m in result["messages"]]), (0, ["warning"]))
 
@@ -614,7 +646,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(lambda model: model.update(
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
         run = self.run_program("check", "model.json")
-        self.assertEqual((run.returncode, run.errors),
+        self.assertEqual((run.returncode, without_positions(run.errors)),
                          (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
                              "gasket section names this material, so this will not stand in the deck\n"
                              "model.json: note: /models/Default Model/materials: nothing uses 1 of the "
@@ -742,7 +774,8 @@ class OtherCommands(ProgramTest):
                       "boundaryConditions/Tip/states/Casez", "boundaryConditions/Tip/states/Initial/typeName",
                       "boundaryConditions/Wire/connectors/0", "boundaryConditions/Wire/datum",
                       "boundaryConditions/Wire/states/Initial/amplitude", "boundaryConditions/Wire/states/Cases/u1"]:
-            self.assertIn("model.json: error: /models/Default Model/" + place + ": found ", run.errors)
+            self.assertIn("model.json: error: /models/Default Model/" + place + ": found ",
+                          without_positions(run.errors))
         self.assertEqual(len(run.errors.splitlines()), 9, run.errors)
 
     def test_Check_OfASubmodelWithANegativeTolerance_Warns(self):
@@ -754,7 +787,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(conditions))
         run = self.run_program("check", "model.json")
         cut = "model.json: warning: /models/Default Model/boundaryConditions/Cut/"
-        self.assertEqual((run.returncode, run.errors.splitlines()), (0, [
+        self.assertEqual((run.returncode, without_positions(run.errors).splitlines()), (0, [
             cut + "shellThickness: found -1.5, expected 0 or more",
             cut + "absoluteExteriorTolerance: found -0.5, expected 0 or more",
             cut + "exteriorTolerance: found -2.5, expected 0 or more"]))
@@ -768,7 +801,7 @@ class OtherCommands(ProgramTest):
         run = self.run_program("check", "model.json")
         steps = "model.json: warning: /models/Default Model/steps/"
         self.assertEqual((run.returncode, run.output), (0, "model.json: no errors\n"))
-        self.assertEqual(run.errors.splitlines(), [
+        self.assertEqual(without_positions(run.errors).splitlines(), [
             steps + "1/loadCases: found load cases, expected none: this procedure allows none",
             steps + "2/suppressed: found true, which changes nothing: a suppressed step is written like any "
                     "other",
@@ -860,7 +893,7 @@ class Format(ProgramTest):
     def test_WrongModel_IsCodeOneAndNothingIsWritten(self):
         self.put("model.json", '{"format": "qrx-model/1"}')
         self.assert_refused(self.run_program("format", "model.json", "-o", "out.json"), 1,
-                            "model.json: error: /models: found nothing, expected an object of models\n")
+                            "model.json:1:1: error: /models: found nothing, expected an object of models\n")
         self.assertEqual(self.entries(), [b"model.json"])
 
     def test_FileThatCannotBeReadOrWritten_IsCodeThree(self):

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <map>
 
 namespace {
 
@@ -530,26 +531,100 @@ TEST(ElementControls, Equality_OverlooksTheLibrary) {
     EXPECT_TRUE(a != b);
 }
 
-TEST(ElementProperties, Groups_GiveTheIndicesOfTheirFirstElement) {
-    bme_MapPropertyArray groups;
+using Runs = std::vector<std::pair<int, int>>;
+
+Runs RunsOf(const bme_MapPropertyArray& groups, int key) {
+    Runs runs;
+    groups.ForEachRun(key, [&](int first, int count) { runs.emplace_back(first, count); });
+    return runs;
+}
+
+TEST(ElementProperties, Equality_ComparesTheIndicesNotTheLabel) {
     bme_Property property;
     property.elementLabel = 8;
-    property.SectionIndex = 1;
-    property.ElemCtrlIndex = 2;
-    property.BeamOriIndex = 3;
     property.MatOriIndex = 4;
     bme_Property second = property;
     second.elementLabel = 5;
     EXPECT_TRUE(property == second);
     second.MatOriIndex = -1;
     EXPECT_FALSE(property == second);
-    groups.Insert(6, cow_List<bme_Property>(property, second));
-    EXPECT_EQ(Items(groups.ElementIds(6)), (Ints{8, 5}));
-    EXPECT_EQ(groups.SectionIndex(6), 1);
-    EXPECT_EQ(groups.ElemCtrlIndex(6), 2);
-    EXPECT_EQ(groups.BeamOriIndex(6), 3);
-    EXPECT_EQ(groups.MatOriIndex(6), 4);
-    EXPECT_EQ(Raised([&] { groups.ElementIds(7); }), "cow_Map: no entry named '7'");
+}
+
+TEST(ElementProperties, Groups_AreNumberedByTheirFirstElementsAndKnowTheirIndices) {
+    bme_PropertyArray properties(10);
+    properties.Set(2, 5, &bme_Property::SectionIndex, 1);
+    properties.Set(2, 2, &bme_Property::ElemCtrlIndex, 2);
+    properties.Set(4, 1, &bme_Property::BeamOriIndex, 3);
+    properties.Set(8, 1, &bme_Property::MatOriIndex, 4);
+    properties.Set(6, 1, &bme_Property::SectionIndex, -1);
+    bme_MapPropertyArray groups(properties);
+    ASSERT_EQ(groups.Count(), 5);
+    EXPECT_EQ(groups.SectionIndex(0), -1);
+    EXPECT_EQ(groups.NumElements(0), 5);
+    EXPECT_EQ(groups.SectionIndex(1), 1);
+    EXPECT_EQ(groups.ElemCtrlIndex(1), 2);
+    EXPECT_EQ(groups.BeamOriIndex(1), -1);
+    EXPECT_EQ(groups.BeamOriIndex(2), 3);
+    EXPECT_EQ(groups.SectionIndex(3), 1);
+    EXPECT_EQ(groups.NumElements(3), 1);
+    EXPECT_EQ(groups.MatOriIndex(4), 4);
+    groups.KeepElements(properties, {true, true, true, true, false});
+    EXPECT_EQ(RunsOf(groups, 0), (Runs{{0, 2}, {6, 2}, {9, 1}}));
+    EXPECT_EQ(RunsOf(groups, 1), (Runs{{2, 2}}));
+    EXPECT_EQ(RunsOf(groups, 2), (Runs{{4, 1}}));
+    EXPECT_EQ(RunsOf(groups, 3), (Runs{{5, 1}}));
+    EXPECT_EQ(RunsOf(groups, 4), Runs());
+    EXPECT_EQ(Raised([&] { static_cast<void>(groups.NumElements(7)); }),
+              "cow_List: index 7 is out of range, expected 0 to 4");
+}
+
+TEST(ElementProperties, Groups_WithoutAnythingSet_AreOneOfAllElements) {
+    const bme_PropertyArray properties(3);
+    const bme_MapPropertyArray groups(properties);
+    ASSERT_EQ(groups.Count(), 1);
+    EXPECT_EQ(groups.NumElements(0), 3);
+    EXPECT_EQ(groups.SectionIndex(0), -1);
+    EXPECT_EQ(bme_MapPropertyArray(bme_PropertyArray(0)).Count(), 0);
+}
+
+// Beyond one stretch of elements, and beyond as many combinations as one byte and two bytes tell apart.
+TEST(ElementProperties, Groups_OfManyElements_AreThoseOfOneEntryForEachElement) {
+    constexpr int count = 70000;
+    constexpr int before = 5000;
+    bme_PropertyArray properties(before + count);
+    std::vector<std::pair<int, int>> expected(before + count, {-1, -1});
+    const auto set = [&](int first, int number, int bme_Property::*index, int value) {
+        properties.Set(first, number, index, value);
+        for (int i = first; i < first + number; ++i) {
+            auto& [section, orientation] = expected[static_cast<std::size_t>(i)];
+            (index == &bme_Property::SectionIndex ? section : orientation) = value;
+        }
+    };
+    set(100, before + 1000, &bme_Property::SectionIndex, 7);
+    set(0, before + count, &bme_Property::MatOriIndex, 3);
+    for (int i = 0; i < 300; ++i) set(before + 3 * i, 1, &bme_Property::SectionIndex, i);
+    for (int i = 0; i < count; ++i) set(before + i, 1, &bme_Property::MatOriIndex, i);
+    set(4096, 3 * 4096, &bme_Property::SectionIndex, 1);
+    set(4096, 3 * 4096, &bme_Property::MatOriIndex, 0);
+
+    std::map<std::pair<int, int>, int> keys;
+    std::vector<Runs> runs;
+    for (int i = 0; i < before + count; ++i) {
+        const auto [place, isNew] =
+            keys.emplace(expected[static_cast<std::size_t>(i)], static_cast<int>(keys.size()));
+        if (isNew) runs.emplace_back();
+        Runs& own = runs[static_cast<std::size_t>(place->second)];
+        if (own.empty() || own.back().first + own.back().second != i) own.emplace_back(i, 0);
+        ++own.back().second;
+    }
+    bme_MapPropertyArray groups(properties);
+    ASSERT_EQ(groups.Count(), static_cast<int>(runs.size()));
+    groups.KeepElements(properties, std::vector<bool>(runs.size(), true));
+    for (const auto& [indices, key] : keys) {
+        ASSERT_EQ(groups.SectionIndex(key), indices.first);
+        ASSERT_EQ(groups.MatOriIndex(key), indices.second);
+        ASSERT_EQ(RunsOf(groups, key), runs[static_cast<std::size_t>(key)]) << key;
+    }
 }
 
 } // namespace

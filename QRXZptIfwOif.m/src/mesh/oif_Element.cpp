@@ -14,6 +14,34 @@ namespace {
 constexpr int kPlacesOfLine = 16;
 constexpr int kWidestNodeField = 7;
 
+/// What the lines of an element take at most: numbers of eleven characters and their commas, ends of lines,
+/// indents, and the room that the last number wants.
+std::size_t RoomOfRow(int numNodes) {
+    constexpr std::size_t line = 12 * kPlacesOfLine + 14;
+    return static_cast<std::size_t>(numNodes / kPlacesOfLine + 1) * line + num_IntRoom(kWidestNodeField);
+}
+
+/// The nodes of an element, to the end of its last line.
+template <class LabelOf>
+char* WriteNodes(char* out, const int* nodes, int numNodes, const LabelOf& labelOf, int nodeWidth,
+                 int indent) {
+    for (int j = 0; j < numNodes; ++j) {
+        const int place = j + 2;
+        const bool last = j == numNodes - 1;
+        // The last number of an element is never indented, also where it begins a line.
+        if (!last && place % kPlacesOfLine == 1) {
+            std::memset(out, ' ', static_cast<std::size_t>(indent));
+            out += indent;
+        }
+        out = num_WriteInt(out, labelOf(nodes[j]), nodeWidth);
+        if (last) break;
+        *out++ = ',';
+        if (place % kPlacesOfLine == 0) *out++ = '\n';
+    }
+    if (numNodes > 0) *out++ = '\n';
+    return out;
+}
+
 int NumDigits(int value) {
     int digits = value < 0 ? 2 : 1;
     while ((value /= 10) != 0) ++digits;
@@ -100,44 +128,23 @@ void oif_Element::WriteConnectivity(utl_Stream& stream) const {
 
 template <class LabelOf>
 void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode) const {
-    // Sixteen numbers of eleven characters, their commas and the indent.
-    constexpr std::size_t lineRoom = 256;
-    static_assert(lineRoom + num_IntRoom(kWidestNodeField) <= utl_Stream::kSlack);
-
     const std::vector<int>& labels = elements_->userElementLabelsAsFlatArray();
     const int numNodes = elements_->numNodesPerElement();
     const int nodeWidth = std::min(NumDigits(largestNode) + 1, kWidestNodeField);
     int largestElement = 0;
     for (const int label : labels) largestElement = std::max(largestElement, label);
     const int elementWidth = NumDigits(largestElement);
-    const auto indent = static_cast<std::size_t>(elementWidth) + 1;
 
-    const int* node = elements_->elementConnectivity().data();
-    for (const int label : labels) {
-        char* out = num_WriteInt(stream.Reserve(utl_Stream::kSlack), label, elementWidth);
-        *out++ = ',';
-        for (int j = 0; j < numNodes; ++j, ++node) {
-            const int place = j + 2;
-            const bool last = j == numNodes - 1;
-            // The last number of an element is never indented, also where it begins a line.
-            if (!last && place % kPlacesOfLine == 1) {
-                std::memset(out, ' ', indent);
-                out += indent;
-            }
-            out = num_WriteInt(out, labelOf(*node), nodeWidth);
-            if (last) {
-                *out++ = '\n';
-            } else if (place % kPlacesOfLine == 0) {
-                *out++ = ',';
-                *out++ = '\n';
-                stream.Commit(out);
-                out = stream.Reserve(utl_Stream::kSlack);
-            } else {
-                *out++ = ',';
-            }
+    const int* const connectivity = elements_->elementConnectivity().data();
+    stream.PrintItems(labels.size(), RoomOfRow(numNodes), [&](std::size_t begin, std::size_t end, char* out) {
+        const int* node = connectivity + begin * static_cast<std::size_t>(numNodes);
+        for (std::size_t i = begin; i < end; ++i, node += numNodes) {
+            out = num_WriteInt(out, labels[i], elementWidth);
+            *out++ = ',';
+            out = WriteNodes(out, node, numNodes, labelOf, nodeWidth, elementWidth + 1);
         }
-        stream.Commit(out);
-    }
+        return out;
+    });
 }
 
 void oif_ElementFromMesh::AddKeyword(Types& types, const cow_String& type, const qkw_Keyword& keyword) {

@@ -1,6 +1,17 @@
 #include "mesh/oif_Node.h"
 
+#include <algorithm>
 #include <cmath>
+
+namespace {
+
+constexpr int kLabelWidth = 7;
+constexpr int kCoordinateWidth = 12;
+constexpr int kCoordinatePrecision = 7;
+// A label of eleven characters and three coordinates of thirteen, and the room that the last one wants.
+constexpr std::size_t kLineRoom = 64 + num_RealRoom(kCoordinateWidth, kCoordinatePrecision);
+
+} // namespace
 
 oif_Node::oif_Node(const ddb_PartInstance& instance, const qkw_ModelInfo&)
     : sourceKind_(1), nodeData_(instance.mesh().nodeData()) {}
@@ -16,31 +27,38 @@ double oif_Node::FindSmallestReal(double x) {
 void oif_Node::Write(utl_Stream& stream) const {
     if (!nodeData_ || nodeData_->NumNodes() == 0) return;
     stream << "*Node" << endl;
-    const utl_StreamSmallReal guard(stream, smallReal_);
     const uti_CoordCont3D coordinates = nodeData_->CoordContainer();
     cow_List<int> labels;
     nodeData_->GetUserNodeLabels(labels);
-    for (int i = 0; i < labels.Length();) {
-        int length = 0;
-        const int* run = labels.ConstRun(i, length);
-        for (int k = 0; k < length; ++k) {
-            const uti_Coord3D at = coordinates.ConstGet(i + k);
-            WriteDataLine(stream, run[k], at.x, at.y, at.z);
-        }
-        i += length;
-    }
+    stream.PrintItems(static_cast<std::size_t>(labels.Length()), kLineRoom,
+                      [&](std::size_t begin, std::size_t end, char* out) {
+                          int i = static_cast<int>(begin);
+                          while (i < static_cast<int>(end)) {
+                              int length = 0;
+                              const int* run = labels.ConstRun(i, length);
+                              length = std::min(length, static_cast<int>(end) - i);
+                              for (int k = 0; k < length; ++k) {
+                                  const uti_Coord3D at = coordinates.ConstGet(i + k);
+                                  out = WriteDataLine(out, run[k], at.x, at.y, at.z);
+                              }
+                              i += length;
+                          }
+                          return out;
+                      });
     stream.Flush();
 }
 
-void oif_Node::WriteDataLine(utl_Stream& stream, int label, float x, float y, float z) const {
-    stream.Print(label, 7);
-    stream << ", ";
-    stream.Print(x, 12, 7);
-    stream << ", ";
-    stream.Print(y, 12, 7);
-    if (threeDimensional_) {
-        stream << ", ";
-        stream.Print(z, 12, 7);
-    }
-    stream << "\n";
+char* oif_Node::WriteDataLine(char* out, int label, float x, float y, float z) const {
+    const auto coordinate = [&out, this](float value) {
+        *out++ = ',';
+        *out++ = ' ';
+        out = num_WriteReal(out, std::fabs(value) < smallReal_ ? 0.0 : static_cast<double>(value),
+                            kCoordinateWidth, kCoordinatePrecision);
+    };
+    out = num_WriteInt(out, label, kLabelWidth);
+    coordinate(x);
+    coordinate(y);
+    if (threeDimensional_) coordinate(z);
+    *out++ = '\n';
+    return out;
 }

@@ -23,7 +23,7 @@ public:
     static double FindSmallestReal(double x);
 
 private:
-    void WriteDataLine(utl_Stream& stream, int label, float x, float y, float z) const;
+    char* WriteDataLine(char* out, int label, float x, float y, float z) const;
 
     [[maybe_unused]] int sourceKind_ = 0; // 1: a part instance; nothing reads it
     bool threeDimensional_ = true;

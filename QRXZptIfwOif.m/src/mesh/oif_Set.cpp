@@ -7,48 +7,101 @@
 
 namespace {
 
-constexpr int kLabelsOfLine = 16;
+constexpr std::size_t kLabelsOfLine = 16;
 
 // Facet ids of a shell; the double side has no name.
 constexpr int kShellTop = 0;
 constexpr int kShellBottom = 1;
 constexpr int kShellBothSides = 6;
 
-bool IsAscending(const cow_List<int>& labels) {
-    int former = -1;
-    for (int i = 0; i < labels.Length();) {
-        int length = 0;
-        const int* run = labels.ConstRun(i, length);
-        for (int k = 0; k < length; ++k) {
-            if (run[k] <= former) return false;
-            former = run[k];
-        }
-        i += length;
-    }
-    return true;
-}
-
 // Label by label; -1 drops nothing, entries are checked when sets enter the store.
-cow_List<int> LabelsOf(const rgnC_SubsetData& subset, const std::vector<int>& labels) {
-    cow_List<int> found{cow_ListConstruct(subset.subset.Length())};
-    for (int i = 0; i < subset.subset.Length(); ++i) {
-        const int entry = subset.subset.UncheckedConstGet(i);
-        if (entry < 0 || entry >= static_cast<int>(labels.size())) {
-            cow_RaiseOutOfRange(entry, static_cast<int>(labels.size()));
-        }
-        found.Append(labels[static_cast<std::size_t>(entry)]);
+int LabelOf(int entry, const std::vector<int>& labels) {
+    if (entry < 0 || entry >= static_cast<int>(labels.size())) {
+        cow_RaiseOutOfRange(entry, static_cast<int>(labels.size()));
     }
-    return found;
+    return labels[static_cast<std::size_t>(entry)];
 }
 
-cow_List<int> NodeLabelsOf(const rgnC_SubsetData& subset, const cow_List<int>& labels) {
-    cow_List<int> found{cow_ListConstruct(subset.subset.Length())};
-    for (int i = 0; i < subset.subset.Length(); ++i) {
-        const int entry = subset.subset.UncheckedConstGet(i);
-        // A node that the mesh doesn't have is dropped silently.
-        if (entry >= 0 && entry < labels.Length()) found.Append(labels.UncheckedConstGet(entry));
+/// The nodes or elements of a set that lie in one mesh.
+class MeshLabels final : public oif_LabelSource {
+public:
+    MeshLabels(const rgnC_SetData& setData, const ddb_Mesh& mesh) : setData_(setData), mesh_(mesh) {}
+
+    void ForEachPiece(const Take& take) const override {
+        oif_LabelPieces pieces(take);
+        const bool nodes = setData_.Kind() == static_cast<int>(res_SetTypeEnm::NODES);
+        for (const int i : setData_.SubSetsIn(mesh_.meshIndex())) {
+            const rgnC_SubsetData subset = setData_.SubSet(i);
+            if (nodes) {
+                AddNodes(subset, pieces);
+            } else if (subset.ClassIndex() >= 0) {
+                AddElements(subset, pieces);
+            }
+        }
+        pieces.HandOn();
     }
-    return found;
+
+private:
+    void AddNodes(const rgnC_SubsetData& subset, oif_LabelPieces& pieces) const {
+        cow_List<int> labels;
+        mesh_.nodeData().GetUserNodeLabels(labels);
+        ForEachEntry(subset, [&](int entry) {
+            // A node that the mesh doesn't have is dropped silently.
+            if (entry >= 0 && entry < labels.Length()) pieces.Add(labels.UncheckedConstGet(entry));
+        });
+    }
+    void AddElements(const rgnC_SubsetData& subset, oif_LabelPieces& pieces) const {
+        const std::vector<int>& labels =
+            mesh_.mesh().Classes().at(static_cast<std::size_t>(subset.ClassIndex())).labels;
+        ForEachEntry(subset, [&](int entry) { pieces.Add(LabelOf(entry, labels)); });
+    }
+    template <class Visitor>
+    static void ForEachEntry(const rgnC_SubsetData& subset, const Visitor& visit) {
+        for (int i = 0; i < subset.subset.Length();) {
+            int length = 0;
+            const int* run = subset.subset.ConstRun(i, length);
+            for (int k = 0; k < length; ++k) visit(run[k]);
+            i += length;
+        }
+    }
+
+    rgnC_SetData setData_;
+    ddb_Mesh mesh_;
+};
+
+/// Labels in ascending order, each once.
+class SortedLabels final : public oif_LabelSource {
+public:
+    void Add(int label) { bits_.SetBit(label); }
+    void ForEachPiece(const Take& take) const override {
+        oif_LabelPieces pieces(take);
+        omi_BlkBitVectTrav traversal(bits_);
+        for (int label = traversal.First(); label >= 0; label = traversal.Next()) pieces.Add(label);
+        pieces.HandOn();
+    }
+
+private:
+    omi_BlkBitVect bits_;
+};
+
+/// Sixteen labels a line.
+char* WriteLines(std::span<const int> labels, char* out) {
+    std::size_t place = 0;
+    for (const int label : labels) {
+        out = num_WriteInt(out, label, 0);
+        const bool last = ++place == labels.size();
+        if (place % kLabelsOfLine == 0 || last) {
+            // A lone label on its line has a comma and a blank behind it.
+            if (place % kLabelsOfLine == 1) {
+                *out++ = ',';
+                *out++ = ' ';
+            }
+            *out++ = '\n';
+        } else {
+            *out++ = ',';
+        }
+    }
+    return out;
 }
 
 } // namespace
@@ -65,36 +118,38 @@ void oif_Set::ComputeData(const rgnC_SetData& setData, const ddb_Mesh& mesh) {
     // A set of a shared mesh has the same labels in every instance: they are worked out once.
     const auto& kept = setData.Object().resolved;
     if (const odiK_Set::Resolved* resolved = setData.LiesInOneMesh() ? kept.Get() : nullptr) {
-        labels_ = resolved->labels;
+        labels_ = oif_SetLabels(resolved->labels);
         faces_ = resolved->faces;
         return;
     }
-    const auto kind = static_cast<res_SetTypeEnm>(setData.Kind());
-    for (const int i : setData.SubSetsIn(mesh.meshIndex())) {
-        const rgnC_SubsetData subset = setData.SubSet(i);
-        if (kind == res_SetTypeEnm::NODES) {
-            cow_List<int> labels;
-            mesh.nodeData().GetUserNodeLabels(labels);
-            labels_.Concatenate(NodeLabelsOf(subset, labels));
-            continue;
+    cow_List<int> list;
+    if (setData.Kind() == static_cast<int>(res_SetTypeEnm::FACETS)) {
+        for (const int i : setData.SubSetsIn(mesh.meshIndex())) {
+            const rgnC_SubsetData subset = setData.SubSet(i);
+            if (subset.ClassIndex() < 0) continue;
+            AppendFacets(list, subset,
+                         mesh.mesh().Classes().at(static_cast<std::size_t>(subset.ClassIndex())));
         }
-        if (subset.ClassIndex() < 0) continue;
-        const odiK_ElementClass& elements =
-            mesh.mesh().Classes().at(static_cast<std::size_t>(subset.ClassIndex()));
-        if (kind == res_SetTypeEnm::ELEMENTS) {
-            labels_.Concatenate(LabelsOf(subset, elements.labels));
-        } else {
-            AppendFacets(subset, elements);
+    } else {
+        const MeshLabels labels(setData, mesh);
+        std::size_t count = 0;
+        labels.ForEachPiece([&count](std::span<const int> piece) { count += piece.size(); });
+        if (count > static_cast<std::size_t>(oif_SetLabels::kLongestList)) {
+            labels_ = oif_SetLabels(std::make_shared<MeshLabels>(labels));
+            return;
         }
+        list = oif_ListOf(labels, static_cast<int>(count));
     }
+    labels_ = oif_SetLabels(list);
     if (setData.LiesInOneMesh()) {
-        kept.Keep(std::unique_ptr<odiK_Set::Resolved>(new odiK_Set::Resolved{labels_, faces_}));
+        kept.Keep(std::unique_ptr<odiK_Set::Resolved>(new odiK_Set::Resolved{list, faces_}));
     }
 }
 
-void oif_Set::AppendFacets(const rgnC_SubsetData& subset, const odiK_ElementClass& elements) {
+void oif_Set::AppendFacets(cow_List<int>& labels, const rgnC_SubsetData& subset,
+                           const odiK_ElementClass& elements) {
     if (subset.subset.IsEmpty() || subset.facetIds.IsEmpty()) return;
-    labels_.Concatenate(LabelsOf(subset, elements.labels));
+    for (const int entry : subset.subset) labels.Append(LabelOf(entry, elements.labels));
     const ddb_FaceRule rule = ddb_FaceRuleOf(elements.shape);
     // One text a face, shared by all facets that have it.
     std::vector<cow_String> names;
@@ -123,31 +178,41 @@ void oif_Set::AppendFacets(const rgnC_SubsetData& subset, const odiK_ElementClas
     faces_.Concatenate(faces);
 }
 
-bool oif_Set::CanGenerate() {
-    generate_ = true;
-    if (!IsAscending(labels_)) {
-        omi_BlkBitVect bits;
-        for (int i = 0; i < labels_.Length(); ++i) bits.SetBit(labels_.UncheckedConstGet(i));
-        cow_List<int> sorted{cow_ListConstruct(bits.Recount())};
-        omi_BlkBitVectTrav traversal(bits);
-        for (int label = traversal.First(); label >= 0; label = traversal.Next()) sorted.Append(label);
-        labels_ = sorted;
-    }
-    const int count = labels_.Length();
-    if (count < 3) {
-        generate_ = false;
-        return false;
-    }
-    start_ = labels_[0];
-    end_ = labels_.Last();
-    increment_ = labels_[1] - start_;
-    for (int i = 2; i < count; ++i) {
-        if (labels_.UncheckedConstGet(i) - labels_.UncheckedConstGet(i - 1) != increment_) {
-            generate_ = false;
-            return false;
+bool oif_Set::IsAscending() const {
+    bool ascending = true;
+    int former = -1;
+    labels_.ForEachPiece([&](std::span<const int> labels) {
+        for (const int label : labels) {
+            ascending = ascending && label > former;
+            former = label;
         }
-    }
-    return true;
+    });
+    return ascending;
+}
+
+void oif_Set::Sort() {
+    auto sorted = std::make_shared<SortedLabels>();
+    labels_.ForEachPiece([&](std::span<const int> labels) {
+        for (const int label : labels) sorted->Add(label);
+    });
+    labels_ = oif_SetLabels(std::move(sorted));
+}
+
+bool oif_Set::CanGenerate() {
+    if (!IsAscending()) Sort();
+    int count = 0;
+    bool regular = true;
+    labels_.ForEachPiece([&](std::span<const int> labels) {
+        for (const int label : labels) {
+            if (count == 0) start_ = label;
+            if (count == 1) increment_ = label - start_;
+            if (count > 1) regular = regular && label - end_ == increment_;
+            end_ = label;
+            ++count;
+        }
+    });
+    generate_ = regular && count >= 3;
+    return generate_;
 }
 
 void oif_Set::WriteData(utl_Stream& stream) const {
@@ -155,19 +220,29 @@ void oif_Set::WriteData(utl_Stream& stream) const {
         stream << start_ << ", " << end_ << ", " << increment_ << endl;
         return;
     }
-    const int length = labels_.Length();
-    for (int count = 1; count <= length; ++count) {
-        stream << labels_.UncheckedConstGet(count - 1);
-        if (count % kLabelsOfLine == 0) {
-            stream << endl;
-        } else if (count == length) {
-            // A lone label on its line has a comma and a blank behind it.
-            if (count % kLabelsOfLine == 1) stream << ", ";
-            stream << endl;
-        } else {
-            stream << ",";
+    // Eleven characters and a comma, and the room that the last number wants.
+    constexpr std::size_t room = 12 * kLabelsOfLine + 4 + num_IntRoom(0);
+    constexpr std::size_t most = kLabelsOfLine << 14;
+    std::vector<int> gathered;
+    const auto write = [&] {
+        stream.PrintItems((gathered.size() + kLabelsOfLine - 1) / kLabelsOfLine, room,
+                          [&](std::size_t begin, std::size_t end, char* out) {
+                              const std::size_t from = begin * kLabelsOfLine;
+                              const std::size_t to = std::min(end * kLabelsOfLine, gathered.size());
+                              return WriteLines({gathered.data() + from, to - from}, out);
+                          });
+        gathered.clear();
+    };
+    labels_.ForEachPiece([&](std::span<const int> labels) {
+        while (!labels.empty()) {
+            const std::size_t count = std::min(labels.size(), most - gathered.size());
+            gathered.insert(gathered.end(), labels.begin(),
+                            labels.begin() + static_cast<std::ptrdiff_t>(count));
+            labels = labels.subspan(count);
+            if (gathered.size() == most) write();
         }
-    }
+    });
+    if (!gathered.empty()) write();
 }
 
 void oif_SetKeyword::WriteMembers(utl_Stream& stream) const {
@@ -192,7 +267,7 @@ void oif_Nset::Write(utl_Stream& stream) const {
     set.WriteData(stream);
 }
 
-oif_Elset::oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal) {
+oif_Elset::oif_Elset(const oif_SetLabels& labels, cow_String name, cow_String instanceName, bool internal) {
     labels_ = labels;
     setName_ = name;
     instanceName_ = instanceName;

@@ -3,6 +3,7 @@
 
 #include "keyword_layer/qkw_Keyword.h"
 #include "keyword_layer/qkw_ModelInfo.h"
+#include "mesh/oif_LabelSource.h"
 
 /// The labels of a set in one mesh, and for facets the face names, as data lines:
 ///     1,3,17          16 labels a line, no blanks, no comma at the end
@@ -10,6 +11,7 @@
 class oif_Set {
 public:
     explicit oif_Set(const cow_List<int>& labels) : labels_(labels) {}
+    explicit oif_Set(const oif_SetLabels& labels) : labels_(labels) {}
     /// The share of the set that lies in the assembly's own mesh.
     oif_Set(const rgnC_SetData& setData, const ddb_Assembly& assembly);
     /// The share that lies in the instance's mesh.
@@ -19,15 +21,18 @@ public:
     bool CanGenerate();
     /// Writes the form that CanGenerate() found, else the list. No labels write nothing.
     void WriteData(utl_Stream& stream) const;
-    const cow_List<int>& Labels() const { return labels_; }
+    const oif_SetLabels& Labels() const { return labels_; }
     /// Parallel to the labels, for facets.
     cow_List<cow_String> FaceList() const { return faces_; }
 
 private:
     void ComputeData(const rgnC_SetData& setData, const ddb_Mesh& mesh);
-    void AppendFacets(const rgnC_SubsetData& subset, const odiK_ElementClass& elements);
+    void AppendFacets(cow_List<int>& labels, const rgnC_SubsetData& subset,
+                      const odiK_ElementClass& elements);
+    bool IsAscending() const;
+    void Sort();
 
-    cow_List<int> labels_;
+    oif_SetLabels labels_;
     cow_List<cow_String> faces_;
     bool generate_ = false;
     int start_ = 0;
@@ -49,7 +54,7 @@ protected:
 
     cow_String setName_;
     cow_String instanceName_;
-    cow_List<int> labels_;
+    oif_SetLabels labels_;
     cow_List<cow_String> members_;
     bool internal_ = false;
 };
@@ -72,7 +77,9 @@ public:
 /// An element set, as oif_Nset. One that is made from names is always internal; a node set never is then.
 class oif_Elset final : public qkw_KeywordOf<oif_Elset>, private oif_SetKeyword {
 public:
-    oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal);
+    oif_Elset(const oif_SetLabels& labels, cow_String name, cow_String instanceName, bool internal);
+    oif_Elset(const cow_List<int>& labels, cow_String name, cow_String instanceName, bool internal)
+        : oif_Elset(oif_SetLabels(labels), name, instanceName, internal) {}
     oif_Elset(const cow_String& name, const cow_List<cow_String>& members) : oif_SetKeyword(name, members) {
         internal_ = true;
     }

@@ -29,7 +29,7 @@ oif_Surface::oif_Surface(const qkw_ModelInfo&, const cow_String& name, const cow
 
 void oif_Surface::CreateLabels(const rgnC_SetData& setData, const ddb_PartInstance& instance) {
     const oif_Set set(setData, instance);
-    labels_ = set.Labels();
+    labels_ = set.Labels().List();
     faces_ = set.FaceList();
 }
 

@@ -20,7 +20,6 @@
 #include "store_interface/records/sections/kseC_ShellSections.h"
 #include "store_interface/records/sections/kseC_SolidSections.h"
 
-#include <unordered_map>
 #include <vector>
 
 namespace {
@@ -29,6 +28,34 @@ namespace {
 cow_String NameInComment(const rgnC_Region& region) {
     return region.ConstSet().Data().Internal() ? cow_String("Picked") : region.SetName();
 }
+
+/// The labels of the elements of a group.
+class GroupLabels final : public oif_LabelSource {
+public:
+    GroupLabels(const ddb_Mesh& mesh, std::shared_ptr<const bme_MapPropertyArray> groups, int key)
+        : mesh_(mesh), groups_(std::move(groups)), key_(key) {}
+
+    void ForEachPiece(const Take& take) const override {
+        oif_LabelPieces pieces(take);
+        auto elements = mesh_.mesh().Classes().begin();
+        groups_->ForEachRun(key_, [&](int first, int count) {
+            while (count > 0) {
+                while (first >= elements->firstElementIndex + elements->NumElements()) ++elements;
+                const int place = first - elements->firstElementIndex;
+                const int taken = std::min(count, elements->NumElements() - place);
+                pieces.Add({elements->labels.data() + place, static_cast<std::size_t>(taken)});
+                first += taken;
+                count -= taken;
+            }
+        });
+        pieces.HandOn();
+    }
+
+private:
+    ddb_Mesh mesh_;
+    std::shared_ptr<const bme_MapPropertyArray> groups_;
+    int key_;
+};
 
 } // namespace
 
@@ -83,28 +110,32 @@ void oif_PartAttributesBuilder::Build() {
 }
 
 void oif_PartAttributesBuilder::InitializePropertyArray(const ddb_PartInstance& instance) {
-    const ddb_ElementData elements = instance.elementData();
-    properties_ = cow_List<bme_Property>{cow_ListConstruct(elements.numElements())};
-    for (int i = 0; i < elements.numClasses(); ++i) {
-        for (const int label : elements.elementClass(i).userElementLabelsAsFlatArray()) {
-            bme_Property property;
-            property.elementLabel = label;
-            properties_.Append(property);
-        }
-    }
+    properties_ = std::make_shared<bme_PropertyArray>(instance.elementData().numElements());
 }
 
 int oif_PartAttributesBuilder::Stamp(const ddb_PartInstance& instance, const rgnC_Region& region,
                                      int bme_Property::*index, int value) {
     const oif_Set set(region.ConstSet().Data(), instance);
-    const cow_List<int>& labels = set.Labels();
-    if (properties_.IsEmpty()) return labels.Length();
     const odiK_Mesh& mesh = instance.mesh().mesh();
-    for (int i = 0; i < labels.Length(); ++i) {
-        // A label that the mesh doesn't have falls on the first element.
-        properties_.Get(std::max(mesh.FindElementIndex(labels.UncheckedConstGet(i)), 0)).*index = value;
-    }
-    return labels.Length();
+    std::size_t numLabels = 0;
+    int first = 0;
+    int count = 0;
+    set.Labels().ForEachPiece([&](std::span<const int> labels) {
+        numLabels += labels.size();
+        if (properties_->NumElements() == 0) return;
+        for (const int label : labels) {
+            // A label that the mesh doesn't have falls on the first element.
+            const int place = std::max(mesh.FindElementIndex(label), 0);
+            if (place != first + count) {
+                properties_->Set(first, count, index, value);
+                first = place;
+                count = 0;
+            }
+            ++count;
+        }
+    });
+    properties_->Set(first, count, index, value);
+    return static_cast<int>(numLabels);
 }
 
 void oif_PartAttributesBuilder::SetSectionsInArray(const ddb_PartInstance& instance) {
@@ -126,8 +157,8 @@ void oif_PartAttributesBuilder::SetElemCtrlInArray(const ddb_PartInstance& insta
         int key = 0;
         while (key < nextElemCtrlKey_ && elemCtrlMap_.ConstGet(key) != controls) ++key;
         if (key == nextElemCtrlKey_) elemCtrlMap_.Insert(nextElemCtrlKey_++, controls);
-        const int first = elementClass.FirstElementIndex();
-        for (int k = 0; k < elementClass.NumElements(); ++k) properties_.Get(first + k).ElemCtrlIndex = key;
+        properties_->Set(elementClass.FirstElementIndex(), elementClass.NumElements(),
+                         &bme_Property::ElemCtrlIndex, key);
     }
 }
 
@@ -146,26 +177,25 @@ void oif_PartAttributesBuilder::SetMatOriInArray(const ddb_PartInstance& instanc
 }
 
 void oif_PartAttributesBuilder::ProcessPropertyArray(const ddb_PartInstance& instance) {
-    if (properties_.IsEmpty()) return;
-    std::vector<cow_List<bme_Property>> groups;
-    std::unordered_map<bme_Property, std::size_t, bme_PropertyHash> groupOf;
-    std::size_t current = 0;
-    for (int i = 0; i < properties_.Length(); ++i) {
-        const bme_Property& property = properties_.UncheckedConstGet(i);
-        // Neighbours mostly belong together.
-        if (groups.empty() || !(groups[current].UncheckedConstGet(0) == property)) {
-            current = groupOf.try_emplace(property, groups.size()).first->second;
-            if (current == groups.size()) groups.emplace_back();
-        }
-        groups[current].Append(property);
+    if (properties_->NumElements() > 0) {
+        const auto groups = std::make_shared<bme_MapPropertyArray>(*properties_);
+        std::vector<bool> partial;
+        for (int key = 0; key < groups->Count(); ++key) partial.push_back(IsPartial(*groups, key));
+        groups->KeepElements(*properties_, partial);
+        properties_.reset();
+        CreateSetsAndAttributes(instance, groups);
     }
-    bme_MapPropertyArray map;
-    for (std::size_t key = 0; key < groups.size(); ++key) map.Insert(static_cast<int>(key), groups[key]);
-    CreateSetsAndAttributes(instance, map);
+    properties_.reset();
 }
 
-void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& instance,
-                                                        const bme_MapPropertyArray& groups) {
+bool oif_PartAttributesBuilder::IsPartial(const bme_MapPropertyArray& groups, int key) const {
+    const int section = groups.SectionIndex(key);
+    return section != -1 && groups.NumElements(key) != assignmentSize_.at(section);
+}
+
+void oif_PartAttributesBuilder::CreateSetsAndAttributes(
+    const ddb_PartInstance& instance, const std::shared_ptr<const bme_MapPropertyArray>& made) {
+    const bme_MapPropertyArray& groups = *made;
     writtenOrientations_ = {};
     const ptoC_PartAttributeList& assignments = instance.Shortcut().ConstGet().ConstGetSectionAssignment();
     for (int key = 0; key < groups.Count(); ++key) {
@@ -173,8 +203,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
         if (groups.SectionIndex(key) == -1) continue;
         const auto& assignment = nex_canDynamicCastRef<ptoC_SectionAssignment>(
             assignments.ConstGet(groups.SectionIndex(key)), NEX_HERE);
-        const cow_List<int> labels = groups.ElementIds(key);
-        const bool isPartial = labels.Length() != assignmentSize_[groups.SectionIndex(key)];
+        const bool isPartial = IsPartial(groups, key);
 
         Group group;
         group.sectionName = assignment.SectionName();
@@ -220,6 +249,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(const ddb_PartInstance& 
 
         AddInstanceDefinition(instance.name(), oif_Comment(text));
         if (isPartial) {
+            const oif_SetLabels labels(std::make_shared<GroupLabels>(instance.mesh(), made, key));
             AddInstanceDefinition(instance.name(), oif_Elset(labels, group.setName, cow_String(), true));
         }
         CreateSection(instance, group);

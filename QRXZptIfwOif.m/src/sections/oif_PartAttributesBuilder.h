@@ -8,6 +8,7 @@
 #include "store_interface/records/sections/kseC_Section.h"
 
 #include <map>
+#include <memory>
 #include <set>
 
 class kseC_BeamSection;
@@ -42,7 +43,10 @@ private:
     void SetBeamOriInArray(const ddb_PartInstance& instance);
     void SetMatOriInArray(const ddb_PartInstance& instance);
     void ProcessPropertyArray(const ddb_PartInstance& instance);
-    void CreateSetsAndAttributes(const ddb_PartInstance& instance, const bme_MapPropertyArray& groups);
+    /// Whether a group is a part only of what its section assignment names.
+    bool IsPartial(const bme_MapPropertyArray& groups, int key) const;
+    void CreateSetsAndAttributes(const ddb_PartInstance& instance,
+                                 const std::shared_ptr<const bme_MapPropertyArray>& groups);
     void CreateElementControls();
 
     struct SectionRow;
@@ -81,8 +85,8 @@ private:
     // Distinct controls other than the defaults, over all instances, so that equal ones share a name.
     cow_Map<int, bme_ElemCtrlParams> elemCtrlMap_;
     int nextElemCtrlKey_ = 0;
-    // Of the instance at hand: an entry for each element, in the order of the mesh.
-    cow_List<bme_Property> properties_;
+    // Of the instance at hand, its elements in the order of the mesh.
+    std::shared_ptr<bme_PropertyArray> properties_;
     std::set<cow_String> writtenOrientations_;
     /// Labels that each section assignment names, also those that later assignments take over.
     std::map<int, int> assignmentSize_;
