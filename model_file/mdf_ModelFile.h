@@ -1,7 +1,7 @@
 #ifndef QRX_MODEL_FILE_MDF_MODELFILE_H
 #define QRX_MODEL_FILE_MDF_MODELFILE_H
 
-#include "model_file/mdf_Value.h"
+#include "model_file/mdf_Parameters.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odb_Odb.h"
 
@@ -53,6 +53,7 @@ struct mdf_Report {
     /// The file, or one that it names, could not be read; a finding says why.
     bool unreadable = false;
     std::list<mdf_MeshOrigin> meshOrigins;
+    std::vector<mdf_Parameter> parameters;
 
     bool HasErrors() const;
     /// "model.json:3:14: error: text", or "model.json: error: /models/A: text".
@@ -71,9 +72,9 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
 /// stream failed.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out);
 /// The same, where meshes that came from mesher's files stay in these; `folder` is the model file's own, from
-/// which their paths count.
+/// which their paths count. And with the parameters that the file had.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out, const std::list<mdf_MeshOrigin>& origins,
-                        const std::string& folder);
+                        const std::string& folder, const std::vector<mdf_Parameter>& parameters = {});
 
 /// Writes the JSON Schema (draft 2020-12) of model files, with the documentation of every field.
 bool mdf_WriteSchema(std::ostream& out);
