@@ -1,7 +1,7 @@
 #include "study/sty_Json.h"
 #include "study/sty_Study.h"
 
-#include <filesystem>
+#include <algorithm>
 
 namespace {
 
@@ -25,7 +25,7 @@ std::string Filled(std::string text, const sty_Request& request, const std::stri
     ReplaceAll(text, "@TABLE@", quote(request.table));
     ReplaceAll(text, "@OUT@", quote(request.out));
     ReplaceAll(text, "@SHARDS@", std::to_string(request.shards));
-    ReplaceAll(text, "@JOBS@", std::to_string(request.jobs));
+    ReplaceAll(text, "@JOBS@", std::to_string(std::max(request.jobs, 1)));
     return text;
 }
 

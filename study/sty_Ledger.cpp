@@ -124,8 +124,8 @@ std::string sty_ReasonIn(std::string_view line) {
     return reason;
 }
 
-void sty_ForEachLine(const std::string& path,
-                     const std::function<void(std::string_view line, long long begin)>& take) {
+std::size_t sty_ForEachLine(const std::string& path,
+                            const std::function<void(std::string_view line, long long begin)>& take) {
     sty_File file(path);
     std::string rest;
     long long begin = 0;
@@ -144,7 +144,7 @@ void sty_ForEachLine(const std::string& path,
     }
     if (file.Error() != 0 && file.Error() != ENOENT)
         throw sty_Refused("cannot read " + fnd_Quoted(path) + ": " + sty_ReasonOf(file.Error()));
-    if (!rest.empty()) take(rest, begin);
+    return rest.size();
 }
 
 std::string sty_Ledger::NameOf(int shard, int shards) {
@@ -163,19 +163,17 @@ bool sty_Ledger::Exists() const {
 }
 
 long long sty_Ledger::TakeUp(sty_DoneRows& done) {
-    const long long size = folder_.SizeOf(name_);
     bool clean = true;
     long long count = 0;
     // The lines that stay are put together only when one doesn't.
     const auto walk = [&](std::string* kept) {
         sty_DoneRows seen = done;
-        sty_ForEachLine(Path(), [&](std::string_view line, long long begin) {
+        const std::size_t cutOff = sty_ForEachLine(Path(), [&](std::string_view line, long long) {
             const std::optional<sty_Entry> entry = sty_EntryOf(line);
             const bool good = entry && seen.IsRow(entry->row) && !entry->deck.empty() &&
                               !seen.Has(entry->row) &&
                               folder_.SizeOf(std::string(entry->deck)) == entry->bytes;
-            const bool ended = begin + static_cast<long long>(line.size()) < size;
-            clean = clean && good && ended;
+            clean = clean && good;
             if (!good) return;
             seen.Add(entry->row);
             if (kept == nullptr) {
@@ -184,6 +182,7 @@ long long sty_Ledger::TakeUp(sty_DoneRows& done) {
                 kept->append(line).append("\n");
             }
         });
+        clean = clean && cutOff == 0;
         return seen;
     };
     sty_DoneRows seen = walk(nullptr);

@@ -50,10 +50,10 @@ std::optional<sty_Entry> sty_EntryOf(std::string_view line);
 /// The reason in the line of a row that failed.
 std::string sty_ReasonIn(std::string_view line);
 
-/// Calls `take(line, begin)` for each line, without its end; the last one is handed over even if it has none.
-/// Raises sty_Refused when there is such a file and it can't be read.
-void sty_ForEachLine(const std::string& path,
-                     const std::function<void(std::string_view line, long long begin)>& take);
+/// Calls `take(line, begin)` for each line, without its end. Gives the bytes behind the last line: one that
+/// was cut off is none. Raises sty_Refused when there is such a file and it can't be read.
+std::size_t sty_ForEachLine(const std::string& path,
+                            const std::function<void(std::string_view line, long long begin)>& take);
 
 /// Which rows have their decks.
 class sty_DoneRows {

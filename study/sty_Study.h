@@ -12,8 +12,8 @@ struct sty_Request {
     std::string table;
     /// The study's folder.
     std::string out;
-    /// Threads.
-    int jobs = 0; ///< 0: as many as there are processors
+    /// Threads; 0: as many as there are processors.
+    int jobs = 0;
     /// The part of the rows that this run is for, from 1.
     int shard = 1;
     int shards = 1;

@@ -69,8 +69,7 @@ bool ReadNumber(std::string_view text, mdf_Value& value) {
         int number = 0;
         if (std::from_chars(text.data(), end, number).ec != std::errc()) return false;
         value = mdf_Value(number);
-        // A zero with a sign is a real number.
-        return text != "-0";
+        return true;
     }
     double number = 0.0;
     if (std::from_chars(text.data(), end, number).ec != std::errc()) return false;

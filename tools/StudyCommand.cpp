@@ -4,13 +4,11 @@
 #include "tools/OutOfMemory.h"
 #include "tools/StandardStreams.h"
 
-#include <algorithm>
 #include <charconv>
 #include <chrono>
 #include <csignal>
 #include <cstdio>
 #include <filesystem>
-#include <thread>
 
 #include <unistd.h>
 
@@ -239,8 +237,7 @@ ExitCode RunStudy(const StudyCommand& command, RunReport& report) {
     if (request.out.empty()) request.out = std::filesystem::path(request.table).stem().string();
     if (request.out.empty())
         return Wrong("the table " + fnd_Quoted(request.table) + " names no file", report);
-    if (request.jobs == 0) request.jobs = std::max(1, static_cast<int>(std::thread::hardware_concurrency()));
-    if (request.jobs < 1 || request.jobs > kMostJobs)
+    if (request.jobs < 0 || request.jobs > kMostJobs)
         return Wrong("found " + std::to_string(request.jobs) + " jobs, expected 1 to " +
                          std::to_string(kMostJobs),
                      report);

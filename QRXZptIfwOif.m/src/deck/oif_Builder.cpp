@@ -23,7 +23,9 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
 }
 
 void oif_Builder::WriteInput(qio_ostream& device) {
-    utl_Stream stream(device, LineLimit, Precision, Precision);
+    // Where the long texts are kept, a large buffer is more work to make than it saves.
+    constexpr std::size_t small = std::size_t{16} * 1024;
+    utl_Stream stream(device, LineLimit, Precision, Precision, texts_ == nullptr ? 0 : small);
     BuildComponents();
     qkw_ComponentList components = WriteList();
     WriteInput(stream, jobKeywords_.ModelDefinition());
