@@ -5,24 +5,33 @@ set -euo pipefail
 usage() {
     cat <<'END'
 usage: test.sh [--long] [PRESET ...]
+       test.sh --cluster
 
 Presets: release unless given, whose tests also run on libraries built with the sanitizers; asan
 (everything built with them, the tests too) and debug. --long adds the tests labelled "long",
-which the asan preset always leaves out.
+which the asan preset always leaves out. --cluster runs studies on Slurm and Snakemake instead, as
+root and in namespaces of its own; it installs both.
 END
 }
 
 cd "$(dirname "${BASH_SOURCE[0]}")"
 select=(--label-exclude '^long$')
 presets=()
+cluster=false
 for argument in "$@"; do
     case $argument in
         --long) select=() ;;
+        --cluster) cluster=true ;;
         -h | --help) usage; exit 0 ;;
         -*) usage >&2; exit 2 ;;
         *) presets+=("$argument") ;;
     esac
 done
+if $cluster; then
+    scripts/install-dependencies.sh cluster
+    scripts/build.sh release qrxdeck
+    exec python3 tests/cluster/cluster_test.py build/release/tools/qrxdeck
+fi
 [ ${#presets[@]} -gt 0 ] || presets=(release)
 
 scripts/install-dependencies.sh test

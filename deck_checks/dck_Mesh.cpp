@@ -31,27 +31,6 @@ bool HasShape(std::string_view type) {
     }
 }
 
-void CheckMesh(const odiK_Mesh* mesh, const std::string& place, fnd_Sink& sink) {
-    if (mesh == nullptr) return;
-    const odiK_NodeData& nodes = mesh->Nodes();
-    std::vector<int> labels;
-    labels.reserve(static_cast<std::size_t>(nodes.NumNodes()));
-    for (const int label : nodes.labels) labels.push_back(label);
-    mq_Mesh arrays{labels, nodes.coordinates, {}};
-    for (const odiK_ElementClass& elements : mesh->Classes()) {
-        mq_Block block;
-        const std::optional<ddb_ElementType> type = ddb_FindElementType(elements.type.View());
-        block.labels = elements.labels;
-        block.nodes = elements.connectivity;
-        block.width = elements.nodesPerElement;
-        block.plane = elements.shape.topologicalDimension == 2 && elements.shape.embeddingDimension == 2;
-        block.hasShape = type && type->cell && HasShape(elements.type.View());
-        if (block.hasShape) block.kind = *type->cell;
-        arrays.blocks.push_back(block);
-    }
-    dck_TellQuality(mq_QualityOf(arrays), place, sink);
-}
-
 } // namespace
 
 void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink) {
@@ -73,14 +52,34 @@ void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Si
         sink.Add("unused-nodes", place, Told(quality.unusedNodes, "node", "of no element"));
 }
 
+void dck_CheckMesh(const odiK_Mesh& mesh, const std::string& place, fnd_Sink& sink) {
+    const odiK_NodeData& nodes = mesh.Nodes();
+    std::vector<int> labels;
+    labels.reserve(static_cast<std::size_t>(nodes.NumNodes()));
+    for (const int label : nodes.labels) labels.push_back(label);
+    mq_Mesh arrays{labels, nodes.coordinates, {}};
+    for (const odiK_ElementClass& elements : mesh.Classes()) {
+        mq_Block block;
+        const std::optional<ddb_ElementType> type = ddb_FindElementType(elements.type.View());
+        block.labels = elements.labels;
+        block.nodes = elements.connectivity;
+        block.width = elements.nodesPerElement;
+        block.plane = elements.shape.topologicalDimension == 2 && elements.shape.embeddingDimension == 2;
+        block.hasShape = type && type->cell && HasShape(elements.type.View());
+        if (block.hasShape) block.kind = *type->cell;
+        arrays.blocks.push_back(block);
+    }
+    dck_TellQuality(mq_QualityOf(arrays), place, sink);
+}
+
 void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink) {
     const odiK_Model& model = *store.FindModel(modelName);
     const std::string root = Place("models", modelName);
     for (const auto& [name, part] : model.Parts()) {
-        CheckMesh(part->mesh.Referent(), root + Place("parts", name) + "/mesh", sink);
+        if (!part->mesh.IsNull()) dck_CheckMesh(*part->mesh, root + Place("parts", name) + "/mesh", sink);
     }
     for (const auto& [name, instance] : model.Instances()) {
-        CheckMesh(instance->ownMesh.Referent(), root + "/assembly" + Place("instances", name) + "/mesh",
-                  sink);
+        if (instance->ownMesh.IsNull()) continue;
+        dck_CheckMesh(*instance->ownMesh, root + "/assembly" + Place("instances", name) + "/mesh", sink);
     }
 }

@@ -83,14 +83,19 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
     int without = 0;
     for (const odiK_ElementClass& elements : mesh.Classes()) {
         std::map<cow_String, std::pair<const cls_Record*, int>> misfits;
+        // Neighbours mostly have one section.
+        const bool needsSection = NeedsSection(elements.type);
+        const cls_Record* last = nullptr;
+        bool lastFits = false;
         for (int i = 0; i < elements.NumElements(); ++i) {
             const cls_Record* section = sectionOf[static_cast<std::size_t>(elements.firstElementIndex + i)];
             if (section == nullptr) {
-                if (NeedsSection(elements.type)) ++without;
-            } else if (!CanTake(elements.type, section->DynTypeId())) {
-                const auto misfit = misfits.try_emplace(names[section], section, 0).first;
-                ++misfit->second.second;
+                without += needsSection ? 1 : 0;
+                continue;
             }
+            if (section != last) lastFits = CanTake(elements.type, section->DynTypeId());
+            last = section;
+            if (!lastFits) ++misfits.try_emplace(names[section], section, 0).first->second.second;
         }
         for (const auto& [name, misfit] : misfits) {
             const auto& [section, count] = misfit;

@@ -19,6 +19,7 @@ public:
                   const std::string& hint = {});
     int NumErrors() const { return numErrors_; }
 
+    const mdf_Report& Report() const { return *report_; }
     const std::string& FileName() const { return report_->fileName; }
     void SetUnreadable() { report_->unreadable = true; }
     mdf_MeshOrigin& AddMeshOrigin() { return report_->meshOrigins.emplace_back(); }

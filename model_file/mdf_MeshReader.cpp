@@ -19,6 +19,21 @@ std::size_t NumElements(const cow_CountedHld<odiK_Mesh>& mesh) {
 } // namespace
 
 cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const fnd_Path& path) {
+    if (shelf_ == nullptr) return ReadNewMesh(json, path);
+    const mdf_MeshShelf::Key key = shelf_->KeyOf(json, path, diagnostics_.FileName());
+    if (const std::shared_ptr<const mdf_MeshShelf::Entry> known = shelf_->Find(key)) {
+        for (const fnd_Finding& finding : known->findings) diagnostics_.Take(finding);
+        return known->mesh;
+    }
+    const int errors = diagnostics_.NumErrors();
+    const std::size_t before = diagnostics_.Report().findings.size();
+    cow_CountedHld<odiK_Mesh> mesh = ReadNewMesh(json, path);
+    if (diagnostics_.NumErrors() != errors) return mesh;
+    const std::vector<fnd_Finding>& said = diagnostics_.Report().findings;
+    return shelf_->Keep(key, {mesh, {said.begin() + static_cast<std::ptrdiff_t>(before), said.end()}});
+}
+
+cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadNewMesh(mdf_Value& json, const fnd_Path& path) {
     cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
     if (!json.IsObject()) {
         diagnostics_.Expected(path, json, "an object");

@@ -1,6 +1,7 @@
 #ifndef QRX_MODEL_FILE_MDF_MESHREADER_H
 #define QRX_MODEL_FILE_MDF_MESHREADER_H
 
+#include "model_file/mdf_MeshShelf.h"
 #include "model_file/mdf_RecordReader.h"
 
 /// Reads meshes and sets. Bulk arrays are moved out of the document, so that they never stand twice in
@@ -10,6 +11,8 @@ public:
     mdf_MeshReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics)
         : model_(model), records_(records), diagnostics_(diagnostics) {}
 
+    /// Takes meshes that are there already from the shelf, which must outlive the reader.
+    void TakeFrom(mdf_MeshShelf& shelf) { shelf_ = &shelf; }
     /// The mesh of a part or an instance.
     cow_CountedHld<odiK_Mesh> ReadMesh(mdf_Value& json, const fnd_Path& path);
     /// The assembly's own mesh: no sets, and ends of elements may lie in instances, which must be there.
@@ -21,6 +24,8 @@ public:
     bool LacksMesh() const { return lacksMesh_; }
 
 private:
+    cow_CountedHld<odiK_Mesh> ReadNewMesh(mdf_Value& json, const fnd_Path& path);
+
     struct Members {
         std::vector<int> labels;
         std::vector<odiK_FacetInput> facets;
@@ -60,6 +65,7 @@ private:
     // Meshes that lack nodes or elements because of errors: what refers to these is not reported too.
     std::set<const odiK_Mesh*> incomplete_;
     bool lacksMesh_ = false;
+    mdf_MeshShelf* shelf_ = nullptr;
 };
 
 #endif

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelFile.h"
 
+#include "model_file/mdf_Document.h"
 #include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelReader.h"
 #include "model_file/mdf_Parser.h"
@@ -21,14 +22,17 @@ std::string Found(const mdf_Value* value) {
     return "found " + (value == nullptr ? std::string("nothing") : mdf_Shown(*value));
 }
 
-void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagnostics& diagnostics) {
+void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagnostics& diagnostics,
+                mdf_MeshShelf* shelf) {
     std::vector<std::string> names;
     for (mdf_Member& member : models.Members()) {
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics)) continue;
         names.push_back(member.name);
         odiK_Model& model = odb.AddModel(cow_String(member.name));
-        mdf_ModelReader(model, diagnostics).Read(member.value, place);
+        mdf_ModelReader reader(model, diagnostics);
+        if (shelf != nullptr) reader.TakeFrom(*shelf);
+        reader.Read(member.value, place);
     }
     if (odb.FindModel(odb_Odb::DefaultModelName()) == nullptr) {
         diagnostics.Add(
@@ -37,7 +41,10 @@ void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagn
     }
 }
 
-std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors, mdf_Report& report) {
+} // namespace
+
+std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
+                                          mdf_Report& report, mdf_MeshShelf* shelf) {
     mdf_Diagnostics diagnostics(report);
     if (!IsDocument(errors, diagnostics)) return nullptr;
     const fnd_Path top;
@@ -45,7 +52,7 @@ std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>&
         diagnostics.Expected(top, root, "an object with the members \"format\" and \"models\"");
         return nullptr;
     }
-    mdf_CheckMembers(diagnostics, root, {"format", "models"}, top);
+    mdf_CheckMembers(diagnostics, root, {"format", "parameters", "models"}, top);
     const mdf_Value* format = root.Find("format");
     if (format == nullptr || !format->IsString() || format->String() != mdf_kFormat) {
         diagnostics.Add("wrong-format", fnd_Path(top, "format"), Found(format), fnd_Quoted(mdf_kFormat));
@@ -56,12 +63,12 @@ std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>&
         diagnostics.Add("missing-field", path, Found(models), "an object of models");
         return nullptr;
     }
+    // While the arrays that their pointers lead through are there.
+    report.parameters = mdf_ReadParameters(root, diagnostics);
     auto odb = std::make_unique<odb_Odb>();
-    ReadModels(*odb, *models, path, diagnostics);
+    ReadModels(*odb, *models, path, diagnostics, shelf);
     return diagnostics.NumErrors() > 0 ? nullptr : std::move(odb);
 }
-
-} // namespace
 
 std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report) {
     report.fileName = path;
@@ -81,7 +88,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
         std::string().swap(text);
     else
         file->Keep(std::move(text));
-    std::unique_ptr<odb_Odb> odb = ReadDocument(root, errors, report);
+    std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report);
     root = mdf_Value();
     report.text = file;
     report.Locate(report.findings);
@@ -94,7 +101,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
-    std::unique_ptr<odb_Odb> odb = ReadDocument(root, errors, report);
+    std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report);
     mdf_Locate(text, report.findings);
     return odb;
 }

@@ -1,7 +1,7 @@
 #ifndef QRX_MODEL_FILE_MDF_MODELFILE_H
 #define QRX_MODEL_FILE_MDF_MODELFILE_H
 
-#include "model_file/mdf_Value.h"
+#include "model_file/mdf_Parameters.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odb_Odb.h"
 
@@ -57,6 +57,7 @@ struct mdf_Report {
     std::list<mdf_MeshOrigin> meshOrigins;
     /// The file, for Locate().
     std::shared_ptr<const mdf_FileText> text;
+    std::vector<mdf_Parameter> parameters;
 
     /// Gives findings on the file's content, whoever found them, their lines and columns, where they have
     /// none. A file that has changed meanwhile gives none. mdf_Locate does the same for a text.
@@ -78,9 +79,9 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
 /// stream failed.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out);
 /// The same, where meshes that came from mesher's files stay in these; `folder` is the model file's own, from
-/// which their paths count.
+/// which their paths count. And with the parameters that the file had.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out, const std::list<mdf_MeshOrigin>& origins,
-                        const std::string& folder);
+                        const std::string& folder, const std::vector<mdf_Parameter>& parameters = {});
 
 /// Writes the JSON Schema (draft 2020-12) of model files, with the documentation of every field.
 bool mdf_WriteSchema(std::ostream& out);

@@ -51,27 +51,47 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
         diagnostics_.Expected(path, json, std::string("an object, each member ") + info.singular);
         return;
     }
-    std::vector<std::string> others;
-    if (info.IsPropagating()) others.emplace_back("states");
     mdl_Repository& repository = info.In(model_);
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
         capitals.Enter(member.name, place, "name", diagnostics_);
-        const std::unique_ptr<cls_Record> record =
-            records_.ReadVariant(info.ItemTypeId(), member.value, place, others);
+        const std::unique_ptr<cls_Record> record = ReadObject(info, member.value, place);
         if (record == nullptr) {
             records_.References().NoteWrong(member.name);
             continue;
         }
-        const mdf_Value* states = info.IsPropagating() ? member.value.Find("states") : nullptr;
-        if (states != nullptr) {
-            records_.ReadStates(static_cast<kprC_PropagatingObject&>(*record), *states,
-                                fnd_Path(place, "states"));
-        }
         repository.InsertRecord(cow_String(member.name), *record);
     }
+}
+
+std::unique_ptr<cls_Record> mdf_ModelReader::ReadObject(const odiK_Repository& info, const mdf_Value& json,
+                                                        const fnd_Path& place) {
+    std::vector<std::string> others;
+    if (info.IsPropagating()) others.emplace_back("states");
+    std::unique_ptr<cls_Record> record = records_.ReadVariant(info.ItemTypeId(), json, place, others);
+    const mdf_Value* states = record != nullptr && info.IsPropagating() ? json.Find("states") : nullptr;
+    if (states != nullptr) {
+        records_.ReadStates(static_cast<kprC_PropagatingObject&>(*record), *states,
+                            fnd_Path(place, "states"));
+    }
+    return record;
+}
+
+void mdf_ModelReader::ReadAnew(const odiK_Repository& info, const std::string& name, const mdf_Value& json,
+                               const fnd_Path& place, const kprC_Timeline& timeline) {
+    const std::unique_ptr<cls_Record> record = ReadObject(info, json, place);
+    if (record == nullptr) return;
+    records_.References().Check();
+    if (info.IsPropagating()) PropagateObject(static_cast<kprC_PropagatingObject&>(*record), timeline, place);
+    info.In(model_).InsertRecord(cow_String(name), *record);
+}
+
+void mdf_ModelReader::PropagateObject(kprC_PropagatingObject& object, const kprC_Timeline& timeline,
+                                      const fnd_Path& place) {
+    fnd_Below below(diagnostics_, place);
+    for (fnd_Finding& problem : object.Propagate(timeline)) below.Take(std::move(problem));
 }
 
 void mdf_ModelReader::ReadSteps(const mdf_Value& json, const fnd_Path& path) {
@@ -133,10 +153,8 @@ void mdf_ModelReader::Propagate(const fnd_Path& path) {
         mdl_Repository& repository = info.In(model_);
         const fnd_Path container(path, std::string_view(info.member));
         for (const cow_String& name : repository.Keys()) {
-            auto& object = static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name));
-            const fnd_Path place(container, name.View());
-            fnd_Below below(diagnostics_, place);
-            for (fnd_Finding& problem : object.Propagate(timeline)) below.Take(std::move(problem));
+            PropagateObject(static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name)), timeline,
+                            fnd_Path(container, name.View()));
         }
     }
 }

@@ -11,10 +11,21 @@ public:
         : model_(model), diagnostics_(diagnostics), records_(model, diagnostics),
           tree_(model, records_, diagnostics) {}
 
+    /// Takes meshes that are there already from the shelf, which must outlive the reader.
+    void TakeFrom(mdf_MeshShelf& shelf) { tree_.TakeFrom(shelf); }
     void Read(mdf_Value& json, const fnd_Path& path);
+    /// Reads one object of a repository anew into a complete model that has it; an object that lives across
+    /// steps is worked out for these. No other object, no step and nothing of the tree may differ from what
+    /// the file says.
+    void ReadAnew(const odiK_Repository& repository, const std::string& name, const mdf_Value& json,
+                  const fnd_Path& place, const kprC_Timeline& timeline);
 
 private:
     void ReadRepository(const odiK_Repository& info, const mdf_Value& json, const fnd_Path& path);
+    std::unique_ptr<cls_Record> ReadObject(const odiK_Repository& info, const mdf_Value& json,
+                                           const fnd_Path& place);
+    void PropagateObject(kprC_PropagatingObject& object, const kprC_Timeline& timeline,
+                         const fnd_Path& place);
     void ReadSteps(const mdf_Value& json, const fnd_Path& path);
     void ReadStep(const mdf_Value& json, bool isFirst, const fnd_Path& path, mdf_CapitalsCheck& capitals);
     void Propagate(const fnd_Path& path);

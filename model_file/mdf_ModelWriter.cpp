@@ -195,11 +195,12 @@ bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream) {
 }
 
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream, const std::list<mdf_MeshOrigin>& origins,
-                        const std::string& folder) {
+                        const std::string& folder, const std::vector<mdf_Parameter>& parameters) {
     mdf_Writer out(stream);
     out.BeginObject();
     out.Key("format");
     out.String(mdf_kFormat);
+    mdf_WriteParameters(out, parameters);
     out.Key("models");
     out.BeginObject();
     for (const auto& [name, model] : odb.Models()) {

@@ -70,7 +70,9 @@ bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, con
 }
 
 const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
-    const auto [place, isNew] = choices_.try_emplace(base);
+    // Classes are the same for all readers, of which there is one a variant.
+    thread_local std::unordered_map<unsigned, Choice> choices;
+    const auto [place, isNew] = choices.try_emplace(base);
     Choice& choice = place->second;
     if (!isNew) return choice;
     choice.classes = cls_Classes().ConcreteClasses(base);

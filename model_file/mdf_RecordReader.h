@@ -42,7 +42,7 @@ private:
         // By the whole name and by the short one, in small letters; null where a short name tells two.
         std::unordered_map<std::string, const cls_ClassEntry*> byName;
     };
-    const Choice& ChoiceOf(unsigned base);
+    static const Choice& ChoiceOf(unsigned base);
 
     bool ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json, const fnd_Path& path,
                    const cls_Field& field, bool mayBeUnset);
@@ -76,7 +76,6 @@ private:
     mdf_Diagnostics& diagnostics_;
     mdf_References references_;
     mdf_PlaceReader places_;
-    std::unordered_map<unsigned, Choice> choices_;
 };
 
 #endif

@@ -24,6 +24,27 @@ constexpr char kFrame[] = R"({
   "required": ["format", "models"],
   "properties": {
     "format": {"description": "what this file is", "const": "qrx-model/1"},
+    "parameters": {
+      "description": "Short names for what a study varies; a column of its table is one of them, or a pointer.",
+      "type": "object",
+      "propertyNames": {"minLength": 1, "pattern": "^[^/]", "not": {"const": "name"}},
+      "additionalProperties": {
+        "anyOf": [
+          {"$ref": "#/$defs/POINTERS"},
+          {
+            "type": "object",
+            "additionalProperties": false,
+            "required": ["pointers"],
+            "properties": {
+              "pointers": {"description": "what it stands for", "$ref": "#/$defs/POINTERS"},
+              "unit": {"description": "for people", "type": "string"},
+              "limits": {"description": "what its numbers may be: \"> 0, <= 20\", or \"0.5 .. 20\" with both ends", "type": "string"},
+              "description": {"description": "for people", "type": "string"}
+            }
+          }
+        ]
+      }
+    },
     "models": {
       "description": "Models by name; decks are written from \"Default Model\".",
       "type": "object",
@@ -35,6 +56,14 @@ constexpr char kFrame[] = R"({
     "NAME": {
       "description": "A name that can stand in a deck.",
       "type": "string", "minLength": 1, "maxLength": 80, "pattern": "^[^\"\\u0000-\\u001f\\u007f]*$"
+    },
+    "POINTER": {
+      "description": "A JSON pointer to a value of this file.",
+      "type": "string", "pattern": "^/models/"
+    },
+    "POINTERS": {
+      "description": "One place, or several that get the same value.",
+      "anyOf": [{"$ref": "#/$defs/POINTER"}, {"type": "array", "items": {"$ref": "#/$defs/POINTER"}, "minItems": 1}]
     },
     "LINE": {
       "description": "A text that can stand on one line of a deck.",

@@ -13,6 +13,8 @@ public:
 
     /// Reads the fields of an object of the frame, in the order of its table.
     void ReadFields(cls_Record& frame, mdf_Value& json, const fnd_Path& path);
+    /// Takes meshes that are there already from the shelf, which must outlive the reader.
+    void TakeFrom(mdf_MeshShelf& shelf) { meshes_.TakeFrom(shelf); }
     /// A mesher's file gave no mesh.
     bool LacksMesh() const { return meshes_.LacksMesh(); }
     /// Looks up the sets that the attributes of parts and instances lie on.

@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -12,14 +12,16 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer] ...
   dev     all of these, and the clang tools
   viewer  build, and what the page of "qrxdeck view" is built and tested with: node, a browser, and the packages
           of viewer/package-lock.json
+  cluster test, and the schedulers that run the shards of studies
 END
 }
 
-build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev)
+build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libmd-dev)
 test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
 bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
+cluster=(slurmctld slurmd slurm-client munge snakemake iproute2 util-linux)
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
 command -v node >/dev/null && command -v npm >/dev/null || viewer+=(nodejs npm)
@@ -33,6 +35,7 @@ for task in "$@"; do
         test) packages+=("${test[@]}") ;;
         bench) packages+=("${bench[@]}") ;;
         dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
+        cluster) packages+=("${test[@]}" "${cluster[@]}") ;;
         viewer) packages+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;

@@ -278,7 +278,7 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     std::ostringstream formatted;
     const std::string place = request.output.empty() ? request.model : request.output;
     mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
-                       std::filesystem::path(place).parent_path().string());
+                       std::filesystem::path(place).parent_path().string(), found.parameters);
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {

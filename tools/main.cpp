@@ -5,6 +5,7 @@
 #include "tools/OutOfMemory.h"
 #include "tools/SignalCleanUp.h"
 #include "tools/StandardStreams.h"
+#include "tools/StudyCommand.h"
 #include "tools/ViewCommand.h"
 
 #include <CLI/CLI.hpp>
@@ -43,6 +44,7 @@ struct CommandLine {
     DeckRequest deck;
     DiffRequest diff;
     FlattenRequest flatten;
+    StudyCommand study;
     bool textOfDeck = false;
     std::string model;
     std::string schemaOutput;
@@ -59,6 +61,8 @@ struct CommandLine {
     CLI::App* meshCommand = app.add_subcommand("mesh", "Tell of a mesher's file: cells, groups, quality");
     CLI::App* newCommand = app.add_subcommand("new", "Make a model file for a mesher's file, to go on from");
     CLI::App* formatCommand = app.add_subcommand("format", "Write a model file anew in its canonical form");
+    CLI::App* studyCommand =
+        app.add_subcommand("study", "Write a deck for each row of a table of parameters");
     CLI::App* viewCommand = app.add_subcommand("view", "Write a page that shows a model, step by step");
     CLI::App* variablesCommand =
         app.add_subcommand("variables", "List the variables that output requests can ask for");
@@ -86,6 +90,7 @@ struct CommandLine {
         AddNew();
         AddFormat();
         AddView();
+        AddStudy();
         variablesCommand
             ->add_option("--step-type", stepType,
                          "Only those of one procedure, by the class of its step, such as StaticStep")
@@ -119,6 +124,7 @@ struct CommandLine {
         if (*newCommand) return RunNew(newModel, report);
         if (*formatCommand) return RunFormat(format, report);
         if (*viewCommand) return RunView(view, report);
+        if (*studyCommand) return RunStudy(study, report);
         if (*variablesCommand) return RunVariables(stepType, report);
         return RunSchema(schemaOutput, report);
     }
@@ -198,6 +204,37 @@ private:
             ->excludes(output);
     }
 
+    void AddStudy() {
+        studyCommand->add_option("TEMPLATE", study.request.model, "Model file, JSON")->type_name("");
+        studyCommand
+            ->add_option("TABLE", study.request.table,
+                         "Table: .csv, .tsv, or .jsonl; columns are JSON pointers into the template, its "
+                         "parameters, or \"name\"")
+            ->type_name("");
+        studyCommand
+            ->add_option("--out", study.request.out,
+                         "Folder of the decks and the ledger (default: the table's name without extension)")
+            ->type_name("DIR");
+        studyCommand
+            ->add_option("--jobs", study.request.jobs, "Decks at a time (default: as many as processors)")
+            ->type_name("N");
+        studyCommand->add_option("--shard", study.shard, "Only the K-th of N parts of the rows")
+            ->type_name("K/N");
+        studyCommand->add_flag("--resume", study.request.resume, "Do what is missing or failed");
+        studyCommand->add_flag("--dry-run", study.request.dryRun, "Make all decks and write nothing");
+        studyCommand->add_option("--merge", study.merge, "Join the ledgers of a study's shards")
+            ->type_name("DIR");
+        studyCommand
+            ->add_option("--emit", study.emit, "Print a script that runs shards: for slurm or snakemake")
+            ->type_name("WORD");
+        studyCommand->add_option("--shards", study.shards, "Shards of the script")->type_name("N");
+        AddJson(studyCommand);
+        studyCommand->footer("Exit codes: 0 all rows have their decks, 1 some failed, 2 template, table or "
+                             "folder can't be used,\n"
+                             "3 a file can't be read or written. A run that a signal interrupts ends by that "
+                             "signal, when the\n"
+                             "rows in hand are done.\n");
+    }
     void AddDiff() {
         diffCommand->add_option("A", diff.first, "Deck, .inp, or model file")->required()->type_name("");
         auto* second = diffCommand->add_option("B", diff.second, "Deck, .inp, or model file")->type_name("");

@@ -62,6 +62,7 @@
 {"no-such-label", fnd_Severity::ERROR, "the mesh has no node or element of the label"},
 {"no-such-meaning", fnd_Severity::WARNING, "the number is none of those that have a meaning here"},
 {"no-such-name", fnd_Severity::ERROR, "the name refers to nothing"},
+{"no-such-place", fnd_Severity::WARNING, "a pointer of a parameter leads to no value of the file"},
 {"no-such-set", fnd_Severity::ERROR, "the mesh or the assembly has no set of the name"},
 {"not-defined", fnd_Severity::WARNING, "the model doesn't define the name; another part of the deck has to"},
 {"sets-in-assembly-mesh", fnd_Severity::ERROR, "sets of the assembly stand in its member \"sets\""},

@@ -64,6 +64,27 @@ void odiK_Assembly::AppendConnectorOrientation(const ptoC_ConnectorOrientation& 
     connectorOrientations.Append(named);
 }
 
+void odiK_Model::Share(const odiK_Model& other) {
+    static_cast<odiK_ModelData&>(*this) = other;
+    steps = other.steps;
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        if (!repository.IsInOrder()) repository.In(*this) = repository.In(other);
+    }
+    datums_ = other.datums_;
+    for (const odiK_Datum& datum : datums_)
+        datumIndex_.emplace(datum.name.View(), static_cast<int>(datumIndex_.size()) + 1);
+    parts_ = other.parts_;
+    instances_ = other.instances_;
+    instanceOfMesh_ = other.instanceOfMesh_;
+    sealed_ = other.sealed_;
+    assemblyMesh_ = other.assemblyMesh_;
+    assembly_ = other.assembly_;
+    assemblySets_ = other.assemblySets_;
+    for (const auto& set : assemblySets_)
+        assemblySetIndex_.emplace(set->name.View(), static_cast<int>(assemblySetIndex_.size()));
+    if (other.IsComplete()) SetComplete();
+}
+
 dtmC_DatumRef odiK_Model::AddDatum(odiK_Datum datum) {
     if (!FindDatum(datum.name).IsNullRef())
         Raise("a datum named " + Quoted(datum.name) + " is there already");

@@ -123,6 +123,9 @@ public:
     odiK_Model& operator=(const odiK_Model&) = delete;
 
     const cow_String& Name() const { return name_; }
+    /// Makes this model, which is empty, a copy of a complete one: it shares parts, instances, meshes, sets
+    /// and records with it. Records may then change, repository by repository; the tree must not.
+    void Share(const odiK_Model& other);
 
     // A repository has a row in odiK_Repositories.cpp too.
     kprC_StepContainer steps;

@@ -22,7 +22,8 @@ ALLOWED = {
     "deck_reader": ["foundation"],
     "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
     "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
-    "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page"],
+    "study": CORE + ["model_file"],
+    "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page", "study"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
@@ -53,6 +54,7 @@ LIBRARIES = {
     "mesh_file": ["pugixml.hpp", "zlib.h", "hdf5.h"],
     "model_file": ["nlohmann/"],
     "view_page": ["nlohmann/"],
+    "study": ["sha2.h"],
     "tools": ["nlohmann/", "CLI/"],
 }
 
@@ -68,9 +70,9 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h", "sys/stat.h",
-          "sys/types.h", "sys/wait.h", "sys/xattr.h"}
-SYSTEM_LAYERS = {"foundation", "mesh_file", "tools"}
+SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h",
+          "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
+SYSTEM_LAYERS = {"foundation", "mesh_file", "study", "tools"}
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')
 

@@ -1,6 +1,8 @@
 #include "deck/oif_Builder.h"
 
 #include "foundation/qio_Device.h"
+#include "mesh/oif_Element.h"
+#include "mesh/oif_Node.h"
 
 oif_Builder::oif_Builder(oif_ModelInfo& modelInfo)
     : jobKeywords_(modelInfo), instance_(modelInfo), amplitude_(modelInfo), material_(modelInfo),
@@ -21,7 +23,9 @@ bool oif_Builder::WriteInputFile(const cow_String& fileName) {
 }
 
 void oif_Builder::WriteInput(qio_ostream& device) {
-    utl_Stream stream(device, LineLimit, Precision, Precision);
+    // Where the long texts are kept, a large buffer is more work to make than it saves.
+    constexpr std::size_t small = std::size_t{16} * 1024;
+    utl_Stream stream(device, LineLimit, Precision, Precision, texts_ == nullptr ? 0 : small);
     BuildComponents();
     qkw_ComponentList components = WriteList();
     WriteInput(stream, jobKeywords_.ModelDefinition());
@@ -82,6 +86,42 @@ void oif_Builder::WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords
     for (const qkw_KeywordHandle& keyword : keywords) keyword.ConstGet().Write(stream);
 }
 
+void oif_Builder::WriteOfInstance(utl_Stream& stream, const qkw_KeywordList& keywords) const {
+    if (texts_ == nullptr) return WriteInput(stream, keywords);
+    for (const qkw_KeywordHandle& handle : keywords) {
+        const qkw_Keyword& keyword = handle.ConstGet();
+        const auto* nodes = dynamic_cast<const oif_Node*>(&keyword);
+        const auto* elements = dynamic_cast<const oif_ElementFromMesh*>(&keyword);
+        if (nodes != nullptr && nodes->MeshOfInstance() != nullptr) {
+            WriteKept(stream, *nodes->MeshOfInstance(), oif_MeshBlockEnm::NODES, keyword);
+        } else if (elements != nullptr) {
+            WriteKept(stream, elements->MeshOfInstance(), oif_MeshBlockEnm::ELEMENTS, keyword);
+        } else {
+            keyword.Write(stream);
+        }
+    }
+}
+
+void oif_Builder::WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
+                            const qkw_Keyword& keyword) const {
+    oif_MeshTexts::Text text = texts_->Find(mesh, block);
+    if (text == nullptr) {
+        qio_StringDevice device;
+        utl_Stream own(device, LineLimit, Precision, Precision);
+        keyword.Write(own);
+        own.Flush();
+        std::string made = device.Text();
+        // The line end goes through the stream, which then knows that a line begins.
+        if (!made.empty()) made.pop_back();
+        text = std::make_shared<const std::string>(std::move(made));
+        texts_->Keep(mesh, block, text);
+    }
+    if (text->empty()) return;
+    stream.Flush();
+    texts_->WriteKept(text);
+    stream.LineBreak();
+}
+
 void oif_Builder::WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
     if (v6Format_) WriteHeading(stream, "PARTS");
     for (const auto& [name, part] : model_->Parts()) {
@@ -99,7 +139,7 @@ void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream, qkw_Component
     }
     for (const auto& [name, instance] : model_->Instances()) {
         for (int i = 0; i < components.Length(); ++i) {
-            WriteInput(stream, components.Get(i).Get().InstanceDefinition(name));
+            WriteOfInstance(stream, components.Get(i).Get().InstanceDefinition(name));
         }
     }
 }

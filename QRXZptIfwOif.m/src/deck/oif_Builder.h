@@ -10,6 +10,7 @@
 #include "constraints/oif_ConstraintBuilder.h"
 #include "deck/oif_FinalBuilder.h"
 #include "deck/oif_JobKeywordsBuilder.h"
+#include "deck/oif_MeshTexts.h"
 #include "interactions/oif_InteractionBuilder.h"
 #include "materials/oif_MaterialBuilder.h"
 #include "mesh/oif_RegionBuilder.h"
@@ -31,6 +32,8 @@ public:
     bool WriteInputFile(const cow_String& fileName);
     /// Writes the deck to a device.
     void WriteInput(qio_ostream& device);
+    /// From now on texts of meshes come from the device that the deck is written to, where it keeps them.
+    void KeepTexts(oif_MeshTexts& texts) { texts_ = &texts; }
     /// Builds as for a deck, writes nothing, and gives the keywords of single objects. One of the three may
     /// be called, and once.
     qkw_FilingLog BuildLogged();
@@ -44,6 +47,9 @@ private:
     qkw_ComponentList WriteList() const;
     void WriteHeading(utl_Stream& stream, const cow_String& text) const;
     void WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const;
+    void WriteOfInstance(utl_Stream& stream, const qkw_KeywordList& keywords) const;
+    void WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
+                   const qkw_Keyword& keyword) const;
     void WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
     void WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
     void WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
@@ -68,6 +74,7 @@ private:
     oif_FinalBuilder final_;
     bool v6Format_;
     const oif_Model* model_;
+    oif_MeshTexts* texts_ = nullptr;
 };
 
 #endif

@@ -1,6 +1,7 @@
 #include "deck/oif_Writer.h"
 
 #include "deck/oif_Builder.h"
+#include "deck/oif_MeshTexts.h"
 #include "store_interface/model/odb_Odb.h"
 
 void oif_Writer::WriteInputFile(const char* jobName) {
@@ -13,5 +14,12 @@ void oif_Writer::WriteInputFile(const char* jobName) {
 void oif_Writer::WriteInput(qio_ostream& device) {
     oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
     oif_Builder builder(modelInfo);
+    builder.WriteInput(device);
+}
+
+void oif_Writer::WriteInput(oif_MeshTexts& device) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_Builder builder(modelInfo);
+    builder.KeepTexts(device);
     builder.WriteInput(device);
 }

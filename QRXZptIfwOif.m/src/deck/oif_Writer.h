@@ -1,11 +1,12 @@
 #ifndef QRX_OIF_WRITER_H
 #define QRX_OIF_WRITER_H
 
+class oif_MeshTexts;
 class odb_Odb;
 class qio_ostream;
 
-/// The way in: writes the model named "Default Model" of an open store as a deck. Several threads may write at
-/// once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
+/// The way in: writes the model named "Default Model" of an open store as a deck. Several threads may write
+/// at once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
 class oif_Writer {
 public:
     /// The store must outlive the writer.
@@ -18,6 +19,8 @@ public:
     void WriteInputFile(const char* jobName);
     /// Writes the same text to a device, which knows whether all of it arrived.
     void WriteInput(qio_ostream& device);
+    /// The same, where texts of meshes that the device keeps are not made again.
+    void WriteInput(oif_MeshTexts& device);
 
 private:
     const odb_Odb& odb_;

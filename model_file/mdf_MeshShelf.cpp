@@ -1,0 +1,64 @@
+#include "model_file/mdf_MeshShelf.h"
+
+#include "model_file/mdf_Pointer.h"
+
+#include <algorithm>
+#include <filesystem>
+
+namespace {
+
+constexpr std::size_t kMostFiles = 16;
+
+/// Size and time of change: a file that was written anew is another one.
+std::string StateOf(const std::filesystem::path& file) {
+    std::error_code error;
+    const auto bytes = std::filesystem::file_size(file, error);
+    if (error) return {};
+    const auto time = std::filesystem::last_write_time(file, error);
+    if (error) return {};
+    return std::to_string(bytes) + "\n" + std::to_string(time.time_since_epoch().count());
+}
+
+bool IsOfFile(const mdf_MeshShelf::Key& key) {
+    return key.find('\n') != std::string::npos;
+}
+
+} // namespace
+
+mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& path,
+                                        const std::string& modelFile) const {
+    const std::string place = path.Text();
+    const bool changed =
+        std::ranges::any_of(changes_, [&](const std::string& change) { return mdf_IsBelow(change, place); });
+    if (!changed) return place;
+    const mdf_Value* file = json.IsObject() ? json.Find("file") : nullptr;
+    if (file == nullptr || !file->IsString()) return {};
+    const std::string state = StateOf(std::filesystem::path(modelFile).parent_path() / file->String());
+    return state.empty() ? Key() : place + "\n" + state + "\n" + mdf_JsonText(json);
+}
+
+std::shared_ptr<const mdf_MeshShelf::Entry> mdf_MeshShelf::Find(const Key& key) {
+    if (key.empty()) return nullptr;
+    const std::lock_guard<std::mutex> lock(kept_->mutex);
+    const auto place = kept_->places.find(key);
+    if (place == kept_->places.end()) return nullptr;
+    if (IsOfFile(key)) kept_->files.splice(kept_->files.begin(), kept_->files, place->second.use);
+    return place->second.entry;
+}
+
+cow_CountedHld<odiK_Mesh> mdf_MeshShelf::Keep(const Key& key, Entry entry) {
+    if (key.empty()) return entry.mesh;
+    const std::lock_guard<std::mutex> lock(kept_->mutex);
+    const auto [place, isNew] = kept_->places.try_emplace(key);
+    if (!isNew) return place->second.entry->mesh;
+    place->second.entry = std::make_shared<const Entry>(std::move(entry));
+    if (IsOfFile(key)) {
+        kept_->files.push_front(key);
+        place->second.use = kept_->files.begin();
+        if (kept_->files.size() > kMostFiles) {
+            kept_->places.erase(kept_->files.back());
+            kept_->files.pop_back();
+        }
+    }
+    return place->second.entry->mesh;
+}

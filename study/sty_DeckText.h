@@ -1,0 +1,76 @@
+#ifndef QRX_STY_DECKTEXT_H
+#define QRX_STY_DECKTEXT_H
+
+#include "deck/oif_MeshTexts.h"
+#include "store_interface/model/odiK_Mesh.h"
+#include "study/sty_Sha256.h"
+
+#include <list>
+#include <map>
+#include <mutex>
+#include <optional>
+#include <span>
+#include <vector>
+
+class odb_Odb;
+
+/// The texts of the last meshes, which all threads of a study share.
+class sty_MeshTexts {
+public:
+    using Text = oif_MeshTexts::Text;
+
+    Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block);
+    void Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text);
+
+private:
+    struct Entry {
+        cow_CountedHld<odiK_Mesh> mesh; // so that no other mesh gets its address
+        Text texts[2];
+    };
+    std::mutex mutex_;
+    std::list<Entry> entries_; // the last one used is the first
+};
+
+/// The text of one deck after the other, as pieces: bytes of its own, and texts of meshes that it shares. Its
+/// sum goes on from where another deck with the same beginning stood.
+class sty_DeckText final : public oif_MeshTexts {
+public:
+    explicit sty_DeckText(sty_MeshTexts& meshes) : meshes_(meshes) {}
+
+    /// Begins the next deck, of this store, which must outlive the writing.
+    void Begin(const odb_Odb& store);
+    void Write(const char* text, std::size_t bytes) override { own_.append(text, bytes); }
+    Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) override { return meshes_.Find(mesh, block); }
+    void Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override;
+    void WriteKept(const Text& text) override;
+
+    long long Bytes() const;
+    /// The SHA-256 of the deck.
+    std::string Sha256();
+    /// Writes the deck to an open file; the errno value of a failure, 0 for none.
+    int WriteTo(int file) const;
+
+private:
+    struct Piece {
+        std::size_t ownEnd; ///< where the bytes of its own end that stand before the kept text
+        Text kept;
+    };
+    /// How a deck that was summed up began: what it continues, bytes of its own, and a kept text.
+    struct Beginning {
+        int former;
+        std::string own;
+        Text kept;
+        sty_Sha256 sum;
+    };
+
+    std::string_view OwnOf(std::size_t piece) const;
+    std::string_view OwnEnd() const;
+
+    sty_MeshTexts& meshes_;
+    const odb_Odb* store_ = nullptr;
+    std::string own_;
+    std::vector<Piece> pieces_;
+    std::vector<Beginning> beginnings_;
+};
+
+#endif

@@ -1,0 +1,46 @@
+#ifndef QRX_STY_FILE_H
+#define QRX_STY_FILE_H
+
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+/// An open file or folder, closed at the end.
+class sty_Descriptor {
+public:
+    explicit sty_Descriptor(int number = -1) : number_(number) {}
+    sty_Descriptor(sty_Descriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
+    sty_Descriptor& operator=(sty_Descriptor&& other) noexcept {
+        std::swap(number_, other.number_);
+        return *this;
+    }
+    ~sty_Descriptor();
+    int Number() const { return number_; }
+    bool IsOpen() const { return number_ >= 0; }
+
+private:
+    int number_;
+};
+
+/// A file that is read from its beginning to its end, piece by piece.
+class sty_File {
+public:
+    explicit sty_File(const std::string& path);
+    /// The next piece, which stays until the one after it; empty at the end and after a failure.
+    std::string_view Next();
+    /// The errno value of the first failure, 0 for none.
+    int Error() const { return error_; }
+
+private:
+    sty_Descriptor file_;
+    std::vector<char> buffer_;
+    int error_ = 0;
+};
+
+/// Writes all of the text; the errno value of a failure, 0 for none.
+int sty_WriteAll(int file, std::string_view text);
+/// "No space left on device".
+std::string sty_ReasonOf(int error);
+
+#endif

@@ -1,0 +1,54 @@
+#include "study/sty_Sha256.h"
+
+#include "study/sty_File.h"
+
+#include <cstring>
+#include <sha2.h>
+
+namespace {
+
+static_assert(sizeof(SHA2_CTX) <= 208);
+
+template <class Action>
+void WithContext(std::array<unsigned char, 208>& bytes, const Action& action) {
+    SHA2_CTX context;
+    std::memcpy(&context, bytes.data(), sizeof context);
+    action(context);
+    std::memcpy(bytes.data(), &context, sizeof context);
+}
+
+} // namespace
+
+sty_Sha256::sty_Sha256() : context_{} {
+    WithContext(context_, [](SHA2_CTX& context) { SHA256Init(&context); });
+}
+
+void sty_Sha256::Add(std::string_view text) {
+    WithContext(context_, [&](SHA2_CTX& context) {
+        SHA256Update(&context, reinterpret_cast<const unsigned char*>(text.data()), text.size());
+    });
+}
+
+std::string sty_Sha256::Hex() const {
+    std::array<unsigned char, kBytes> copy = context_;
+    unsigned char digest[SHA256_DIGEST_LENGTH];
+    WithContext(copy, [&](SHA2_CTX& context) { SHA256Final(digest, &context); });
+    constexpr char digits[] = "0123456789abcdef";
+    std::string hex;
+    for (const unsigned char byte : digest) {
+        hex += digits[byte >> 4];
+        hex += digits[byte & 15];
+    }
+    return hex;
+}
+
+std::string sty_Sha256OfFile(const std::string& path) {
+    sty_File file(path);
+    sty_Sha256 sum;
+    for (;;) {
+        const std::string_view piece = file.Next();
+        if (piece.empty()) break;
+        sum.Add(piece);
+    }
+    return file.Error() != 0 ? std::string() : sum.Hex();
+}

@@ -1,0 +1,239 @@
+#include "study/sty_Variants.h"
+
+#include "deck/oif_Writer.h"
+#include "deck_checks/dck_Check.h"
+#include "foundation/nex_Exception.h"
+#include "model_file/mdf_Diagnostics.h"
+#include "model_file/mdf_Pointer.h"
+#include "study/sty_Json.h"
+
+#include <algorithm>
+
+namespace {
+
+constexpr std::size_t kMostErrors = 20;
+
+/// Calls `take` for each number of a value.
+template <class Taker>
+bool AllNumbers(const mdf_Value& value, const Taker& take) {
+    if (value.IsNumber()) return take(value.Real());
+    if (!value.IsArray()) return false;
+    for (std::size_t i = 0; i < value.Size(); ++i) {
+        if (!AllNumbers(value.Item(i), take)) return false;
+    }
+    return true;
+}
+
+/// Pointers so that each stands right behind those that it lies below.
+bool Before(std::string_view a, std::string_view b) {
+    const auto rank = [](char c) { return c == '/' ? -1 : static_cast<int>(static_cast<unsigned char>(c)); };
+    return std::ranges::lexicographical_compare(a, b, {}, rank, rank);
+}
+
+} // namespace
+
+sty_Columns::sty_Columns(const sty_Table& table, const std::vector<mdf_Parameter>& parameters) {
+    std::vector<std::string> names;
+    for (const mdf_Parameter& parameter : parameters) names.push_back(parameter.name);
+    for (const std::string& name : table.Columns()) {
+        Column& column = columns_.emplace_back();
+        column.name = name;
+        if (name == sty_Table::kNameColumn) continue;
+        if (name.starts_with('/')) {
+            column.pointers.push_back(name);
+            continue;
+        }
+        const auto parameter = std::ranges::find(parameters, name, &mdf_Parameter::name);
+        if (parameter != parameters.end()) {
+            column.pointers = parameter->pointers;
+            column.range = parameter->range;
+            column.limits = parameter->limits;
+            column.unit = parameter->unit;
+            continue;
+        }
+        const std::string hint = fnd_DidYouMean(name, names);
+        column.problem = "found a column " + fnd_Quoted(name) +
+                         ", expected \"name\", a JSON pointer or a parameter of the template" +
+                         (hint.empty() ? "" : "; " + hint);
+        if (table.HasHeader() && problem_.empty()) problem_ = column.problem;
+    }
+    FindConflicts(table.HasHeader());
+}
+
+void sty_Columns::FindConflicts(bool refuse) {
+    std::vector<std::pair<std::string_view, int>> places;
+    for (std::size_t i = 0; i < columns_.size(); ++i) {
+        for (const std::string& pointer : columns_[i].pointers)
+            places.emplace_back(pointer, static_cast<int>(i));
+    }
+    std::ranges::stable_sort(places, Before, [](const auto& place) { return place.first; });
+    std::size_t above = 0;
+    for (std::size_t i = 1; i < places.size(); ++i) {
+        if (!mdf_IsBelow(places[i].first, places[above].first)) {
+            above = i;
+            continue;
+        }
+        conflicts_.emplace_back(places[above].second, places[i].second);
+    }
+    if (!refuse || conflicts_.empty() || !problem_.empty()) return;
+    const auto [first, second] = conflicts_.front();
+    problem_ = "the columns " + fnd_Quoted(NameOf(first)) + " and " + fnd_Quoted(NameOf(second)) +
+               " change one place of the template";
+}
+
+std::vector<std::string> sty_Columns::Pointers() const {
+    std::vector<std::string> pointers;
+    for (const Column& column : columns_)
+        pointers.insert(pointers.end(), column.pointers.begin(), column.pointers.end());
+    return pointers;
+}
+
+std::string sty_Columns::ProblemOf(const Column& column, const sty_Cell& cell) {
+    if (!column.problem.empty()) return column.problem;
+    if (cell.value.IsObject()) return "found an object, expected a JSON scalar or array";
+    if (column.limits.empty()) return {};
+    double wrong = 0.0;
+    bool outside = false;
+    const bool numbers = AllNumbers(cell.value, [&](double number) {
+        if (!outside && !column.range.Allow(number)) {
+            outside = true;
+            wrong = number;
+        }
+        return true;
+    });
+    const std::string expected = column.limits + (column.unit.empty() ? "" : " " + column.unit);
+    if (!numbers) return "found " + mdf_Shown(cell.value) + ", expected a number, " + expected;
+    return outside ? "found " + (cell.value.IsNumber() ? mdf_Shown(cell.value) : fnd_Shown(wrong)) +
+                         ", expected " + expected
+                   : std::string();
+}
+
+std::vector<sty_Columns::Change> sty_Columns::ChangesOf(const sty_Row& row, const mdf_Template& base,
+                                                        sty_Result& result) const {
+    std::vector<Change> changes;
+    result.row = row.number;
+    result.name = row.name;
+    result.parameters = "{";
+    std::set<int> given;
+    for (const sty_Cell& cell : row.cells) {
+        const Column& column = columns_[static_cast<std::size_t>(cell.column)];
+        if (result.parameters.size() > 1) result.parameters += ", ";
+        sty_AppendQuoted(result.parameters, column.name);
+        result.parameters.append(": ").append(cell.json);
+        if (!conflicts_.empty()) given.insert(cell.column);
+        if (std::string problem = ProblemOf(column, cell); !problem.empty()) {
+            result.errors.push_back({column.name, {}, std::move(problem)});
+            continue;
+        }
+        for (const std::string& pointer : column.pointers) {
+            const auto problem = base.ProblemOf(pointer);
+            if (!problem) {
+                changes.push_back({cell.column, {pointer, cell.value}});
+                continue;
+            }
+            const std::string hint = problem->hint.empty() ? "" : "; " + problem->hint;
+            result.errors.push_back(
+                {column.name, pointer, problem->found + ", expected " + problem->expected + hint});
+        }
+    }
+    result.parameters += '}';
+    for (const auto& [first, second] : conflicts_) {
+        if (!given.contains(first) || !given.contains(second)) continue;
+        result.errors.push_back(
+            {NameOf(second), {}, "changes the place that " + fnd_Quoted(NameOf(first)) + " changes too"});
+    }
+    if (!row.problem.empty()) result.errors.push_back({row.problemColumn, {}, row.problem});
+    return changes;
+}
+
+sty_Variants::sty_Variants(std::unique_ptr<mdf_Template> base, const sty_Columns& columns,
+                           sty_MeshTexts& meshes)
+    : template_(std::move(base)), columns_(columns), meshes_(meshes), text_(meshes) {}
+
+std::unique_ptr<sty_Variants> sty_Variants::Twin() const {
+    return std::make_unique<sty_Variants>(template_->Twin(), columns_, meshes_);
+}
+
+std::string sty_Variants::KeyOf(const fnd_Finding& finding) {
+    return std::string(finding.code->name) + "\n" + finding.place + "\n" + finding.Text();
+}
+
+std::vector<fnd_Finding> sty_Variants::Baseline() {
+    return CheckDeck(template_->Store());
+}
+
+void sty_Variants::LeaveOut(const std::vector<fnd_Finding>& findings) {
+    for (const fnd_Finding& finding : findings) leftOut_.insert(KeyOf(finding));
+}
+
+void sty_Variants::CheckMeshes(const odb_Odb& store, fnd_Sink& sink) {
+    const odiK_Model& model = *store.FindModel(odb_Odb::DefaultModelName());
+    const auto check = [&](const cow_CountedHld<odiK_Mesh>& mesh, std::string_view member,
+                           const cow_String& name) {
+        if (mesh.IsNull()) return;
+        std::string place("/models");
+        fnd_AppendPointer(place, odb_Odb::DefaultModelName());
+        place += member;
+        fnd_AppendPointer(place, name.View());
+        place += "/mesh";
+        Quality& known = qualities_[place];
+        if (!(known.mesh == mesh)) {
+            fnd_List list;
+            dck_CheckMesh(*mesh, place, list);
+            known = {mesh, std::move(list.findings)};
+        }
+        for (const fnd_Finding& finding : known.findings) sink.Take(finding);
+    };
+    for (const auto& [name, part] : model.Parts()) check(part->mesh, "/parts", name);
+    for (const auto& [name, instance] : model.Instances())
+        check(instance->ownMesh, "/assembly/instances", name);
+}
+
+std::vector<fnd_Finding> sty_Variants::CheckDeck(const odb_Odb& store) {
+    fnd_List list;
+    dck_CheckDeck(store, odb_Odb::DefaultModelName(), list);
+    CheckMeshes(store, list);
+    return std::move(list.findings);
+}
+
+void sty_Variants::TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>& changes,
+                              sty_Result& result) {
+    for (const fnd_Finding& finding : report.findings) {
+        if (!finding.IsError() || result.errors.size() >= kMostErrors) continue;
+        // The column whose place the finding is about, or lies around it.
+        const auto blamed = std::ranges::find_if(changes, [&](const sty_Columns::Change& change) {
+            return mdf_IsBelow(finding.place, change.change.pointer);
+        });
+        const std::string column = blamed == changes.end() ? "" : columns_.NameOf(blamed->column);
+        result.errors.push_back({column, finding.place, finding.Text()});
+    }
+}
+
+sty_Result sty_Variants::Make(const sty_Row& row) {
+    sty_Result result;
+    std::vector<sty_Columns::Change> changes = columns_.ChangesOf(row, *template_, result);
+    if (!result.IsDone()) return result;
+    std::vector<mdf_Change> values;
+    for (sty_Columns::Change& change : changes) values.push_back(change.change);
+    mdf_Report report;
+    const std::unique_ptr<odb_Odb> store = template_->Variant(values, report);
+    if (store == nullptr) {
+        TakeErrors(report, changes, result);
+        if (result.errors.empty()) result.errors.push_back({{}, {}, "the variant can't be read"});
+        return result;
+    }
+    std::vector<fnd_Finding> findings = std::move(report.findings);
+    try {
+        for (fnd_Finding& finding : CheckDeck(*store)) findings.push_back(std::move(finding));
+        text_.Begin(*store);
+        oif_Writer(*store).WriteInput(static_cast<oif_MeshTexts&>(text_));
+    } catch (const QRXBasException& failure) {
+        const std::string context = failure.Context();
+        result.errors.push_back({{}, {}, failure.what() + (context.empty() ? "" : " (" + context + ")")});
+    }
+    std::erase_if(findings, [&](const fnd_Finding& finding) { return leftOut_.contains(KeyOf(finding)); });
+    result.findings = std::move(findings);
+    if (!result.IsDone()) return result;
+    result.bytes = text_.Bytes();
+    return result;
+}

@@ -1,0 +1,158 @@
+#include "study/sty_Folder.h"
+#include "store_interface/model/odb_Odb.h"
+#include "study/sty_DeckText.h"
+#include "study/sty_Ledger.h"
+#include "study/sty_Study.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+#include <numeric>
+
+#include <unistd.h>
+
+namespace {
+
+class Scratch {
+public:
+    Scratch() {
+        char name[] = "/tmp/qrx-study-XXXXXX";
+        path_ = ::mkdtemp(name);
+    }
+    ~Scratch() { std::filesystem::remove_all(path_); }
+    std::string Path(const std::string& name = "") const { return path_ + (name.empty() ? "" : "/" + name); }
+
+private:
+    std::string path_;
+};
+
+int WriteOne(int file) {
+    return sty_WriteAll(file, "one");
+}
+
+} // namespace
+
+TEST(sty_Layout, OfUpToAThousandRows_HasNoFolders) {
+    EXPECT_EQ(sty_Layout(9).PathOf(9, ""), "9.inp");
+    EXPECT_EQ(sty_Layout(1000).PathOf(7, ""), "0007.inp");
+    EXPECT_EQ(sty_Layout(1000).PathOf(1000, "A"), "A.inp");
+}
+
+TEST(sty_Layout, OfMoreRows_HasAThousandInAFolderAndAThousandFoldersInOne) {
+    EXPECT_EQ(sty_Layout(1001).PathOf(1000, ""), "000/1000.inp");
+    EXPECT_EQ(sty_Layout(1001).PathOf(1001, ""), "001/1001.inp");
+    EXPECT_EQ(sty_Layout(1'000'000).PathOf(1'000'000, ""), "999/1000000.inp");
+    EXPECT_EQ(sty_Layout(1'000'001).PathOf(1'000'001, ""), "001/000/1000001.inp");
+    EXPECT_EQ(sty_Layout(10'000'000).PathOf(1'234'567, ""), "001/234/01234567.inp");
+    EXPECT_EQ(sty_Layout(10'000'000).PathOf(10'000'000, "last"), "009/999/last.inp");
+}
+
+TEST(sty_RowsOf, Shards_ShareTheRowsEvenlyAndInOrder) {
+    for (const long long rows : {1LL, 5LL, 39LL, 40LL, 2000LL, 10'000'000'000LL}) {
+        long long next = 1;
+        long long least = rows;
+        long long most = 0;
+        for (int shard = 1; shard <= 40; ++shard) {
+            const sty_Rows part = sty_RowsOf(rows, shard, 40);
+            EXPECT_EQ(part.first, next);
+            next = part.last + 1;
+            least = std::min(least, part.last - part.first + 1);
+            most = std::max(most, part.last - part.first + 1);
+        }
+        EXPECT_EQ(next, rows + 1);
+        EXPECT_LE(most - least, 1);
+    }
+}
+
+TEST(sty_Placer, WhereAForeignFileStands_LeavesIt) {
+    const Scratch scratch;
+    sty_Folder folder(scratch.Path());
+    folder.Prepare();
+    std::filesystem::create_directory(scratch.Path("000"));
+    std::ofstream(scratch.Path("000/1.inp")) << "mine";
+    {
+        sty_Placer placer(folder, "job");
+        const auto no = [](const std::string&) { return false; };
+        EXPECT_EQ(placer.Place("000/1.inp", WriteOne, false, no), sty_Placer::Result::FOREIGN);
+        EXPECT_EQ(folder.SizeOf("000/1.inp"), 4);
+        EXPECT_EQ(placer.Place("000/1.inp", WriteOne, true, no), sty_Placer::Result::PLACED);
+        EXPECT_EQ(folder.SizeOf("000/1.inp"), 3);
+        EXPECT_EQ(placer.Place("001/002/3.inp", WriteOne, false, no), sty_Placer::Result::PLACED);
+        const auto yes = [](const std::string& path) { return path.ends_with("001/002/3.inp"); };
+        EXPECT_EQ(placer.Place("001/002/3.inp", WriteOne, false, yes), sty_Placer::Result::PLACED);
+    }
+    EXPECT_TRUE(std::filesystem::is_empty(scratch.Path(sty_Folder::kHidden)));
+}
+
+TEST(sty_Placer, WhenWritingFails_NothingStandsThere) {
+    const Scratch scratch;
+    sty_Folder folder(scratch.Path());
+    folder.Prepare();
+    sty_Placer placer(folder, "job");
+    const auto fail = [](int file) {
+        sty_WriteAll(file, "half");
+        return ENOSPC;
+    };
+    EXPECT_THROW(placer.Place("1.inp", fail, false, [](const std::string&) { return false; }), sty_Refused);
+    EXPECT_EQ(folder.SizeOf("1.inp"), -1);
+}
+
+TEST(sty_Ledger, LinesOfResults_AreReadBack) {
+    sty_Result done;
+    done.row = 17;
+    done.deck = "000/017.inp";
+    done.bytes = 12345678901;
+    done.sha256 = std::string(64, 'a');
+    done.parameters = "{\"a\": \"]}\"}";
+    std::string line = sty_LineOf(done);
+    EXPECT_EQ(line.back(), '\n');
+    line.pop_back();
+    const auto entry = sty_EntryOf(line);
+    ASSERT_TRUE(entry);
+    EXPECT_EQ(entry->row, 17);
+    EXPECT_EQ(entry->deck, "000/017.inp");
+    EXPECT_EQ(entry->bytes, 12345678901);
+    for (std::size_t length = 0; length < line.find("aaa"); ++length)
+        EXPECT_FALSE(sty_EntryOf(std::string_view(line).substr(0, length))) << length;
+
+    sty_Result failed;
+    failed.row = 3;
+    failed.parameters = "{}";
+    failed.errors = {{"column", "/a", "found \"x\", expected\na number"}};
+    line = sty_LineOf(failed);
+    line.pop_back();
+    ASSERT_TRUE(sty_EntryOf(line));
+    EXPECT_TRUE(sty_EntryOf(line)->deck.empty());
+    EXPECT_TRUE(sty_ReasonIn(line).starts_with("found \"x\", expected"));
+}
+
+TEST(sty_DeckText, PiecesOfDecks_AreOneTextWithItsSum) {
+    const Scratch scratch;
+    odb_Odb store;
+    store.AddModel(odb_Odb::DefaultModelName());
+    sty_MeshTexts meshes;
+    sty_DeckText deck(meshes);
+    const auto nodes = std::make_shared<const std::string>(std::string(1000, 'n'));
+    const auto elements = std::make_shared<const std::string>(std::string(500, 'e'));
+    const std::string ends[] = {"end", "another end", "", "end"};
+    const std::string begins[] = {"begin", "begin", "begins", "begin"};
+    for (int i = 0; i < 4; ++i) {
+        deck.Begin(store);
+        deck.Write(begins[i].data(), begins[i].size());
+        deck.WriteKept(nodes);
+        deck.WriteKept(elements);
+        deck.Write(ends[i].data(), ends[i].size());
+        const std::string whole = begins[i] + *nodes + *elements + ends[i];
+        sty_Sha256 sum;
+        sum.Add(whole);
+        EXPECT_EQ(deck.Bytes(), static_cast<long long>(whole.size()));
+        EXPECT_EQ(deck.Sha256(), sum.Hex());
+        const std::string path = scratch.Path(std::to_string(i));
+        std::FILE* file = std::fopen(path.c_str(), "w");
+        EXPECT_EQ(deck.WriteTo(::fileno(file)), 0);
+        std::fclose(file);
+        std::ifstream in(path);
+        EXPECT_EQ(std::string(std::istreambuf_iterator<char>(in), {}), whole);
+    }
+}
