@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Finding.h"
 
 class odb_Odb;
+class odiK_Mesh;
 struct mq_Quality;
 
 /// Everything that can be said of the model "Default Model" of a store before its deck is written, whether
@@ -18,13 +19,14 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
 void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
 /// The part that only the deck writer's rules tell. To be asked of a model without errors.
 void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
-/// Writes the deck of "Default Model" to nowhere: says what is raised, unless it stands among the `told` ones,
-/// and how large a huge deck will be.
+/// Writes the deck of "Default Model" to nowhere: says what is raised, unless it stands among the `told`
+/// ones, and how large a huge deck will be.
 void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink);
-/// The quality of all meshes: elements of negative or zero size, mid-side nodes far away, nodes and elements that
-/// stand twice, nodes of no element, faces that three solids share.
+/// The quality of all meshes: elements of negative or zero size, mid-side nodes far away, nodes and elements
+/// that stand twice, nodes of no element, faces that three solids share.
 void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
-/// The same of one mesh at the place.
+/// The quality of one mesh, and what there is to say of it at a place.
+mq_Quality dck_QualityOf(const odiK_Mesh& mesh);
 void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink);
 
 #endif

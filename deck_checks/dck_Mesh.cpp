@@ -32,13 +32,18 @@ bool HasShape(std::string_view type) {
 }
 
 void CheckMesh(const odiK_Mesh* mesh, const std::string& place, fnd_Sink& sink) {
-    if (mesh == nullptr) return;
-    const odiK_NodeData& nodes = mesh->Nodes();
+    if (mesh != nullptr) dck_TellQuality(dck_QualityOf(*mesh), place, sink);
+}
+
+} // namespace
+
+mq_Quality dck_QualityOf(const odiK_Mesh& mesh) {
+    const odiK_NodeData& nodes = mesh.Nodes();
     std::vector<int> labels;
     labels.reserve(static_cast<std::size_t>(nodes.NumNodes()));
     for (const int label : nodes.labels) labels.push_back(label);
     mq_Mesh arrays{labels, nodes.coordinates, {}};
-    for (const odiK_ElementClass& elements : mesh->Classes()) {
+    for (const odiK_ElementClass& elements : mesh.Classes()) {
         mq_Block block;
         const std::optional<ddb_ElementType> type = ddb_FindElementType(elements.type.View());
         block.labels = elements.labels;
@@ -49,10 +54,8 @@ void CheckMesh(const odiK_Mesh* mesh, const std::string& place, fnd_Sink& sink) 
         if (block.hasShape) block.kind = *type->cell;
         arrays.blocks.push_back(block);
     }
-    dck_TellQuality(mq_QualityOf(arrays), place, sink);
+    return mq_QualityOf(arrays);
 }
-
-} // namespace
 
 void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink) {
     if (quality.inverted.count > 0)

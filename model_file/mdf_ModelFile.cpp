@@ -19,14 +19,15 @@ std::string Found(const mdf_Value* value) {
     return "found " + (value == nullptr ? std::string("nothing") : mdf_Shown(*value));
 }
 
-void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagnostics& diagnostics) {
+void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagnostics& diagnostics,
+                const mdf_GivenMeshes& given) {
     std::vector<std::string> names;
     for (mdf_Member& member : models.Members()) {
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics)) continue;
         names.push_back(member.name);
         odiK_Model& model = odb.AddModel(cow_String(member.name));
-        mdf_ModelReader(model, diagnostics).Read(member.value, place);
+        mdf_ModelReader(model, diagnostics, given).Read(member.value, place);
     }
     if (odb.FindModel(odb_Odb::DefaultModelName()) == nullptr) {
         diagnostics.Add(
@@ -35,7 +36,8 @@ void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagn
     }
 }
 
-std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors, mdf_Report& report) {
+std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors, mdf_Report& report,
+                                      const mdf_GivenMeshes& given) {
     mdf_Diagnostics diagnostics(report);
     if (!IsDocument(errors, diagnostics)) return nullptr;
     const fnd_Path top;
@@ -55,7 +57,7 @@ std::unique_ptr<odb_Odb> ReadDocument(mdf_Value& root, std::vector<fnd_Finding>&
         return nullptr;
     }
     auto odb = std::make_unique<odb_Odb>();
-    ReadModels(*odb, *models, path, diagnostics);
+    ReadModels(*odb, *models, path, diagnostics, given);
     return diagnostics.NumErrors() > 0 ? nullptr : std::move(odb);
 }
 
@@ -75,14 +77,14 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
     mdf_Parse(text, root, errors);
     // The text has gone into the document; of a large file there is no room for both beside the store.
     std::string().swap(text);
-    return ReadDocument(root, errors, report);
+    return ReadDocument(root, errors, report, {});
 }
 
 std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
-                                           mdf_Report& report) {
+                                           mdf_Report& report, const mdf_GivenMeshes& given) {
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
-    return ReadDocument(root, errors, report);
+    return ReadDocument(root, errors, report, given);
 }

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelReader.h"
 
+#include "foundation/thr_Poll.h"
 #include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/model/odiK_ModelRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -56,6 +57,7 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
     mdl_Repository& repository = info.In(model_);
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
+        thr_Poll::Now();
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
         capitals.Enter(member.name, place, "name", diagnostics_);
@@ -133,6 +135,7 @@ void mdf_ModelReader::Propagate(const fnd_Path& path) {
         mdl_Repository& repository = info.In(model_);
         const fnd_Path container(path, std::string_view(info.member));
         for (const cow_String& name : repository.Keys()) {
+            thr_Poll::Now();
             auto& object = static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name));
             const fnd_Path place(container, name.View());
             fnd_Below below(diagnostics_, place);

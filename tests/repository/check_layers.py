@@ -9,7 +9,7 @@ import re
 import sys
 
 DECK_WRITER = "QRXZptIfwOif.m/src"
-CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks"]
+CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "whole_file"]
 
 # What a layer may include besides its own headers.
 ALLOWED = {
@@ -18,6 +18,7 @@ ALLOWED = {
     "keyword_layer": ["foundation", "store_interface"],
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
+    "whole_file": ["foundation"],
     "mesh_file": ["foundation"],
     "deck_reader": ["foundation"],
     "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
@@ -70,7 +71,7 @@ STANDARD = set("""
 # The operating system's own headers, for the output device and the programs.
 SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/single_threaded.h", "sys/stat.h",
           "sys/types.h", "sys/wait.h", "sys/xattr.h"}
-SYSTEM_LAYERS = {"foundation", "mesh_file", "tools"}
+SYSTEM_LAYERS = {"foundation", "whole_file", "mesh_file", "tools"}
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')
 
