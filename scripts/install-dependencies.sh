@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|python] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -12,6 +12,7 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer] ...
   dev     all of these, and the clang tools
   viewer  build, and what the page of "qrxdeck view" is built and tested with: node, a browser, and the packages
           of viewer/package-lock.json
+  python  build, and what the package for Python is built, used and tested with
 END
 }
 
@@ -19,6 +20,8 @@ build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib
 test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
 bench=(libbenchmark-dev libfmt-dev gmsh)
 dev=(clang clang-tidy clang-format)
+
+python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind11 python3-numpy python3-pytest mypy)
 
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
@@ -33,6 +36,7 @@ for task in "$@"; do
         test) packages+=("${test[@]}") ;;
         bench) packages+=("${bench[@]}") ;;
         dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
+        python) packages+=("${python[@]}") ;;
         viewer) packages+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;

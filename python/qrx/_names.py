@@ -10,6 +10,7 @@ _CLASSES = {
     "kbeC_TangentialBehavior": "ConnectorTangentialBehavior",
     "odiK_Coupling": "OtherCoupling",
 }
+_ENUMS = {"kmaC_Foam::HardeningEnm": "FoamHardeningRule"}
 # Classes that answer with the name of another one.
 ALIASES = {"odiK_Tie": "kcoC_Tie"}
 # The tree of a model, which has classes of its own in Python.
@@ -42,6 +43,8 @@ def field_names(fields):
 
 def enum_name(type_name):
     """'StepNlgeom' of 'kprC_Step::NlgeomEnm'."""
+    if type_name in _ENUMS:
+        return _ENUMS[type_name]
     words = type_name.split("::")
     last = re.sub(r"(Enm|Enum)$", "", words[-1])
     if len(words) > 1:
