@@ -5,6 +5,7 @@
 #include "whole_file/whf_File.h"
 
 #include <cerrno>
+#include <cstdio>
 
 void pyx_RaiseWrong(fnd_CodeName code, std::string place, std::string found, std::string expected,
                     std::string hint) {
@@ -16,6 +17,25 @@ void pyx_RaiseErrors(const std::vector<fnd_Finding>& findings) {
     for (const fnd_Finding& finding : findings) {
         if (finding.IsError()) throw pyx_Wrong{findings};
     }
+}
+
+void pyx_RaiseUnreadable(const std::vector<fnd_Finding>& findings) {
+    std::string text;
+    for (const fnd_Finding& finding : findings) {
+        if (finding.code->name == "unreadable-file") text = finding.found;
+    }
+    for (const char* reason : {": the file can't be read", ": there is no such file", ": found a folder"}) {
+        const std::size_t end = text.rfind(reason);
+        if (end == std::string::npos) continue;
+        const std::string path = text.substr(0, end);
+        // The system says its number again.
+        errno = 0;
+        std::FILE* file = std::fopen(path.c_str(), "rb");
+        const int error = file == nullptr ? errno : 0;
+        if (file != nullptr) std::fclose(file);
+        throw pyx_FileRefused{error, text.substr(end + 2), path};
+    }
+    throw pyx_FileRefused{0, text, ""};
 }
 
 py::list pyx_TuplesOf(const std::vector<fnd_Finding>& findings) {

@@ -26,6 +26,9 @@ struct pyx_FileRefused {
     std::string path;
 };
 
+/// Raises it for what a reader said of a file that the system doesn't hand out, "path: why".
+[[noreturn]] void pyx_RaiseUnreadable(const std::vector<fnd_Finding>& findings);
+
 /// A list of the findings' tuples, as qrx.Finding takes them.
 py::list pyx_TuplesOf(const std::vector<fnd_Finding>& findings);
 

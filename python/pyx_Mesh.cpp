@@ -254,7 +254,7 @@ pyx_Mesh pyx_Mesh::OfFile(py::handle request) {
     std::unique_ptr<odb_Odb> store;
     pyx_Released([&] { store = mdf_ReadModelText(text, "", report); });
     for (fnd_Finding& finding : report.findings) finding.place.clear();
-    if (report.unreadable) throw pyx_FileRefused{0, report.findings.front().found, ""};
+    if (report.unreadable) pyx_RaiseUnreadable(report.findings);
     if (store == nullptr) throw pyx_Wrong{report.findings};
     const auto& part = store->FindModel(odb_Odb::DefaultModelName())->Parts().begin()->second;
     return pyx_Mesh(part->mesh, report.meshOrigins.front());

@@ -110,7 +110,7 @@ std::unique_ptr<pyx_Store> pyx_Store::Load(const std::string& path) {
     auto store = std::make_unique<pyx_Store>();
     mdf_Report& report = store->report_;
     pyx_Released([&] { store->odb_ = mdf_ReadModelFile(path, report); });
-    if (report.unreadable) throw pyx_FileRefused{0, report.findings.back().found, ""};
+    if (report.unreadable) pyx_RaiseUnreadable(report.findings);
     if (store->odb_ == nullptr) throw pyx_Wrong{report.findings};
     return store;
 }

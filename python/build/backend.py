@@ -71,7 +71,9 @@ def _run(*command, **options):
 
 
 def _build(folder):
-    """Builds the package's folder and gives it."""
+    """Builds the package's folder and gives it; QRX_BUILT_PACKAGE names one that is built already."""
+    if "QRX_BUILT_PACKAGE" in os.environ:
+        return pathlib.Path(os.environ["QRX_BUILT_PACKAGE"])
     given = os.environ.get("QRX_PACKAGE_BUILD_DIR")
     build = pathlib.Path(given) if given else pathlib.Path(folder) / "build"
     flags = f"-O2 -DNDEBUG -ffile-prefix-map={ROOT}=. -ffile-prefix-map={build}=build"

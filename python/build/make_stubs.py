@@ -25,12 +25,13 @@ _Set = TypeVar("_Set")
 _T = TypeVar("_T", bound="Record")
 _Path = str | os.PathLike[str]
 _Number = float | np.floating[Any] | np.integer[Any]
-_Rows = Sequence[Sequence[_Number]] | NDArray[Any]
-_Table = _Rows | Sequence[_Number] | _Number
-_Triple = Sequence[_Number] | NDArray[Any]
+_Rows = Sequence[Sequence[float]] | NDArray[Any]
+_Table = Sequence[Sequence[float] | float] | NDArray[Any] | _Number
+_Triple = Sequence[float] | NDArray[Any]
+_Places = Sequence[Sequence[int]] | NDArray[Any]
 _Region = str | tuple[str | None, str] | tuple["Instance", str] | Mapping[str, str] | None
 _Datum = str | "Datum" | None
-_Complex = builtins.complex | "Polar" | Sequence[_Number]
+_Complex = builtins.complex | "Polar" | Sequence[float]
 
 class _Attr(Generic[_Get, _Set]):
     @overload
@@ -110,7 +111,7 @@ class _HasCells(Protocol):
     @property
     def cells(self) -> Any: ...
 
-_Cells = Mapping[str, ArrayLike] | Iterable[tuple[str, ArrayLike]]
+_Cells = Mapping[str, _Places] | Iterable[tuple[str, _Places]]
 
 class Mesh:
     @overload
@@ -119,7 +120,7 @@ class Mesh:
                  group_arrays: Sequence[str] = ...,
                  surfaces: Mapping[str, Any] = ...) -> None: ...
     @overload
-    def __init__(self, points: ArrayLike, cells: _Cells, *, point_labels: ArrayLike | None = ...,
+    def __init__(self, points: _Rows, cells: _Cells, *, point_labels: ArrayLike | None = ...,
                  cell_labels: Mapping[str, ArrayLike] | Sequence[ArrayLike] | None = ...,
                  point_sets: Mapping[str, ArrayLike] | None = ..., cell_sets: Mapping[str, Any] | None = ...,
                  surfaces: Mapping[str, Any] | None = ..., controls: Mapping[str, ElemCtrlParams] | None = ...,
