@@ -60,6 +60,10 @@ class DeckError(Exception):
         return f"{self.text} ({self.context})" if self.context else self.text
 
 
+for _class in (Finding, ModelError, DeckError):
+    _class.__module__ = "qrx"
+
+
 def wrong(place, found, expected="", hint=""):
     """The error of one finding."""
     return ModelError([Finding(place, found, expected, hint, "error", "wrong-value")])

@@ -24,6 +24,7 @@ ALLOWED = {
     "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
     "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page"],
+    "python": CORE + ["mesh_file", "model_file", "deck_reader", "view_page", "tools"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
@@ -55,6 +56,7 @@ LIBRARIES = {
     "model_file": ["nlohmann/"],
     "view_page": ["nlohmann/"],
     "tools": ["nlohmann/", "CLI/"],
+    "python": ["nlohmann/", "pybind11/"],
 }
 
 STANDARD = set("""
