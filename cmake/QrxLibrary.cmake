@@ -22,7 +22,7 @@ set_target_properties(QRXZptInputFileWriter PROPERTIES
 
 # Installed headers keep the paths that they have in the tree, so that includes read the same there.
 set(qrx_include_dir ${CMAKE_INSTALL_INCLUDEDIR}/${QRX_INCLUDE_SUBDIR})
-foreach(layer foundation store_interface keyword_layer deck_checks)
+foreach(layer foundation store_interface keyword_layer deck_checks whole_file)
     install(DIRECTORY ${PROJECT_SOURCE_DIR}/${layer}/ DESTINATION ${qrx_include_dir}/${layer}
         FILES_MATCHING PATTERN "*.h" PATTERN "*.inl")
 endforeach()

@@ -5,6 +5,7 @@
 #include "deck_checks/dck_Checks.h"
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
+#include "foundation/thr_Poll.h"
 #include "store_interface/model/odb_Odb.h"
 
 #include <algorithm>
@@ -13,7 +14,10 @@ namespace {
 
 class Counter final : public qio_ostream {
 public:
-    void Write(const char*, std::size_t length) override { bytes += static_cast<long long>(length); }
+    void Write(const char*, std::size_t length) override {
+        thr_Poll::Now();
+        bytes += static_cast<long long>(length);
+    }
     long long bytes = 0;
 };
 

@@ -25,7 +25,8 @@ void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fn
 /// The quality of all meshes: elements of negative or zero size, mid-side nodes far away, nodes and elements
 /// that stand twice, nodes of no element, faces that three solids share.
 void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
-/// The same of one mesh at the place, and of the quality of one.
+/// The quality of one mesh, and what there is to say of it at a place.
+mq_Quality dck_QualityOf(const odiK_Mesh& mesh);
 void dck_CheckMesh(const odiK_Mesh& mesh, const std::string& place, fnd_Sink& sink);
 void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink);
 

@@ -33,6 +33,26 @@ bool HasShape(std::string_view type) {
 
 } // namespace
 
+mq_Quality dck_QualityOf(const odiK_Mesh& mesh) {
+    const odiK_NodeData& nodes = mesh.Nodes();
+    std::vector<int> labels;
+    labels.reserve(static_cast<std::size_t>(nodes.NumNodes()));
+    for (const int label : nodes.labels) labels.push_back(label);
+    mq_Mesh arrays{labels, nodes.coordinates, {}};
+    for (const odiK_ElementClass& elements : mesh.Classes()) {
+        mq_Block block;
+        const std::optional<ddb_ElementType> type = ddb_FindElementType(elements.type.View());
+        block.labels = elements.labels;
+        block.nodes = elements.connectivity;
+        block.width = elements.nodesPerElement;
+        block.plane = elements.shape.topologicalDimension == 2 && elements.shape.embeddingDimension == 2;
+        block.hasShape = type && type->cell && HasShape(elements.type.View());
+        if (block.hasShape) block.kind = *type->cell;
+        arrays.blocks.push_back(block);
+    }
+    return mq_QualityOf(arrays);
+}
+
 void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Sink& sink) {
     if (quality.inverted.count > 0)
         sink.Add("inverted-elements", place, Told(quality.inverted, "element", "of negative or zero size"));
@@ -53,23 +73,7 @@ void dck_TellQuality(const mq_Quality& quality, const std::string& place, fnd_Si
 }
 
 void dck_CheckMesh(const odiK_Mesh& mesh, const std::string& place, fnd_Sink& sink) {
-    const odiK_NodeData& nodes = mesh.Nodes();
-    std::vector<int> labels;
-    labels.reserve(static_cast<std::size_t>(nodes.NumNodes()));
-    for (const int label : nodes.labels) labels.push_back(label);
-    mq_Mesh arrays{labels, nodes.coordinates, {}};
-    for (const odiK_ElementClass& elements : mesh.Classes()) {
-        mq_Block block;
-        const std::optional<ddb_ElementType> type = ddb_FindElementType(elements.type.View());
-        block.labels = elements.labels;
-        block.nodes = elements.connectivity;
-        block.width = elements.nodesPerElement;
-        block.plane = elements.shape.topologicalDimension == 2 && elements.shape.embeddingDimension == 2;
-        block.hasShape = type && type->cell && HasShape(elements.type.View());
-        if (block.hasShape) block.kind = *type->cell;
-        arrays.blocks.push_back(block);
-    }
-    dck_TellQuality(mq_QualityOf(arrays), place, sink);
+    dck_TellQuality(dck_QualityOf(mesh), place, sink);
 }
 
 void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink) {

@@ -1,5 +1,7 @@
 #include "foundation/nex_Exception.h"
 
+#include "foundation/thr_Poll.h"
+
 #include <string>
 
 namespace {
@@ -17,6 +19,7 @@ void nex_Raise(const atr_String& text) {
 
 nex_Context::nex_Context(const char* kind, const atr_StringBase& name)
     : kind_(kind), name_(&name), outer_(innermost) {
+    thr_Poll::Now();
     innermost = this;
 }
 

@@ -7,6 +7,7 @@
 /// Reads what a model file's text was parsed to; its bulk arrays are moved out. Null when there are errors,
 /// those of the parser included.
 std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
-                                          mdf_Report& report, mdf_MeshShelf* shelf = nullptr);
+                                          mdf_Report& report, mdf_MeshShelf* shelf = nullptr,
+                                          const mdf_GivenMeshes& given = {});
 
 #endif

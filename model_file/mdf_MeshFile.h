@@ -34,9 +34,10 @@ public:
     static const std::vector<std::string>& Members();
     /// False when there is no mesh.
     bool Read(odiK_Mesh& mesh, const mdf_Value& json, const fnd_Path& path);
+    /// What is asked alone. False after an error.
+    bool ReadRequest(mdf_MeshFileRequest& request, const mdf_Value& json, const fnd_Path& path);
 
 private:
-    bool ReadRequest(mdf_MeshFileRequest& request, const mdf_Value& json, const fnd_Path& path);
     void ReadFileName(mdf_MeshFileRequest& request, const mdf_Value& json, const fnd_Path& path);
     void ReadElementTypes(mdf_MeshFileRequest& request, const mdf_Value& json, const fnd_Path& path);
     void ReadSurfaceElements(mdf_MeshFileRequest& request, const mdf_Value& json, const fnd_Path& path);

@@ -19,6 +19,8 @@ std::size_t NumElements(const cow_CountedHld<odiK_Mesh>& mesh) {
 } // namespace
 
 cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const fnd_Path& path) {
+    if (json.IsInt() && json.Int() >= 0 && static_cast<std::size_t>(json.Int()) < given_.size())
+        return given_[static_cast<std::size_t>(json.Int())];
     if (shelf_ == nullptr) return ReadNewMesh(json, path);
     const mdf_MeshShelf::Key key = shelf_->KeyOf(json, path, diagnostics_.FileName());
     if (const std::shared_ptr<const mdf_MeshShelf::Entry> known = shelf_->Find(key)) {

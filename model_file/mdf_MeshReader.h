@@ -8,8 +8,9 @@
 /// memory.
 class mdf_MeshReader {
 public:
-    mdf_MeshReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics)
-        : model_(model), records_(records), diagnostics_(diagnostics) {}
+    mdf_MeshReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics,
+                   const mdf_GivenMeshes& given)
+        : model_(model), records_(records), diagnostics_(diagnostics), given_(given) {}
 
     /// Takes meshes that are there already from the shelf, which must outlive the reader.
     void TakeFrom(mdf_MeshShelf& shelf) { shelf_ = &shelf; }
@@ -62,6 +63,7 @@ private:
     odiK_Model& model_;
     mdf_RecordReader& records_;
     mdf_Diagnostics& diagnostics_;
+    const mdf_GivenMeshes& given_;
     // Meshes that lack nodes or elements because of errors: what refers to these is not reported too.
     std::set<const odiK_Mesh*> incomplete_;
     bool lacksMesh_ = false;

@@ -23,14 +23,14 @@ std::string Found(const mdf_Value* value) {
 }
 
 void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagnostics& diagnostics,
-                mdf_MeshShelf* shelf) {
+                mdf_MeshShelf* shelf, const mdf_GivenMeshes& given) {
     std::vector<std::string> names;
     for (mdf_Member& member : models.Members()) {
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics)) continue;
         names.push_back(member.name);
         odiK_Model& model = odb.AddModel(cow_String(member.name));
-        mdf_ModelReader reader(model, diagnostics);
+        mdf_ModelReader reader(model, diagnostics, given);
         if (shelf != nullptr) reader.TakeFrom(*shelf);
         reader.Read(member.value, place);
     }
@@ -44,7 +44,8 @@ void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagn
 } // namespace
 
 std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
-                                          mdf_Report& report, mdf_MeshShelf* shelf) {
+                                          mdf_Report& report, mdf_MeshShelf* shelf,
+                                          const mdf_GivenMeshes& given) {
     mdf_Diagnostics diagnostics(report);
     if (!IsDocument(errors, diagnostics)) return nullptr;
     const fnd_Path top;
@@ -66,7 +67,7 @@ std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Findi
     // While the arrays that their pointers lead through are there.
     report.parameters = mdf_ReadParameters(root, diagnostics);
     auto odb = std::make_unique<odb_Odb>();
-    ReadModels(*odb, *models, path, diagnostics, shelf);
+    ReadModels(*odb, *models, path, diagnostics, shelf, given);
     return diagnostics.NumErrors() > 0 ? nullptr : std::move(odb);
 }
 
@@ -96,12 +97,12 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
 }
 
 std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
-                                           mdf_Report& report) {
+                                           mdf_Report& report, const mdf_GivenMeshes& given) {
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
-    std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report);
+    std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report, nullptr, given);
     mdf_Locate(text, report.findings);
     return odb;
 }

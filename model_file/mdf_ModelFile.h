@@ -18,6 +18,7 @@ inline constexpr char mdf_kFormat[] = "qrx-model/1";
 
 class mdf_FileText;
 class odiK_Mesh;
+using mdf_GivenMeshes = std::vector<cow_CountedHld<odiK_Mesh>>;
 
 /// Where a mesh came from that the model file only names: {"file": ...}.
 struct mdf_MeshOrigin {
@@ -72,8 +73,10 @@ std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding);
 /// Reads a model file, or its text, into a store. Null when there are errors; warnings alone don't hinder.
 /// The store's models are complete: every name is resolved and every status is known.
 std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report);
+/// `given`: meshes that are in memory already, shared, not copied; the member "mesh" of a part or an instance
+/// names one by its place.
 std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
-                                           mdf_Report& report);
+                                           mdf_Report& report, const mdf_GivenMeshes& given = {});
 
 /// Writes all models of a store as a model file; fields that have their default are left out. False when the
 /// stream failed.

@@ -1,5 +1,6 @@
 #include "model_file/mdf_ModelReader.h"
 
+#include "foundation/thr_Poll.h"
 #include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/model/odiK_ModelRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -54,6 +55,7 @@ void mdf_ModelReader::ReadRepository(const odiK_Repository& info, const mdf_Valu
     mdl_Repository& repository = info.In(model_);
     mdf_CapitalsCheck capitals;
     for (const mdf_Member& member : json.Members()) {
+        thr_Poll::Now();
         const fnd_Path place(path, member.name);
         if (!fnd_CheckName(member.name, place, diagnostics_)) continue;
         capitals.Enter(member.name, place, "name", diagnostics_);
@@ -153,6 +155,7 @@ void mdf_ModelReader::Propagate(const fnd_Path& path) {
         mdl_Repository& repository = info.In(model_);
         const fnd_Path container(path, std::string_view(info.member));
         for (const cow_String& name : repository.Keys()) {
+            thr_Poll::Now();
             PropagateObject(static_cast<kprC_PropagatingObject&>(repository.WritableRecord(name)), timeline,
                             fnd_Path(container, name.View()));
         }

@@ -7,9 +7,10 @@
 /// Reads one model of a model file into an empty model of a store.
 class mdf_ModelReader {
 public:
-    mdf_ModelReader(odiK_Model& model, mdf_Diagnostics& diagnostics)
+    /// The given meshes must outlive the reader.
+    mdf_ModelReader(odiK_Model& model, mdf_Diagnostics& diagnostics, const mdf_GivenMeshes& given)
         : model_(model), diagnostics_(diagnostics), records_(model, diagnostics),
-          tree_(model, records_, diagnostics) {}
+          tree_(model, records_, diagnostics, given) {}
 
     /// Takes meshes that are there already from the shelf, which must outlive the reader.
     void TakeFrom(mdf_MeshShelf& shelf) { tree_.TakeFrom(shelf); }

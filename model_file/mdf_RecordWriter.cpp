@@ -87,16 +87,6 @@ bool SameZeros(const cls_FieldType& type, const void* a, const void* b) {
     }
 }
 
-/// What a file gets that says nothing of the field.
-bool IsDefault(const cls_Field& field, const cls_Record& record, const cls_Record& byDefault) {
-    const void* value = field.In(record);
-    if (field.defaultItems == nullptr)
-        return field.type->Equal(value, field.In(byDefault)) &&
-               SameZeros(*field.type, value, field.In(byDefault));
-    const cow_List<double> items = field.defaultItems(record);
-    return *static_cast<const cow_List<double>*>(value) == items && SameZeros(*field.type, value, &items);
-}
-
 /// The word that a reader takes for the number, or nothing.
 std::string WordOf(const cls_Field& field, int number) {
     for (const cls_IntMeaning& meaning : field.meanings) {
@@ -125,6 +115,15 @@ bool IsShort(const cls_FieldType& type) {
 
 } // namespace
 
+bool mdf_IsDefault(const cls_Field& field, const cls_Record& record, const cls_Record& byDefault) {
+    const void* value = field.In(record);
+    if (field.defaultItems == nullptr)
+        return field.type->Equal(value, field.In(byDefault)) &&
+               SameZeros(*field.type, value, field.In(byDefault));
+    const cow_List<double> items = field.defaultItems(record);
+    return *static_cast<const cow_List<double>*>(value) == items && SameZeros(*field.type, value, &items);
+}
+
 void mdf_RecordWriter::WriteFields(const cls_Record& record, std::string_view passedOver) {
     const std::unique_ptr<cls_Record> byDefault(cls_Classes().Find(record.DynTypeId())->create());
     for (const cls_Field& field : record.DynFields().All()) {
@@ -135,7 +134,7 @@ void mdf_RecordWriter::WriteFields(const cls_Record& record, std::string_view pa
 void mdf_RecordWriter::WriteField(const cls_Field& field, const cls_Record& record,
                                   const cls_Record& byDefault) {
     if (field.notModelData) return;
-    if (field.required || !IsDefault(field, record, byDefault)) WriteMember(field, record);
+    if (field.required || !mdf_IsDefault(field, record, byDefault)) WriteMember(field, record);
 }
 
 void mdf_RecordWriter::WriteMember(const cls_Field& field, const cls_Record& record) {

@@ -4,6 +4,9 @@
 #include "model_file/mdf_Writer.h"
 #include "store_interface/model/odiK_Model.h"
 
+/// What a file gets that says nothing of the field, signs of zeros included.
+bool mdf_IsDefault(const cls_Field& field, const cls_Record& record, const cls_Record& byDefault);
+
 /// Writes records of any class by their field tables. Fields that have their default are left out.
 class mdf_RecordWriter {
 public:

@@ -7,9 +7,10 @@
 /// Reads the frame of a model: its data, datums, parts and assembly, field by field of their tables.
 class mdf_TreeReader {
 public:
-    mdf_TreeReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics)
+    mdf_TreeReader(odiK_Model& model, mdf_RecordReader& records, mdf_Diagnostics& diagnostics,
+                   const mdf_GivenMeshes& given)
         : model_(model), records_(records), diagnostics_(diagnostics), datums_(model, records, diagnostics),
-          meshes_(model, records, diagnostics) {}
+          meshes_(model, records, diagnostics, given) {}
 
     /// Reads the fields of an object of the frame, in the order of its table.
     void ReadFields(cls_Record& frame, mdf_Value& json, const fnd_Path& path);

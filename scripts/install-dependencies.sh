@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -13,6 +13,7 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster] ...
   viewer  build, and what the page of "qrxdeck view" is built and tested with: node, a browser, and the packages
           of viewer/package-lock.json
   cluster test, and the schedulers that run the shards of studies
+  python  build, and what the package for Python is built, used and tested with
 END
 }
 
@@ -22,6 +23,8 @@ bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
 cluster=(slurmctld slurmd slurm-client munge snakemake iproute2 util-linux)
+python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind11 python3-numpy python3-pytest mypy)
+
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
 command -v node >/dev/null && command -v npm >/dev/null || viewer+=(nodejs npm)
@@ -36,6 +39,7 @@ for task in "$@"; do
         bench) packages+=("${bench[@]}") ;;
         dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
         cluster) packages+=("${test[@]}" "${cluster[@]}") ;;
+        python) packages+=("${python[@]}") ;;
         viewer) packages+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;

@@ -1,7 +1,7 @@
 #ifndef QRX_TOOLS_COMMANDPARTS_H
 #define QRX_TOOLS_COMMANDPARTS_H
 
-#include "tools/DeckFile.h"
+#include "whole_file/whf_File.h"
 #include "tools/RunReport.h"
 
 #include <list>
@@ -15,7 +15,7 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
 /// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
 /// there is to say of it, for which everything that can fail is done before the file stands. What `write`
 /// raises beyond that comes through.
-bool ReplaceFile(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell,
+bool ReplaceFile(whf_File& file, const whf_File::Write& write, const whf_File::Ready& tell,
                  RunReport& report);
 /// Replaces the file as a whole by what `write` gives, or leaves it as it was; false when the file system
 /// refuses. Messages call the file by the word `thing`.

@@ -12,13 +12,13 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
-#include "tools/DeckFile.h"
 #include "tools/MeshDescription.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
 #include "tools/OutOfMemory.h"
 #include "tools/StandardStreams.h"
 #include "tools/VariableList.h"
+#include "whole_file/whf_File.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -143,16 +143,16 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
     return odb;
 }
 
-bool ReplaceFile(DeckFile& file, const DeckFile::Write& write, const DeckFile::Ready& tell,
+bool ReplaceFile(whf_File& file, const whf_File::Write& write, const whf_File::Ready& tell,
                  RunReport& report) {
-    DeckFile::Result result;
+    whf_File::Result result;
     const auto ready = [&](long long bytes) {
         tell(bytes);
         if (!report.PrepareForSuccess()) throw OutputIsLost();
     };
     try {
         result = file.Replace(write, ready);
-    } catch (const DeckFileError& failure) {
+    } catch (const whf_Error& failure) {
         report.Error(file.Target(), failure.what());
         return false;
     } catch (const OutputIsLost&) {
@@ -207,7 +207,7 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     const std::vector<dck_KindCount> counts = dck_CountsOfDeck(*model);
     const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(odb, *model);
 
-    DeckFile deck(target);
+    whf_File deck(target);
     fnd_List list;
     try {
         dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
@@ -296,7 +296,7 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
 
 bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,
                  RunReport& report) {
-    DeckFile file(target, DeckFileSystem::Standard(), thing);
+    whf_File file(target, whf_System::Standard(), thing);
     return ReplaceFile(
         file, write, [](long long) {}, report);
 }

@@ -1,7 +1,7 @@
 #include "tools/OutOfMemory.h"
 
 #include "tools/RunReport.h"
-#include "tools/SignalCleanUp.h"
+#include "whole_file/whf_SignalCleanUp.h"
 #include "tools/StandardStreams.h"
 
 #include <new>
@@ -25,7 +25,7 @@ void OutOfMemory::MarkWritten() noexcept {
 }
 
 void OutOfMemory::End() noexcept {
-    SignalCleanUp::Remove();
+    whf_SignalCleanUp::Remove();
     const ExitCode code = isWritten ? ExitCode::REPORT_LOST : ExitCode::FILE_SYSTEM_REFUSED;
     if (tellsAsJson && !isWritten) {
         WriteToStandardOutput(

@@ -66,9 +66,9 @@ bool Open(const std::string& file) {
 }
 
 /// Writes the file as a whole, and tells of it as a member of the report.
-bool Write(const std::string& target, const char* thing, const char* member, const DeckFile::Write& write,
+bool Write(const std::string& target, const char* thing, const char* member, const whf_File::Write& write,
            RunReport& report) {
-    DeckFile file(target, DeckFileSystem::Standard(), thing);
+    whf_File file(target, whf_System::Standard(), thing);
     const auto tell = [&](long long bytes) {
         report.Print(fnd_Visible(target) + ": " + std::to_string(bytes) + " bytes\n");
         report.Member(member) = {{"target", target}, {"bytes", bytes}};

@@ -2,7 +2,7 @@
 #include "faults/FailingAllocations.h"
 #include "faults/Store.h"
 #include "support/TestFolder.h"
-#include "tools/DeckFile.h"
+#include "whole_file/whf_File.h"
 
 #include <gtest/gtest.h>
 
@@ -24,7 +24,7 @@ TEST(Memory, EachAllocationFailing_LeavesTheOldDeckWholeAndNoDebris) {
         {
             const FailingAllocation failing(n);
             try {
-                DeckFile deck(target);
+                whf_File deck(target);
                 deck.Replace([&odb](qio_ostream& device) { oif_Writer(odb).WriteInput(device); });
             } catch (const std::bad_alloc&) {
                 raised = true;

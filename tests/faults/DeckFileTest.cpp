@@ -1,4 +1,4 @@
-#include "tools/DeckFile.h"
+#include "whole_file/whf_File.h"
 
 #include "deck/oif_Writer.h"
 #include "faults/Store.h"
@@ -37,8 +37,8 @@ struct Fault {
 
 Fault fault;
 
-const DeckFileSystem& Real() {
-    return DeckFileSystem::Standard();
+const whf_System& Real() {
+    return whf_System::Standard();
 }
 
 int Refuse() {
@@ -46,7 +46,7 @@ int Refuse() {
     return -1;
 }
 
-constexpr DeckFileSystem kFaultyFiles{
+constexpr whf_System kFaultyFiles{
     [](const char* path, char* buffer, std::size_t bytes) {
         return fault.Fails("readlink") ? static_cast<ssize_t>(Refuse())
                                        : Real().readlink(path, buffer, bytes);
@@ -112,18 +112,18 @@ protected:
         FillStore(odb_, 12000);
     }
 
-    void WriteTo(DeckFile& deck) {
+    void WriteTo(whf_File& deck) {
         result_ = deck.Replace([this](qio_ostream& device) { oif_Writer(odb_).WriteInput(device); });
     }
 
     /// Whether the write succeeded; the error stands in failure_.
-    bool Write(const DeckFileSystem& files, const qio_System& device) {
+    bool Write(const whf_System& files, const qio_System& device) {
         const qio_SystemSwap swap(device);
-        DeckFile deck(folder_.Path("job.inp"), files);
+        whf_File deck(folder_.Path("job.inp"), files);
         try {
             WriteTo(deck);
             return true;
-        } catch (const DeckFileError& error) {
+        } catch (const whf_Error& error) {
             failure_ = error.what();
             error_ = error.Error();
             return false;
@@ -132,14 +132,14 @@ protected:
 
     std::string WholeDeck() {
         const TestFolder other;
-        DeckFile deck(other.Path("job.inp"));
+        whf_File deck(other.Path("job.inp"));
         WriteTo(deck);
         return other.Text("job.inp");
     }
 
     odb_Odb odb_;
     TestFolder folder_;
-    DeckFile::Result result_;
+    whf_File::Result result_;
     std::string failure_;
     int error_ = 0;
 };
@@ -294,7 +294,7 @@ TEST_F(DeckFileTest, LinkOfAnotherUserWhereAllMayWrite_IsNotFollowed) {
     folder_.Put("precious", kOldDeck);
     std::filesystem::create_symlink("precious", folder_.Path("job.inp"));
     static bool isSticky = false;
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.inspect = [](int at, const char* name, struct stat* found) {
         const int result = Real().inspect(at, name, found);
         if (S_ISLNK(found->st_mode)) found->st_uid = 4711;
@@ -341,7 +341,7 @@ TEST_F(DeckFileTest, NewDeck_HasTheModeOfAnyNewFile) {
 }
 
 TEST_F(DeckFileTest, GroupThatCannotBeKept_GivesTheNewOneNoMoreThanAllHave) {
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.chown = [](int, uid_t, gid_t) {
         errno = EPERM;
         return -1;
@@ -359,7 +359,7 @@ TEST_F(DeckFileTest, OwnerAndGroup_AreAskedForAsTheyWere) {
     folder_.Put("job.inp", kOldDeck);
     static std::vector<std::pair<uid_t, gid_t>> asked;
     asked.clear();
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.inspect = [](int at, const char* name, struct stat* found) {
         const int result = Real().inspect(at, name, found);
         if (std::string_view(name) == "job.inp") {
@@ -392,7 +392,7 @@ TEST_F(DeckFileTest, LinkInThePlaceOfTheFreshFolder_IsNotFollowed) {
     std::filesystem::create_directory(folder_.Path("trap"));
     static std::string trap;
     trap = folder_.Path("trap");
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.makeFolder = [](int at, const char* name) {
         const int made = Real().makeFolder(at, name);
         if (made == 0 && ::renameat(at, name, at, "away") == 0) return ::symlinkat(trap.c_str(), at, name);
@@ -407,7 +407,7 @@ TEST_F(DeckFileTest, LinkThatComesLater_DoesNotRedirectTheDeck) {
     std::filesystem::create_directory(folder_.Path("trap"));
     static std::string folder;
     folder = folder_.Path();
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.create = [](int at, const char* name, mode_t mode) {
         for (const auto& entry : std::filesystem::directory_iterator(folder)) {
             if (!entry.path().filename().string().starts_with(".qrxdeck-")) continue;
@@ -427,7 +427,7 @@ TEST_F(DeckFileTest, FileThatIsThereAlready_IsNotWrittenTo) {
     folder_.Put("precious", kOldDeck);
     static std::string precious;
     precious = folder_.Path("precious");
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.create = [](int at, const char* name, mode_t mode) {
         EXPECT_EQ(::symlinkat(precious.c_str(), at, name), 0);
         return Real().create(at, name, mode);
@@ -477,7 +477,7 @@ TEST_F(DeckFileTest, HiddenThingsThatAreNoLeavings_Stay) {
 
 TEST_F(DeckFileTest, NothingIsToldAfterTheRenaming_WhatTellsMayStillRefuse) {
     folder_.Put("job.inp", kOldDeck);
-    DeckFile deck(folder_.Path("job.inp"));
+    whf_File deck(folder_.Path("job.inp"));
     long long told = 0;
     const auto write = [this](qio_ostream& device) { oif_Writer(odb_).WriteInput(device); };
     EXPECT_THROW(deck.Replace(write,
@@ -493,7 +493,7 @@ TEST_F(DeckFileTest, NothingIsToldAfterTheRenaming_WhatTellsMayStillRefuse) {
 }
 
 TEST_F(DeckFileTest, FileSystemWithoutSync_IsNoFailure) {
-    DeckFileSystem files = Real();
+    whf_System files = Real();
     files.sync = [](int) {
         errno = EINVAL;
         return -1;
@@ -504,7 +504,7 @@ TEST_F(DeckFileTest, FileSystemWithoutSync_IsNoFailure) {
 
 TEST_F(DeckFileTest, WriterRaises_LeavesTheOldDeckWholeAndPassesTheExceptionOn) {
     folder_.Put("job.inp", kOldDeck);
-    DeckFile deck(folder_.Path("job.inp"));
+    whf_File deck(folder_.Path("job.inp"));
     EXPECT_THROW(deck.Replace([this](qio_ostream& device) {
         oif_Writer(odb_).WriteInput(device);
         nex_Raise("no");
@@ -517,7 +517,7 @@ TEST_F(DeckFileTest, WriterRaises_LeavesTheOldDeckWholeAndPassesTheExceptionOn) 
 TEST_F(DeckFileTest, TargetWithoutFolder_StandsInTheCurrentOne) {
     const auto former = std::filesystem::current_path();
     std::filesystem::current_path(folder_.Path(""));
-    DeckFile deck("a b.c \xC3\xA4.inp");
+    whf_File deck("a b.c \xC3\xA4.inp");
     WriteTo(deck);
     std::filesystem::current_path(former);
     EXPECT_EQ(folder_.Entries(), Names({"a b.c \xC3\xA4.inp"}));

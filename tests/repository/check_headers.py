@@ -18,8 +18,8 @@ import tempfile
 
 from check_layers import DECK_WRITER
 
-FOLDERS = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "mesh_file", "model_file",
-           "deck_reader", "view_page"]
+FOLDERS = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "whole_file", "mesh_file",
+           "model_file", "deck_reader", "view_page", "study"]
 MANY = 4
 
 # Containers and strings give these too.

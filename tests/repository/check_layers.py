@@ -9,7 +9,7 @@ import re
 import sys
 
 DECK_WRITER = "QRXZptIfwOif.m/src"
-CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks"]
+CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "whole_file"]
 
 # What a layer may include besides its own headers.
 ALLOWED = {
@@ -18,12 +18,14 @@ ALLOWED = {
     "keyword_layer": ["foundation", "store_interface"],
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
+    "whole_file": ["foundation"],
     "mesh_file": ["foundation"],
     "deck_reader": ["foundation"],
     "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
     "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "study": CORE + ["model_file"],
     "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page", "study"],
+    "python": CORE + ["mesh_file", "model_file", "deck_reader", "view_page", "study", "tools"],
 }
 # The rooms of a layer, lowest first: a room includes its own headers and those of the rooms before it. Rooms of
 # one line don't know each other.
@@ -56,6 +58,7 @@ LIBRARIES = {
     "view_page": ["nlohmann/"],
     "study": ["sha2.h"],
     "tools": ["nlohmann/", "CLI/"],
+    "python": ["nlohmann/", "pybind11/"],
 }
 
 STANDARD = set("""
@@ -72,7 +75,7 @@ STANDARD = set("""
 # The operating system's own headers, for the output device and the programs.
 SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h",
           "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
-SYSTEM_LAYERS = {"foundation", "mesh_file", "study", "tools"}
+SYSTEM_LAYERS = {"foundation", "whole_file", "mesh_file", "study", "tools"}
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*(?:"([^"]*)"|<([^>]*)>|(\S.*))')
 

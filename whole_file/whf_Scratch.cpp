@@ -1,6 +1,6 @@
-#include "tools/ScratchFolder.h"
+#include "whole_file/whf_Scratch.h"
 
-#include "tools/SignalCleanUp.h"
+#include "whole_file/whf_SignalCleanUp.h"
 
 #include <cerrno>
 #include <memory>
@@ -20,26 +20,26 @@ bool IsOurs(const struct stat& found) {
     return S_ISDIR(found.st_mode) && found.st_uid == ::geteuid() && (found.st_mode & 077) == 0;
 }
 
-void RemoveIfLeft(int folder, const char* name, const DeckFileSystem& system) {
-    const Descriptor opened(system.openFolder(folder, name, kFolderFlags), system);
+void RemoveIfLeft(int folder, const char* name, const whf_System& system) {
+    const whf_Descriptor opened(system.openFolder(folder, name, kFolderFlags), system);
     struct stat found = {};
     if (opened.Number() < 0 || system.inspectOpen(opened.Number(), &found) != 0 || !IsOurs(found)) return;
     if (system.lock(opened.Number()) != 0) return;
-    system.remove(opened.Number(), ScratchFolder::kFileName);
+    system.remove(opened.Number(), whf_Scratch::kFileName);
     system.removeFolder(folder, name);
 }
 
 } // namespace
 
-int Descriptor::Close() noexcept {
+int whf_Descriptor::Close() noexcept {
     if (number_ < 0) return 0;
     const int number = std::exchange(number_, -1);
     errno = 0;
     // An interrupted close has closed.
-    return system_->close(number) != 0 && errno != EINTR ? ErrorNumber() : 0;
+    return system_->close(number) != 0 && errno != EINTR ? whf_ErrorNumber() : 0;
 }
 
-void ScratchFolder::RemoveLeavings(int folder, const DeckFileSystem& system) {
+void whf_Scratch::RemoveLeavings(int folder, const whf_System& system) {
     const int listed = ::openat(folder, ".", O_RDONLY | O_DIRECTORY | O_CLOEXEC);
     if (listed < 0) return;
     const std::unique_ptr<DIR, int (*)(DIR*)> entries(::fdopendir(listed), ::closedir);
@@ -53,16 +53,16 @@ void ScratchFolder::RemoveLeavings(int folder, const DeckFileSystem& system) {
     }
 }
 
-ScratchFolder::ScratchFolder(int folder, const std::string& folderName, const DeckFileSystem& system)
+whf_Scratch::whf_Scratch(int folder, const std::string& folderName, const whf_System& system)
     : folder_(folder), system_(system), opened_(-1, system) {
     constexpr int attempts = 100;
     for (int i = 0; i < attempts; ++i) {
         if (Make(folderName)) return;
     }
-    throw DeckFileError("cannot make a temporary folder in '" + folderName + "'", EEXIST);
+    throw whf_Error("cannot make a temporary folder in '" + folderName + "'", EEXIST);
 }
 
-std::string ScratchFolder::NewName() {
+std::string whf_Scratch::NewName() {
     constexpr std::string_view letters = "abcdefghijklmnopqrstuvwxyz0123456789";
     constexpr int length = 12;
     std::random_device random;
@@ -72,48 +72,48 @@ std::string ScratchFolder::NewName() {
     return name;
 }
 
-bool ScratchFolder::Make(const std::string& folderName) {
+bool whf_Scratch::Make(const std::string& folderName) {
     const auto fail = [&](int error) {
-        throw DeckFileError("cannot make a temporary folder in '" + folderName + "'", error);
+        throw whf_Error("cannot make a temporary folder in '" + folderName + "'", error);
     };
     name_ = NewName();
-    const SignalCleanUp::Block block;
-    const int madeError = ErrorOf([&] { return system_.makeFolder(folder_, name_.c_str()); });
+    const whf_SignalCleanUp::Block block;
+    const int madeError = whf_ErrorOf([&] { return system_.makeFolder(folder_, name_.c_str()); });
     if (madeError == EEXIST) return false;
     if (madeError != 0) fail(madeError);
     int number = -1;
     const int openError =
-        ErrorOf([&] { return number = system_.openFolder(folder_, name_.c_str(), kFolderFlags); });
-    Descriptor opened(number, system_);
+        whf_ErrorOf([&] { return number = system_.openFolder(folder_, name_.c_str(), kFolderFlags); });
+    whf_Descriptor opened(number, system_);
     struct stat found = {};
     struct stat named = {};
     int error = openError;
-    if (error == 0) error = ErrorOf([&] { return system_.inspectOpen(number, &found); });
+    if (error == 0) error = whf_ErrorOf([&] { return system_.inspectOpen(number, &found); });
     if (error == 0 && !IsOurs(found)) error = EPERM;
     if (error != 0) {
         system_.removeFolder(folder_, name_.c_str());
         fail(error);
     }
     // Some file systems have no locks; there nobody takes the folder for a left one either.
-    const int lockError = ErrorOf([&] { return system_.lock(number); });
-    const int lookError = ErrorOf([&] { return system_.inspect(folder_, name_.c_str(), &named); });
+    const int lockError = whf_ErrorOf([&] { return system_.lock(number); });
+    const int lookError = whf_ErrorOf([&] { return system_.inspect(folder_, name_.c_str(), &named); });
     if (lockError == EWOULDBLOCK || lookError != 0 || named.st_dev != found.st_dev ||
         named.st_ino != found.st_ino) {
         system_.removeFolder(folder_, name_.c_str());
         return false;
     }
     opened_ = std::move(opened);
-    SignalCleanUp::Set(folder_, name_.c_str(), number);
+    cleanUpPlace_ = whf_SignalCleanUp::Set(folder_, name_.c_str(), number);
     return true;
 }
 
-int ScratchFolder::Remove() noexcept {
+int whf_Scratch::Remove() noexcept {
     if (removed_ || opened_.Number() < 0) return 0;
     removed_ = true;
     const int fileError =
-        moved_ ? 0 : ErrorOf([this] { return system_.remove(opened_.Number(), kFileName); });
-    const int folderError = ErrorOf([this] { return system_.removeFolder(folder_, name_.c_str()); });
-    SignalCleanUp::Clear();
+        moved_ ? 0 : whf_ErrorOf([this] { return system_.remove(opened_.Number(), kFileName); });
+    const int folderError = whf_ErrorOf([this] { return system_.removeFolder(folder_, name_.c_str()); });
+    whf_SignalCleanUp::Clear(std::exchange(cleanUpPlace_, -1));
     opened_.Close();
     return fileError != 0 && fileError != ENOENT ? fileError : folderError;
 }

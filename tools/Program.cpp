@@ -1,9 +1,11 @@
+#include "tools/Program.h"
+
 #include "foundation/nex_Exception.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/Commands.h"
 #include "tools/DeckCommands.h"
 #include "tools/OutOfMemory.h"
-#include "tools/SignalCleanUp.h"
+#include "whole_file/whf_SignalCleanUp.h"
 #include "tools/StandardStreams.h"
 #include "tools/StudyCommand.h"
 #include "tools/ViewCommand.h"
@@ -311,9 +313,9 @@ ExitCode Main(int argc, char** argv) {
 
 } // namespace
 
-int main(int argc, char** argv) {
+int RunProgram(int argc, char** argv) {
     SecureStandardStreams();
-    SignalCleanUp::Install();
+    whf_SignalCleanUp::Install();
     OutOfMemory::Install(false);
     try {
         return static_cast<int>(Main(argc, argv));

@@ -1,5 +1,5 @@
-#ifndef QRX_TOOLS_DECKFILE_H
-#define QRX_TOOLS_DECKFILE_H
+#ifndef QRX_WHOLE_FILE_WHF_FILE_H
+#define QRX_WHOLE_FILE_WHF_FILE_H
 
 #include <functional>
 #include <stdexcept>
@@ -12,7 +12,7 @@ class qio_ostream;
 
 /// The system calls that put a deck in its place, each as the call of that name and -1 with errno when it
 /// fails. `at` is an open folder, in which names are looked up. Tests put their own here to make a call fail.
-struct DeckFileSystem {
+struct whf_System {
     ssize_t (*readlink)(const char* path, char* buffer, std::size_t bytes);
     int (*openFolder)(int at, const char* name, int flags);
     /// Never follows a link at the name itself.
@@ -34,13 +34,13 @@ struct DeckFileSystem {
     int (*remove)(int at, const char* name);
     int (*removeFolder)(int at, const char* name);
 
-    static const DeckFileSystem& Standard();
+    static const whf_System& Standard();
 };
 
 /// The file system refused. what() tells what could not be done, and why.
-class DeckFileError : public std::runtime_error {
+class whf_Error : public std::runtime_error {
 public:
-    DeckFileError(const std::string& action, int error);
+    whf_Error(const std::string& action, int error);
     /// The errno value, 0 for a failure without a reason.
     int Error() const { return error_; }
 
@@ -55,7 +55,7 @@ private:
 /// The hidden folder belongs to the user alone and is used through its descriptor, so nobody who may write to
 /// the folder of the deck can put another file, or a link, in between. It is locked while its run lives; one
 /// that a run left behind when it was killed is removed by the next run that writes beside it.
-class DeckFile {
+class whf_File {
 public:
     struct Result {
         long long bytes = 0;
@@ -69,10 +69,10 @@ public:
 
     /// A symbolic link at the target is followed: what it points to is replaced. The system must outlive the
     /// deck file. Messages call the file by the word `thing`.
-    explicit DeckFile(std::string target, const DeckFileSystem& system = DeckFileSystem::Standard(),
+    explicit whf_File(std::string target, const whf_System& system = whf_System::Standard(),
                       std::string thing = "deck");
 
-    /// Calls `write`, and `ready` when all is written and only the renaming is left. Raises DeckFileError,
+    /// Calls `write`, and `ready` when all is written and only the renaming is left. Raises whf_Error,
     /// and lets the exceptions of both through.
     ///
     /// What replaces a file has its mode, its access control list and, where that is permitted, its owner and
@@ -92,7 +92,7 @@ private:
     std::string target_;
     std::string thing_;
     std::string temporaryFolder_;
-    const DeckFileSystem& system_;
+    const whf_System& system_;
 };
 
 #endif

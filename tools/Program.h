@@ -1,0 +1,8 @@
+#ifndef QRX_TOOLS_PROGRAM_H
+#define QRX_TOOLS_PROGRAM_H
+
+/// Runs the command line in this process, which is the program's alone: signals, standard streams and a lack
+/// of memory are the program's too. Gives its exit code.
+int RunProgram(int argc, char** argv);
+
+#endif
