@@ -22,7 +22,7 @@ import zipfile
 ROOT = pathlib.Path(__file__).resolve().parents[2]
 TREE = ["CMakeLists.txt", "README.md", "pyproject.toml", "cmake", "foundation", "store_interface", "keyword_layer",
         "QRXZptIfwOif.m", "deck_checks", "whole_file", "deck_reader", "mesh_file", "model_file", "view_page", "viewer",
-        "tools", "examples", "python", "scripts", "docs"]
+        "study", "tools", "examples", "python", "scripts", "docs"]
 
 
 def get_requires_for_build_wheel(config_settings=None):
