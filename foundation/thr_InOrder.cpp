@@ -115,10 +115,17 @@ private:
     std::vector<std::thread> threads_;
 };
 
+std::atomic<int> usualThreads = 0;
+
 } // namespace
+
+void thr_SetUsualThreads(int threads) {
+    usualThreads = threads;
+}
 
 int thr_NumThreads(int wanted) {
     constexpr int most = 64;
+    if (wanted <= 0) wanted = usualThreads;
     if (wanted <= 0) wanted = static_cast<int>(std::thread::hardware_concurrency());
     return std::clamp(wanted, 1, most);
 }

@@ -4,8 +4,10 @@
 #include <cstddef>
 #include <functional>
 
-/// The threads that a task may use when it is asked to use `wanted`; 0 stands for one a core.
+/// The threads that a task may use when it is asked to use `wanted`; 0 stands for the process's usual number.
 int thr_NumThreads(int wanted);
+/// Changes the process's usual number of threads, which is one a core at first and again with 0.
+void thr_SetUsualThreads(int threads);
 
 /// Calls `task(i)` for each i below `count`, in several threads at once, and returns when all are done; in
 /// the calling thread alone where no further one can be had. The tasks raise nothing.

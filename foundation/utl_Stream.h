@@ -73,7 +73,7 @@ public:
     /// Prints `count` items, none of which needs more than `room` bytes. Many of them are laid out by several
     /// threads; the device gets their text from this one, in order.
     void PrintItems(std::size_t count, std::size_t room, const LayOut& layOut);
-    /// How many threads PrintItems() may use; 0, as at first, stands for one a core.
+    /// How many threads PrintItems() may use; 0, as at first, stands for the process's usual number.
     void SetThreads(int threads) { threads_ = threads; }
 
     /// Passes all pending text on to the device.

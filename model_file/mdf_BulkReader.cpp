@@ -180,6 +180,9 @@ template <bool inRows>
 bool mdf_BulkReader::Read(mdf_Numbers& numbers, std::size_t length) {
     Pieces pieces = inRows ? RowsAhead() : NumbersAhead();
     if (pieces.empty()) return false;
+    // A number and its comma take two bytes, so rows that can't all be that long are not.
+    const auto bytes = static_cast<std::size_t>(pieces.back().end - at_);
+    if (pieces.back().first + pieces.back().count > (bytes + 1) / 2 / length) return false;
     pieces.back().isLast = true;
     return numbers.allInts ? ReadPieces<inRows>(pieces, numbers, numbers.ints, length)
                            : ReadPieces<inRows>(pieces, numbers, numbers.reals, length);

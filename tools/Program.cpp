@@ -1,6 +1,7 @@
 #include "tools/Program.h"
 
 #include "foundation/nex_Exception.h"
+#include "foundation/thr_InOrder.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/Commands.h"
 #include "tools/DeckCommands.h"
@@ -52,6 +53,7 @@ struct CommandLine {
     std::string schemaOutput;
     std::string stepType;
     bool json = false;
+    int threads = 0;
     bool history = false;
     CLI::App* writeCommand = app.add_subcommand("write", "Write the deck of a model");
     CLI::App* checkCommand = app.add_subcommand(
@@ -114,6 +116,7 @@ struct CommandLine {
     }
 
     ExitCode Run(RunReport& report) const {
+        thr_SetUsualThreads(threads);
         if (*writeCommand) return RunWrite(write, report);
         if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
         if (*diffCommand) {
@@ -134,6 +137,12 @@ struct CommandLine {
 private:
     void AddModel(CLI::App* command, std::string& file, const char* about = "Model file, JSON") {
         command->add_option("MODEL", file, about)->required()->type_name("");
+        command
+            ->add_option(
+                "--threads", threads,
+                "Threads for what is large; the result is the same with any number (default: one a core)")
+            ->check(CLI::Range(1, 64))
+            ->type_name("N");
         AddJson(command);
     }
     void AddMeshFile(CLI::App* command, std::string& file) {

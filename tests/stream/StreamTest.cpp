@@ -4,8 +4,10 @@
 
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <limits>
 #include <new>
+#include <stdexcept>
 #include <string>
 
 namespace {
@@ -324,3 +326,90 @@ TEST(Stream, DeviceThatThrows_EndsNoProgramInTheDestructor) {
 }
 
 } // namespace
+
+namespace {
+
+/// Items of the lengths 1 to 97, each a line of a letter; `items` of them, laid out by so many threads.
+std::string Items(std::size_t items, int threads, std::size_t bufferBytes = 0) {
+    qio_StringDevice device;
+    utl_Stream stream(device, 131, 6, 6, bufferBytes);
+    stream.SetThreads(threads);
+    stream << "head" << endl;
+    stream.PrintItems(items, 100, [](std::size_t begin, std::size_t end, char* out) {
+        for (std::size_t i = begin; i < end; ++i) {
+            std::memset(out, static_cast<char>('a' + i % 26), i % 97);
+            out += i % 97;
+            *out++ = '\n';
+        }
+        return out;
+    });
+    stream << "tail" << endl;
+    stream.Flush();
+    return device.Text();
+}
+
+} // namespace
+
+TEST(StreamItems, OfAnyNumberOfThreadsAndAnyBuffer_AreTheSameText) {
+    for (const std::size_t items : {0u, 1u, 3u, 1000u, 300000u}) {
+        std::string expected = "head\n";
+        for (std::size_t i = 0; i < items; ++i)
+            expected.append(i % 97, static_cast<char>('a' + i % 26)).append("\n");
+        expected += "tail\n";
+        EXPECT_EQ(Items(items, 1), expected) << items;
+        EXPECT_EQ(Items(items, 1, 1), expected) << items;
+        for (const int threads : {2, 3, 8})
+            EXPECT_EQ(Items(items, threads), expected) << items << " " << threads;
+    }
+}
+
+TEST(StreamItems, ColumnBehindThem_IsThatOfTheLastLine) {
+    for (const int threads : {1, 4}) {
+        qio_StringDevice device;
+        utl_Stream stream(device, 5, 6, 6);
+        stream.SetThreads(threads);
+        stream.PrintItems(200000, 100, [](std::size_t begin, std::size_t end, char* out) {
+            for (std::size_t i = begin; i < end; ++i) {
+                *out++ = 'x';
+                if (i % 100 == 93) *out++ = '\n';
+            }
+            return out;
+        });
+        stream.OptionalLineBreak();
+        stream << "y";
+        stream.Flush();
+        EXPECT_EQ(device.Text().substr(device.Text().size() - 8), "xxxxxx\ny");
+    }
+}
+
+TEST(StreamItems, FailureOfALayOut_ComesInItsTurnAndOfADeviceAtOnce) {
+    for (const int threads : {1, 4}) {
+        qio_StringDevice device;
+        {
+            utl_Stream stream(device, 131, 6, 6);
+            stream.SetThreads(threads);
+            const auto layOut = [](std::size_t begin, std::size_t end, char* out) {
+                for (std::size_t i = begin; i < end; ++i) {
+                    if (i == 150000) throw std::runtime_error("broken");
+                    *out++ = 'x';
+                }
+                return out;
+            };
+            EXPECT_THROW(stream.PrintItems(300000, 100, layOut), std::runtime_error);
+        }
+        EXPECT_LE(device.Text().size(), 150000u);
+        EXPECT_GE(device.Text().size(), 100000u);
+    }
+    class BrokenDevice final : public qio_ostream {
+    public:
+        void Write(const char*, std::size_t) override { throw std::runtime_error("full"); }
+    } broken;
+    utl_Stream stream(broken, 131, 6, 6);
+    stream.SetThreads(4);
+    EXPECT_THROW(stream.PrintItems(300000, 100,
+                                   [](std::size_t begin, std::size_t end, char* out) {
+                                       std::memset(out, 'x', end - begin);
+                                       return out + (end - begin);
+                                   }),
+                 std::runtime_error);
+}

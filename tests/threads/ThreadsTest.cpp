@@ -3,6 +3,7 @@
 #include "deck/oif_Writer.h"
 #include "deck_checks/dck_Check.h"
 #include "foundation/qio_Device.h"
+#include "foundation/thr_InOrder.h"
 #include "model_file/mdf_ModelFile.h"
 
 #include <gtest/gtest.h>
@@ -75,6 +76,43 @@ TEST(Threads, OneStoreWrittenByAll_GivesOneDeck) {
             for (const std::string& deck : decks) EXPECT_EQ(deck, expected);
         }
     }
+}
+
+TEST(Threads, LargeMesh_IsReadAndWrittenAlikeByAnyNumberOfThreads) {
+    constexpr int count = 60000;
+    std::string text = R"({"format": "qrx-model/1", "models": {"Default Model": {"parts": {"P": {"mesh": {
+        "nodes": {"labels": [)";
+    const auto list = [&](const auto& item) {
+        for (int i = 0; i < count; ++i) text.append(i == 0 ? "" : ", ").append(item(i));
+    };
+    // No label is where its place would have it, and some coordinates are whole numbers.
+    const auto label = [](int i) { return std::to_string(3 * i + 5 - i % 2); };
+    list(label);
+    text += R"(], "coordinates": [)";
+    list([](int i) {
+        return "[" + std::to_string(i) + (i % 7 == 0 ? "" : ".25") + ", " + std::to_string(i % 11) +
+               ", -0.001]";
+    });
+    text += R"(]}, "elements": [{"type": "T3D2", "labels": [)";
+    list(label);
+    text += R"(], "connectivity": [)";
+    list([&](int i) { return "[" + label(i) + ", " + label(i / 2) + "]"; });
+    text += R"(]}], "sets": [{"name": "S", "kind": "node", "labels": [)";
+    list([&](int i) { return label(i * 7919 % count); });
+    text += R"(]}]}}}, "assembly": {"instances": {"I": {"part": "P"}}}}}})";
+    std::string expected;
+    for (const int threads : {1, 2, 5}) {
+        thr_SetUsualThreads(threads);
+        mdf_Report report;
+        const auto odb = mdf_ReadModelText(text, "m.json", report);
+        ASSERT_NE(odb, nullptr) << (report.findings.empty() ? "" : report.findings[0].Text());
+        const std::string deck = Deck(*odb);
+        if (threads == 1) expected = deck;
+        EXPECT_TRUE(deck == expected) << threads;
+    }
+    thr_SetUsualThreads(0);
+    EXPECT_NE(expected.find("\n      5,           0.,           0.,       -0.001\n"), std::string::npos);
+    EXPECT_NE(expected.find("\n      7,         1.25,           1.,       -0.001\n"), std::string::npos);
 }
 
 TEST(Threads, StoreThatNobodyHasCompleted_IsCompletedOnce) {

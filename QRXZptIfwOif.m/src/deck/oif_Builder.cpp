@@ -4,12 +4,12 @@
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 
-oif_Builder::oif_Builder(oif_ModelInfo& modelInfo)
+oif_Builder::oif_Builder(oif_ModelInfo& modelInfo, int threads)
     : jobKeywords_(modelInfo), instance_(modelInfo), amplitude_(modelInfo), material_(modelInfo),
       transform_(modelInfo), boundaryCondition_(modelInfo), step_(modelInfo), load_(modelInfo),
       field_(modelInfo), interaction_(modelInfo), constraint_(modelInfo), outputRequest_(modelInfo),
       part_(modelInfo), partAttributes_(modelInfo), region_(modelInfo), final_(modelInfo),
-      v6Format_(modelInfo.V6Format()), model_(&modelInfo.Model()) {}
+      v6Format_(modelInfo.V6Format()), threads_(threads), model_(&modelInfo.Model()) {}
 
 bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     qio_CurrentSystem().remove(fileName.CStr());
@@ -26,6 +26,7 @@ void oif_Builder::WriteInput(qio_ostream& device) {
     // Where the long texts are kept, a large buffer is more work to make than it saves.
     constexpr std::size_t small = std::size_t{16} * 1024;
     utl_Stream stream(device, LineLimit, Precision, Precision, texts_ == nullptr ? 0 : small);
+    stream.SetThreads(threads_);
     BuildComponents();
     qkw_ComponentList components = WriteList();
     WriteInput(stream, jobKeywords_.ModelDefinition());

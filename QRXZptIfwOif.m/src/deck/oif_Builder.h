@@ -23,7 +23,8 @@
 /// (parts, instances, assembly, model, steps) and within a section component by component.
 class oif_Builder {
 public:
-    explicit oif_Builder(oif_ModelInfo& modelInfo);
+    /// `threads` as for oif_Writer.
+    explicit oif_Builder(oif_ModelInfo& modelInfo, int threads = 0);
     oif_Builder(const oif_Builder&) = delete;
     oif_Builder& operator=(const oif_Builder&) = delete;
 
@@ -73,6 +74,7 @@ private:
     oif_RegionBuilder region_;
     oif_FinalBuilder final_;
     bool v6Format_;
+    int threads_;
     const oif_Model* model_;
     oif_MeshTexts* texts_ = nullptr;
 };

@@ -7,13 +7,13 @@
 void oif_Writer::WriteInputFile(const char* jobName) {
     oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
     const cow_String fileName = cow_String(jobName) + ".inp";
-    oif_Builder builder(modelInfo);
+    oif_Builder builder(modelInfo, threads_);
     builder.WriteInputFile(fileName);
 }
 
 void oif_Writer::WriteInput(qio_ostream& device) {
     oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
-    oif_Builder builder(modelInfo);
+    oif_Builder builder(modelInfo, threads_);
     builder.WriteInput(device);
 }
 

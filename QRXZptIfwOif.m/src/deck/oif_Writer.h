@@ -9,8 +9,10 @@ class qio_ostream;
 /// at once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
 class oif_Writer {
 public:
-    /// The store must outlive the writer.
-    explicit oif_Writer(const odb_Odb& odb) : odb_(odb) {}
+    /// The store must outlive the writer. Large meshes and sets are laid out by as many threads; 0 stands for
+    /// the process's usual number (thr_SetUsualThreads), which is one a core. Devices and the store's own
+    /// code meet the calling thread alone, and the deck is the same with any number.
+    explicit oif_Writer(const odb_Odb& odb, int threads = 0) : odb_(odb), threads_(threads) {}
 
     /// Writes `<jobName>.inp`; the name may hold folders, and ".inp" is appended whatever it ends in. An old
     /// file of the name is deleted first. Nothing is reported when the file can't be opened or a write fails:
@@ -24,6 +26,7 @@ public:
 
 private:
     const odb_Odb& odb_;
+    int threads_;
 };
 
 #endif
