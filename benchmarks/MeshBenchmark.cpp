@@ -105,12 +105,13 @@ void WriteElements(utl_Stream& stream) {
 }
 
 template <class Writer>
-void ThroughStream(benchmark::State& state, const char* path, int lines, Writer write) {
+void ThroughStream(benchmark::State& state, const char* path, int lines, Writer write, int threads = 1) {
     TheStore();
     for (auto _ : state) {
         qio_ios device;
         device.attach(Open(path).release(), true);
         utl_Stream stream(device, 131, 6, 6, static_cast<std::size_t>(state.range(0)));
+        stream.SetThreads(threads);
         write(stream);
         stream.Flush();
         state.counters["bytes/line"] = static_cast<double>(device.Bytes()) / lines;
@@ -127,6 +128,16 @@ void NodesStreamToFile(benchmark::State& state) {
 }
 void ElementsStream(benchmark::State& state) {
     ThroughStream(state, kNull, kElements, WriteElements);
+}
+void NodesTwoThreads(benchmark::State& state) {
+    ThroughStream(state, kNull, kNodes, WriteNodes, 2);
+}
+void NodesTwoThreadsToFile(benchmark::State& state) {
+    ThroughStream(state, kFile, kNodes, WriteNodes, 2);
+    std::remove(kFile);
+}
+void ElementsTwoThreads(benchmark::State& state) {
+    ThroughStream(state, kNull, kElements, WriteElements, 2);
 }
 
 void NodesFprintf(benchmark::State& state) {
@@ -217,6 +228,9 @@ BENCHMARK(NodesStreamToFile)->Arg(64 << 10)->Arg(256 << 10)->Arg(1 << 20)->Unit(
 BENCHMARK(NodesRawToFile)->Unit(benchmark::kMillisecond);
 BENCHMARK(ElementsStream)->Arg(256 << 10)->Unit(benchmark::kMillisecond);
 BENCHMARK(ElementsFprintf)->Unit(benchmark::kMillisecond);
+BENCHMARK(NodesTwoThreads)->Arg(256 << 10)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(NodesTwoThreadsToFile)->Arg(256 << 10)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(ElementsTwoThreads)->Arg(256 << 10)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 /// The usual table, and behind it the ratios of the best times.
 class RatioReporter : public benchmark::ConsoleReporter {
@@ -235,6 +249,9 @@ public:
         Ratio("NodesFprintf", "NodesStream/262144");
         Ratio("NodesFmt", "NodesStream/262144");
         Ratio("ElementsFprintf", "ElementsStream/262144");
+        Ratio("NodesStream/262144", "NodesTwoThreads/262144/real_time");
+        Ratio("ElementsStream/262144", "ElementsTwoThreads/262144/real_time");
+        Ratio("NodesTwoThreadsToFile/262144/real_time", "NodesRawToFile");
         // To a file: against the text alone plus the bytes alone.
         const auto file = best_.find("NodesStreamToFile/262144");
         const auto null = best_.find("NodesStream/262144");

@@ -1,11 +1,22 @@
 #include "foundation/num_RealText.h"
 
+#include "foundation/num_Digits.h"
+
 #include <array>
 #include <bit>
 #include <charconv>
 #include <cstdint>
 #include <cstring>
 #include <string_view>
+
+constexpr std::array<std::uint32_t, 10000> num_fourDigits = [] {
+    std::array<std::uint32_t, 10000> texts{};
+    for (std::uint32_t n = 0; n < texts.size(); ++n) {
+        const std::uint32_t digits[] = {n / 1000, n / 100 % 10, n / 10 % 10, n % 10};
+        for (int i = 0; i < 4; ++i) texts[n] |= ('0' + digits[i]) << (8 * i);
+    }
+    return texts;
+}();
 
 namespace {
 
@@ -157,32 +168,17 @@ inline bool Round(std::uint64_t bits, int precision, Decimal& decimal) {
     return true;
 }
 
-/// Eight bytes in a word, the first in the lowest byte.
-inline void Store(char* out, std::uint64_t bytes) {
-    if constexpr (std::endian::native == std::endian::little) {
-        std::memcpy(out, &bytes, sizeof bytes);
-    } else {
-        for (int i = 0; i < 8; ++i) out[i] = static_cast<char>(bytes >> (8 * i));
-    }
-}
-
-constexpr std::uint64_t kZeros = 0x3030303030303030;
-constexpr std::uint64_t kBlanks = 0x2020202020202020;
 constexpr std::uint64_t kZeroPoint = 0x3030303030302e30; // "0.000000"
 
 /// The eight digits of n < 10^8 as byte values, the first in the lowest byte.
 inline std::uint64_t EightDigits(std::uint32_t n) {
-    const std::uint64_t fours = n / 10000 | std::uint64_t{n % 10000} << 32;
-    const std::uint64_t hundreds = ((fours * 10486) >> 20) & 0x7f0000007f;
-    const std::uint64_t twos = hundreds + ((fours - hundreds * 100) << 16);
-    const std::uint64_t tens = ((twos * 103) >> 10) & 0xf000f000f000f;
-    return tens + ((twos - tens * 10) << 8);
+    return num_EightDigits(n) ^ num_zeros;
 }
 
 /// Blanks that right-align a text of `length` in `width`; returns where the text begins.
 inline char* Pad(char* out, int width, int length) {
-    Store(out, kBlanks);
-    Store(out + 8, kBlanks);
+    num_Store(out, num_blanks);
+    num_Store(out + 8, num_blanks);
     if (width <= length) return out;
     const int blanks = width - length;
     if (blanks > 16) [[unlikely]]
@@ -231,7 +227,7 @@ inline char* WriteShort(char* out, int negative, const Decimal& decimal, int wid
         static_cast<std::uint32_t>(decimal.digits * kTens[static_cast<std::size_t>(8 - precision)]);
     const std::uint64_t values = EightDigits(scaled);
     const int count = 8 - std::countl_zero(values) / 8;
-    const std::uint64_t digits = values | kZeros;
+    const std::uint64_t digits = values | num_zeros;
     const int exponent = decimal.exponent;
 
     if (static_cast<unsigned>(exponent) < static_cast<unsigned>(precision)) [[likely]] {
@@ -242,22 +238,22 @@ inline char* WriteShort(char* out, int negative, const Decimal& decimal, int wid
             (digits & mask) | std::uint64_t{'.'} << (8 * whole) | (digits & ~mask) << 8;
         char* begin = Pad(out, width, length);
         *begin = '-';
-        Store(begin + negative, text);
+        num_Store(begin + negative, text);
         return length > width ? begin + length : out + width;
     }
     if (exponent < 0 && exponent >= -4) {
         const int length = negative + 1 - exponent + count;
         char* begin = Pad(out, width, length);
         *begin = '-';
-        Store(begin + negative, kZeroPoint);
-        Store(begin + negative + 1 - exponent, digits);
+        num_Store(begin + negative, kZeroPoint);
+        num_Store(begin + negative + 1 - exponent, digits);
         return begin + length;
     }
     const int length = negative + count + (count > 1) + 4 + (exponent > 99 || exponent < -99);
     char* begin = Pad(out, width, length);
     *begin = '-';
     char* text = begin + negative;
-    Store(text + 1, digits >> 8 << 8 | '.');
+    num_Store(text + 1, digits >> 8 << 8 | '.');
     text[0] = static_cast<char>(digits);
     WriteExponent(text + count + (count > 1), exponent);
     return begin + length;
@@ -270,8 +266,8 @@ inline char* WriteLong(char* out, bool negative, const Decimal& decimal, int wid
     const std::uint64_t second = EightDigits(static_cast<std::uint32_t>(scaled % 100000000));
     const int count = second != 0 ? 16 - std::countl_zero(second) / 8 : 8 - std::countl_zero(first) / 8;
     char digits[16];
-    Store(digits, first | kZeros);
-    Store(digits + 8, second | kZeros);
+    num_Store(digits, first | num_zeros);
+    num_Store(digits + 8, second | num_zeros);
 
     char* text = out;
     *text = '-';
@@ -284,7 +280,7 @@ inline char* WriteLong(char* out, bool negative, const Decimal& decimal, int wid
         text[whole] = '.';
         text += 1 + (count > whole ? count : whole);
     } else if (exponent < 0 && exponent >= -4) {
-        Store(text, kZeroPoint);
+        num_Store(text, kZeroPoint);
         text += 1 - exponent;
         std::memcpy(text, digits, 16);
         text += count;
@@ -326,6 +322,34 @@ char* num_WriteReal(char* out, double value, int width, int precision) {
     return WriteLong(out, negative != 0, decimal, width, precision);
 }
 
+char* num_WriteFloat(char* out, float value) {
+    constexpr int width = 12;
+    constexpr int precision = 7;
+    const auto pattern = std::bit_cast<std::uint32_t>(value);
+    const std::uint32_t magnitude = pattern & 0x7fffffff;
+    // From 2^-13 to below 2^23, where all that follows is exact.
+    constexpr std::uint32_t least = (127 - 13) << 23;
+    constexpr std::uint32_t greatest = (127 + 23) << 23;
+    if (magnitude - least >= greatest - least) return num_WriteReal(out, value, width, precision);
+    constexpr double tens[] = {1e0, 1e1, 1e2, 1e3, 1e4, 1e5, 1e6};
+    const double size = std::bit_cast<float>(magnitude);
+    const int b = static_cast<int>(magnitude >> 23) - 127;
+    // The greatest power of ten that can be in it is tried.
+    int exponent = DecimalExponentBelow(b + 1);
+    exponent -= exponent >= 0 ? static_cast<int>(size < tens[exponent])
+                              : static_cast<int>(size * tens[-exponent] < 1.0);
+    const std::uint64_t significand = (magnitude & 0x7fffff) | 0x800000;
+    const std::uint64_t product = significand * kTens[static_cast<std::size_t>(precision - 1 - exponent)];
+    const int shift = 23 - b;
+    const std::uint64_t below = (std::uint64_t{1} << (shift - 1)) - 1;
+    std::uint64_t digits = (product + below + (product >> shift & 1)) >> shift;
+    if (digits == kTens[precision]) [[unlikely]] {
+        digits /= 10;
+        ++exponent;
+    }
+    return WriteShort(out, static_cast<int>(pattern >> 31), {digits, exponent}, width, precision);
+}
+
 char* num_WriteInt(char* out, int value, int width) {
     if (static_cast<unsigned>(value) >= 100000000) [[unlikely]]
         return WriteAnyInt(out, value, width);
@@ -333,15 +357,15 @@ char* num_WriteInt(char* out, int value, int width) {
     // A lone zero still is one digit.
     const int leading = std::countr_zero(values | std::uint64_t{1} << 56) / 8;
     const std::uint64_t blanked =
-        (values | kZeros) ^ (((std::uint64_t{1} << (8 * leading)) - 1) & (kZeros ^ kBlanks));
+        (values | num_zeros) ^ (((std::uint64_t{1} << (8 * leading)) - 1) & (num_zeros ^ num_blanks));
     const int length = 8 - leading;
     const int field = width > length ? width : length;
     if (field <= 8) [[likely]] {
-        Store(out, blanked >> (8 * (8 - field)));
+        num_Store(out, blanked >> (8 * (8 - field)));
         return out + field;
     }
     std::memset(out, ' ', static_cast<std::size_t>(field - 8));
-    Store(out + field - 8, blanked);
+    num_Store(out + field - 8, blanked);
     return out + field;
 }
 

@@ -28,6 +28,9 @@ inline char* num_WriteReal(char* out, float value, int width, int precision) {
     return num_WriteReal(out, static_cast<double>(value), width, precision);
 }
 
+/// The same as num_WriteReal(out, value, 12, 7): coordinates, quickly.
+char* num_WriteFloat(char* out, float value);
+
 /// Writes the decimal digits right-aligned in `width` blanks; a longer number is not cut. Returns the end.
 /// The caller provides num_IntRoom(width) bytes.
 char* num_WriteInt(char* out, int value, int width);

@@ -188,6 +188,10 @@ bool mdf_BulkReader::Read(mdf_Numbers& numbers, std::size_t length) {
                            : ReadPieces<inRows>(pieces, numbers, numbers.reals, length);
 }
 
+bool mdf_BulkReader::ReadNumbers(mdf_Numbers& numbers) {
+    return Read<false>(numbers, 1);
+}
+
 bool mdf_BulkReader::ReadRows(mdf_Rows& rows) {
     const bool whole = Read<true>(rows.numbers, rows.length);
     rows.count = rows.numbers.Size() / rows.length;

@@ -14,7 +14,7 @@ public:
     mdf_BulkReader(const char*& at, const char* end, int threads) : at_(at), end_(end), threads_(threads) {}
 
     /// True when all was read, up to the bracket that closes the array.
-    bool ReadNumbers(mdf_Numbers& numbers) { return Read<false>(numbers, 1); }
+    bool ReadNumbers(mdf_Numbers& numbers);
     bool ReadRows(mdf_Rows& rows);
 
 private:

@@ -2,11 +2,13 @@
 
 #include "base/oif_KeywordLine.h"
 #include "base/oif_ModelInfo.h"
+#include "foundation/num_Digits.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/model/odiK_Mesh.h"
 
 #include <algorithm>
 #include <cstring>
+#include <type_traits>
 #include <vector>
 
 namespace {
@@ -21,24 +23,38 @@ std::size_t RoomOfRow(int numNodes) {
     return static_cast<std::size_t>(numNodes / kPlacesOfLine + 1) * line + num_IntRoom(kWidestNodeField);
 }
 
+/// Numbers with a comma behind each. `fits`: none of them is negative or has more digits than the field.
+template <bool fits, class LabelOf>
+char* WriteFields(char* out, const int* nodes, int count, const LabelOf& labelOf, int width) {
+    for (int i = 0; i < count; ++i) {
+        if constexpr (fits) {
+            out = num_WriteField(out, static_cast<std::uint32_t>(labelOf(nodes[i])), width, ',');
+        } else {
+            out = num_WriteInt(out, labelOf(nodes[i]), width);
+            *out++ = ',';
+        }
+    }
+    return out;
+}
+
 /// The nodes of an element, to the end of its last line.
-template <class LabelOf>
-char* WriteNodes(char* out, const int* nodes, int numNodes, const LabelOf& labelOf, int nodeWidth,
-                 int indent) {
-    for (int j = 0; j < numNodes; ++j) {
-        const int place = j + 2;
-        const bool last = j == numNodes - 1;
+template <bool fits, class LabelOf>
+char* WriteNodes(char* out, const int* nodes, int numNodes, const LabelOf& labelOf, int width, int indent) {
+    if (numNodes == 0) return out;
+    // The element's label is the first number of the first line.
+    int onLine = std::min(numNodes, kPlacesOfLine - 1);
+    for (int j = 0;; onLine = std::min(numNodes - j, kPlacesOfLine)) {
         // The last number of an element is never indented, also where it begins a line.
-        if (!last && place % kPlacesOfLine == 1) {
+        if (j > 0 && numNodes - j > 1) {
             std::memset(out, ' ', static_cast<std::size_t>(indent));
             out += indent;
         }
-        out = num_WriteInt(out, labelOf(nodes[j]), nodeWidth);
-        if (last) break;
-        *out++ = ',';
-        if (place % kPlacesOfLine == 0) *out++ = '\n';
+        out = WriteFields<fits>(out, nodes + j, onLine, labelOf, width);
+        j += onLine;
+        if (j == numNodes) break;
+        *out++ = '\n';
     }
-    if (numNodes > 0) *out++ = '\n';
+    out[-1] = '\n';
     return out;
 }
 
@@ -85,7 +101,8 @@ void oif_Element::WriteConnectivity(utl_Stream& stream) const {
     if (!mesh_) {
         const auto largest = std::max_element(connectivity.begin(), connectivity.end());
         WriteRows(
-            stream, [](int index) { return index; }, largest == connectivity.end() ? 0 : *largest);
+            stream, [](int index) { return index; }, largest == connectivity.end() ? 0 : *largest,
+            std::ranges::all_of(connectivity, [](int index) { return index >= 0; }));
         return;
     }
     const odiK_NodeData& nodes = mesh_->mesh().Nodes();
@@ -103,7 +120,7 @@ void oif_Element::WriteConnectivity(utl_Stream& stream) const {
     if (nodes.index.IsRun(first)) {
         WriteRows(
             stream, [first](int index) { return first + index; },
-            connectivity.empty() ? 0 : first + largestIndex);
+            connectivity.empty() ? 0 : first + largestIndex, first >= 0);
         return;
     }
     // The blocks of the label list, so that a look-up reads two addresses and no counts.
@@ -122,12 +139,18 @@ void oif_Element::WriteConnectivity(utl_Stream& stream) const {
         return table[(begin + index) >> shift][(begin + index) & mask];
     };
     int largest = 0;
-    for (const int index : connectivity) largest = std::max(largest, labelOf(index));
-    WriteRows(stream, labelOf, largest);
+    bool areNatural = true;
+    for (const int index : connectivity) {
+        const int label = labelOf(index);
+        largest = std::max(largest, label);
+        areNatural = areNatural && label >= 0;
+    }
+    WriteRows(stream, labelOf, largest, areNatural);
 }
 
 template <class LabelOf>
-void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode) const {
+void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode,
+                            bool areNatural) const {
     const std::vector<int>& labels = elements_->userElementLabelsAsFlatArray();
     const int numNodes = elements_->numNodesPerElement();
     const int nodeWidth = std::min(NumDigits(largestNode) + 1, kWidestNodeField);
@@ -136,15 +159,23 @@ void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int larg
     const int elementWidth = NumDigits(largestElement);
 
     const int* const connectivity = elements_->elementConnectivity().data();
-    stream.PrintItems(labels.size(), RoomOfRow(numNodes), [&](std::size_t begin, std::size_t end, char* out) {
-        const int* node = connectivity + begin * static_cast<std::size_t>(numNodes);
-        for (std::size_t i = begin; i < end; ++i, node += numNodes) {
-            out = num_WriteInt(out, labels[i], elementWidth);
-            *out++ = ',';
-            out = WriteNodes(out, node, numNodes, labelOf, nodeWidth, elementWidth + 1);
-        }
-        return out;
-    });
+    const auto layOut = [&]<bool fits>(std::bool_constant<fits>) {
+        return [&, numNodes, nodeWidth, elementWidth](std::size_t begin, std::size_t end, char* out) {
+            const int* node = connectivity + begin * static_cast<std::size_t>(numNodes);
+            for (std::size_t i = begin; i < end; ++i, node += numNodes) {
+                out = num_WriteInt(out, labels[i], elementWidth);
+                *out++ = ',';
+                out = WriteNodes<fits>(out, node, numNodes, labelOf, nodeWidth, elementWidth + 1);
+            }
+            return out;
+        };
+    };
+    const std::size_t room = RoomOfRow(numNodes);
+    if (areNatural && largestNode <= static_cast<int>(num_mostInField)) {
+        stream.PrintItems(labels.size(), room, layOut(std::true_type()));
+    } else {
+        stream.PrintItems(labels.size(), room, layOut(std::false_type()));
+    }
 }
 
 void oif_ElementFromMesh::AddKeyword(Types& types, const cow_String& type, const qkw_Keyword& keyword) {

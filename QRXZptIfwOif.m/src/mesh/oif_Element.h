@@ -27,7 +27,7 @@ public:
 private:
     void WriteConnectivity(utl_Stream& stream) const;
     template <class LabelOf>
-    void WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode) const;
+    void WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode, bool areNatural) const;
 
     int firstNumber_;
     int secondNumber_;

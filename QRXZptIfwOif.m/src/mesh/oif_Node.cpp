@@ -1,15 +1,15 @@
 #include "mesh/oif_Node.h"
 
+#include "foundation/num_Digits.h"
+
 #include <algorithm>
 #include <cmath>
 
 namespace {
 
 constexpr int kLabelWidth = 7;
-constexpr int kCoordinateWidth = 12;
-constexpr int kCoordinatePrecision = 7;
 // A label of eleven characters and three coordinates of thirteen, and the room that the last one wants.
-constexpr std::size_t kLineRoom = 64 + num_RealRoom(kCoordinateWidth, kCoordinatePrecision);
+constexpr std::size_t kLineRoom = 64 + num_RealRoom(12, 7);
 
 } // namespace
 
@@ -52,10 +52,11 @@ char* oif_Node::WriteDataLine(char* out, int label, float x, float y, float z) c
     const auto coordinate = [&out, this](float value) {
         *out++ = ',';
         *out++ = ' ';
-        out = num_WriteReal(out, std::fabs(value) < smallReal_ ? 0.0 : static_cast<double>(value),
-                            kCoordinateWidth, kCoordinatePrecision);
+        out = num_WriteFloat(out, std::fabs(value) < smallReal_ ? 0.0F : value);
     };
-    out = num_WriteInt(out, label, kLabelWidth);
+    out = static_cast<std::uint32_t>(label) <= num_mostInField
+              ? num_WriteField(out, static_cast<std::uint32_t>(label), kLabelWidth, ',') - 1
+              : num_WriteInt(out, label, kLabelWidth);
     coordinate(x);
     coordinate(y);
     if (threeDimensional_) coordinate(z);
