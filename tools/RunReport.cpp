@@ -20,6 +20,18 @@ void PutError(std::string line) {
 
 } // namespace
 
+void RunTimes::End(const char* part) {
+    double before = 0.0;
+    for (const auto& [name, seconds] : parts_) before += seconds;
+    parts_.emplace_back(part, std::chrono::duration<double>(Clock::now() - begin_).count() - before);
+}
+
+double RunTimes::Whole() const {
+    double whole = 0.0;
+    for (const auto& [name, seconds] : parts_) whole += seconds;
+    return whole;
+}
+
 RunReport::RunReport(bool asJson) : asJson_(asJson) {
     root_["exitCode"] = 0;
     root_["messages"] = ordered_json::array();

@@ -5,7 +5,10 @@
 
 #include <nlohmann/json.hpp>
 
+#include <chrono>
 #include <string>
+#include <utility>
+#include <vector>
 
 /// What a run of the program came to.
 enum class ExitCode : int {
@@ -18,6 +21,20 @@ enum class ExitCode : int {
     REPORT_LOST = 6, ///< what was to be written stands, but the report on it could not be given
 };
 
+/// How long the parts of a run took, from its beginning on.
+class RunTimes {
+public:
+    /// The part that ends now.
+    void End(const char* part);
+    double Whole() const;
+    const std::vector<std::pair<const char*, double>>& Parts() const { return parts_; }
+
+private:
+    using Clock = std::chrono::steady_clock;
+    Clock::time_point begin_ = Clock::now();
+    std::vector<std::pair<const char*, double>> parts_;
+};
+
 /// What a run has to say: as text, messages at once on the standard error; or all of it as one JSON object on
 /// the standard output when the run ends, and nothing on the standard error.
 class RunReport {
@@ -25,6 +42,7 @@ public:
     explicit RunReport(bool asJson);
 
     bool AsJson() const { return asJson_; }
+    RunTimes& Times() { return times_; }
     void AddAll(const mdf_Report& report);
     void Add(const std::string& file, const fnd_Finding& finding);
     /// What was found in a file; with lines if it is the one whose report was added last.
@@ -56,6 +74,7 @@ private:
     std::string JsonText(ExitCode code);
 
     bool asJson_;
+    RunTimes times_;
     std::string fileRead_;
     std::shared_ptr<const mdf_FileText> textRead_;
     std::vector<fnd_Finding> foretold_;

@@ -1,3 +1,4 @@
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "support/TestFolder.h"
@@ -179,6 +180,55 @@ TEST(ModelFileErrors, Members_RepeatedVeryOften_AreReportedUpToTheLimit) {
     std::string text = "[";
     for (int i = 0; i < 80; ++i) text += "{\"a\": 1, \"a\": 2},";
     EXPECT_EQ(ErrorsOf(text + "{}]").size(), mdf_maxErrors);
+}
+
+TEST(ModelFileErrors, Places_AreLookedUpInTheText) {
+    const std::string text = "\xEF\xBB\xBF{ \"a\": 1, // \"b\": {\r\n"
+                             "  \"b\": [[1, 2], [3, /* ] */ 4],\n"
+                             "\t{\"x/y\": \"}\\\"\", \"\\u00e9~\": {}}]\n}";
+    const struct {
+        const char* place;
+        long line;
+        long column;
+    } cases[] = {
+        {"", 1, 1},
+        {"/a", 1, 3},
+        {"/b", 2, 3},
+        {"/b/0", 2, 9},
+        {"/b/1/1", 2, 29},
+        {"/b/2", 3, 2},
+        {"/b/2/x~1y", 3, 3},
+        {"/b/2/\xC3\xA9~0", 3, 17},
+        // Nearest to what isn't there: what is around it.
+        {"/c", 1, 1},
+        {"/a/0", 1, 3},
+        {"/b/2/z/0", 3, 2},
+        {"/b/7", 2, 3},
+        {"/b/x", 2, 3},
+    };
+    std::vector<fnd_Finding> findings;
+    for (const auto& c : cases) findings.push_back(fnd_Make("unknown-member", c.place, "x"));
+    mdf_Locate(text, findings);
+    for (std::size_t i = 0; i < findings.size(); ++i) {
+        EXPECT_EQ(findings[i].line, cases[i].line) << cases[i].place;
+        EXPECT_EQ(findings[i].column, cases[i].column) << cases[i].place;
+    }
+}
+
+TEST(ModelFileErrors, Places_OfAFileThatHasChanged_AreNotTold) {
+    const TestFolder folder;
+    const std::string path = folder.Path("model.json");
+    const std::string text = R"({"format": "qrx-model/1", "models": {"Default Model": {}}})";
+    std::ofstream(path, std::ios::binary) << text;
+    mdf_Report report;
+    ASSERT_NE(mdf_ReadModelFile(path, report), nullptr);
+    std::vector<fnd_Finding> findings{fnd_Make("unknown-member", "/models", "x")};
+    report.Locate(findings);
+    EXPECT_EQ(findings[0].column, 27);
+    findings[0].line = 0;
+    std::ofstream(path, std::ios::binary) << "\n" << text;
+    report.Locate(findings);
+    EXPECT_EQ(findings[0].line, 0);
 }
 
 TEST(ModelFileErrors, AppendPointer_WithTildeAndSlash_Escapes) {

@@ -410,3 +410,76 @@ TEST(ModelFileParser, Nesting_OfTwoHundredLevels_IsAccepted) {
     const std::string rows = std::string(200, '[') + "1" + std::string(200, ']');
     EXPECT_EQ(Parsed(rows).Size(), 1u);
 }
+
+namespace {
+
+std::string Joined(int count, const std::string& separator, const auto& item) {
+    std::string text = "[";
+    for (int i = 0; i < count; ++i) text.append(i == 0 ? "" : separator).append(item(i));
+    return text + "]";
+}
+
+} // namespace
+
+// Of more than some thousand numbers the rest is read in pieces.
+TEST(ModelFileParser, LargeArrays_WithOddItemsAnywhere_AreReadAsSmallOnesAre) {
+    constexpr int count = 100000;
+    for (const int odd : {-1, 4095, 4096, 5000, 77777, count - 1}) {
+        for (const std::string item : {"null", "2.5", "/* c */ 7", "3000000000", "[1]", "\"s\"", "-0.0"}) {
+            const mdf_Value value = Parsed(
+                Joined(count, ", ", [&](int i) { return i == odd ? item : std::to_string(i % 1000); }));
+            ASSERT_EQ(value.Size(), static_cast<std::size_t>(count));
+            for (int i = 0; i < count; i += 1237) {
+                if (i != odd) {
+                    ASSERT_EQ(value.Item(static_cast<std::size_t>(i)).Int(), i % 1000);
+                }
+            }
+            if (odd < 0) continue;
+            const mdf_Value found = value.Item(static_cast<std::size_t>(odd));
+            const mdf_Value expected = Parsed(item);
+            EXPECT_EQ(found.Kind(), expected.Kind()) << item;
+            EXPECT_EQ(found.IsLargeInteger(), expected.IsLargeInteger()) << item;
+            EXPECT_EQ(value.Item(count - 1).IsNumber(), odd != count - 1 || expected.IsNumber());
+        }
+    }
+}
+
+TEST(ModelFileParser, LargeMatrices_WithOddRowsAnywhere_AreReadAsSmallOnesAre) {
+    constexpr int count = 60000;
+    for (const int odd : {-1, 2000, 2050, 44444, count - 1}) {
+        for (const std::string row :
+             {"[1, 2.5]", "[1, 2, 3]", "[]", "[1, null]", "[1 , // ]\n 2]", "7", "[[1], 2]"}) {
+            const mdf_Value value = Parsed(Joined(count, ",\n  ", [&](int i) {
+                return i == odd ? row : "[" + std::to_string(i) + ", " + std::to_string(-i) + "]";
+            }));
+            ASSERT_EQ(value.Size(), static_cast<std::size_t>(count));
+            for (int i = 0; i < count; i += 997) {
+                if (i == odd) continue;
+                const mdf_Value item = value.Item(static_cast<std::size_t>(i));
+                ASSERT_EQ(item.Item(0).Int(), i) << row << odd;
+                ASSERT_EQ(item.Item(1).Int(), -i) << row << odd;
+            }
+            if (odd < 0) continue;
+            const mdf_Value expected = Parsed(row);
+            const mdf_Value found = value.Item(static_cast<std::size_t>(odd));
+            EXPECT_EQ(found.Kind(), expected.Kind()) << row;
+            EXPECT_EQ(found.Size(), expected.Size()) << row;
+        }
+    }
+}
+
+TEST(ModelFileParser, LargeArrays_ThatBreakOff_AreErrorsWhereTheyDo) {
+    const auto message = [](const std::string& end) {
+        mdf_Value root;
+        std::vector<fnd_Finding> errors;
+        const std::string text = Joined(50000, ",\n", [](int) { return std::string("[1, 2]"); });
+        EXPECT_FALSE(mdf_Parse(text.substr(0, text.size() - 1) + end, root, errors));
+        return std::to_string(errors.back().line) + ":" + std::to_string(errors.back().column) + " " +
+               errors.back().Text();
+    };
+    EXPECT_EQ(message(""), "50000:7 found the end of the file, expected ',' or ']'");
+    EXPECT_EQ(message(",]"), "50000:8 found ']', expected no comma behind the last one");
+    EXPECT_EQ(message(", [1, ]]"), "50000:13 found ']', expected no comma behind the last one");
+    EXPECT_EQ(message(", [1, 1e999]]"),
+              "50000:13 the number '1e999' is beyond the range of double precision");
+}

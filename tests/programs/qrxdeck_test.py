@@ -123,7 +123,8 @@ class Write(ProgramTest):
         self.assertEqual((run.returncode, run.errors), (0, ""))
         self.assertEqual((self.folder / "model.inp").read_bytes(), DECK)
         self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
-        self.assertRegex(run.output, r"^model\.inp: %d bytes in \d+\.\d\d s\nwritten:\n" % len(DECK))
+        self.assertRegex(run.output, r"^model\.inp: %d bytes in \d+\.\d\d s: reading \d+\.\d\d, checking \d+\.\d\d, "
+                                     r"writing \d+\.\d\d, syncing \d+\.\d\d\nwritten:\n" % len(DECK))
         self.assertIn("\n  2  nodes\n", run.output)
         self.assertNotIn("left out", run.output)
 
@@ -200,6 +201,9 @@ class Write(ProgramTest):
         self.assertEqual((run.returncode, run.errors), (0, ""))
         result = json.loads(run.output)
         seconds = result["written"].pop("seconds")
+        times = result["written"].pop("times")
+        self.assertEqual(list(times), ["reading", "checking", "writing", "syncing"])
+        self.assertAlmostEqual(sum(times.values()), seconds)
         self.assertGreater(seconds, 0)
         self.assertLess(seconds, 60)
         self.assertEqual(result, {

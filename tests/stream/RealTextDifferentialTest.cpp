@@ -29,6 +29,27 @@ TEST(RealTextDifferential, RandomFloatPatternsInTheCoordinateField_AgreeWithTheC
     }
 }
 
+TEST(RealTextDifferential, CoordinatesAsSuch_AreTheTextOfTheirField) {
+    auto random = Generator();
+    const auto check = [](std::uint32_t pattern) {
+        const auto value = std::bit_cast<float>(pattern);
+        char text[128];
+        char expected[128];
+        const std::string_view written(text, static_cast<std::size_t>(num_WriteFloat(text, value) - text));
+        const char* const end = num_WriteReal(expected, value, 12, 7);
+        EXPECT_EQ(written, std::string_view(expected, static_cast<std::size_t>(end - expected))) << pattern;
+    };
+    for (int i = 0; i < 1000000; ++i) {
+        check(static_cast<std::uint32_t>(random()));
+        // Of everyday size, where the work is done another way, and at both ends of that.
+        check(static_cast<std::uint32_t>((random() % 45 + 110) << 23 | (random() & 0x807fffff)));
+    }
+    for (int i = 0; i < 5000; ++i) {
+        for (const double scale : {1e-4, 1e-3, 0.01, 0.1, 1.0, 10.0, 1e3, 1e5, 1e6})
+            check(std::bit_cast<std::uint32_t>(static_cast<float>((i + 0.5) * scale)));
+    }
+}
+
 TEST(RealTextDifferential, RandomDoublePatternsInTheFormsInUse_AgreeWithTheCLibrary) {
     auto random = Generator();
     for (int i = 0; i < 400000; ++i) {
