@@ -17,6 +17,10 @@ target_include_directories(QRXZptInputFileWriter PUBLIC
     $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src>
     $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/${QRX_INCLUDE_SUBDIR}>)
 target_compile_features(QRXZptInputFileWriter PUBLIC cxx_std_20)
+# Threads may be a library of their own in older systems.
+set(THREADS_PREFER_PTHREAD_FLAG ON)
+find_package(Threads REQUIRED)
+target_link_libraries(QRXZptInputFileWriter PUBLIC Threads::Threads)
 set_target_properties(QRXZptInputFileWriter PROPERTIES
     VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR})
 

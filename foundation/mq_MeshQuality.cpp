@@ -1,8 +1,12 @@
 #include "foundation/mq_MeshQuality.h"
 
+#include "foundation/thr_InOrder.h"
+
 #include <algorithm>
 #include <bit>
 #include <cmath>
+#include <functional>
+#include <iterator>
 #include <numeric>
 
 namespace {
@@ -101,24 +105,41 @@ public:
         : mesh_(mesh), numNodes_(static_cast<int>(mesh.nodeLabels.size())) {}
 
     mq_Quality Examine() {
+        // Each finds something of its own, the longest first.
+        const std::function<void()> tasks[] = {
+            [this] { ExamineFaces(); },
+            [this] { ForEachShape([this](const mq_Block& block) { ExamineShapes(block); }); },
+            [this] { ForEachShape([this](const mq_Block& block) { ExamineRepetitions(block); }); },
+            [this] { ExamineNodes(); },
+            [this] { ExamineUse(); },
+        };
+        const int threads = numNodes_ < kFewNodes ? 1 : 0;
+        thr_ForEach(threads, std::size(tasks), [&](std::size_t i) { tasks[i](); });
+        return std::move(quality_);
+    }
+
+private:
+    static constexpr int kFewNodes = 20000;
+
+    template <class Look>
+    void ForEachShape(const Look& look) const {
+        for (const mq_Block& block : mesh_.blocks) {
+            if (block.hasShape) look(block);
+        }
+    }
+
+    void ExamineUse() {
         std::vector<char> used(static_cast<std::size_t>(numNodes_));
         for (const mq_Block& block : mesh_.blocks) {
             for (const int node : block.nodes) {
                 if (IsNode(node)) used[static_cast<std::size_t>(node)] = 1;
             }
-            if (!block.hasShape) continue;
-            ExamineShapes(block);
-            ExamineRepetitions(block);
         }
         for (std::size_t i = 0; i < used.size(); ++i) {
             if (used[i] == 0) quality_.unusedNodes.Add(mesh_.nodeLabels[i]);
         }
-        ExamineNodes();
-        ExamineFaces();
-        return std::move(quality_);
     }
 
-private:
     bool IsNode(int node) const { return node >= 0 && node < numNodes_; }
     bool HasAllNodes(const int* row, int count) const {
         return std::all_of(row, row + count, [this](int node) { return IsNode(node); });

@@ -143,9 +143,20 @@ void thr_ForEach(int threads, std::size_t count, const std::function<void(std::s
     const std::size_t used = std::min(static_cast<std::size_t>(thr_NumThreads(threads)), count);
     if (used == 0) return;
     std::atomic<std::size_t> next = 0;
+    std::mutex mutex;
+    std::exception_ptr failure;
     const auto work = [&] {
-        for (std::size_t i = next++; i < count; i = next++) task(i);
+        try {
+            for (std::size_t i = next++; i < count; i = next++) task(i);
+        } catch (...) {
+            next = count;
+            const std::lock_guard lock(mutex);
+            if (!failure) failure = std::current_exception();
+        }
     };
-    const Helpers helpers(used - 1, work, [] {});
-    work();
+    {
+        const Helpers helpers(used - 1, work, [] {});
+        work();
+    }
+    if (failure) std::rethrow_exception(failure);
 }

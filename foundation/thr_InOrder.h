@@ -10,7 +10,8 @@ int thr_NumThreads(int wanted);
 void thr_SetUsualThreads(int threads);
 
 /// Calls `task(i)` for each i below `count`, in several threads at once, and returns when all are done; in
-/// the calling thread alone where no further one can be had. The tasks raise nothing.
+/// the calling thread alone where no further one can be had. After a task that raises no further ones are
+/// begun, and the first failure is raised here.
 void thr_ForEach(int threads, std::size_t count, const std::function<void(std::size_t)>& task);
 
 /// Makes the texts of the blocks 0 to `count` - 1 in several threads, and hands them on in order.

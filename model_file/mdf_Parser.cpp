@@ -260,7 +260,8 @@ inline bool DocumentReader::MayReadInBulk(const mdf_Numbers& numbers, std::size_
 
 /// Adds a number that begins here; false, with the error told, when it is none.
 inline bool DocumentReader::Add(mdf_Numbers& numbers, const mdf_Number& number, int depth) {
-    if (numbers.Full() && numbers.Size() >= kFewNumbers) [[unlikely]]
+    // Later than reading in bulk is thought of, which is between two rows.
+    if (numbers.Full() && numbers.Size() >= 4 * kFewNumbers) [[unlikely]]
         numbers.Reserve(numbers.Size() + NumbersAhead(at_, end_, depth));
     if (number.kind == mdf_Number::Kind::INT) {
         numbers.AddInt(number.whole);
