@@ -82,7 +82,22 @@ TEST(sty_Placer, WhereAForeignFileStands_LeavesIt) {
         const auto yes = [](const std::string& path) { return path.ends_with("001/002/3.inp"); };
         EXPECT_EQ(placer.Place("001/002/3.inp", WriteOne, false, yes), sty_Placer::Result::PLACED);
     }
-    EXPECT_TRUE(std::filesystem::is_empty(scratch.Path(sty_Folder::kHidden)));
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-job")));
+}
+
+TEST(sty_Folder, WhatAKilledRunLeft_IsRemoved) {
+    const Scratch scratch;
+    const sty_Folder folder(scratch.Path());
+    std::filesystem::create_directory(scratch.Path("000"));
+    for (const char* name :
+         {"000/.study-2-of-4.0", "000/.study-2-of-4.1", "000/.study-2-of-40.1", "000/1.inp"})
+        std::ofstream(scratch.Path(name)) << "half";
+    folder.RemoveUnplaced("000", "2-of-4.");
+    folder.RemoveUnplaced("001", "2-of-4.");
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-2-of-4.0")));
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-2-of-4.1")));
+    EXPECT_TRUE(std::filesystem::exists(scratch.Path("000/.study-2-of-40.1")));
+    EXPECT_TRUE(std::filesystem::exists(scratch.Path("000/1.inp")));
 }
 
 TEST(sty_Placer, WhenWritingFails_NothingStandsThere) {
