@@ -61,6 +61,17 @@ long long sty_DeckText::Bytes() const {
     return static_cast<long long>(bytes);
 }
 
+std::string sty_DeckText::Whole() const {
+    std::string whole;
+    whole.reserve(static_cast<std::size_t>(Bytes()));
+    std::size_t written = 0;
+    for (const Piece& piece : pieces_) {
+        whole.append(own_, written, piece.ownEnd - written).append(*piece.kept);
+        written = piece.ownEnd;
+    }
+    return whole.append(own_, written);
+}
+
 /// The last deck that begins with the same mesh, or none yet.
 sty_DeckText::Summed& sty_DeckText::SummedLike() {
     const Text first = pieces_.empty() ? nullptr : pieces_.front().kept;

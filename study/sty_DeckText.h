@@ -45,6 +45,7 @@ public:
     void WriteKept(const Text& text) override;
 
     long long Bytes() const;
+    std::string Whole() const;
     /// The SHA-256 of the deck.
     std::string Sha256();
     /// Writes the deck to an open file; the errno value of a failure, 0 for none.

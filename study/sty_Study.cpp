@@ -67,8 +67,7 @@ public:
         const Clock::time_point start = Clock::now();
         ReadInputs();
         PrepareFolder();
-        std::unique_ptr<sty_Variants> first =
-            std::make_unique<sty_Variants>(std::move(template_), *columns_, meshes_);
+        std::unique_ptr<sty_Variants> first = std::make_unique<sty_Variants>(std::move(template_), meshes_);
         TellBaseline(*first);
         RunRows(std::move(first), start);
         outcome_.counts.seconds = SecondsSince(start);
@@ -88,7 +87,7 @@ private:
         }
         mdf_Report report;
         const auto places = [&](const std::vector<mdf_Parameter>& parameters) {
-            columns_ = std::make_unique<sty_Columns>(*table_, parameters);
+            columns_ = std::make_unique<sty_Columns>(table_->Columns(), table_->HasHeader(), parameters);
             return columns_->Pointers();
         };
         identity_.templateSha256 = sty_Sha256OfFile(request_.model);
@@ -270,7 +269,7 @@ private:
             sty_RawRow raw;
             while (!stop_ && queue.Next(raw)) {
                 const Clock::time_point start = Clock::now();
-                sty_Result result = variants.Make(table_->Parse(raw));
+                sty_Result result = variants.Make(table_->Parse(raw), *columns_);
                 if (result.IsDone()) Write(variants.Text(), placer.get(), result);
                 result.seconds = SecondsSince(start);
                 if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
