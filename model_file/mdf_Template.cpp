@@ -47,10 +47,11 @@ void ForEachMesh(mdf_Value& root, const Visitor& visit) {
 mdf_Value CopyWithoutMeshes(mdf_Value& root, std::span<const std::string> places) {
     std::vector<std::pair<mdf_Value*, mdf_Value>> apart;
     ForEachMesh(root, [&](mdf_Value& mesh, const std::string& pointer) {
-        const bool isFile = mesh.IsObject() && mesh.Find("file") != nullptr;
+        // A given mesh is a number.
+        const bool isSmall = !mesh.IsObject() || mesh.Find("file") != nullptr;
         const bool varies = std::ranges::any_of(
             places, [&](const std::string& place) { return mdf_IsBelow(place, pointer); });
-        if (!isFile && !varies) apart.emplace_back(&mesh, std::exchange(mesh, mdf_Value()));
+        if (!isSmall && !varies) apart.emplace_back(&mesh, std::exchange(mesh, mdf_Value()));
     });
     mdf_Value copy = root;
     for (auto& [place, mesh] : apart) *place = std::move(mesh);

@@ -12,7 +12,7 @@ namespace {
 
 constexpr std::size_t kMostMeshes = 16;
 constexpr std::size_t kMostSummed = 8;
-constexpr std::size_t kBytesOfMark = std::size_t{16} * 1024;
+constexpr std::size_t kBytesOfMark = std::size_t{2} * 1024;
 constexpr int kMostVectors = 64;
 
 } // namespace

@@ -25,7 +25,7 @@ public:
 private:
     struct Entry {
         cow_CountedHld<odiK_Mesh> mesh; // so that no other mesh gets its address
-        Text texts[2];
+        Text texts[oif_kMeshBlocks];
     };
     std::mutex mutex_;
     std::list<Entry> entries_; // the last one used is the first
