@@ -1,6 +1,7 @@
 #include "model_file/mdf_Template.h"
 
 #include "model_file/mdf_Document.h"
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelReader.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Pointer.h"
@@ -46,10 +47,11 @@ void ForEachMesh(mdf_Value& root, const Visitor& visit) {
 mdf_Value CopyWithoutMeshes(mdf_Value& root, std::span<const std::string> places) {
     std::vector<std::pair<mdf_Value*, mdf_Value>> apart;
     ForEachMesh(root, [&](mdf_Value& mesh, const std::string& pointer) {
-        const bool isFile = mesh.IsObject() && mesh.Find("file") != nullptr;
+        // A given mesh is a number.
+        const bool isSmall = !mesh.IsObject() || mesh.Find("file") != nullptr;
         const bool varies = std::ranges::any_of(
             places, [&](const std::string& place) { return mdf_IsBelow(place, pointer); });
-        if (!isFile && !varies) apart.emplace_back(&mesh, std::exchange(mesh, mdf_Value()));
+        if (!isSmall && !varies) apart.emplace_back(&mesh, std::exchange(mesh, mdf_Value()));
     });
     mdf_Value copy = root;
     for (auto& [place, mesh] : apart) *place = std::move(mesh);
@@ -97,14 +99,18 @@ std::unique_ptr<mdf_Template> mdf_Template::OfFile(const std::string& path, cons
 }
 
 std::unique_ptr<mdf_Template> mdf_Template::OfText(std::string_view text, const std::string& fileName,
-                                                   const Places& places, mdf_Report& report) {
+                                                   const Places& places, mdf_Report& report,
+                                                   const mdf_GivenMeshes& given) {
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors);
     std::unique_ptr<mdf_Template> made(new mdf_Template());
     made->fileName_ = fileName;
-    return made->Read(root, errors, places, report) ? std::move(made) : nullptr;
+    made->given_ = given;
+    const bool isRead = made->Read(root, errors, places, report);
+    mdf_Locate(text, report.findings);
+    return isRead ? std::move(made) : nullptr;
 }
 
 bool mdf_Template::Read(mdf_Value& root, std::vector<fnd_Finding>& errors, const Places& places,
@@ -116,7 +122,7 @@ bool mdf_Template::Read(mdf_Value& root, std::vector<fnd_Finding>& errors, const
         parameters_ = mdf_ReadParameters(root, diagnostics);
     }
     root_ = CopyWithoutMeshes(root, places(parameters_));
-    store_ = mdf_ReadDocument(root, errors, report, &shelf_);
+    store_ = mdf_ReadDocument(root, errors, report, &shelf_, given_);
     if (store_ == nullptr) return false;
     fnd_List rules;
     for (const auto& [name, model] : store_->Models()) AddRules(*model, rules);
@@ -135,12 +141,13 @@ std::unique_ptr<mdf_Template> mdf_Template::Twin() const {
     twin->parameters_ = parameters_;
     twin->root_ = root_;
     twin->shelf_ = mdf_MeshShelf(shelf_, {});
+    twin->given_ = given_;
     twin->findings_ = findings_;
     mdf_Value read = root_;
     std::vector<fnd_Finding> errors;
     mdf_Report report;
     report.fileName = fileName_;
-    twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_);
+    twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_, given_);
     if (twin->store_ == nullptr) throw std::logic_error("a template that was read can't be read again");
     twin->timeline_ =
         std::make_unique<kprC_Timeline>(twin->store_->FindModel(odb_Odb::DefaultModelName())->steps);
@@ -233,7 +240,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfObjects(std::span<const mdf_Chan
     for (const auto& [pointer, object] : objects) {
         const Target& target = *object.first;
         const fnd_Path container(ofModel, std::string_view(target.repository->member));
-        mdf_ModelReader(model, diagnostics)
+        mdf_ModelReader(model, diagnostics, given_)
             .ReadAnew(*target.repository, target.object, object.second, fnd_Path(container, target.object),
                       *timeline_);
     }
@@ -270,7 +277,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfModels(std::span<const mdf_Chang
     const fnd_Path top;
     const fnd_Path path(top, "models");
     for (auto& [name, json] : models) {
-        mdf_ModelReader reader(store->AddModel(cow_String(name)), diagnostics);
+        mdf_ModelReader reader(store->AddModel(cow_String(name)), diagnostics, given_);
         reader.TakeFrom(shelf);
         reader.Read(json, fnd_Path(path, name));
     }

@@ -27,7 +27,8 @@ public:
     static std::unique_ptr<mdf_Template> OfFile(const std::string& path, const Places& places,
                                                 mdf_Report& report);
     static std::unique_ptr<mdf_Template> OfText(std::string_view text, const std::string& fileName,
-                                                const Places& places, mdf_Report& report);
+                                                const Places& places, mdf_Report& report,
+                                                const mdf_GivenMeshes& given = {});
     mdf_Template(const mdf_Template&) = delete;
     mdf_Template& operator=(const mdf_Template&) = delete;
     ~mdf_Template();
@@ -66,6 +67,7 @@ private:
     std::vector<mdf_Parameter> parameters_;
     mdf_Value root_; // without what the shelf has
     mdf_MeshShelf shelf_;
+    mdf_GivenMeshes given_;
     std::unique_ptr<odb_Odb> store_;
     /// What reading the template says but for the rules of whole models, which are asked of each variant.
     std::vector<fnd_Finding> findings_;

@@ -2,6 +2,7 @@
 #include "python/pyx_Hooks.h"
 #include "python/pyx_Mesh.h"
 #include "python/pyx_Store.h"
+#include "python/pyx_Study.h"
 #include "store_interface/findings/fnd_Nearest.h"
 #include "tools/Program.h"
 
@@ -43,6 +44,7 @@ PYBIND11_MODULE(_qrx, module) {
     pyx_AddClasses(module);
     pyx_Mesh::Add(module);
     pyx_Store::Add(module);
+    pyx_Study::Add(module);
     module.def("set_hooks", &SetHooks, py::arg("record"), py::arg("member"), py::arg("polar"),
                py::arg("region"), py::arg("model_error"), py::arg("deck_error"));
     module.def("nearest", [](const std::string& name, const std::vector<std::string>& known) {

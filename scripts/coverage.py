@@ -19,7 +19,7 @@ import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 BUILD = ROOT / "build" / "coverage"
-FOLDERS = ["foundation", "store_interface", "keyword_layer", "QRXZptIfwOif.m", "deck_checks", "model_file", "tools"]
+FOLDERS = ["foundation", "store_interface", "keyword_layer", "QRXZptIfwOif.m", "deck_checks", "model_file", "study", "tools"]
 
 
 def run_tests():

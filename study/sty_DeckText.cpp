@@ -11,7 +11,8 @@
 namespace {
 
 constexpr std::size_t kMostMeshes = 16;
-constexpr std::size_t kMostBeginnings = 64;
+constexpr std::size_t kMostSummed = 8;
+constexpr std::size_t kBytesOfMark = std::size_t{2} * 1024;
 constexpr int kMostVectors = 64;
 
 } // namespace
@@ -54,42 +55,78 @@ void sty_DeckText::WriteKept(const Text& text) {
     pieces_.push_back({own_.size(), text});
 }
 
-std::string_view sty_DeckText::OwnOf(std::size_t piece) const {
-    const std::size_t begin = piece == 0 ? 0 : pieces_[piece - 1].ownEnd;
-    return std::string_view(own_).substr(begin, pieces_[piece].ownEnd - begin);
-}
-
-std::string_view sty_DeckText::OwnEnd() const {
-    return std::string_view(own_).substr(pieces_.empty() ? 0 : pieces_.back().ownEnd);
-}
-
 long long sty_DeckText::Bytes() const {
     std::size_t bytes = own_.size();
     for (const Piece& piece : pieces_) bytes += piece.kept->size();
     return static_cast<long long>(bytes);
 }
 
-std::string sty_DeckText::Sha256() {
-    sty_Sha256 sum;
-    int at = -1;
-    if (beginnings_.size() + pieces_.size() > kMostBeginnings) beginnings_.clear();
-    for (std::size_t i = 0; i < pieces_.size(); ++i) {
-        const std::string_view own = OwnOf(i);
-        const auto known = std::ranges::find_if(beginnings_, [&](const Beginning& beginning) {
-            return beginning.former == at && beginning.kept == pieces_[i].kept && beginning.own == own;
-        });
-        if (known != beginnings_.end()) {
-            sum = known->sum;
-            at = static_cast<int>(known - beginnings_.begin());
-            continue;
-        }
-        sum.Add(own);
-        sum.Add(*pieces_[i].kept);
-        beginnings_.push_back({at, std::string(own), pieces_[i].kept, sum});
-        at = static_cast<int>(beginnings_.size()) - 1;
+std::string sty_DeckText::Whole() const {
+    std::string whole;
+    whole.reserve(static_cast<std::size_t>(Bytes()));
+    std::size_t written = 0;
+    for (const Piece& piece : pieces_) {
+        whole.append(own_, written, piece.ownEnd - written).append(*piece.kept);
+        written = piece.ownEnd;
     }
-    sum.Add(OwnEnd());
-    return sum.Hex();
+    return whole.append(own_, written);
+}
+
+/// The last deck that begins with the same mesh, or none yet.
+sty_DeckText::Summed& sty_DeckText::SummedLike() {
+    const Text first = pieces_.empty() ? nullptr : pieces_.front().kept;
+    const auto place = std::ranges::find(summed_, first, &Summed::first);
+    if (place != summed_.end()) {
+        summed_.splice(summed_.begin(), summed_, place);
+        return summed_.front();
+    }
+    if (summed_.size() >= kMostSummed) summed_.pop_back();
+    summed_.emplace_front();
+    summed_.front().first = first;
+    summed_.front().marks.push_back({0, 0, sty_Sha256()});
+    return summed_.front();
+}
+
+/// The last mark up to which the decks are the same; those behind it are dropped.
+sty_DeckText::Summed::Mark sty_DeckText::CommonBeginning(Summed& former) const {
+    std::size_t pieces = 0;
+    std::size_t own = 0;
+    for (;; ++pieces) {
+        const bool atEnd = pieces >= pieces_.size() || pieces >= former.pieces.size();
+        const std::size_t end = pieces < pieces_.size() ? pieces_[pieces].ownEnd : own_.size();
+        const std::size_t formerEnd =
+            pieces < former.pieces.size() ? former.pieces[pieces].ownEnd : former.own.size();
+        const std::size_t least = std::min(end, formerEnd);
+        const auto begin = own_.begin() + static_cast<std::ptrdiff_t>(own);
+        const auto differ = std::mismatch(begin, own_.begin() + static_cast<std::ptrdiff_t>(least),
+                                          former.own.begin() + static_cast<std::ptrdiff_t>(own));
+        own = static_cast<std::size_t>(differ.first - own_.begin());
+        if (atEnd || end != formerEnd || own < least || pieces_[pieces].kept != former.pieces[pieces].kept)
+            break;
+    }
+    while (former.marks.back().pieces > pieces || former.marks.back().own > own) former.marks.pop_back();
+    return former.marks.back();
+}
+
+std::string sty_DeckText::Sha256() {
+    Summed& summed = SummedLike();
+    Summed::Mark at = CommonBeginning(summed);
+    for (;; ++at.pieces) {
+        const bool last = at.pieces == pieces_.size();
+        const std::size_t end = last ? own_.size() : pieces_[at.pieces].ownEnd;
+        while (at.own < end) {
+            const std::size_t step = std::min(end - at.own, kBytesOfMark);
+            at.sum.Add(std::string_view(own_).substr(at.own, step));
+            at.own += step;
+            if (step == kBytesOfMark) summed.marks.push_back(at);
+        }
+        if (last) break;
+        at.sum.Add(*pieces_[at.pieces].kept);
+        summed.marks.push_back({at.pieces + 1, at.own, at.sum});
+    }
+    summed.pieces = pieces_;
+    summed.own = own_;
+    return at.sum.Hex();
 }
 
 int sty_DeckText::WriteTo(int file) const {
@@ -97,11 +134,14 @@ int sty_DeckText::WriteTo(int file) const {
     const auto add = [&](std::string_view text) {
         if (!text.empty()) vectors.push_back({const_cast<char*>(text.data()), text.size()});
     };
-    for (std::size_t i = 0; i < pieces_.size(); ++i) {
-        add(OwnOf(i));
-        add(*pieces_[i].kept);
+    const std::string_view own = own_;
+    std::size_t written = 0;
+    for (const Piece& piece : pieces_) {
+        add(own.substr(written, piece.ownEnd - written));
+        add(*piece.kept);
+        written = piece.ownEnd;
     }
-    add(OwnEnd());
+    add(own.substr(written));
     for (std::size_t first = 0; first < vectors.size();) {
         const int count = static_cast<int>(std::min<std::size_t>(vectors.size() - first, kMostVectors));
         errno = 0;

@@ -25,7 +25,7 @@ public:
 private:
     struct Entry {
         cow_CountedHld<odiK_Mesh> mesh; // so that no other mesh gets its address
-        Text texts[2];
+        Text texts[oif_kMeshBlocks];
     };
     std::mutex mutex_;
     std::list<Entry> entries_; // the last one used is the first
@@ -45,6 +45,7 @@ public:
     void WriteKept(const Text& text) override;
 
     long long Bytes() const;
+    std::string Whole() const;
     /// The SHA-256 of the deck.
     std::string Sha256();
     /// Writes the deck to an open file; the errno value of a failure, 0 for none.
@@ -55,22 +56,27 @@ private:
         std::size_t ownEnd; ///< where the bytes of its own end that stand before the kept text
         Text kept;
     };
-    /// How a deck that was summed up began: what it continues, bytes of its own, and a kept text.
-    struct Beginning {
-        int former;
+    /// A deck that was summed up, and its sum at some places.
+    struct Summed {
+        struct Mark {
+            std::size_t pieces; ///< kept texts that stand before it
+            std::size_t own;    ///< bytes of its own that stand before it
+            sty_Sha256 sum;
+        };
+        Text first; // the first kept text; null for none
+        std::vector<Piece> pieces;
         std::string own;
-        Text kept;
-        sty_Sha256 sum;
+        std::vector<Mark> marks;
     };
 
-    std::string_view OwnOf(std::size_t piece) const;
-    std::string_view OwnEnd() const;
+    Summed& SummedLike();
+    Summed::Mark CommonBeginning(Summed& former) const;
 
     sty_MeshTexts& meshes_;
     const odb_Odb* store_ = nullptr;
     std::string own_;
     std::vector<Piece> pieces_;
-    std::vector<Beginning> beginnings_;
+    std::list<Summed> summed_; // the last one used is the first
 };
 
 #endif

@@ -40,6 +40,33 @@ private:
 
 /// Writes all of the text; the errno value of a failure, 0 for none.
 int sty_WriteAll(int file, std::string_view text);
+/// Writes lines to a file, many at a time.
+class sty_LineWriter {
+public:
+    explicit sty_LineWriter(int file) : file_(file) {}
+    void Add(std::string_view line) {
+        text_.append(line).append("\n");
+        if (text_.size() >= kBytes) Flush();
+    }
+    /// The errno value of the first failure, 0 for none.
+    int End() {
+        Flush();
+        return error_;
+    }
+
+private:
+    static constexpr std::size_t kBytes = std::size_t{1} << 20;
+
+    void Flush() {
+        if (error_ == 0) error_ = sty_WriteAll(file_, text_);
+        text_.clear();
+    }
+
+    int file_;
+    int error_ = 0;
+    std::string text_;
+};
+
 /// "No space left on device".
 std::string sty_ReasonOf(int error);
 

@@ -21,15 +21,15 @@ constexpr int kOpenFolder = O_RDONLY | O_DIRECTORY | O_CLOEXEC;
     throw sty_Refused("cannot " + action + " " + fnd_Quoted(path) + ": " + sty_ReasonOf(error));
 }
 
-/// Renames within a file system where nothing has the new name; EEXIST when something has.
-int RenameToNew(int from, const char* name, int to, const char* target) {
+/// Renames within a folder where nothing has the new name; EEXIST when something has.
+int RenameToNew(int folder, const char* name, const char* target) {
 #ifdef RENAME_NOREPLACE
-    if (::renameat2(from, name, to, target, RENAME_NOREPLACE) == 0) return 0;
+    if (::renameat2(folder, name, folder, target, RENAME_NOREPLACE) == 0) return 0;
     // Some file systems don't know the flag.
     if (errno != EINVAL && errno != ENOSYS && errno != ENOTSUP) return errno;
 #endif
-    if (::linkat(from, name, to, target, 0) != 0) return errno;
-    return ::unlinkat(from, name, 0) == 0 ? 0 : errno;
+    if (::linkat(folder, name, folder, target, 0) != 0) return errno;
+    return ::unlinkat(folder, name, 0) == 0 ? 0 : errno;
 }
 
 } // namespace
@@ -89,14 +89,27 @@ std::optional<std::string> sty_Folder::Read(const std::string& name) const {
     return text;
 }
 
-bool sty_Folder::Write(const std::string& name, const std::string& text, bool replace) {
+bool sty_Folder::Write(const std::string& name, const Writing& write, bool replace) {
     sty_Placer placer(*this, name + "." + std::to_string(::getpid()));
-    const auto write = [&](int file) {
-        const int error = sty_WriteAll(file, text);
+    const auto writeAndSync = [&](int file) {
+        const int error = write(file);
         return error == 0 && ::fsync(file) != 0 && errno != EINVAL ? errno : error;
     };
-    return placer.Place(name, write, replace, [](const std::string&) { return false; }) ==
+    return placer.Place(name, writeAndSync, replace, [](const std::string&) { return false; }) ==
            sty_Placer::Result::PLACED;
+}
+
+void sty_Folder::RemoveUnplaced(const std::string& folder, const std::string& name) const {
+    const sty_Descriptor opened(::openat(Number(), folder.empty() ? "." : folder.c_str(), kOpenFolder));
+    if (!opened.IsOpen()) return;
+    const std::string beginning = kUnplaced + name;
+    const int listed = ::openat(opened.Number(), ".", kOpenFolder);
+    const std::unique_ptr<DIR, int (*)(DIR*)> entries(listed < 0 ? nullptr : ::fdopendir(listed), ::closedir);
+    if (entries == nullptr) return;
+    while (const dirent* entry = ::readdir(entries.get())) {
+        if (std::string_view(entry->d_name).starts_with(beginning))
+            ::unlinkat(opened.Number(), entry->d_name, 0);
+    }
 }
 
 long long sty_Folder::SizeOf(const std::string& path) const {
@@ -107,15 +120,12 @@ long long sty_Folder::SizeOf(const std::string& path) const {
 }
 
 std::optional<sty_Descriptor> sty_Folder::Lock(const std::string& name) const {
-    sty_Descriptor file(::openat(Hidden(), name.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0666));
+    sty_Descriptor file(
+        ::openat(hidden_.Number(), name.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0666));
     if (!file.IsOpen()) Refuse("make", path_ + "/" + kHidden + "/" + name, errno);
     // Some file systems have no locks.
     if (::flock(file.Number(), LOCK_EX | LOCK_NB) != 0 && errno == EWOULDBLOCK) return std::nullopt;
     return file;
-}
-
-sty_Placer::~sty_Placer() {
-    ::unlinkat(folder_.Hidden(), name_.c_str(), 0);
 }
 
 int sty_Placer::FolderOf(const std::string& path) {
@@ -135,31 +145,37 @@ int sty_Placer::FolderOf(const std::string& path) {
     return target_.Number();
 }
 
-sty_Placer::Result sty_Placer::Place(const std::string& path, const std::function<int(int file)>& write,
-                                     bool ours, const std::function<bool(const std::string& path)>& isSame) {
+void sty_Placer::Make(int folder, const std::string& whole, const sty_Folder::Writing& write) const {
+    const auto create = [&] {
+        return ::openat(folder, name_.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+    };
+    int number = create();
+    if (number < 0 && errno == EEXIST) {
+        ::unlinkat(folder, name_.c_str(), 0);
+        number = create();
+    }
+    const sty_Descriptor file(number);
+    if (!file.IsOpen()) Refuse("make a file for", whole, errno);
+    const int error = write(file.Number());
+    if (error == 0) return;
+    ::unlinkat(folder, name_.c_str(), 0);
+    Refuse("write", whole, error);
+}
+
+sty_Placer::Result sty_Placer::Place(const std::string& path, const sty_Folder::Writing& write, bool ours,
+                                     const std::function<bool(const std::string& path)>& isSame) {
     const std::string whole = folder_.Path() + "/" + path;
     const int folder = FolderOf(path);
     const std::string target = path.substr(path.rfind('/') + 1);
-    {
-        const auto create = [&] {
-            return ::openat(folder_.Hidden(), name_.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
-        };
-        int number = create();
-        if (number < 0 && errno == EEXIST) {
-            // What a run that was killed left, or a file that was not put in its place.
-            ::unlinkat(folder_.Hidden(), name_.c_str(), 0);
-            number = create();
-        }
-        const sty_Descriptor file(number);
-        if (!file.IsOpen()) Refuse("make a file for", whole, errno);
-        if (const int error = write(file.Number()); error != 0) Refuse("write", whole, error);
+    Make(folder, whole, write);
+    int error = 0;
+    if (ours) {
+        error = ::renameat(folder, name_.c_str(), folder, target.c_str()) == 0 ? 0 : errno;
+    } else {
+        error = RenameToNew(folder, name_.c_str(), target.c_str());
     }
-    int error = ours ? EEXIST : RenameToNew(folder_.Hidden(), name_.c_str(), folder, target.c_str());
-    if (error == EEXIST && !ours) {
-        if (isSame(whole)) return Result::PLACED;
-        return Result::FOREIGN;
-    }
-    if (ours) error = ::renameat(folder_.Hidden(), name_.c_str(), folder, target.c_str()) == 0 ? 0 : errno;
-    if (error != 0) Refuse("put in its place", whole, error);
-    return Result::PLACED;
+    if (error == 0) return Result::PLACED;
+    ::unlinkat(folder, name_.c_str(), 0);
+    if (ours || error != EEXIST) Refuse("put in its place", whole, error);
+    return isSame(whole) ? Result::PLACED : Result::FOREIGN;
 }

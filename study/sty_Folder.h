@@ -41,6 +41,10 @@ class sty_Folder {
 public:
     static constexpr const char* kHidden = ".study";
     static constexpr const char* kIdentity = "study.json";
+    /// What the names of files begin with that are not in their places yet.
+    static constexpr const char* kUnplaced = ".study-";
+    /// Writes a file; gives the errno value of a failure, 0 for none.
+    using Writing = std::function<int(int file)>;
 
     /// Makes the folder where it isn't there. Raises sty_Refused.
     explicit sty_Folder(const std::string& path);
@@ -53,13 +57,14 @@ public:
     /// The text of a file, nothing where there is none.
     std::optional<std::string> Read(const std::string& name) const;
     /// Replaces a file, or makes it only where there is none; false when there was.
-    bool Write(const std::string& name, const std::string& text, bool replace);
+    bool Write(const std::string& name, const Writing& write, bool replace);
+    /// Removes what a run that was killed left in a folder below this one: `name` is that of its placer.
+    void RemoveUnplaced(const std::string& folder, const std::string& name) const;
     /// The size of a file below the folder, -1 where there is none.
     long long SizeOf(const std::string& path) const;
     /// Locks a file of the hidden folder for as long as the descriptor lives; nothing when another process
     /// has it.
     std::optional<sty_Descriptor> Lock(const std::string& name) const;
-    int Hidden() const { return hidden_.Number(); }
 
 private:
     std::string path_;
@@ -70,9 +75,9 @@ private:
 /// Puts decks below the folder, for one thread.
 class sty_Placer {
 public:
-    /// `name` is that of the file in the hidden folder, which no other thread or process uses.
-    sty_Placer(const sty_Folder& folder, std::string name) : folder_(folder), name_(std::move(name)) {}
-    ~sty_Placer();
+    /// `name` is one that no other thread or process uses.
+    sty_Placer(const sty_Folder& folder, const std::string& name)
+        : folder_(folder), name_(sty_Folder::kUnplaced + name) {}
     sty_Placer(const sty_Placer&) = delete;
     sty_Placer& operator=(const sty_Placer&) = delete;
 
@@ -80,11 +85,12 @@ public:
     /// Writes a file and puts it in its place. A file that stands there already is replaced when it is
     /// `ours`, and taken for the same where `isSame` says so of its path; else it stays, and FOREIGN. Raises
     /// sty_Refused.
-    Result Place(const std::string& path, const std::function<int(int file)>& write, bool ours,
+    Result Place(const std::string& path, const sty_Folder::Writing& write, bool ours,
                  const std::function<bool(const std::string& path)>& isSame);
 
 private:
     int FolderOf(const std::string& path);
+    void Make(int folder, const std::string& whole, const sty_Folder::Writing& write) const;
 
     const sty_Folder& folder_;
     std::string name_;

@@ -165,9 +165,9 @@ bool sty_Ledger::Exists() const {
 long long sty_Ledger::TakeUp(sty_DoneRows& done) {
     bool clean = true;
     long long count = 0;
-    // The lines that stay are put together only when one doesn't.
-    const auto walk = [&](std::string* kept) {
+    const auto walk = [&](const std::function<void(std::string_view line)>& take) {
         sty_DoneRows seen = done;
+        count = 0;
         const std::size_t cutOff = sty_ForEachLine(Path(), [&](std::string_view line, long long) {
             const std::optional<sty_Entry> entry = sty_EntryOf(line);
             const bool good = entry && seen.IsRow(entry->row) && !entry->deck.empty() &&
@@ -176,20 +176,23 @@ long long sty_Ledger::TakeUp(sty_DoneRows& done) {
             clean = clean && good;
             if (!good) return;
             seen.Add(entry->row);
-            if (kept == nullptr) {
-                ++count;
-            } else {
-                kept->append(line).append("\n");
-            }
+            ++count;
+            take(line);
         });
         clean = clean && cutOff == 0;
         return seen;
     };
-    sty_DoneRows seen = walk(nullptr);
+    sty_DoneRows seen = walk([](std::string_view) {});
     if (!clean) {
-        std::string kept;
-        walk(&kept);
-        folder_.Write(name_, kept, true);
+        // The lines that stay, as a new file.
+        folder_.Write(
+            name_,
+            [&](int file) {
+                sty_LineWriter writer(file);
+                walk([&](std::string_view line) { writer.Add(line); });
+                return writer.End();
+            },
+            true);
     }
     done = std::move(seen);
     return count;

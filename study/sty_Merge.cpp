@@ -37,6 +37,16 @@ std::string LineAt(const sty_Descriptor& file, const LinePlace& place, const std
     return line;
 }
 
+void Count(const LinePlace& place, const std::string& line, sty_Merged& merged) {
+    if (place.done) {
+        ++merged.done;
+        return;
+    }
+    ++merged.failed;
+    if (merged.failures.size() < sty_Outcome::kMostFailures)
+        merged.failures.push_back({place.row, {}, sty_ReasonIn(line)});
+}
+
 /// "17, 201-250"; after many ranges "...".
 class RangeText {
 public:
@@ -104,28 +114,26 @@ sty_Merged sty_Merge(const std::string& path) {
 
     sty_Merged merged;
     merged.rows = identity->rows;
+    const auto write = [&](int file) {
+        sty_LineWriter writer(file);
+        for (std::size_t i = 0; i < places.size(); ++i) {
+            if (i + 1 < places.size() && places[i + 1].row == places[i].row) continue;
+            const auto ledger = static_cast<std::size_t>(places[i].ledger);
+            const std::string line = LineAt(files[ledger], places[i], ledgers[ledger]);
+            Count(places[i], line, merged);
+            writer.Add(line);
+        }
+        return writer.End();
+    };
+    folder.Write(sty_Ledger::NameOf(1, 1), write, true);
     RangeText missing;
-    std::string joined;
     long long next = 1;
-    for (std::size_t i = 0; i < places.size(); ++i) {
-        if (i + 1 < places.size() && places[i + 1].row == places[i].row) continue;
-        const LinePlace& place = places[i];
+    for (const LinePlace& place : places) {
         for (; next < place.row; ++next) missing.Add(next);
         next = place.row + 1;
-        const auto ledger = static_cast<std::size_t>(place.ledger);
-        const std::string line = LineAt(files[ledger], place, ledgers[ledger]);
-        joined.append(line).append("\n");
-        if (place.done) {
-            ++merged.done;
-            continue;
-        }
-        ++merged.failed;
-        if (merged.failures.size() < sty_Outcome::kMostFailures)
-            merged.failures.push_back({place.row, {}, sty_ReasonIn(line)});
     }
     for (; next <= identity->rows; ++next) missing.Add(next);
     merged.missing = merged.rows - merged.done - merged.failed;
     merged.missingRows = missing.Text();
-    folder.Write(sty_Ledger::NameOf(1, 1), joined, true);
     return merged;
 }

@@ -67,8 +67,7 @@ public:
         const Clock::time_point start = Clock::now();
         ReadInputs();
         PrepareFolder();
-        std::unique_ptr<sty_Variants> first =
-            std::make_unique<sty_Variants>(std::move(template_), *columns_, meshes_);
+        std::unique_ptr<sty_Variants> first = std::make_unique<sty_Variants>(std::move(template_), meshes_);
         TellBaseline(*first);
         RunRows(std::move(first), start);
         outcome_.counts.seconds = SecondsSince(start);
@@ -88,7 +87,7 @@ private:
         }
         mdf_Report report;
         const auto places = [&](const std::vector<mdf_Parameter>& parameters) {
-            columns_ = std::make_unique<sty_Columns>(*table_, parameters);
+            columns_ = std::make_unique<sty_Columns>(table_->Columns(), table_->HasHeader(), parameters);
             return columns_->Pointers();
         };
         identity_.templateSha256 = sty_Sha256OfFile(request_.model);
@@ -138,22 +137,38 @@ private:
             throw Unusable(request_.out,
                            "found a folder with other files, expected a new or empty one, or a study's");
         folder_->Prepare();
+        const auto writeIdentity = [this](int file) { return sty_WriteAll(file, identity_.Text()); };
         // Of several shards that begin at once one is the first.
-        if (!held && !folder_->Write(sty_Folder::kIdentity, identity_.Text(), false))
+        if (!held && !folder_->Write(sty_Folder::kIdentity, writeIdentity, false))
             held = folder_->Read(sty_Folder::kIdentity);
         if (held) CheckIdentity(*held);
 
         ledger_ = std::make_unique<sty_Ledger>(*folder_, sty_Ledger::NameOf(request_.shard, request_.shards));
-        const std::string shard = std::to_string(request_.shard) + "-of-" + std::to_string(request_.shards);
-        lock_ = folder_->Lock(shard + ".lock");
+        lock_ = folder_->Lock(PlacerName() + "lock");
         if (!lock_) throw Unusable(request_.out, "another run is at work on " + NameOfShard());
         if (ledger_->Exists() && !request_.resume)
             throw Unusable(request_.out, NameOfShard() + " was begun already: --resume goes on with it");
+        if (ledger_->Exists()) RemoveUnplaced();
         ledger_->TakeUp(*done_);
         TakeUpOthers();
         for (long long row = rows_.first; row <= rows_.last; ++row)
             outcome_.counts.earlier += done_->Has(row);
         ledger_->Open();
+    }
+
+    /// What the names of this shard's hidden files begin with.
+    std::string PlacerName() const {
+        return std::to_string(request_.shard) + "-of-" + std::to_string(request_.shards) + ".";
+    }
+
+    /// What a run that was killed was about to put in its place.
+    void RemoveUnplaced() const {
+        const auto folderOf = [&](long long row) {
+            return std::filesystem::path(layout_.PathOf(row, {})).parent_path().string();
+        };
+        for (long long row = rows_.first; row <= rows_.last; row += sty_Layout::kMostEntries)
+            folder_->RemoveUnplaced(folderOf(row), PlacerName());
+        if (rows_.last >= rows_.first) folder_->RemoveUnplaced(folderOf(rows_.last), PlacerName());
     }
 
     std::string NameOfShard() const {
@@ -249,14 +264,12 @@ private:
         try {
             std::unique_ptr<sty_Placer> placer;
             if (folder_ != nullptr) {
-                placer = std::make_unique<sty_Placer>(*folder_, std::to_string(request_.shard) + "-of-" +
-                                                                    std::to_string(request_.shards) + "." +
-                                                                    std::to_string(job));
+                placer = std::make_unique<sty_Placer>(*folder_, PlacerName() + std::to_string(job));
             }
             sty_RawRow raw;
             while (!stop_ && queue.Next(raw)) {
                 const Clock::time_point start = Clock::now();
-                sty_Result result = variants.Make(table_->Parse(raw));
+                sty_Result result = variants.Make(table_->Parse(raw), *columns_);
                 if (result.IsDone()) Write(variants.Text(), placer.get(), result);
                 result.seconds = SecondsSince(start);
                 if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));

@@ -30,12 +30,26 @@ bool Before(std::string_view a, std::string_view b) {
     return std::ranges::lexicographical_compare(a, b, {}, rank, rank);
 }
 
+void TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>& changes,
+                const sty_Columns& columns, sty_Result& result) {
+    for (const fnd_Finding& finding : report.findings) {
+        if (!finding.IsError() || result.errors.size() >= kMostErrors) continue;
+        // The column whose place the finding is about, or lies around it.
+        const auto blamed = std::ranges::find_if(changes, [&](const sty_Columns::Change& change) {
+            return mdf_IsBelow(finding.place, change.change.pointer);
+        });
+        const std::string column = blamed == changes.end() ? "" : columns.NameOf(blamed->column);
+        result.errors.push_back({column, finding.place, finding.Text()});
+    }
+}
+
 } // namespace
 
-sty_Columns::sty_Columns(const sty_Table& table, const std::vector<mdf_Parameter>& parameters) {
+sty_Columns::sty_Columns(const std::vector<std::string>& columns, bool inAllRows,
+                         const std::vector<mdf_Parameter>& parameters) {
     std::vector<std::string> names;
     for (const mdf_Parameter& parameter : parameters) names.push_back(parameter.name);
-    for (const std::string& name : table.Columns()) {
+    for (const std::string& name : columns) {
         Column& column = columns_.emplace_back();
         column.name = name;
         if (name == sty_Table::kNameColumn) continue;
@@ -55,9 +69,9 @@ sty_Columns::sty_Columns(const sty_Table& table, const std::vector<mdf_Parameter
         column.problem = "found a column " + fnd_Quoted(name) +
                          ", expected \"name\", a JSON pointer or a parameter of the template" +
                          (hint.empty() ? "" : "; " + hint);
-        if (table.HasHeader() && problem_.empty()) problem_ = column.problem;
+        if (inAllRows && problem_.empty()) problem_ = column.problem;
     }
-    FindConflicts(table.HasHeader());
+    FindConflicts(inAllRows);
 }
 
 void sty_Columns::FindConflicts(bool refuse) {
@@ -146,12 +160,11 @@ std::vector<sty_Columns::Change> sty_Columns::ChangesOf(const sty_Row& row, cons
     return changes;
 }
 
-sty_Variants::sty_Variants(std::unique_ptr<mdf_Template> base, const sty_Columns& columns,
-                           sty_MeshTexts& meshes)
-    : template_(std::move(base)), columns_(columns), meshes_(meshes), text_(meshes) {}
+sty_Variants::sty_Variants(std::unique_ptr<mdf_Template> base, sty_MeshTexts& meshes)
+    : template_(std::move(base)), meshes_(meshes), text_(meshes) {}
 
 std::unique_ptr<sty_Variants> sty_Variants::Twin() const {
-    return std::make_unique<sty_Variants>(template_->Twin(), columns_, meshes_);
+    return std::make_unique<sty_Variants>(template_->Twin(), meshes_);
 }
 
 std::string sty_Variants::KeyOf(const fnd_Finding& finding) {
@@ -196,29 +209,16 @@ std::vector<fnd_Finding> sty_Variants::CheckDeck(const odb_Odb& store) {
     return std::move(list.findings);
 }
 
-void sty_Variants::TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>& changes,
-                              sty_Result& result) {
-    for (const fnd_Finding& finding : report.findings) {
-        if (!finding.IsError() || result.errors.size() >= kMostErrors) continue;
-        // The column whose place the finding is about, or lies around it.
-        const auto blamed = std::ranges::find_if(changes, [&](const sty_Columns::Change& change) {
-            return mdf_IsBelow(finding.place, change.change.pointer);
-        });
-        const std::string column = blamed == changes.end() ? "" : columns_.NameOf(blamed->column);
-        result.errors.push_back({column, finding.place, finding.Text()});
-    }
-}
-
-sty_Result sty_Variants::Make(const sty_Row& row) {
+sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
     sty_Result result;
-    std::vector<sty_Columns::Change> changes = columns_.ChangesOf(row, *template_, result);
+    std::vector<sty_Columns::Change> changes = columns.ChangesOf(row, *template_, result);
     if (!result.IsDone()) return result;
     std::vector<mdf_Change> values;
     for (sty_Columns::Change& change : changes) values.push_back(change.change);
     mdf_Report report;
     const std::unique_ptr<odb_Odb> store = template_->Variant(values, report);
     if (store == nullptr) {
-        TakeErrors(report, changes, result);
+        TakeErrors(report, changes, columns, result);
         if (result.errors.empty()) result.errors.push_back({{}, {}, "the variant can't be read"});
         return result;
     }

@@ -11,11 +11,13 @@
 /// What the columns of a table stand for in a template.
 class sty_Columns {
 public:
-    sty_Columns(const sty_Table& table, const std::vector<mdf_Parameter>& parameters);
+    /// `inAllRows`: every row has all of them.
+    sty_Columns(const std::vector<std::string>& names, bool inAllRows,
+                const std::vector<mdf_Parameter>& parameters);
 
     /// All pointers that the columns lead to.
     std::vector<std::string> Pointers() const;
-    /// What no row of a table with a header could be right with; empty for none.
+    /// What no row could be right with, where every row has all columns; empty for none.
     const std::string& Problem() const { return problem_; }
     const std::string& NameOf(int column) const { return columns_[static_cast<std::size_t>(column)].name; }
 
@@ -48,7 +50,7 @@ private:
 /// Makes variants of a template and their decks, for one thread.
 class sty_Variants {
 public:
-    sty_Variants(std::unique_ptr<mdf_Template> base, const sty_Columns& columns, sty_MeshTexts& meshes);
+    sty_Variants(std::unique_ptr<mdf_Template> base, sty_MeshTexts& meshes);
 
     /// The same for another thread.
     std::unique_ptr<sty_Variants> Twin() const;
@@ -58,19 +60,17 @@ public:
     void LeaveOut(const std::vector<fnd_Finding>& findings);
 
     /// Makes the row's variant and its deck's text; a row that is wrong has errors in its result.
-    sty_Result Make(const sty_Row& row);
+    sty_Result Make(const sty_Row& row, const sty_Columns& columns);
+    const mdf_Template& Base() const { return *template_; }
     /// The text of the last deck.
     sty_DeckText& Text() { return text_; }
 
 private:
     std::vector<fnd_Finding> CheckDeck(const odb_Odb& store);
     void CheckMeshes(const odb_Odb& store, fnd_Sink& sink);
-    void TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>& changes,
-                    sty_Result& result);
     static std::string KeyOf(const fnd_Finding& finding);
 
     std::unique_ptr<mdf_Template> template_;
-    const sty_Columns& columns_;
     sty_MeshTexts& meshes_;
     sty_DeckText text_;
     std::set<std::string> leftOut_;

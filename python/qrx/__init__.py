@@ -33,6 +33,8 @@ _PLACES = {
     "DeckError": "_errors",
     "Record": "_records",
     "Polar": "_records",
+    "study": "_study",
+    "StudyResult": "_study",
     "Region": "_records",
 }
 

@@ -7,6 +7,8 @@ usage: decks_test.py PROGRAM [unittest options]
 import copy
 import json
 import shutil
+import subprocess
+import sys
 
 from studies import FORCE, MODEL, MODEL_POINTER, ROOT, StudyTest, main, put
 
@@ -155,6 +157,27 @@ class Decks(StudyTest):
                 deck, _ = self.written(model)
                 for line in self.ledger(name + "-out").values():
                     self.assertEqual(self.deck(name + "-out", line), deck, line["parameters"])
+
+    def test_ExampleOfAPlate_200Decks_EveryTwentiethIsThatOfWrite(self):
+        example = ROOT / "examples/plate_study"
+        for name in ("plate_study.json", "make_study.py"):
+            shutil.copy(example / name, self.folder / name)
+        subprocess.run([sys.executable, self.path("make_study.py"), str(self.folder)], check=True)
+        self.study("plate_study.json", "plates.csv")
+        lines = self.ledger("plates")
+        self.assertEqual(len(lines), 200)
+        self.assertEqual(len({line["sha256"] for line in lines.values()}), 200)
+        loads = sorted(line["parameters"]["load"] for line in lines.values())
+        # A Latin hypercube: one value in each part of the range.
+        for part, load in enumerate(loads):
+            self.assertAlmostEqual(load, 0.0005 + 0.0045 * (part + 0.5) / 200, delta=0.0045 / 400 + 1e-6)
+        model = json.loads("\n".join(line for line in (self.folder / "plate_study.json").read_text().splitlines()
+                                     if not line.lstrip().startswith("//")))
+        for row in range(1, 201, 20):
+            changed = copy.deepcopy(model)
+            for name, value in lines[row]["parameters"].items():
+                put(changed, model["parameters"][name]["pointers"], value)
+            self.assertEqual(self.deck("plates", lines[row]), self.written(changed)[0])
 
     def test_Parameters_StandForTheirPointers(self):
         model = copy.deepcopy(MODEL)

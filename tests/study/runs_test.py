@@ -155,6 +155,8 @@ class Runs(StudyTest):
         self.assertEqual(self.decks_in("once"), self.decks_in("out"))
         hidden = sorted(path.name for path in (self.folder / "out/.study").iterdir())
         self.assertEqual(hidden, ["1-of-1.lock"])
+        left = [str(path) for path in (self.folder / "out").rglob(".study-*")]
+        self.assertEqual(left, [])
 
     def test_Interrupted_TheRowsInHandEnd_AndItSaysHowToGoOn(self):
         self.write_model()

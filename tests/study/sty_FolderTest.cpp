@@ -82,7 +82,22 @@ TEST(sty_Placer, WhereAForeignFileStands_LeavesIt) {
         const auto yes = [](const std::string& path) { return path.ends_with("001/002/3.inp"); };
         EXPECT_EQ(placer.Place("001/002/3.inp", WriteOne, false, yes), sty_Placer::Result::PLACED);
     }
-    EXPECT_TRUE(std::filesystem::is_empty(scratch.Path(sty_Folder::kHidden)));
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-job")));
+}
+
+TEST(sty_Folder, WhatAKilledRunLeft_IsRemoved) {
+    const Scratch scratch;
+    const sty_Folder folder(scratch.Path());
+    std::filesystem::create_directory(scratch.Path("000"));
+    for (const char* name :
+         {"000/.study-2-of-4.0", "000/.study-2-of-4.1", "000/.study-2-of-40.1", "000/1.inp"})
+        std::ofstream(scratch.Path(name)) << "half";
+    folder.RemoveUnplaced("000", "2-of-4.");
+    folder.RemoveUnplaced("001", "2-of-4.");
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-2-of-4.0")));
+    EXPECT_FALSE(std::filesystem::exists(scratch.Path("000/.study-2-of-4.1")));
+    EXPECT_TRUE(std::filesystem::exists(scratch.Path("000/.study-2-of-40.1")));
+    EXPECT_TRUE(std::filesystem::exists(scratch.Path("000/1.inp")));
 }
 
 TEST(sty_Placer, WhenWritingFails_NothingStandsThere) {
@@ -133,26 +148,67 @@ TEST(sty_DeckText, PiecesOfDecks_AreOneTextWithItsSum) {
     store.AddModel(odb_Odb::DefaultModelName());
     sty_MeshTexts meshes;
     sty_DeckText deck(meshes);
-    const auto nodes = std::make_shared<const std::string>(std::string(1000, 'n'));
-    const auto elements = std::make_shared<const std::string>(std::string(500, 'e'));
-    const std::string ends[] = {"end", "another end", "", "end"};
-    const std::string begins[] = {"begin", "begin", "begins", "begin"};
-    for (int i = 0; i < 4; ++i) {
+    // Texts that are long against the distance of the places from which sums go on, and differ early, late,
+    // in length and in what is kept.
+    const auto kept = [](char c) { return std::make_shared<const std::string>(std::string(70'000, c)); };
+    const auto nodes = kept('n');
+    const auto elements = kept('e');
+    const auto others = kept('o');
+    const std::string text(100'000, 't');
+    const auto changed = [&](std::size_t at) { return text.substr(0, at) + "x" + text.substr(at + 1); };
+    const auto longer = [&](std::size_t at) { return text.substr(0, at) + "x" + text.substr(at); };
+    struct Deck {
+        std::string begin;
+        sty_MeshTexts::Text first;
+        std::string middle;
+        sty_MeshTexts::Text second;
+        std::string end;
+    };
+    const Deck decks[] = {{text, nodes, "", elements, text},
+                          {text, nodes, "", elements, changed(99'999)},
+                          {text, nodes, "", elements, text},
+                          {text, nodes, "", elements, longer(50'000)},
+                          {text, nodes, "m", elements, text},
+                          {text, nodes, "", elements, ""},
+                          {changed(0), nodes, "", elements, text},
+                          {longer(16'384), nodes, "", elements, text},
+                          {text, nodes, text, elements, text},
+                          {text, nodes, changed(20'000), elements, text},
+                          {text, nodes, "", others, text},
+                          {text, others, "", elements, text},
+                          {text, nodes, "", nullptr, text},
+                          {text, nodes, "", elements, text},
+                          {text, nullptr, "", nullptr, changed(7)},
+                          {"", nullptr, "", nullptr, ""},
+                          {text, nullptr, text, nullptr, ""},
+                          {text, elements, "", nodes, text.substr(0, 16'384)},
+                          {text, elements, "", nodes, text.substr(0, 16'383)}};
+    for (const Deck& each : decks) {
         deck.Begin(store);
-        deck.Write(begins[i].data(), begins[i].size());
-        deck.WriteKept(nodes);
-        deck.WriteKept(elements);
-        deck.Write(ends[i].data(), ends[i].size());
-        const std::string whole = begins[i] + *nodes + *elements + ends[i];
+        std::string whole;
+        const auto own = [&](const std::string& piece) {
+            deck.Write(piece.data(), piece.size());
+            whole += piece;
+        };
+        const auto shared = [&](const sty_MeshTexts::Text& piece) {
+            if (piece == nullptr) return;
+            deck.WriteKept(piece);
+            whole += *piece;
+        };
+        own(each.begin);
+        shared(each.first);
+        own(each.middle);
+        shared(each.second);
+        own(each.end);
         sty_Sha256 sum;
         sum.Add(whole);
         EXPECT_EQ(deck.Bytes(), static_cast<long long>(whole.size()));
-        EXPECT_EQ(deck.Sha256(), sum.Hex());
-        const std::string path = scratch.Path(std::to_string(i));
+        EXPECT_EQ(deck.Sha256(), sum.Hex()) << &each - decks;
+        const std::string path = scratch.Path("deck");
         std::FILE* file = std::fopen(path.c_str(), "w");
         EXPECT_EQ(deck.WriteTo(::fileno(file)), 0);
         std::fclose(file);
         std::ifstream in(path);
-        EXPECT_EQ(std::string(std::istreambuf_iterator<char>(in), {}), whole);
+        EXPECT_TRUE(std::string(std::istreambuf_iterator<char>(in), {}) == whole);
     }
 }

@@ -87,29 +87,37 @@ void oif_Builder::WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords
     for (const qkw_KeywordHandle& keyword : keywords) keyword.ConstGet().Write(stream);
 }
 
-void oif_Builder::WriteOfInstance(utl_Stream& stream, const qkw_KeywordList& keywords) const {
-    if (texts_ == nullptr) return WriteInput(stream, keywords);
+void oif_Builder::WriteOfInstance(utl_Stream& stream, const qkw_BuilderComponent& component,
+                                  const ddb_BaseInstance& instance, const qkw_KeywordList& keywords) const {
+    if (texts_ == nullptr || !instance.IsPartInstance()) return WriteInput(stream, keywords);
+    const ddb_Mesh view = ddb_PartInstance(instance).mesh();
+    const odiK_Mesh& mesh = view.mesh();
+    // All that this component says of an instance are the sets of its mesh, by names and labels.
+    if (dynamic_cast<const oif_RegionBuilder*>(&component) != nullptr) {
+        WriteKept(stream, mesh, oif_MeshBlockEnm::SETS, [&](utl_Stream& own) { WriteInput(own, keywords); });
+        return;
+    }
     for (const qkw_KeywordHandle& handle : keywords) {
         const qkw_Keyword& keyword = handle.ConstGet();
-        const auto* nodes = dynamic_cast<const oif_Node*>(&keyword);
-        const auto* elements = dynamic_cast<const oif_ElementFromMesh*>(&keyword);
-        if (nodes != nullptr && nodes->MeshOfInstance() != nullptr) {
-            WriteKept(stream, *nodes->MeshOfInstance(), oif_MeshBlockEnm::NODES, keyword);
-        } else if (elements != nullptr) {
-            WriteKept(stream, elements->MeshOfInstance(), oif_MeshBlockEnm::ELEMENTS, keyword);
+        const auto write = [&keyword](utl_Stream& own) { keyword.Write(own); };
+        if (dynamic_cast<const oif_Node*>(&keyword) != nullptr) {
+            WriteKept(stream, mesh, oif_MeshBlockEnm::NODES, write);
+        } else if (dynamic_cast<const oif_ElementFromMesh*>(&keyword) != nullptr) {
+            WriteKept(stream, mesh, oif_MeshBlockEnm::ELEMENTS, write);
         } else {
             keyword.Write(stream);
         }
     }
 }
 
+template <class Writing>
 void oif_Builder::WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
-                            const qkw_Keyword& keyword) const {
+                            const Writing& write) const {
     oif_MeshTexts::Text text = texts_->Find(mesh, block);
     if (text == nullptr) {
         qio_StringDevice device;
         utl_Stream own(device, LineLimit, Precision, Precision);
-        keyword.Write(own);
+        write(own);
         own.Flush();
         std::string made = device.Text();
         // The line end goes through the stream, which then knows that a line begins.
@@ -140,7 +148,8 @@ void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream, qkw_Component
     }
     for (const auto& [name, instance] : model_->Instances()) {
         for (int i = 0; i < components.Length(); ++i) {
-            WriteOfInstance(stream, components.Get(i).Get().InstanceDefinition(name));
+            qkw_BuilderComponent& component = components.Get(i).Get();
+            WriteOfInstance(stream, component, instance, component.InstanceDefinition(name));
         }
     }
 }

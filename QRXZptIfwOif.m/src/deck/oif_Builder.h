@@ -48,9 +48,12 @@ private:
     qkw_ComponentList WriteList() const;
     void WriteHeading(utl_Stream& stream, const cow_String& text) const;
     void WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const;
-    void WriteOfInstance(utl_Stream& stream, const qkw_KeywordList& keywords) const;
+    void WriteOfInstance(utl_Stream& stream, const qkw_BuilderComponent& component,
+                         const ddb_BaseInstance& instance, const qkw_KeywordList& keywords) const;
+    /// Writes what `write` gives, which the mesh alone decides.
+    template <class Writing>
     void WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
-                   const qkw_Keyword& keyword) const;
+                   const Writing& write) const;
     void WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
     void WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
     void WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;

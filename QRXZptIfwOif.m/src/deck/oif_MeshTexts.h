@@ -9,7 +9,8 @@
 class odiK_Mesh;
 
 /// What of a mesh is one text in every deck that shows it.
-enum class oif_MeshBlockEnm { NODES, ELEMENTS };
+enum class oif_MeshBlockEnm { NODES, ELEMENTS, SETS };
+inline constexpr int oif_kMeshBlocks = 3;
 
 /// A device of somebody who writes many decks with the same meshes: it keeps the texts of their nodes and
 /// elements, which no other part of a model has a say in, and gets them handed back instead of their bytes.

@@ -46,8 +46,6 @@ public:
     oif_ElementFromMesh(const ddb_PartInstance& instance, const qkw_ModelInfo& modelInfo)
         : modelInfo_(&modelInfo), instance_(instance) {}
     void Write(utl_Stream& stream) const override;
-    /// The mesh that alone decides the text: labels of instances have no offset.
-    const odiK_Mesh& MeshOfInstance() const { return instance_.mesh().mesh(); }
 
 private:
     using Types = cow_Map<cow_String, qkw_KeywordList>;

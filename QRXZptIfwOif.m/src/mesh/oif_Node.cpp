@@ -14,7 +14,7 @@ constexpr std::size_t kLineRoom = 64 + num_RealRoom(12, 7);
 } // namespace
 
 oif_Node::oif_Node(const ddb_PartInstance& instance, const qkw_ModelInfo&)
-    : sourceKind_(1), nodeData_(instance.mesh().nodeData()), mesh_(&instance.mesh().mesh()) {}
+    : sourceKind_(1), nodeData_(instance.mesh().nodeData()) {}
 
 oif_Node::oif_Node(const ddb_Assembly& assembly, const qkw_ModelInfo&) {
     if (assembly.hasMesh()) nodeData_ = assembly.mesh().nodeData();

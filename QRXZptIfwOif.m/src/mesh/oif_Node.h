@@ -17,8 +17,6 @@ public:
     oif_Node(const ddb_PartInstance& instance, const qkw_ModelInfo& modelInfo);
     oif_Node(const ddb_Assembly& assembly, const qkw_ModelInfo& modelInfo);
     void Write(utl_Stream& stream) const override;
-    /// The mesh that alone decides the text; null for the assembly's own.
-    const odiK_Mesh* MeshOfInstance() const { return mesh_; }
 
     /// One ten-billionth of a scale of coordinates: below that a coordinate would be as good as zero. No deck
     /// uses it, coordinates go out unfiltered.
@@ -31,7 +29,6 @@ private:
     bool threeDimensional_ = true;
     double smallReal_ = 0.0;
     std::optional<ddb_NodeData> nodeData_;
-    const odiK_Mesh* mesh_ = nullptr; // that nodeData_ holds
 };
 
 #endif
