@@ -70,8 +70,13 @@ bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, con
 }
 
 const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
-    // Classes are the same for all readers, of which there is one a variant.
+    // Classes are the same for all readers, of which there is one a variant, until a program adds its own.
     thread_local std::unordered_map<unsigned, Choice> choices;
+    thread_local std::size_t known = 0;
+    if (known != cls_Classes().All().size()) {
+        known = cls_Classes().All().size();
+        choices.clear();
+    }
     const auto [place, isNew] = choices.try_emplace(base);
     Choice& choice = place->second;
     if (!isNew) return choice;
@@ -79,8 +84,8 @@ const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
     for (const cls_ClassEntry* entry : choice.classes) {
         choice.names.emplace_back(entry->info.name);
         // By a short name that two have, neither is known.
-        const auto [known, isFirst] = choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
-        if (!isFirst) known->second = nullptr;
+        const auto [entryOfName, isFirst] = choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
+        if (!isFirst) entryOfName->second = nullptr;
     }
     for (const cls_ClassEntry* entry : choice.classes) choice.byName[fnd_LowerCase(entry->info.name)] = entry;
     return choice;

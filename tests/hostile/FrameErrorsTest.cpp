@@ -23,7 +23,7 @@ const FindingCase frameCases[] = {
      {"/format: found 1, expected 'qrx-model/1'"}},
     {"UnknownRootMember",
      R"({"format": "qrx-model/1", "model": {}, "models": {"Default Model": {}}})",
-     {"/model: found an unknown member 'model', expected one of format, models; did you mean 'models'?"}},
+     {"/model: found an unknown member 'model', expected one of format, parameters, models; did you mean 'models'?"}},
     {"ModelsAsArray",
      R"({"format": "qrx-model/1", "models": [{}]})",
      {"/models: found an array of 1 item, expected an object of models"}},

@@ -20,7 +20,7 @@ def deck_of(program, model, folder, job):
     """The exit code and the deck, or the error without the model's name."""
     result = run(program, "write", model, "--job", job, cwd=folder)
     deck = folder / (job + ".inp")
-    errors = [line for line in result.stderr.decode().replace(str(model), "").splitlines() if "warning" not in line]
+    errors = [line for line in result.stderr.decode().replace(str(model), "").splitlines() if ": warning: " not in line and ": note: " not in line]
     return result.returncode, deck.read_bytes() if deck.exists() else None, errors
 
 

@@ -310,7 +310,7 @@ class Refusals(ProgramTest):
     def test_UnknownCommand_IsNamed(self):
         self.assert_refused(self.run_program("wirte", "model.json"), 2,
                             "qrxdeck: error: there is no command 'wirte'; "
-                            "the commands are write, check, diff, flatten, info, mesh, new, format, view, variables, schema\n"
+                            "the commands are write, check, diff, flatten, info, mesh, new, format, study, view, variables, schema\n"
                             "Run with --help for more information.\n")
 
     def test_WrongUsage_IsToldInJson(self):
