@@ -202,7 +202,7 @@ class _Owner:
         document = super()._document()
         document.pop("class", None)
         if self.mesh is not None:
-            document["mesh"] = self.mesh.native
+            document["mesh"] = self.mesh._native
         for name, member in _LISTS.items():
             records = getattr(self, name)
             if records or (records is not None and self._optional_lists):
@@ -662,7 +662,11 @@ class Model:
 
     def check(self):
         """All that there is to say of the model and its deck, as a list of findings; empty when all is well."""
-        return [Finding(*finding) for finding in _qrx.check(_file_of([self]))]
+        try:
+            return [Finding(*finding) for finding in _qrx.check(_file_of([self]))]
+        except ModelError as error:
+            # Of a value that no model file can hold, put into a list behind the record's back.
+            return error.findings
 
     def write(self, target):
         """Writes the deck to a path, which is replaced as a whole or not at all, or to a binary file."""
@@ -854,7 +858,7 @@ def _owner_of(owner, told, meshes):
     owner._fill(told)
     if owner.mesh is not None:
         # One object for a mesh that several show.
-        owner.mesh = meshes.setdefault(owner.mesh.native.same_as, owner.mesh)
+        owner.mesh = meshes.setdefault(owner.mesh._native.same_as, owner.mesh)
     return owner
 
 
@@ -893,9 +897,10 @@ def _summary(model):
         if getattr(model, name)
     ]
     text += _table(("kind", "count", "names"), rows)
-    errors = [finding for finding in model.check() if finding.is_error]
-    if errors:
-        text += _table(("errors",), [(str(finding),) for finding in errors])
+    try:
+        model._store()
+    except ModelError as error:
+        text += _table(("errors",), [(str(finding),) for finding in error.findings if finding.is_error])
     return text
 
 

@@ -86,6 +86,19 @@ def test_DeckError_TellsObjectAndStep():
     assert str(error) == "no such thing (step 'Load', load 'P1')"
 
 
+def test_ValueThatIsPutBehindTheRecordsBack_IsFoundByTheCheck():
+    model = rod.model()
+    model.materials["Steel"].elastic.table[0][0] = float("nan")
+    (finding,) = model.check()
+    assert finding.place == "/models/Default Model/materials/Steel/elastic/table/0/0"
+    assert finding.found == "found nan"
+    model.materials["Steel"].elastic.table[0] = ["x", 1]
+    finding = next(each for each in model.check() if each.is_error)
+    assert finding.place == "/models/Default Model/materials/Steel/elastic/table/0/0"
+    with pytest.raises(qrx.ModelError):
+        model.deck()
+
+
 def test_Steps_HaveTheirOrder():
     model = qrx.Model()
     model.add_step(qrx.StaticStep("B"))
@@ -183,7 +196,8 @@ def test_Notebook_ShowsASummary():
     assert "&lt;b&gt;" in shown
     assert "<b>" not in shown
     model.loads["Force"].region = "NOWHERE"
-    assert "no-such-set" in shown or "NOWHERE" in model._repr_html_()
+    assert "NOWHERE" not in shown
+    assert "found set &#x27;NOWHERE&#x27;" in model._repr_html_()
 
 
 def test_View_IsThePage(tmp_path):
