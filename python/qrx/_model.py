@@ -483,6 +483,46 @@ class _Datums(_Named):
         return list(self._items.values())
 
 
+class Parameter(NamedTuple):
+    """A short name for places of the model that studies vary together.
+
+    ``pointers`` are JSON pointers into the model file, ``limits`` a text such as "> 0, <= 20" or "0.5 .. 20".
+    """
+
+    pointers: tuple
+    unit: str = ""
+    limits: str = ""
+    description: str = ""
+
+    @classmethod
+    def of(cls, value):
+        """A parameter of pointers, or of what a model file says."""
+        if isinstance(value, dict):
+            fields = dict(value)
+            return cls(_pointers(fields.pop("pointers", ())), **fields)
+        if isinstance(value, Parameter):
+            return cls(_pointers(value.pointers), *value[1:])
+        return cls(_pointers(value))
+
+    def _document(self):
+        texts = {name: text for name, text in zip(self._fields[1:], self[1:]) if text}
+        return {"pointers": list(self.pointers), **texts}
+
+
+def _pointers(value):
+    return (value,) if isinstance(value, str) else tuple(value)
+
+
+class _Parameters(dict):
+    """Parameters by name."""
+
+    def __setitem__(self, name, value):
+        super().__setitem__(name, Parameter.of(value))
+
+    def __missing__(self, name):
+        raise _no_such("parameters", name, self)
+
+
 class HistoryCell(NamedTuple):
     """What an object is in a step; whether the step writes it, and with op=NEW. None: only the status is known."""
 
@@ -554,6 +594,7 @@ class Model:
         self.parts = _Named("parts", Part)
         self.assembly = Assembly()
         self.steps = Steps()
+        self.parameters = {}
         for attribute, row in _repositories().items():
             object.__setattr__(self, attribute, Repository(*row))
         if heading is not None:
@@ -565,6 +606,11 @@ class Model:
         if name in _repositories():
             taken = Repository(*_repositories()[name])
             taken.update(value)
+            value = taken
+        elif name == "parameters":
+            taken = _Parameters()
+            for each, parameter in dict(value).items():
+                taken[each] = parameter
             value = taken
         elif not hasattr(type(self), name) and name not in _MEMBERS:
             known = [*_model_data()._fields, *_repositories(), *_MEMBERS, "heading"]
@@ -658,15 +704,25 @@ class Model:
         return document
 
     def _store(self):
-        return _qrx.store_of(_file_of([self]))
+        return _store_of([self])
 
     def check(self):
         """All that there is to say of the model and its deck, as a list of findings; empty when all is well."""
         try:
-            return [Finding(*finding) for finding in _qrx.check(_file_of([self]))]
+            return [Finding(*finding) for finding in _qrx.check(self._checked())]
         except ModelError as error:
             # Of a value that no model file can hold, put into a list behind the record's back.
             return error.findings
+
+    def _checked(self):
+        # A mesh stands in the document by its number: what lies in one is looked for when a study reads the file.
+        parameters = {
+            name: parameter
+            for name, parameter in self.parameters.items()
+            if not any("/mesh/" in pointer for pointer in parameter.pointers)
+        }
+        document = _file_of([self])
+        return {**document, "parameters": parameters} if parameters else document
 
     def write(self, target):
         """Writes the deck to a path, which is replaced as a whole or not at all, or to a binary file."""
@@ -723,6 +779,7 @@ class Model:
             twin.parts[name] = part.copy()
         twin.assembly = self.assembly.copy()
         twin.steps._list = [step.copy() for step in self.steps._list]
+        twin.parameters = self.parameters
         for attribute in _repositories():
             for name, record in getattr(self, attribute).items():
                 getattr(twin, attribute)[name] = record.copy()
@@ -738,7 +795,7 @@ class Model:
             return NotImplemented
         return all(
             getattr(self, name) == getattr(other, name)
-            for name in ("name", "_data", "datums", "parts", "assembly", "steps", *_repositories())
+            for name in ("name", "_data", "datums", "parts", "assembly", "steps", "parameters", *_repositories())
         )
 
     __hash__ = None
@@ -752,7 +809,7 @@ class Model:
         return _summary(self)
 
 
-_MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps")
+_MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps", "parameters")
 
 
 @functools.cache
@@ -802,12 +859,20 @@ def _file_of(models):
     return {"format": FORMAT, "models": {model.name: model for model in models}}
 
 
+def _store_of(models):
+    store = _qrx.store_of(_file_of(models))
+    store.set_parameters([
+        (name, *parameter) for model in models for name, parameter in model.parameters.items()
+    ])
+    return store
+
+
 def save(models, target):
     """Writes a model file of several models."""
     models = list(models)
     is_file = hasattr(target, "write")
     folder = "" if is_file else os.path.dirname(_records.file_path(target))
-    text = _qrx.store_of(_file_of(models)).model_file(folder)
+    text = _store_of(models).model_file(folder)
     if is_file:
         target.write(text)
     else:
@@ -827,7 +892,13 @@ def load_all(path):
     path = _records.file_path(path)
     with open(path, "rb"):
         pass
-    return {name: _model_of(name, tree) for name, tree in _qrx.load(path).trees().items()}
+    store = _qrx.load(path)
+    models = {name: _model_of(name, tree) for name, tree in store.trees().items()}
+    for name, *parameter in store.parameters:
+        # A model's own: the first pointer says whose.
+        token = parameter[0][0].split("/")[2].replace("~1", "/").replace("~0", "~")
+        models[token].parameters[name] = Parameter(*parameter)
+    return models
 
 
 def _model_of(name, tree):
@@ -904,5 +975,5 @@ def _summary(model):
     return text
 
 
-__all__ = ["Assembly", "AssemblyMesh", "AssemblySet", "Instance", "Model", "ModelError", "Part", "load", "load_all",
+__all__ = ["Assembly", "AssemblyMesh", "AssemblySet", "Instance", "Model", "Parameter", "Part", "load", "load_all",
            "save"]
