@@ -154,6 +154,15 @@ def _write_wheel(folder, files):
     return name
 
 
+def prepare_metadata_for_build_wheel(metadata_directory, config_settings=None):
+    """What the wheel will say of itself, without building it."""
+    info = pathlib.Path(metadata_directory) / f"qrx-{_version()}.dist-info"
+    info.mkdir()
+    (info / "METADATA").write_text(_metadata(), encoding="utf-8")
+    (info / "WHEEL").write_text(_wheel_text(), encoding="utf-8")
+    return info.name
+
+
 def build_wheel(wheel_directory, config_settings=None, metadata_directory=None):
     with tempfile.TemporaryDirectory() as folder:
         package = _build(folder)

@@ -4,6 +4,7 @@ import os
 import pathlib
 import subprocess
 import sys
+import zipfile
 
 import pytest
 
@@ -59,6 +60,18 @@ def test_Wheel_InAnEmptyEnvironmentWithoutNetwork_Works(tmp_path):
     )
     listed = run("-m", "pip", "show", "-f", "qrx")
     assert "qrx/py.typed" in listed and "qrx/__init__.pyi" in listed
+
+
+def test_MetadataAhead_IsThatOfTheWheel(tmp_path):
+    code = (
+        f"import sys; sys.path.insert(0, {str(ROOT / 'python' / 'build')!r}); sys.dont_write_bytecode = True; "
+        f"import backend; print(backend.prepare_metadata_for_build_wheel({str(tmp_path)!r}))"
+    )
+    made = subprocess.run([sys.executable, "-c", code], capture_output=True, text=True, check=True)
+    info = made.stdout.strip()
+    with zipfile.ZipFile(wheel(tmp_path / "wheel")) as packed:
+        for name in ("METADATA", "WHEEL"):
+            assert packed.read(f"{info}/{name}") == (tmp_path / info / name).read_bytes()
 
 
 def test_SourceArchive_HasAllThatTheBuildTakes(tmp_path):
