@@ -239,10 +239,10 @@ MODEL = '''
 class Model:
     name: str
     heading: _Attr[str | None, str]
-    datums: MutableMapping[str, Datum]
-    parts: MutableMapping[str, Part]
+    datums: _Attr[MutableMapping[str, Datum], Mapping[str, Datum]]
+    parts: _Attr[MutableMapping[str, Part], Mapping[str, Part]]
     assembly: Assembly
-    steps: Steps
+    steps: _Attr[Steps, Steps | Mapping[str, Step] | Iterable[Step]]
     parameters: _Attr[MutableMapping[str, Parameter], Mapping[str, Parameter | str | Sequence[str] | Mapping[str, Any]]]
     @property
     def instances(self) -> MutableMapping[str, Instance]: ...
@@ -447,7 +447,8 @@ def stubs():
         lines.append(f"    {name}: _Attr[{get}, {put}]")
     for member, class_name, _, _ in _qrx.repositories():
         if member != "steps":
-            lines.append(f"    {_names.repository_name(member)}: Repository[{_names.class_name(class_name)}]")
+            held = _names.class_name(class_name)
+            lines.append(f"    {_names.repository_name(member)}: _Attr[Repository[{held}], Mapping[str, {held}]]")
     lines.append(
         f"    def __init__(self, heading: str | None = ..., *, name: str = ..., {', '.join(arguments(data._fields))}) "
         "-> None: ..."

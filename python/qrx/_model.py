@@ -590,13 +590,13 @@ class Model:
     def __init__(self, heading=None, *, name=DEFAULT_NAME, **fields):
         self.name = name
         self._data = _model_data()(**fields)
-        self.datums = _Datums()
-        self.parts = _Named("parts", Part)
+        self.datums = {}
+        self.parts = {}
         self.assembly = Assembly()
         self.steps = Steps()
         self.parameters = {}
-        for attribute, row in _repositories().items():
-            object.__setattr__(self, attribute, Repository(*row))
+        for attribute in _repositories():
+            setattr(self, attribute, {})
         if heading is not None:
             if "top_level_solver_input" in fields:
                 raise TypeError("heading and top_level_solver_input both say how the deck opens")
@@ -604,14 +604,16 @@ class Model:
 
     def __setattr__(self, name, value):
         if name in _repositories():
-            taken = Repository(*_repositories()[name])
-            taken.update(value)
+            value = _filled(Repository(*_repositories()[name]), value)
+        elif name in ("parts", "datums", "parameters"):
+            value = _filled({"parts": _parts, "datums": _Datums, "parameters": _Parameters}[name](), value)
+        elif name == "steps" and not isinstance(value, Steps):
+            taken = Steps()
+            for step in value.values() if isinstance(value, Mapping) else value:
+                taken.add(step)
             value = taken
-        elif name == "parameters":
-            taken = _Parameters()
-            for each, parameter in dict(value).items():
-                taken[each] = parameter
-            value = taken
+        elif name == "assembly" and not isinstance(value, Assembly):
+            raise wrong("/assembly", f"found {value!r}", "a qrx.Assembly")
         elif not hasattr(type(self), name) and name not in _MEMBERS:
             known = [*_model_data()._fields, *_repositories(), *_MEMBERS, "heading"]
             hint = _qrx.nearest(name, known)
@@ -807,6 +809,16 @@ class Model:
 
     def _repr_html_(self):
         return _summary(self)
+
+
+def _parts():
+    return _Named("parts", Part)
+
+
+def _filled(container, value):
+    for name, each in dict(value).items():
+        container[name] = each
+    return container
 
 
 _MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps", "parameters")

@@ -134,6 +134,13 @@ def test_Container_IsAssignedAsAWhole():
     assert list(model.materials) == ["Steel"]
     with pytest.raises(qrx.ModelError):
         model.materials = {"Steel": 5}
+    model.steps = [qrx.StaticStep("A"), qrx.StaticStep("B")]
+    assert list(model.steps) == ["Initial", "A", "B"]
+    model.parts = dict(model.parts)
+    assert model.parts["ROD"].name == "ROD"
+    for name, value in (("parts", {"A": 5}), ("datums", {"A": 5}), ("assembly", {}), ("steps", [5])):
+        with pytest.raises(qrx.ModelError):
+            setattr(model, name, value)
 
 
 def test_Heading_IsTheTextBelowTheKeyword():
