@@ -81,6 +81,7 @@ def deck(model, folder, program):
     told("  the same store by the library's writer alone", alone)
     print(f"  ratio {whole / alone:.3f} (at most 1.05)")
     if program:
+        program = os.path.abspath(program)
         model.save(os.path.join(folder, "cube.json"))
         run = subprocess.run(
             [program, "write", "cube.json", "--job", "program", "--json"], cwd=folder, capture_output=True, check=True
@@ -127,7 +128,8 @@ def loads(count):
 
 def imports():
     code = "import time; begin = time.perf_counter(); import qrx; print(time.perf_counter() - begin)"
-    times = [float(subprocess.run([sys.executable, "-c", code], capture_output=True, check=True).stdout) for _ in range(9)]
+    command = [sys.executable, "-c", code]
+    times = [float(subprocess.run(command, capture_output=True, check=True).stdout) for _ in range(9)]
     told("import qrx", min(times), "0.1 s")
 
 

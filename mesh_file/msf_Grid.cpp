@@ -33,9 +33,8 @@ public:
             }
         }
         if (nodes.empty()) return;
-        std::ranges::sort(nodes);
-        const auto repeated = std::ranges::unique(nodes);
-        nodes.erase(repeated.begin(), repeated.end());
+        std::sort(nodes.begin(), nodes.end());
+        nodes.erase(std::unique(nodes.begin(), nodes.end()), nodes.end());
         builder_.Group(group.name, 0).nodes = std::move(nodes);
     }
 

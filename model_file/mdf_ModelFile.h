@@ -19,6 +19,7 @@ inline constexpr char mdf_kFormat[] = "qrx-model/1";
 class mdf_FileText;
 class odiK_Mesh;
 using mdf_GivenMeshes = std::vector<cow_CountedHld<odiK_Mesh>>;
+inline const mdf_GivenMeshes mdf_NoGivenMeshes;
 
 /// Where a mesh came from that the model file only names: {"file": ...}.
 struct mdf_MeshOrigin {

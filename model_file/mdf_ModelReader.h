@@ -8,7 +8,8 @@
 class mdf_ModelReader {
 public:
     /// The given meshes must outlive the reader.
-    mdf_ModelReader(odiK_Model& model, mdf_Diagnostics& diagnostics, const mdf_GivenMeshes& given)
+    mdf_ModelReader(odiK_Model& model, mdf_Diagnostics& diagnostics,
+                    const mdf_GivenMeshes& given = mdf_NoGivenMeshes)
         : model_(model), diagnostics_(diagnostics), records_(model, diagnostics),
           tree_(model, records_, diagnostics, given) {}
 

@@ -172,7 +172,6 @@ py::object pyx_Class::Checked(const cls_Field& field, py::handle value) const {
     if (IsPlain(field, value.ptr())) return py::reinterpret_borrow<py::object>(value);
     const bool isAttribute = field.type->Kind() == cls_FieldKind::Attribute;
     if (isAttribute && value.is_none()) return py::none();
-    field.type->Assign(field.In(*scratch_), field.In(*byDefault_));
     py::object read = Read(field, AsWord(field, value));
     return isAttribute && IsLongForm(value) ? py::reinterpret_borrow<py::object>(value) : read;
 }
@@ -194,6 +193,8 @@ py::object pyx_Class::Read(const cls_Field& field, py::handle value) const {
         throw;
     }
     mdf_Diagnostics diagnostics(report);
+    // Not before: what tells the value may be any code of Python's, and put values into fields too.
+    field.type->Assign(field.In(*scratch_), field.In(*byDefault_));
     mdf_RecordReader(*empty, diagnostics).ReadField(*scratch_, field, &json, place);
     pyx_RaiseErrors(report.findings);
     const void* read = field.In(*scratch_);

@@ -43,7 +43,7 @@ py::list pyx_TuplesOf(const std::vector<fnd_Finding>& findings) {
     for (const fnd_Finding& finding : findings) {
         all.append(py::make_tuple(finding.place, finding.found, finding.expected, finding.hint,
                                   fnd_SeverityWord(finding.code->severity), finding.code->name,
-                                  finding.Text()));
+                                  finding.Text(), finding.line, finding.column));
     }
     return all;
 }

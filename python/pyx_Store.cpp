@@ -12,6 +12,8 @@
 #include "view_page/vpg_Html.h"
 #include "whole_file/whf_File.h"
 
+#include <pybind11/stl.h>
+
 #include <sstream>
 
 namespace {
@@ -162,8 +164,30 @@ py::bytes pyx_Store::Deck() const {
 
 py::bytes pyx_Store::ModelFile(const std::string& folder) const {
     std::ostringstream text;
-    pyx_Released([&] { mdf_WriteModelFile(*odb_, text, report_.meshOrigins, folder); });
+    pyx_Released([&] { mdf_WriteModelFile(*odb_, text, report_.meshOrigins, folder, report_.parameters); });
     return std::move(text).str();
+}
+
+py::list pyx_Store::Parameters() const {
+    py::list all;
+    for (const mdf_Parameter& parameter : report_.parameters) {
+        all.append(py::make_tuple(parameter.name, py::tuple(py::cast(parameter.pointers)), parameter.unit,
+                                  parameter.limits, parameter.description));
+    }
+    return all;
+}
+
+void pyx_Store::SetParameters(const py::list& parameters) {
+    report_.parameters.clear();
+    for (const py::handle each : parameters) {
+        const auto told = py::reinterpret_borrow<py::tuple>(each);
+        mdf_Parameter& parameter = report_.parameters.emplace_back();
+        parameter.name = told[0].cast<std::string>();
+        parameter.pointers = told[1].cast<std::vector<std::string>>();
+        parameter.unit = told[2].cast<std::string>();
+        parameter.limits = told[3].cast<std::string>();
+        parameter.description = told[4].cast<std::string>();
+    }
 }
 
 std::string pyx_Store::History() const {
@@ -202,6 +226,8 @@ void pyx_Store::Add(py::module_& module) {
         .def("write_deck_to", &pyx_Store::WriteDeckTo)
         .def("deck", &pyx_Store::Deck)
         .def("model_file", &pyx_Store::ModelFile)
+        .def_property_readonly("parameters", &pyx_Store::Parameters)
+        .def("set_parameters", &pyx_Store::SetParameters)
         .def("history", &pyx_Store::History)
         .def("description", &pyx_Store::Description)
         .def("deck_lines", &pyx_Store::DeckLines)

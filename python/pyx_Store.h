@@ -24,6 +24,9 @@ public:
     py::bytes Deck() const;
     /// The text of the model file; the folder is where paths of mesh files begin.
     py::bytes ModelFile(const std::string& folder) const;
+    /// [(name, pointers, unit, limits, description)].
+    py::list Parameters() const;
+    void SetParameters(const py::list& parameters);
     std::string History() const;
     std::string Description() const;
     /// [(load case, text)].

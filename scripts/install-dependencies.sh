@@ -37,7 +37,7 @@ for task in "$@"; do
         build) ;;
         test) packages+=("${test[@]}") ;;
         bench) packages+=("${bench[@]}") ;;
-        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}") ;;
+        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}") ;;
         cluster) packages+=("${test[@]}" "${cluster[@]}") ;;
         python) packages+=("${python[@]}") ;;
         viewer) packages+=("${viewer[@]}") && with_page=true ;;

@@ -47,12 +47,13 @@ void whf_SignalCleanUp::Install() {
 }
 
 int whf_SignalCleanUp::Set(int at, const char* name, int folder) noexcept {
-    if (std::strlen(name) > NAME_MAX) return -1;
+    const std::size_t length = std::strlen(name);
+    if (length > NAME_MAX) return -1;
     for (int place = 0; place < kMost; ++place) {
         Folder& own = theFolders[place];
         Use expected = Use::FREE;
         if (!own.use.compare_exchange_strong(expected, Use::FILLED)) continue;
-        std::strcpy(own.name, name);
+        std::memcpy(own.name, name, length + 1);
         own.at = at;
         own.number = folder;
         own.use.store(Use::SET);

@@ -33,10 +33,6 @@ def get_requires_for_build_sdist(config_settings=None):
     return []
 
 
-def get_requires_for_build_editable(config_settings=None):
-    return []
-
-
 def _project():
     return tomllib.loads((ROOT / "pyproject.toml").read_text(encoding="utf-8"))["project"]
 
@@ -158,6 +154,15 @@ def _write_wheel(folder, files):
     return name
 
 
+def prepare_metadata_for_build_wheel(metadata_directory, config_settings=None):
+    """What the wheel will say of itself, without building it."""
+    info = pathlib.Path(metadata_directory) / f"qrx-{_version()}.dist-info"
+    info.mkdir()
+    (info / "METADATA").write_text(_metadata(), encoding="utf-8")
+    (info / "WHEEL").write_text(_wheel_text(), encoding="utf-8")
+    return info.name
+
+
 def build_wheel(wheel_directory, config_settings=None, metadata_directory=None):
     with tempfile.TemporaryDirectory() as folder:
         package = _build(folder)
@@ -169,17 +174,6 @@ def build_wheel(wheel_directory, config_settings=None, metadata_directory=None):
             elif path.name == f"_qrx{suffix}":
                 files.append((f"qrx/{path.name}", _stripped(path), 0o755))
         return _write_wheel(wheel_directory, files)
-
-
-def build_editable(wheel_directory, config_settings=None, metadata_directory=None):
-    """Modules from the tree, the extension from a build beside it."""
-    os.environ.setdefault("QRX_PACKAGE_BUILD_DIR", str(ROOT / "build" / "python"))
-    package = _build(wheel_directory)
-    for path in (ROOT / "python" / "qrx").glob("*.py"):
-        link = package / path.name
-        link.unlink(missing_ok=True)
-        link.symlink_to(path)
-    return _write_wheel(wheel_directory, [("qrx.pth", f"{package.parent}\n".encode(), 0o644)])
 
 
 def build_sdist(sdist_directory, config_settings=None):

@@ -49,6 +49,8 @@ class Finding(NamedTuple):
     severity: str = ...
     code: str = ...
     text: str = ...
+    line: int = ...
+    column: int = ...
     @property
     def is_error(self) -> bool: ...
 
@@ -176,6 +178,12 @@ class AssemblyMesh:
     def __init__(self, points: ArrayLike = ..., cells: Any = ..., *, point_labels: ArrayLike | None = ...,
                  controls: Mapping[str, ElemCtrlParams] | None = ...) -> None: ...
 
+class Parameter(NamedTuple):
+    pointers: tuple[str, ...]
+    unit: str = ...
+    limits: str = ...
+    description: str = ...
+
 class Repository(MutableMapping[str, _T]):
     def __getitem__(self, name: str) -> _T: ...
     def __setitem__(self, name: str, record: _T) -> None: ...
@@ -245,10 +253,11 @@ MODEL = '''
 class Model:
     name: str
     heading: _Attr[str | None, str]
-    datums: MutableMapping[str, Datum]
-    parts: MutableMapping[str, Part]
+    datums: _Attr[MutableMapping[str, Datum], Mapping[str, Datum]]
+    parts: _Attr[MutableMapping[str, Part], Mapping[str, Part]]
     assembly: Assembly
-    steps: Steps
+    steps: _Attr[Steps, Steps | Mapping[str, Step] | Iterable[Step]]
+    parameters: _Attr[MutableMapping[str, Parameter], Mapping[str, Parameter | str | Sequence[str] | Mapping[str, Any]]]
     @property
     def instances(self) -> MutableMapping[str, Instance]: ...
     def add_part(self, name: str, mesh: Mesh | _HasCells | None = ..., *, solver_input: str = ...) -> Part: ...
@@ -452,7 +461,8 @@ def stubs():
         lines.append(f"    {name}: _Attr[{get}, {put}]")
     for member, class_name, _, _ in _qrx.repositories():
         if member != "steps":
-            lines.append(f"    {_names.repository_name(member)}: Repository[{_names.class_name(class_name)}]")
+            held = _names.class_name(class_name)
+            lines.append(f"    {_names.repository_name(member)}: _Attr[Repository[{held}], Mapping[str, {held}]]")
     lines.append(
         f"    def __init__(self, heading: str | None = ..., *, name: str = ..., {', '.join(arguments(data._fields))}) "
         "-> None: ..."

@@ -22,6 +22,7 @@ _PLACES = {
     "Assembly": "_model",
     "AssemblyMesh": "_model",
     "AssemblySet": "_model",
+    "Parameter": "_model",
     "load": "_model",
     "load_all": "_model",
     "save": "_model",

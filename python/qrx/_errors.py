@@ -7,7 +7,8 @@ from typing import NamedTuple
 class Finding(NamedTuple):
     """Something to say of a model: where, what, and how to mend it.
 
-    ``place`` is a JSON pointer into the model file that the model would make.
+    ``place`` is a JSON pointer into the model file that the model would make; in a file that was read it has a
+    ``line`` and a ``column`` too, from 1.
     """
 
     place: str
@@ -17,6 +18,8 @@ class Finding(NamedTuple):
     severity: str = "error"
     code: str = ""
     text: str = ""
+    line: int = 0
+    column: int = 0
 
     @property
     def is_error(self):
@@ -26,7 +29,8 @@ class Finding(NamedTuple):
         text = self.text or ", expected ".join(part for part in (self.found, self.expected) if part)
         if not self.text and self.hint:
             text += "; " + self.hint
-        return f"{self.severity}: {self.place + ': ' if self.place else ''}{text}"
+        where = f"line {self.line}, column {self.column}: " if self.line else ""
+        return f"{self.severity}: {where}{self.place + ': ' if self.place else ''}{text}"
 
 
 class ModelError(ValueError):

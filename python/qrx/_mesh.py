@@ -107,7 +107,7 @@ class Mesh:
         surfaces=None, controls=None, **request,
     ):
         if cells is None:
-            self._native = _of_object(points, request).native
+            self._native = _of_object(points, request)._native
         else:
             blocks = _blocks_of(cells)
             if blocks and all(kind in _VTK for kind, _ in blocks):
@@ -158,10 +158,6 @@ class Mesh:
     def of(cls, value):
         """The mesh itself, or one made of an object with points and cells."""
         return value if isinstance(value, Mesh) else cls(value)
-
-    @property
-    def native(self):
-        return self._native
 
     @property
     def points(self):
@@ -361,7 +357,11 @@ def _of_arrays(points, blocks, point_labels, cell_labels, controls):
     made = [
         (kind, data, labels, (controls or {}).get(kind)) for (kind, data), labels in zip(blocks, by_block)
     ]
-    return _qrx.Mesh.of_arrays(_points(points), point_labels, made)
+    import numpy
+
+    # What is beyond single precision is refused with its place.
+    with numpy.errstate(over="ignore"):
+        return _qrx.Mesh.of_arrays(_points(points), point_labels, made)
 
 
 def _of_cells(points, blocks, point_sets, cell_sets, request):

@@ -202,7 +202,7 @@ class _Owner:
         document = super()._document()
         document.pop("class", None)
         if self.mesh is not None:
-            document["mesh"] = self.mesh.native
+            document["mesh"] = self.mesh._native
         for name, member in _LISTS.items():
             records = getattr(self, name)
             if records or (records is not None and self._optional_lists):
@@ -483,6 +483,46 @@ class _Datums(_Named):
         return list(self._items.values())
 
 
+class Parameter(NamedTuple):
+    """A short name for places of the model that studies vary together.
+
+    ``pointers`` are JSON pointers into the model file, ``limits`` a text such as "> 0, <= 20" or "0.5 .. 20".
+    """
+
+    pointers: tuple
+    unit: str = ""
+    limits: str = ""
+    description: str = ""
+
+    @classmethod
+    def of(cls, value):
+        """A parameter of pointers, or of what a model file says."""
+        if isinstance(value, dict):
+            fields = dict(value)
+            return cls(_pointers(fields.pop("pointers", ())), **fields)
+        if isinstance(value, Parameter):
+            return cls(_pointers(value.pointers), *value[1:])
+        return cls(_pointers(value))
+
+    def _document(self):
+        texts = {name: text for name, text in zip(self._fields[1:], self[1:]) if text}
+        return {"pointers": list(self.pointers), **texts}
+
+
+def _pointers(value):
+    return (value,) if isinstance(value, str) else tuple(value)
+
+
+class _Parameters(dict):
+    """Parameters by name."""
+
+    def __setitem__(self, name, value):
+        super().__setitem__(name, Parameter.of(value))
+
+    def __missing__(self, name):
+        raise _no_such("parameters", name, self)
+
+
 class HistoryCell(NamedTuple):
     """What an object is in a step; whether the step writes it, and with op=NEW. None: only the status is known."""
 
@@ -550,12 +590,13 @@ class Model:
     def __init__(self, heading=None, *, name=DEFAULT_NAME, **fields):
         self.name = name
         self._data = _model_data()(**fields)
-        self.datums = _Datums()
-        self.parts = _Named("parts", Part)
+        self.datums = {}
+        self.parts = {}
         self.assembly = Assembly()
         self.steps = Steps()
-        for attribute, row in _repositories().items():
-            object.__setattr__(self, attribute, Repository(*row))
+        self.parameters = {}
+        for attribute in _repositories():
+            setattr(self, attribute, {})
         if heading is not None:
             if "top_level_solver_input" in fields:
                 raise TypeError("heading and top_level_solver_input both say how the deck opens")
@@ -563,9 +604,16 @@ class Model:
 
     def __setattr__(self, name, value):
         if name in _repositories():
-            taken = Repository(*_repositories()[name])
-            taken.update(value)
+            value = _filled(Repository(*_repositories()[name]), value)
+        elif name in ("parts", "datums", "parameters"):
+            value = _filled({"parts": _parts, "datums": _Datums, "parameters": _Parameters}[name](), value)
+        elif name == "steps" and not isinstance(value, Steps):
+            taken = Steps()
+            for step in value.values() if isinstance(value, Mapping) else value:
+                taken.add(step)
             value = taken
+        elif name == "assembly" and not isinstance(value, Assembly):
+            raise wrong("/assembly", f"found {value!r}", "a qrx.Assembly")
         elif not hasattr(type(self), name) and name not in _MEMBERS:
             known = [*_model_data()._fields, *_repositories(), *_MEMBERS, "heading"]
             hint = _qrx.nearest(name, known)
@@ -658,11 +706,25 @@ class Model:
         return document
 
     def _store(self):
-        return _qrx.store_of(_file_of([self]))
+        return _store_of([self])
 
     def check(self):
         """All that there is to say of the model and its deck, as a list of findings; empty when all is well."""
-        return [Finding(*finding) for finding in _qrx.check(_file_of([self]))]
+        try:
+            return [Finding(*finding) for finding in _qrx.check(self._checked())]
+        except ModelError as error:
+            # Of a value that no model file can hold, put into a list behind the record's back.
+            return error.findings
+
+    def _checked(self):
+        # A mesh stands in the document by its number: what lies in one is looked for when a study reads the file.
+        parameters = {
+            name: parameter
+            for name, parameter in self.parameters.items()
+            if not any("/mesh/" in pointer for pointer in parameter.pointers)
+        }
+        document = _file_of([self])
+        return {**document, "parameters": parameters} if parameters else document
 
     def write(self, target):
         """Writes the deck to a path, which is replaced as a whole or not at all, or to a binary file."""
@@ -719,6 +781,7 @@ class Model:
             twin.parts[name] = part.copy()
         twin.assembly = self.assembly.copy()
         twin.steps._list = [step.copy() for step in self.steps._list]
+        twin.parameters = self.parameters
         for attribute in _repositories():
             for name, record in getattr(self, attribute).items():
                 getattr(twin, attribute)[name] = record.copy()
@@ -734,7 +797,7 @@ class Model:
             return NotImplemented
         return all(
             getattr(self, name) == getattr(other, name)
-            for name in ("name", "_data", "datums", "parts", "assembly", "steps", *_repositories())
+            for name in ("name", "_data", "datums", "parts", "assembly", "steps", "parameters", *_repositories())
         )
 
     __hash__ = None
@@ -748,7 +811,17 @@ class Model:
         return _summary(self)
 
 
-_MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps")
+def _parts():
+    return _Named("parts", Part)
+
+
+def _filled(container, value):
+    for name, each in dict(value).items():
+        container[name] = each
+    return container
+
+
+_MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps", "parameters")
 
 
 @functools.cache
@@ -798,12 +871,20 @@ def _file_of(models):
     return {"format": FORMAT, "models": {model.name: model for model in models}}
 
 
+def _store_of(models):
+    store = _qrx.store_of(_file_of(models))
+    store.set_parameters([
+        (name, *parameter) for model in models for name, parameter in model.parameters.items()
+    ])
+    return store
+
+
 def save(models, target):
     """Writes a model file of several models."""
     models = list(models)
     is_file = hasattr(target, "write")
     folder = "" if is_file else os.path.dirname(_records.file_path(target))
-    text = _qrx.store_of(_file_of(models)).model_file(folder)
+    text = _store_of(models).model_file(folder)
     if is_file:
         target.write(text)
     else:
@@ -823,7 +904,13 @@ def load_all(path):
     path = _records.file_path(path)
     with open(path, "rb"):
         pass
-    return {name: _model_of(name, tree) for name, tree in _qrx.load(path).trees().items()}
+    store = _qrx.load(path)
+    models = {name: _model_of(name, tree) for name, tree in store.trees().items()}
+    for name, *parameter in store.parameters:
+        # A model's own: the first pointer says whose.
+        token = parameter[0][0].split("/")[2].replace("~1", "/").replace("~0", "~")
+        models[token].parameters[name] = Parameter(*parameter)
+    return models
 
 
 def _model_of(name, tree):
@@ -854,7 +941,7 @@ def _owner_of(owner, told, meshes):
     owner._fill(told)
     if owner.mesh is not None:
         # One object for a mesh that several show.
-        owner.mesh = meshes.setdefault(owner.mesh.native.same_as, owner.mesh)
+        owner.mesh = meshes.setdefault(owner.mesh._native.same_as, owner.mesh)
     return owner
 
 
@@ -893,11 +980,12 @@ def _summary(model):
         if getattr(model, name)
     ]
     text += _table(("kind", "count", "names"), rows)
-    errors = [finding for finding in model.check() if finding.is_error]
-    if errors:
-        text += _table(("errors",), [(str(finding),) for finding in errors])
+    try:
+        model._store()
+    except ModelError as error:
+        text += _table(("errors",), [(str(finding),) for finding in error.findings if finding.is_error])
     return text
 
 
-__all__ = ["Assembly", "AssemblyMesh", "AssemblySet", "Instance", "Model", "ModelError", "Part", "load", "load_all",
+__all__ = ["Assembly", "AssemblyMesh", "AssemblySet", "Instance", "Model", "Parameter", "Part", "load", "load_all",
            "save"]

@@ -137,6 +137,7 @@ class Field:
         self.told = native.type
         self.kind = self.told["kind"]
         self.place = "/" + native.name
+        self.is_text = native.verbatim
         self._default = None
         self._has_default = False
         if self.kind == "Attribute":
@@ -312,7 +313,11 @@ class Record:
         document = {"class": self._full_name} if self._tells_class else {}
         fields = self._fields
         for name, value in self._values.items():
-            document[fields[name].file_name] = value
+            field = fields[name]
+            # Deck text by its lines, as model files have it: what points to a line finds it.
+            if field.is_text and isinstance(value, str) and value.endswith("\n"):
+                value = value[:-1].split("\n")
+            document[field.file_name] = value
         return document
 
     def _same(self, other):

@@ -5,6 +5,7 @@
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "support/TestFolder.h"
+#include "whole_file/whf_SignalCleanUp.h"
 
 #include <gtest/gtest.h>
 
@@ -388,6 +389,29 @@ TEST_F(DeckFileTest, DeckThatMayNotBeWritten_IsRefused) {
 }
 
 // Somebody who may write to the folder puts a link in the place of the fresh one.
+TEST_F(DeckFileTest, FoldersOfFilesThatAreWrittenAtOnce_AreAllRemovedAtASignal) {
+    const TestFolder folder;
+    whf_File first(folder.Path("first.inp"));
+    whf_File second(folder.Path("second.inp"));
+    std::vector<std::string> during;
+    std::vector<std::string> left{"not looked at"};
+    const auto writeBoth = [&](qio_ostream&) {
+        second.Replace([&](qio_ostream&) {
+            during = folder.Entries();
+            whf_SignalCleanUp::Remove();
+            left = folder.Entries();
+        });
+    };
+    EXPECT_THROW(first.Replace(writeBoth), whf_Error);
+    EXPECT_EQ(during.size(), 2U);
+    EXPECT_EQ(left, std::vector<std::string>());
+    EXPECT_EQ(folder.Entries(), std::vector<std::string>());
+    // Their places serve the next ones.
+    for (int i = 0; i < 2 * whf_SignalCleanUp::kMost; ++i)
+        whf_File(folder.Path("next.inp")).Replace([](qio_ostream& device) { device.Write("x", 1); });
+    EXPECT_EQ(folder.Entries(), std::vector<std::string>({"next.inp"}));
+}
+
 TEST_F(DeckFileTest, LinkInThePlaceOfTheFreshFolder_IsNotFollowed) {
     std::filesystem::create_directory(folder_.Path("trap"));
     static std::string trap;

@@ -20,8 +20,11 @@ def program():
     return os.environ["QRX_PROGRAM"]
 
 
-def run(*words, **options):
-    return subprocess.run([str(word) for word in words], capture_output=True, text=True, check=False, **options)
+def run(*words):
+    """Runs a program, without what a sanitized extension has the interpreter preload."""
+    environment = {name: value for name, value in os.environ.items() if name != "LD_PRELOAD"}
+    command = [str(word) for word in words]
+    return subprocess.run(command, capture_output=True, text=True, check=False, env=environment)
 
 
 def model_files():

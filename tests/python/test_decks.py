@@ -73,7 +73,9 @@ def _wrapped(told, record):
 
 
 def _new(cls):
-    return cls("X") if issubclass(cls, _records.Step) or cls.__name__ == "Datum" else cls()
+    if cls is qrx.InitialStep:
+        return cls()
+    return cls("X") if issubclass(cls, _records.Step) or cls is qrx.Datum else cls()
 
 
 def _place(model, record, depth=0):

@@ -9,8 +9,10 @@ from conftest import ROOT, example_scripts, module_of, run
 
 
 def test_EveryExample_HasAScript():
+    # A study's template is a model file by its nature: what varies is what it names.
     folders = {path.parent.name for path in (ROOT / "examples").glob("*/*.json")} | {"in_memory"}
-    assert {path.parent.name for path in example_scripts()} >= folders
+    folders -= {"plate_study"}
+    assert {path.parent.name for path in example_scripts()} == folders
 
 
 @pytest.mark.parametrize("path", example_scripts(), ids=lambda path: path.stem)

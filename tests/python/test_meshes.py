@@ -1,6 +1,8 @@
 """Meshes of arrays, of files and of other programs."""
 
 import gc
+import pathlib
+import sys
 import types
 import weakref
 
@@ -148,6 +150,48 @@ def test_Mesh_OutlivesPartAndModelAndModelThePart():
     gc.collect()
     assert mesh.num_points == 3
     assert mesh.sets["TIP"].labels.tolist() == [3]
+
+
+def test_Views_HoldTheMeshAndNothingHoldsTheArraysGiven():
+    points = POINTS.astype(np.float32)
+    cells = np.array(BRICK, np.int32)
+    before = [sys.getrefcount(points), sys.getrefcount(cells)]
+    mesh = qrx.Mesh(points, {"C3D8": cells})
+    after = [sys.getrefcount(points), sys.getrefcount(cells)]
+    assert after == before
+    native = mesh._native
+    held = [sys.getrefcount(native)]
+    views = [mesh.points, mesh.cells[0].data]
+    held.append(sys.getrefcount(native))
+    del views
+    gc.collect()
+    held.append(sys.getrefcount(native))
+    assert held[1] == held[0] + 2
+    assert held[2] == held[0]
+
+
+def test_ModelsThatAreGone_LeaveNothing():
+    def resident():
+        return int(pathlib.Path("/proc/self/statm").read_text().split()[1]) * 4096
+
+    def once():
+        model = rod.model()
+        model.add_part("LARGE", qrx.Mesh(np.zeros((100000, 3)), {"T3D2": np.zeros((100000, 2), np.int64)}))
+        model.add_instance("LARGE-1", "LARGE")
+        model.copy().deck()
+        model.loads["Force"].region = "NOWHERE"
+        with pytest.raises(qrx.ModelError):
+            model.deck()
+
+    for _ in range(5):
+        once()
+    gc.collect()
+    before = resident()
+    for _ in range(20):
+        once()
+    gc.collect()
+    # Each has meshes of 2.4 MB and a deck of as much; what is kept of 20 would be 80 MB and more.
+    assert resident() - before < 30e6
 
 
 def test_NumbersOfAnArray_AreCopiedOnce():

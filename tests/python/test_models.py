@@ -86,6 +86,19 @@ def test_DeckError_TellsObjectAndStep():
     assert str(error) == "no such thing (step 'Load', load 'P1')"
 
 
+def test_ValueThatIsPutBehindTheRecordsBack_IsFoundByTheCheck():
+    model = rod.model()
+    model.materials["Steel"].elastic.table[0][0] = float("nan")
+    (finding,) = model.check()
+    assert finding.place == "/models/Default Model/materials/Steel/elastic/table/0/0"
+    assert finding.found == "found nan"
+    model.materials["Steel"].elastic.table[0] = ["x", 1]
+    finding = next(each for each in model.check() if each.is_error)
+    assert finding.place == "/models/Default Model/materials/Steel/elastic/table/0/0"
+    with pytest.raises(qrx.ModelError):
+        model.deck()
+
+
 def test_Steps_HaveTheirOrder():
     model = qrx.Model()
     model.add_step(qrx.StaticStep("B"))
@@ -121,6 +134,13 @@ def test_Container_IsAssignedAsAWhole():
     assert list(model.materials) == ["Steel"]
     with pytest.raises(qrx.ModelError):
         model.materials = {"Steel": 5}
+    model.steps = [qrx.StaticStep("A"), qrx.StaticStep("B")]
+    assert list(model.steps) == ["Initial", "A", "B"]
+    model.parts = dict(model.parts)
+    assert model.parts["ROD"].name == "ROD"
+    for name, value in (("parts", {"A": 5}), ("datums", {"A": 5}), ("assembly", {}), ("steps", [5])):
+        with pytest.raises(qrx.ModelError):
+            setattr(model, name, value)
 
 
 def test_Heading_IsTheTextBelowTheKeyword():
@@ -183,7 +203,8 @@ def test_Notebook_ShowsASummary():
     assert "&lt;b&gt;" in shown
     assert "<b>" not in shown
     model.loads["Force"].region = "NOWHERE"
-    assert "no-such-set" in shown or "NOWHERE" in model._repr_html_()
+    assert "NOWHERE" not in shown
+    assert "found set &#x27;NOWHERE&#x27;" in model._repr_html_()
 
 
 def test_View_IsThePage(tmp_path):
@@ -267,3 +288,49 @@ def test_ModelsOfPython_TellAllFields():
     assert qrx.Model(wave_formulation="total").wave_formulation == "TOTAL"
     with pytest.raises(TypeError, match="did you mean 'absolute_zero'"):
         qrx.Model(absolut_zero=1)
+
+
+def test_Parameters_StayWithTheModel(tmp_path):
+    model = rod.model()
+    force = "/models/Default Model/loads/Force/states/Pull/component1"
+    model.parameters["force"] = force
+    model.parameters["stiffness"] = {
+        "pointers": ["/models/Default Model/materials/Steel/elastic/table/0/0"], "unit": "MPa", "limits": "> 0",
+        "description": "Young's modulus",
+    }
+    model.parameters["title"] = "/models/Default Model/topLevelSolverInput/1"
+    assert model.check() == []
+    assert model.parameters["force"] == qrx.Parameter((force,))
+    model.save(tmp_path / "rod.json")
+    read = qrx.load(tmp_path / "rod.json")
+    assert read == model
+    assert read.parameters["stiffness"].unit == "MPa"
+    assert model.copy() == model
+    model.parameters["force"] = force.replace("Force", "Forse")
+    (finding,) = model.check()
+    assert finding.place == "/parameters/force/pointers/0"
+    assert finding.hint == "did you mean 'Force'?"
+    with pytest.raises(KeyError, match="did you mean 'force'"):
+        model.parameters["farce"]
+
+
+def test_ParameterInAMeshFile_Stays(tmp_path):
+    import shutil
+
+    from conftest import ROOT
+
+    shutil.copy(ROOT / "examples" / "bonded_blocks" / "blocks.msh", tmp_path)
+    model = qrx.Model()
+    model.add_part("P", qrx.Mesh.read(tmp_path / "blocks.msh", scale=2.0))
+    model.parameters["scale"] = "/models/Default Model/parts/P/mesh/scale"
+    model.save(tmp_path / "p.json")
+    assert qrx.load(tmp_path / "p.json") == model
+
+
+def test_FindingInAFile_HasItsLine(tmp_path):
+    (tmp_path / "m.json").write_text('{"format": "qrx-model/1",\n "models": {"Default Model": {"lods": {}}}}')
+    with pytest.raises(qrx.ModelError) as raised:
+        qrx.load(tmp_path / "m.json")
+    (finding,) = raised.value.findings
+    assert finding.line == 2
+    assert "line 2, column " in str(raised.value)

@@ -4,6 +4,7 @@ import os
 import pathlib
 import subprocess
 import sys
+import zipfile
 
 import pytest
 
@@ -59,3 +60,32 @@ def test_Wheel_InAnEmptyEnvironmentWithoutNetwork_Works(tmp_path):
     )
     listed = run("-m", "pip", "show", "-f", "qrx")
     assert "qrx/py.typed" in listed and "qrx/__init__.pyi" in listed
+
+
+def test_MetadataAhead_IsThatOfTheWheel(tmp_path):
+    code = (
+        f"import sys; sys.path.insert(0, {str(ROOT / 'python' / 'build')!r}); sys.dont_write_bytecode = True; "
+        f"import backend; print(backend.prepare_metadata_for_build_wheel({str(tmp_path)!r}))"
+    )
+    made = subprocess.run([sys.executable, "-c", code], capture_output=True, text=True, check=True)
+    info = made.stdout.strip()
+    with zipfile.ZipFile(wheel(tmp_path / "wheel")) as packed:
+        for name in ("METADATA", "WHEEL"):
+            assert packed.read(f"{info}/{name}") == (tmp_path / info / name).read_bytes()
+
+
+def test_SourceArchive_HasAllThatTheBuildTakes(tmp_path):
+    import re
+    import tarfile
+
+    code = (
+        f"import sys; sys.path.insert(0, {str(ROOT / 'python' / 'build')!r}); sys.dont_write_bytecode = True; "
+        f"import backend; print(backend.build_sdist({str(tmp_path)!r}))"
+    )
+    made = subprocess.run([sys.executable, "-c", code], capture_output=True, text=True, check=True)
+    with tarfile.open(tmp_path / made.stdout.strip()) as archive:
+        names = archive.getnames()
+    top = {name.split("/")[1] for name in names if "/" in name}
+    lists = re.findall(r"add_subdirectory\((.+)\)", (ROOT / "CMakeLists.txt").read_text(encoding="utf-8"))
+    assert set(lists) - top == {"tests", "benchmarks", "fuzz"}
+    assert not [name for name in names if "node_modules" in name or "__pycache__" in name]
