@@ -7,7 +7,19 @@
 
 namespace {
 
+// Of large meshes the last two are kept whatever they take.
 constexpr std::size_t kMostFiles = 16;
+constexpr std::size_t kFewFiles = 2;
+constexpr std::size_t kMostBytes = std::size_t{512} << 20;
+
+/// About what a mesh takes.
+std::size_t BytesOf(const odiK_Mesh& mesh) {
+    constexpr std::size_t ofNode = 20;
+    std::size_t bytes = ofNode * static_cast<std::size_t>(mesh.Nodes().NumNodes());
+    for (const odiK_ElementClass& elements : mesh.Classes())
+        bytes += sizeof(int) * (elements.connectivity.size() + elements.labels.size());
+    return bytes;
+}
 
 /// Size and time of change: a file that was written anew is another one.
 std::string StateOf(const std::filesystem::path& file) {
@@ -55,7 +67,13 @@ cow_CountedHld<odiK_Mesh> mdf_MeshShelf::Keep(const Key& key, Entry entry) {
     if (IsOfFile(key)) {
         kept_->files.push_front(key);
         place->second.use = kept_->files.begin();
-        if (kept_->files.size() > kMostFiles) {
+        const auto bytes = [this] {
+            std::size_t all = 0;
+            for (const Key& each : kept_->files) all += BytesOf(*kept_->places[each].entry->mesh);
+            return all;
+        };
+        while (kept_->files.size() > kMostFiles ||
+               (kept_->files.size() > kFewFiles && bytes() > kMostBytes)) {
             kept_->places.erase(kept_->files.back());
             kept_->files.pop_back();
         }

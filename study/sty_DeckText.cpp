@@ -10,7 +10,10 @@
 
 namespace {
 
+// Of large meshes the last two are kept whatever they take, so that rows may go to and fro.
 constexpr std::size_t kMostMeshes = 16;
+constexpr std::size_t kFewMeshes = 2;
+constexpr std::size_t kMostMeshBytes = std::size_t{256} << 20;
 constexpr std::size_t kMostSummed = 8;
 constexpr std::size_t kBytesOfMark = std::size_t{2} * 1024;
 constexpr int kMostVectors = 64;
@@ -32,9 +35,17 @@ void sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm
     if (place == entries_.end()) {
         entries_.push_front({mesh, {}});
         place = entries_.begin();
-        if (entries_.size() > kMostMeshes) entries_.pop_back();
     }
     place->texts[static_cast<int>(block)] = text;
+    const auto bytes = [this] {
+        std::size_t all = 0;
+        for (const Entry& entry : entries_) {
+            for (const Text& each : entry.texts) all += each == nullptr ? 0 : each->size();
+        }
+        return all;
+    };
+    while (entries_.size() > kMostMeshes || (entries_.size() > kFewMeshes && bytes() > kMostMeshBytes))
+        entries_.pop_back();
 }
 
 void sty_DeckText::Begin(const odb_Odb& store) {
