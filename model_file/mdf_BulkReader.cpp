@@ -155,10 +155,7 @@ template <bool inRows, class T>
 bool mdf_BulkReader::ReadPieces(Pieces& pieces, mdf_Numbers& numbers, std::vector<T>& values,
                                 std::size_t length) {
     const std::size_t before = values.size();
-    const std::size_t count = (pieces.back().first + pieces.back().count) * length;
-    // Rows that are empty claim more than the text can hold.
-    if (count > static_cast<std::size_t>(end_ - at_)) return false;
-    values.resize(before + count);
+    values.resize(before + (pieces.back().first + pieces.back().count) * length);
     thr_ForEach(threads_, pieces.size(), [&](std::size_t i) {
         Piece& piece = pieces[i];
         try {

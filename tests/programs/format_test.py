@@ -26,10 +26,12 @@ def deck_of(program, model, folder, job):
 
 def problem_of(program, model, folder):
     """What is wrong with the formatted model; None when all is well."""
-    for mesh in model.parent.glob("*.*"):
+    for mesh in model.parent.rglob("*.*"):
         # Paths of mesh files are relative to the model file.
-        if mesh.suffix in (".msh", ".unv") and not (folder / mesh.name).exists():
-            shutil.copy(mesh, folder)
+        copy = folder / mesh.relative_to(model.parent)
+        if mesh.suffix in (".msh", ".unv") and not copy.exists():
+            copy.parent.mkdir(exist_ok=True)
+            shutil.copy(mesh, copy)
     first = run(program, "format", model, cwd=folder)
     if first.returncode == 1:
         return None if run(program, "check", model, cwd=folder).returncode == 1 else "is right but not formatted"

@@ -492,7 +492,9 @@ class Signals(ProgramTest):
         runs = []
         for _ in range(2):
             run = subprocess.Popen([PROGRAM, "write", "large.json"], cwd=self.folder, stdout=subprocess.DEVNULL)
-            while run.poll() is None and sum(n.startswith(b".qrxdeck") for n in self.entries()) <= len(runs):
+            self.addCleanup(run.kill)
+            # The file comes when the folder has been locked.
+            while run.poll() is None and len(list(self.folder.glob(".qrxdeck-*/*"))) <= len(runs):
                 time.sleep(0.001)
             run.send_signal(signal.SIGSTOP)
             runs.append(run)
