@@ -3,6 +3,7 @@
 
 #include "study/sty_File.h"
 
+#include <exception>
 #include <functional>
 #include <map>
 #include <optional>

@@ -133,6 +133,8 @@ private:
         if (request_.dryRun) return;
         folder_ = std::make_unique<sty_Folder>(request_.out);
         std::optional<std::string> held = folder_->Read(sty_Folder::kIdentity);
+        // Another shard may have put it there meanwhile, ahead of all else that it writes.
+        if (!held && !folder_->IsEmpty()) held = folder_->Read(sty_Folder::kIdentity);
         if (!held && !folder_->IsEmpty())
             throw Unusable(request_.out,
                            "found a folder with other files, expected a new or empty one, or a study's");

@@ -5,6 +5,7 @@
 #include "study/sty_File.h"
 #include "study/sty_Sha256.h"
 
+#include <exception>
 #include <map>
 #include <memory>
 #include <string>
