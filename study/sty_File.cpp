@@ -36,19 +36,6 @@ std::string_view sty_File::Next() {
     return {};
 }
 
-int sty_WriteAll(int file, std::string_view text) {
-    while (!text.empty()) {
-        errno = 0;
-        const ssize_t taken = ::write(file, text.data(), text.size());
-        if (taken > 0) {
-            text.remove_prefix(static_cast<std::size_t>(taken));
-        } else if (errno != EINTR) {
-            return errno != 0 ? errno : EIO;
-        }
-    }
-    return 0;
-}
-
 std::string sty_ReasonOf(int error) {
     return std::generic_category().message(error == 0 ? EIO : error);
 }

@@ -1,6 +1,8 @@
 #ifndef QRX_STY_FILE_H
 #define QRX_STY_FILE_H
 
+#include "whole_file/whf_WriteAll.h"
+
 #include <string>
 #include <string_view>
 #include <utility>
@@ -38,8 +40,6 @@ private:
     int error_ = 0;
 };
 
-/// Writes all of the text; the errno value of a failure, 0 for none.
-int sty_WriteAll(int file, std::string_view text);
 /// Writes lines to a file, many at a time.
 class sty_LineWriter {
 public:
@@ -58,7 +58,7 @@ private:
     static constexpr std::size_t kBytes = std::size_t{1} << 20;
 
     void Flush() {
-        if (error_ == 0) error_ = sty_WriteAll(file_, text_);
+        if (error_ == 0) error_ = whf_WriteAll(file_, text_);
         text_.clear();
     }
 

@@ -209,7 +209,7 @@ void sty_Ledger::Open() {
 
 void sty_Ledger::Append(const std::string& line) {
     const std::lock_guard<std::mutex> lock(mutex_);
-    if (const int error = sty_WriteAll(file_.Number(), line); error != 0) {
+    if (const int error = whf_WriteAll(file_.Number(), line); error != 0) {
         // A line that is cut off would spoil the next one.
         static_cast<void>(::ftruncate(file_.Number(), bytes_) == 0);
         throw sty_Refused("cannot write " + fnd_Quoted(Path()) + ": " + sty_ReasonOf(error));

@@ -139,7 +139,7 @@ private:
             throw Unusable(request_.out,
                            "found a folder with other files, expected a new or empty one, or a study's");
         folder_->Prepare();
-        const auto writeIdentity = [this](int file) { return sty_WriteAll(file, identity_.Text()); };
+        const auto writeIdentity = [this](int file) { return whf_WriteAll(file, identity_.Text()); };
         // Of several shards that begin at once one is the first.
         if (!held && !folder_->Write(sty_Folder::kIdentity, writeIdentity, false))
             held = folder_->Read(sty_Folder::kIdentity);

@@ -1,26 +1,11 @@
 #include "tools/StandardStreams.h"
 
+#include "whole_file/whf_WriteAll.h"
+
 #include <cerrno>
 
 #include <fcntl.h>
 #include <unistd.h>
-
-namespace {
-
-int WriteAll(int file, std::string_view text) noexcept {
-    while (!text.empty()) {
-        errno = 0;
-        const ssize_t taken = ::write(file, text.data(), text.size());
-        if (taken > 0) {
-            text.remove_prefix(static_cast<std::size_t>(taken));
-        } else if (errno != EINTR) {
-            return errno != 0 ? errno : EIO;
-        }
-    }
-    return 0;
-}
-
-} // namespace
 
 void SecureStandardStreams() noexcept {
     for (const int number : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
@@ -37,9 +22,9 @@ bool CanWriteToStandardOutput() noexcept {
 }
 
 int WriteToStandardOutput(std::string_view text) noexcept {
-    return WriteAll(STDOUT_FILENO, text);
+    return whf_WriteAll(STDOUT_FILENO, text);
 }
 
 int WriteToStandardError(std::string_view text) noexcept {
-    return WriteAll(STDERR_FILENO, text);
+    return whf_WriteAll(STDERR_FILENO, text);
 }

@@ -28,7 +28,7 @@ private:
 };
 
 int WriteOne(int file) {
-    return sty_WriteAll(file, "one");
+    return whf_WriteAll(file, "one");
 }
 
 } // namespace
@@ -106,7 +106,7 @@ TEST(sty_Placer, WhenWritingFails_NothingStandsThere) {
     folder.Prepare();
     sty_Placer placer(folder, "job");
     const auto fail = [](int file) {
-        sty_WriteAll(file, "half");
+        whf_WriteAll(file, "half");
         return ENOSPC;
     };
     EXPECT_THROW(placer.Place("1.inp", fail, false, [](const std::string&) { return false; }), sty_Refused);
