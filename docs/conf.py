@@ -51,7 +51,22 @@ spelling_show_suggestions = False
 spelling_ignore_contributor_names = False
 
 
+def without_modules(app, pagename, templatename, context, doctree):
+    """Debian's theme has its script as a module, which browsers don't take from disk; the pages do without."""
+    context["script_files"] = [file for file in context.get("script_files", []) if "furo.js" not in str(file)]
+
+
+def without_outside(app, exception):
+    """Debian's theme takes a style sheet from a web server's folder."""
+    sheet = pathlib.Path(app.outdir) / "_static" / "styles" / "furo.css"
+    if sheet.exists():
+        sheet.write_text(re.sub(r"@import[^;]*;", "", sheet.read_text(encoding="utf-8")), encoding="utf-8")
+
+
 def setup(app):
     app.add_lexer("inp", DeckLexer)
     app.add_lexer("json", JsonLexer)
     app.add_lexer("jsonl", JsonLexer)
+    # Behind the theme's own, which adds the script.
+    app.connect("html-page-context", without_modules, priority=900)
+    app.connect("build-finished", without_outside)

@@ -85,7 +85,7 @@ def compact(value, indent=0, width=80):
 def table(fields, title):
     if not fields:
         return []
-    lines = [f"| {title} | value | default | |", "|---|---|---|---|"]
+    lines = ["```{rst-class} fields", "```", "", f"| {title} | value | default | |", "|---|---|---|---|"]
     for field in fields:
         name = f"`{field.name}`" + (" (needed)" if field.required else "")
         lines.append(f"| {name} | {cell(field.value)} | {cell(field.default)} | {cell(escaped(field.meaning))} |")
