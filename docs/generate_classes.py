@@ -83,12 +83,17 @@ def compact(value, indent=0, width=80):
 
 
 def table(fields, title):
+    """Rows of fields, with their defaults where any has one."""
     if not fields:
         return []
-    lines = ["```{rst-class} fields", "```", "", f"| {title} | value | default | |", "|---|---|---|---|"]
+    defaults = any(field.default for field in fields)
+    heads = [title, "value", *(["default"] if defaults else []), " "]
+    lines = ["```{rst-class} " + ("fields defaults" if defaults else "fields"), "```", "",
+             f"| {' | '.join(heads)} |", "|---" * len(heads) + "|"]
     for field in fields:
         name = f"`{field.name}`" + (" (needed)" if field.required else "")
-        lines.append(f"| {name} | {cell(field.value)} | {cell(field.default)} | {cell(escaped(field.meaning))} |")
+        cells = [name, cell(field.value), *([cell(field.default)] if defaults else []), cell(escaped(field.meaning))]
+        lines.append(f"| {' | '.join(cells)} |")
     return lines + [""]
 
 
