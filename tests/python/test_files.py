@@ -138,6 +138,14 @@ def test_Threads_WriteModelsAtOnce(tmp_path):
         assert (tmp_path / f"{number}.inp").read_text() == expected[number % 4]
 
 
+def test_DeckOfAnyNumberOfThreads_IsTheSame(tmp_path):
+    model = large(100000)
+    expected = model.deck()
+    for threads in (1, 2, 5):
+        model.write(tmp_path / "large.inp", threads=threads)
+        assert (tmp_path / "large.inp").read_text() == expected
+
+
 def test_OtherThreads_GoOnWhileADeckIsWritten():
     model = large(300000)
     counted = []
