@@ -19,7 +19,7 @@ END
 }
 
 build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libmd-dev)
-test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
+test=(mold libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema bash-completion zsh fish groff-base)
 bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
