@@ -9,6 +9,7 @@
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
@@ -38,10 +39,10 @@ std::string ReasonText(int error) {
 
 /// The path of the deck; empty for a job name that names no file.
 std::string TargetOf(const WriteRequest& request) {
-    const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
-                                                          : std::filesystem::path(request.job);
+    const std::filesystem::path job =
+        request.job.empty() ? plt_Path(request.model).stem() : plt_Path(request.job);
     if (!job.has_filename() || job.filename() == "." || job.filename() == "..") return {};
-    std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
+    std::filesystem::path target = plt_Path(request.outputDir) / job;
     target += ".inp";
     return target.string();
 }
@@ -187,7 +188,7 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
         report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) + " names no file");
         return ExitCode::WRONG_USAGE;
     }
-    if (!request.outputDir.empty() && std::filesystem::path(request.job).is_absolute()) {
+    if (!request.outputDir.empty() && plt_Path(request.job).is_absolute()) {
         report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) +
                                     " is an absolute path, so it can't stand in the folder " +
                                     fnd_Quoted(request.outputDir));
@@ -290,8 +291,8 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
     const std::string place = request.output.empty() ? request.model : request.output;
-    mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
-                       std::filesystem::path(place).parent_path().string(), found.parameters);
+    mdf_WriteModelFile(*odb, formatted, found.meshOrigins, plt_Path(place).parent_path().string(),
+                       found.parameters);
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {

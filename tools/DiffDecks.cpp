@@ -4,13 +4,13 @@
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "model_file/mdf_ModelFile.h"
+#include "platform/plt_Files.h"
+#include "platform/plt_Process.h"
 #include "tools/DeckCommands.h"
 
 #include <algorithm>
 #include <cstdlib>
 #include <filesystem>
-
-#include <unistd.h>
 
 using nlohmann::ordered_json;
 
@@ -19,23 +19,18 @@ namespace {
 /// A fresh folder that goes with the object.
 class TemporaryDeck {
 public:
-    TemporaryDeck() {
-        std::error_code error;
-        path_ = std::filesystem::temp_directory_path(error).string() + "/qrxdeck-XXXXXX";
-        made_ = ::mkdtemp(path_.data()) != nullptr;
-    }
+    TemporaryDeck() : path_(plt_MakeTemporaryFolder("qrxdeck-")) {}
     TemporaryDeck(const TemporaryDeck&) = delete;
     TemporaryDeck& operator=(const TemporaryDeck&) = delete;
     ~TemporaryDeck() {
         std::error_code error;
-        if (made_) std::filesystem::remove_all(path_, error);
+        if (IsMade()) std::filesystem::remove_all(plt_Path(path_), error);
     }
-    bool IsMade() const { return made_; }
+    bool IsMade() const { return !path_.empty(); }
     std::string Job() const { return path_ + "/deck"; }
 
 private:
     std::string path_;
-    bool made_ = false;
 };
 
 /// Reads the deck of a model.
@@ -119,7 +114,7 @@ void PrintComments(const drd_DiffResult& result, RunReport& report) {
 
 void Print(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& second, RunReport& report) {
     const char* noColor = std::getenv("NO_COLOR");
-    const Colours colours(::isatty(STDOUT_FILENO) == 1 && (noColor == nullptr || *noColor == '\0'));
+    const Colours colours(plt_IsTerminal(plt_kStandardOutput) && (noColor == nullptr || *noColor == '\0'));
     for (const drd_Difference& difference : result.differences) {
         report.Print(
             colours.Of(difference.change, difference.text) + "\n" +

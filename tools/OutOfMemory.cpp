@@ -1,12 +1,11 @@
 #include "tools/OutOfMemory.h"
 
+#include "platform/plt_Process.h"
 #include "tools/RunReport.h"
 #include "whole_file/whf_SignalCleanUp.h"
 #include "tools/StandardStreams.h"
 
 #include <new>
-
-#include <unistd.h>
 
 namespace {
 
@@ -36,5 +35,5 @@ void OutOfMemory::End() noexcept {
         WriteToStandardError(isWritten ? "qrxdeck: error: not enough memory to report what was written\n"
                                        : "qrxdeck: error: not enough memory\n");
     }
-    ::_exit(static_cast<int>(code));
+    plt_EndNow(static_cast<int>(code));
 }

@@ -74,7 +74,7 @@ struct CommandLine {
         app.add_subcommand("schema", "Print the JSON Schema of model files, for editors and generators");
 
     CommandLine() {
-        app.set_version_flag("--version", "qrxdeck " QRX_VERSION);
+        app.set_version_flag("--version", ProgramVersion());
         app.require_subcommand(1);
         app.footer(kExitCodes);
         app.get_formatter()->column_width(30);

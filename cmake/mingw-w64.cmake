@@ -1,0 +1,20 @@
+# Toolchain of Debian's mingw-w64, the kind whose threads are the standard library's.
+set(CMAKE_SYSTEM_NAME Windows)
+set(CMAKE_SYSTEM_PROCESSOR x86_64)
+set(CMAKE_C_COMPILER x86_64-w64-mingw32-gcc-posix)
+set(CMAKE_CXX_COMPILER x86_64-w64-mingw32-g++-posix)
+set(CMAKE_RC_COMPILER x86_64-w64-mingw32-windres)
+set(CMAKE_FIND_ROOT_PATH /usr/x86_64-w64-mingw32)
+set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
+set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
+# Libraries that are headers alone serve every system; nothing else of this one's may be seen.
+foreach(name nlohmann CLI)
+    if(EXISTS /usr/include/${name})
+        file(CREATE_LINK /usr/include/${name} ${CMAKE_BINARY_DIR}/headers/${name} SYMBOLIC)
+    endif()
+endforeach()
+set(QRX_HEADERS_OF_OTHERS ${CMAKE_BINARY_DIR}/headers)
+# One file that needs no other.
+set(CMAKE_EXE_LINKER_FLAGS_INIT "-static")
