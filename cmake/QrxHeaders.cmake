@@ -1,11 +1,17 @@
-# Finds nlohmann-json and CLI11, of which programs take nothing but headers. A toolchain names the folder that has them
-# in QRX_HEADERS_OF_OTHERS; else they are installed packages.
-if(QRX_HEADERS_OF_OTHERS)
-    foreach(target nlohmann_json::nlohmann_json CLI11::CLI11)
-        if(NOT TARGET ${target})
-            add_library(${target} INTERFACE IMPORTED GLOBAL)
-            target_include_directories(${target} SYSTEM INTERFACE ${QRX_HEADERS_OF_OTHERS})
+# nlohmann-json and CLI11, of which programs take nothing but headers: installed packages, or, where a toolchain names the
+# folder of this system's headers in QRX_HOST_HEADERS, these alone of it.
+if(QRX_HOST_HEADERS)
+    set(headers ${PROJECT_BINARY_DIR}/headers)
+    foreach(name nlohmann CLI)
+        if(NOT EXISTS ${QRX_HOST_HEADERS}/${name})
+            message(FATAL_ERROR "No ${QRX_HOST_HEADERS}/${name}: scripts/install-dependencies.sh build gets it")
         endif()
+        file(MAKE_DIRECTORY ${headers})
+        file(CREATE_LINK ${QRX_HOST_HEADERS}/${name} ${headers}/${name} SYMBOLIC)
+    endforeach()
+    foreach(target nlohmann_json::nlohmann_json CLI11::CLI11)
+        add_library(${target} INTERFACE IMPORTED)
+        target_include_directories(${target} SYSTEM INTERFACE ${headers})
     endforeach()
 else()
     find_package(nlohmann_json 3 REQUIRED)

@@ -9,12 +9,9 @@ set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
 set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
-# Libraries that are headers alone serve every system; nothing else of this one's may be seen.
-foreach(name nlohmann CLI)
-    if(EXISTS /usr/include/${name})
-        file(CREATE_LINK /usr/include/${name} ${CMAKE_BINARY_DIR}/headers/${name} SYMBOLIC)
-    endif()
-endforeach()
-set(QRX_HEADERS_OF_OTHERS ${CMAKE_BINARY_DIR}/headers)
+# Where libraries that are headers alone are, which serve every system.
+set(QRX_HOST_HEADERS /usr/include)
+# CMake finds it by a program of this system, which gives this system's library.
+set(CMAKE_DISABLE_FIND_PACKAGE_HDF5 ON)
 # One file that needs no other.
 set(CMAKE_EXE_LINKER_FLAGS_INIT "-static")

@@ -1,12 +1,11 @@
 #include "foundation/num_ReadReal.h"
 
 #ifndef __cpp_lib_to_chars
+#include "platform/plt_Real.h"
+
 #include <cerrno>
 #include <cmath>
 #include <string>
-
-#include <locale.h>
-#include <stdlib.h>
 
 namespace {
 
@@ -14,7 +13,8 @@ bool IsDigit(char c) {
     return c >= '0' && c <= '9';
 }
 
-/// The end of the longest number from `at` on, as from_chars takes it; null for none.
+/// The end of the longest number from `at` on, as from_chars takes it but for words such as "nan"; null for
+/// none.
 const char* EndOf(const char* at, const char* last) {
     if (at != last && *at == '-') ++at;
     const auto passDigits = [&at, last] {
@@ -40,10 +40,9 @@ const char* EndOf(const char* at, const char* last) {
 std::from_chars_result num_ReadReal(const char* first, const char* last, double& value) {
     const char* const end = EndOf(first, last);
     if (end == nullptr) return {first, std::errc::invalid_argument};
-    static const locale_t plain = newlocale(LC_ALL_MASK, "C", nullptr);
     const std::string text(first, end);
     errno = 0;
-    const double read = strtod_l(text.c_str(), nullptr, plain);
+    const double read = plt_ReadPlainReal(text.c_str());
     // What lies between zero and the smallest normal number is told as a failure too, but is one that a
     // double holds.
     const bool isBeyond = errno == ERANGE && (std::isinf(read) || read == 0.0);
