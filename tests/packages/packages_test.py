@@ -64,6 +64,7 @@ class Packages(unittest.TestCase):
     def unpacked(self, name):
         folder = self.scratch / "unpacked" / name
         if not folder.exists():
+            folder.mkdir(parents=True)
             run("dpkg-deb", "-x", self.deb(name), folder)
         return folder
 
