@@ -83,7 +83,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
     }
     mdf_Value root;
     std::vector<fnd_Finding> errors;
-    mdf_Parse(text, root, errors);
+    mdf_Parse(text, root, errors, report.progress);
     // The text has gone into the document; of a large file there is no room for both beside the store.
     if (file->CanBeReadAgain())
         std::string().swap(text);
@@ -101,7 +101,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
-    mdf_Parse(text, root, errors);
+    mdf_Parse(text, root, errors, report.progress);
     std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report, nullptr, given);
     mdf_Locate(text, report.findings);
     return odb;

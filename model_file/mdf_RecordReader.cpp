@@ -84,7 +84,8 @@ const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
     for (const cls_ClassEntry* entry : choice.classes) {
         choice.names.emplace_back(entry->info.name);
         // By a short name that two have, neither is known.
-        const auto [entryOfName, isFirst] = choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
+        const auto [entryOfName, isFirst] =
+            choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
         if (!isFirst) entryOfName->second = nullptr;
     }
     for (const cls_ClassEntry* entry : choice.classes) choice.byName[fnd_LowerCase(entry->info.name)] = entry;
@@ -115,7 +116,7 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     if (entry != choice.byName.end() && entry->second != nullptr) {
         return std::unique_ptr<cls_Record>(entry->second->create());
     }
-    diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names)),
+    diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names, name->String())),
                           fnd_DidYouMean(diagnostics_, name->String(), [&names](fnd_Nearest& nearest) {
                               for (const std::string& each : names) nearest.Try(each);
                           }));
@@ -249,7 +250,7 @@ bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const 
         return true;
     }
     const std::vector<std::string> words(field.words.begin(), field.words.end());
-    diagnostics_.Expected(path, json, fnd_OneOf(words),
+    diagnostics_.Expected(path, json, fnd_OneOf(words, mdf_GivenWord(json)),
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }
@@ -280,7 +281,7 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const fnd_Path
         }
     }
     std::string expected = mayBeUnset ? "an integer of 32 bits or null" : "an integer of 32 bits";
-    if (!words.empty()) expected += ", or " + fnd_OneOf(words);
+    if (!words.empty()) expected += ", or " + fnd_OneOf(words, mdf_GivenWord(json));
     diagnostics_.Expected(path, json, expected,
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
@@ -302,7 +303,7 @@ bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf
         words.emplace_back(listed.name);
         shown.push_back(std::string(listed.name) + " (" + std::to_string(listed.value) + ")");
     }
-    diagnostics_.Expected(path, json, fnd_OneOf(wordsOnly ? words : shown),
+    diagnostics_.Expected(path, json, fnd_OneOf(wordsOnly ? words : shown, mdf_GivenWord(json)),
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }

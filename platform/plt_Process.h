@@ -12,13 +12,15 @@ constexpr int plt_kStandardInput = 0;
 constexpr int plt_kStandardOutput = 1;
 constexpr int plt_kStandardError = 2;
 
-/// Makes the standard streams ready: those that are closed are opened on nothing, so that no file gets their numbers;
-/// what is written to the standard output or read from the standard input fails all the same. Texts go as the bytes
-/// that they are, and a terminal takes them for UTF-8.
+/// Makes the standard streams ready: those that are closed are opened on nothing, so that no file gets their
+/// numbers; what is written to the standard output or read from the standard input fails all the same. Texts
+/// go as the bytes that they are, and a terminal takes them for UTF-8.
 void plt_SecureStandardStreams() noexcept;
 /// Whether anything can be written to the standard output at all.
 bool plt_CanWriteToStandardOutput() noexcept;
 bool plt_IsTerminal(int file) noexcept;
+/// -1 for what is no terminal, 0 where it doesn't tell.
+int plt_ColumnsOfTerminal(int file) noexcept;
 
 /// The words of the command line, as UTF-8.
 std::vector<std::string> plt_CommandLine(int argc, char** argv);
@@ -34,8 +36,9 @@ std::string plt_ProgramPath();
 /// Lets the desktop open a file; false when it has no program for it.
 bool plt_OpenOnDesktop(const std::string& path);
 
-/// Calls `clean`, which must be safe in a handler of signals, when a signal, or the user, ends the process. What the
-/// caller told the process to ignore stays ignored. A file that outgrows its limit fails with EFBIG instead of ending it.
+/// Calls `clean`, which must be safe in a handler of signals, when a signal, or the user, ends the process.
+/// What the caller told the process to ignore stays ignored. A file that outgrows its limit fails with EFBIG
+/// instead of ending it.
 void plt_AtEndingSignals(void (*clean)());
 
 /// Holds the signals back that end the process, for as long as it lives.
@@ -66,9 +69,10 @@ private:
     std::unique_ptr<Former> former_;
 };
 
-/// Runs `work` in a process of its own, in which nothing else of this one happens, and `take` here meanwhile; each has
-/// an end of one pipe. The work is whole when it gives true; NO_PROCESS with errno.
+/// Runs `work` in a process of its own, in which nothing else of this one happens, and `take` here meanwhile;
+/// each has an end of one pipe. The work is whole when it gives true; NO_PROCESS with errno.
 enum class plt_ApartEnm { WHOLE, DIED, NO_PROCESS };
-plt_ApartEnm plt_RunApart(const std::function<bool(int pipe)>& work, const std::function<void(int pipe)>& take);
+plt_ApartEnm plt_RunApart(const std::function<bool(int pipe)>& work,
+                          const std::function<void(int pipe)>& take);
 
 #endif

@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|packages|windows|libcxx] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs|packages|windows|libcxx] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -14,6 +14,7 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|packa
           of viewer/package-lock.json
   cluster test, and the schedulers that run the shards of studies
   python  build, and what the package for Python is built, used and tested with
+  docs    build, and what the manual is built and checked with
   packages  build, and what packages are built and tested with
   windows   build, and what qrxdeck.exe is built and tested with
   libcxx    build, and clang with its own standard library
@@ -21,12 +22,13 @@ END
 }
 
 build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libmd-dev)
-test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
+test=(mold libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema bash-completion zsh fish groff-base)
 bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
 cluster=(slurmctld slurmd slurm-client munge snakemake iproute2 util-linux)
 python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind11 python3-numpy python3-pytest mypy)
+docs=(doxygen python3-sphinx python3-myst-parser python3-breathe furo python3-sphinxcontrib.spelling hunspell-en-gb)
 
 packages=(dpkg-dev gzip xz-utils lintian debootstrap python3)
 windows=(g++-mingw-w64-x86-64-posix libz-mingw-w64-dev wine64 wine unzip python3)
@@ -44,9 +46,10 @@ for task in "$@"; do
         build) ;;
         test) wanted+=("${test[@]}") ;;
         bench) wanted+=("${bench[@]}") ;;
-        dev) wanted+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}") ;;
+        dev) wanted+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}" "${docs[@]}") ;;
         cluster) wanted+=("${test[@]}" "${cluster[@]}") ;;
         python) wanted+=("${python[@]}") ;;
+        docs) wanted+=("${docs[@]}") ;;
         packages) wanted+=("${packages[@]}") ;;
         windows) wanted+=("${windows[@]}") ;;
         libcxx) wanted+=("${libcxx[@]}") ;;

@@ -9,10 +9,13 @@
 /// What the user asked for on the command line.
 struct WriteRequest {
     std::string model;
-    /// Empty: the model file's name without extension. May hold a folder, relative to the output folder.
+    /// Empty: the model file's name without extension. May hold a folder, relative to the output folder; with
+    /// ".inp" or without. "-": the standard output.
     std::string job;
     /// Empty: the current one.
     std::string outputDir;
+    /// The deck's file as it stands, in place of both; "-": the standard output.
+    std::string output;
     /// Reads the deck back and holds it against the store.
     bool verify = false;
 };
@@ -41,6 +44,8 @@ struct NewRequest {
     bool force = false;
 };
 
+/// The path of the deck; "-" for the standard output, empty for a job name that names no file.
+std::string DeckTargetOf(const WriteRequest& request);
 ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 /// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,

@@ -7,6 +7,7 @@
 #include <iterator>
 
 #include <fcntl.h>
+#include <sys/ioctl.h>
 #include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -58,6 +59,12 @@ bool plt_CanWriteToStandardOutput() noexcept {
 
 bool plt_IsTerminal(int file) noexcept {
     return ::isatty(file) == 1;
+}
+
+int plt_ColumnsOfTerminal(int file) noexcept {
+    if (::isatty(file) == 0) return -1;
+    winsize size = {};
+    return ::ioctl(file, TIOCGWINSZ, &size) == 0 ? size.ws_col : 0;
 }
 
 std::vector<std::string> plt_CommandLine(int argc, char** argv) {

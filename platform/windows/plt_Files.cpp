@@ -183,7 +183,8 @@ int plt_InspectOpen(int file, plt_Status* found) {
 
 int plt_MayWrite(int at, const char* name) {
     const DWORD attributes = GetFileAttributesW(PathIn(at, name).c_str());
-    if (attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_READONLY) != 0) return plt_Fail(EACCES);
+    if (attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_READONLY) != 0)
+        return plt_Fail(EACCES);
     const OwnHandle handle(Open(PathIn(at, name), GENERIC_WRITE, kShareAll, OPEN_EXISTING));
     return handle.get() == INVALID_HANDLE_VALUE ? plt_Fail() : 0;
 }

@@ -17,8 +17,8 @@ plt_MappedFile::plt_MappedFile(const std::string& path) {
     } else if (!plt_IsFile(status)) {
         error_ = plt_IsFolder(status) ? EISDIR : ENOTSUP;
     } else if (status.st_size > 0) {
-        const HANDLE mapping = CreateFileMappingW(reinterpret_cast<HANDLE>(_get_osfhandle(file)), nullptr, PAGE_READONLY,
-                                                  0, 0, nullptr);
+        const HANDLE mapping = CreateFileMappingW(reinterpret_cast<HANDLE>(_get_osfhandle(file)), nullptr,
+                                                  PAGE_READONLY, 0, 0, nullptr);
         if (mapping != nullptr)
             begin_ = static_cast<const char*>(MapViewOfFile(mapping, FILE_MAP_READ, 0, 0, 0));
         if (begin_ == nullptr) {

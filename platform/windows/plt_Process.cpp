@@ -45,6 +45,13 @@ bool plt_IsTerminal(int file) noexcept {
     return GetConsoleMode(reinterpret_cast<HANDLE>(_get_osfhandle(file)), &mode) != 0;
 }
 
+int plt_ColumnsOfTerminal(int file) noexcept {
+    if (!plt_IsTerminal(file)) return -1;
+    CONSOLE_SCREEN_BUFFER_INFO info;
+    const auto handle = reinterpret_cast<HANDLE>(_get_osfhandle(file));
+    return GetConsoleScreenBufferInfo(handle, &info) != 0 ? info.srWindow.Right - info.srWindow.Left + 1 : 0;
+}
+
 std::vector<std::string> plt_CommandLine(int, char**) {
     int count = 0;
     wchar_t** words = CommandLineToArgvW(GetCommandLineW(), &count);
@@ -73,7 +80,8 @@ void plt_EndBySignal(int signal) {
 }
 
 bool plt_OpenOnDesktop(const std::string& path) {
-    const HINSTANCE opened = ShellExecuteW(nullptr, L"open", plt_Wide(path).c_str(), nullptr, nullptr, SW_SHOWNORMAL);
+    const HINSTANCE opened =
+        ShellExecuteW(nullptr, L"open", plt_Wide(path).c_str(), nullptr, nullptr, SW_SHOWNORMAL);
     // Up to 32 are errors.
     return reinterpret_cast<INT_PTR>(opened) > 32;
 }

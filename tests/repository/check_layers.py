@@ -74,8 +74,9 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"aclapi.h", "dirent.h", "fcntl.h", "io.h", "process.h", "shellapi.h", "unistd.h", "windows.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h",
-          "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
+SYSTEM = {"aclapi.h", "dirent.h", "fcntl.h", "io.h", "process.h", "shellapi.h", "unistd.h", "windows.h", "sys/file.h",
+          "sys/ioctl.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h", "sys/stat.h", "sys/types.h", "sys/uio.h",
+          "sys/wait.h", "sys/xattr.h"}
 SYSTEM_LAYERS = {"foundation", "platform"}
 
 # What instructions of the processor are reached through, each with a portable way beside it.
