@@ -1,4 +1,5 @@
-# Packs manual pages, as Debian wants them, and gives all that is packed one time, that of the sources, so that the same sources make the same package.
+# Packs manual pages, as Debian wants them. Then all that is in a package gets one time, that of the sources, so that the
+# same sources make the same package.
 set(time "$ENV{SOURCE_DATE_EPOCH}")
 if(NOT time)
     set(time "${CPACK_QRX_TIME}")

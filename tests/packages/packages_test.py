@@ -169,20 +169,22 @@ class InAFreshRoot(unittest.TestCase):
                        "DEBIAN_FRONTEND": "noninteractive"}
         return run("chroot", cls.root, "sh", "-ec", "cd /tmp/work 2>/dev/null || cd /tmp\n" + script, env=environment)
 
-    def test_ModelsOfTheReadme_BecomeDecks(self):
+    def test_CommandsOfTheReadme_DoWhatItSays(self):
         readme = (OPTIONS.repository / "README.md").read_text(encoding="utf-8")
-        models = [block for block in re.findall(r"^```json\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
-                  if '"format"' in block]
-        self.assertGreater(len(models), 0)
-        for model in models:
-            (self.root / "tmp/work/rod.json").write_text(model, encoding="utf-8")
-            self.there("qrxdeck check rod.json && qrxdeck write rod.json && qrxdeck check rod.inp")
-            deck = (self.root / "tmp/work/rod.inp").read_text(encoding="utf-8")
-            self.assertTrue(deck.startswith("*Heading\n"), deck[:100])
-            if "rod.inp" in readme:
-                shown = re.findall(r"^```\n(\*.*?)^```$", readme, re.MULTILINE | re.DOTALL)
-                for part in shown:
-                    self.assertIn(part, deck)
+        blocks = re.findall(r"^<!-- files: (\S+) -->\n```sh\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
+        self.assertGreater(len(blocks), 0)
+        for file, commands in blocks:
+            shutil.copy(OPTIONS.repository / file, self.root / "tmp/work")
+            self.there(commands)
+        self.assertTrue((self.root / "tmp/work/part.inp").read_text(encoding="utf-8").startswith("*Heading\n"))
+        # And the lines that it shows of a deck.
+        for example in ("bracket.json", "bracket.msh"):
+            shutil.copy(OPTIONS.repository / "examples/bracket" / example, self.root / "tmp/work")
+        self.there("qrxdeck write bracket.json && qrxdeck check bracket.inp")
+        shown = re.findall(r"^```inp\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
+        self.assertGreater(len(shown), 0)
+        for lines in shown:
+            self.assertIn(lines, (self.root / "tmp/work/bracket.inp").read_text(encoding="utf-8"))
 
     def test_Version_TellsTheCommit(self):
         self.assertRegex(self.there("qrxdeck --version"), r"^qrxdeck \d+\.\d+\.\d+ \([0-9a-f]{12}\+?\)\n$")
