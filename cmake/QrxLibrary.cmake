@@ -51,7 +51,7 @@ endforeach()
 set(qrx_include_dir ${CMAKE_INSTALL_INCLUDEDIR}/${QRX_INCLUDE_SUBDIR})
 foreach(layer platform foundation store_interface keyword_layer deck_checks whole_file)
     install(DIRECTORY ${PROJECT_SOURCE_DIR}/${layer}/ DESTINATION ${qrx_include_dir}/${layer} COMPONENT development
-        FILES_MATCHING PATTERN "*.h" PATTERN "*.inl")
+        FILES_MATCHING PATTERN "*.h" PATTERN "*.inl" PATTERN windows EXCLUDE)
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src/ DESTINATION ${qrx_include_dir} OPTIONAL
     COMPONENT development FILES_MATCHING PATTERN "*.h")

@@ -30,7 +30,13 @@ BOOL WINAPI AtEnd(DWORD event) {
 
 void plt_SecureStandardStreams() noexcept {
     for (const int number : {plt_kStandardInput, plt_kStandardOutput, plt_kStandardError}) {
-        if (_get_osfhandle(number) >= 0) _setmode(number, _O_BINARY);
+        if (_get_osfhandle(number) < 0) continue;
+        _setmode(number, _O_BINARY);
+        // Colours, and lines that change, are sequences there as everywhere.
+        const auto handle = reinterpret_cast<HANDLE>(_get_osfhandle(number));
+        DWORD mode = 0;
+        if (number != plt_kStandardInput && GetConsoleMode(handle, &mode) != 0)
+            SetConsoleMode(handle, mode | ENABLE_VIRTUAL_TERMINAL_PROCESSING);
     }
     SetConsoleOutputCP(CP_UTF8);
 }

@@ -60,7 +60,7 @@ GIVEN_BY = {
     "logic_error": "stdexcept", "runtime_error": "stdexcept", "invalid_argument": "stdexcept",
     "strong_ordering": "compare", "mutex": "mutex", "lock_guard": "mutex", "unique_lock": "mutex", "thread": "thread",
     "condition_variable": "condition_variable", "jthread": "thread", "atomic": ATOMICS,
-    "from_chars": "charconv", "to_chars": "charconv", "chrono": "chrono", "source_location": "source_location",
+    "from_chars": "charconv", "from_chars_result": "charconv", "to_chars": "charconv", "chrono": "chrono", "source_location": "source_location",
 }
 for trait in ("is_constructible_v is_final_v is_enum_v enable_if_t remove_reference_t remove_cvref_t remove_const_t "
               "is_trivially_destructible_v is_trivially_copyable_v is_member_object_pointer_v is_base_of_v "
