@@ -23,8 +23,13 @@ struct Folder {
 static_assert(std::atomic<Use>::is_always_lock_free);
 Folder theFolders[whf_SignalCleanUp::kMost];
 
+using Function = void (*)() noexcept;
+std::atomic<Function> theFunction = nullptr;
+static_assert(std::atomic<Function>::is_always_lock_free);
+
 void CleanUp(int signal) {
     whf_SignalCleanUp::Remove();
+    if (const Function function = theFunction.load(); function != nullptr) function();
     // The handler is the default one by now; this arrives when it returns.
     ::raise(signal);
 }
@@ -64,6 +69,10 @@ int whf_SignalCleanUp::Set(int at, const char* name, int folder) noexcept {
 
 void whf_SignalCleanUp::Clear(int place) noexcept {
     if (place >= 0) theFolders[place].use.store(Use::FREE);
+}
+
+void whf_SignalCleanUp::AlsoCall(void (*function)() noexcept) noexcept {
+    theFunction.store(function);
 }
 
 void whf_SignalCleanUp::Remove() noexcept {
