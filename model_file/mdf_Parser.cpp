@@ -1,5 +1,6 @@
 #include "model_file/mdf_Parser.h"
 
+#include "foundation/thr_Poll.h"
 #include "foundation/thr_Progress.h"
 #include "model_file/mdf_BulkReader.h"
 #include "model_file/mdf_Locate.h"
@@ -194,6 +195,7 @@ bool DocumentReader::ReadBehindValue() {
 }
 
 bool DocumentReader::MayNest() {
+    thr_Poll::Now();
     if (builder_.Depth() < static_cast<std::size_t>(mdf_maxDepth)) return true;
     SyntaxError(OffsetOf(at_),
                 "arrays and objects are nested deeper than " + std::to_string(mdf_maxDepth) + " levels");

@@ -173,6 +173,7 @@ import numpy as np, os, pathlib, sys, qrx, time
 sys.path.insert(0, {tests!r})
 from test_files import large
 model = large(2000000)
+model.save("large.json")
 print("ready", flush=True)
 try:
     while True:
@@ -182,7 +183,7 @@ except KeyboardInterrupt:
 """
 
 
-@pytest.mark.parametrize("run", ["model.write('large.inp')", "model.deck()", "model.check()"])
+@pytest.mark.parametrize("run", ["model.write('large.inp')", "model.deck()", "model.check()", "qrx.load('large.json')"])
 def test_Interrupt_EndsALongRunAndLeavesNothing(tmp_path, run):
     tests = str(pathlib.Path(__file__).parent)
     process = subprocess.Popen(
@@ -195,7 +196,7 @@ def test_Interrupt_EndsALongRunAndLeavesNothing(tmp_path, run):
     assert process.communicate(timeout=60)[0] == "interrupted\n"
     assert time.monotonic() - begin < 20
     assert process.returncode == 0
-    assert [name for name in os.listdir(tmp_path) if name != "large.inp"] == []
+    assert [name for name in os.listdir(tmp_path) if name not in ("large.inp", "large.json")] == []
 
 
 def test_CommandLine_IsTheProgram(tmp_path, program):
