@@ -70,8 +70,8 @@ void drd_Parser::OpenFile(const std::filesystem::path& path, drd_Place includedA
         return;
     }
     deck_.files.push_back({path.string(), includedAt});
-    sources_.push_back(std::make_unique<Source>(
-        Source{drd_LineSource(file), static_cast<int>(deck_.files.size()) - 1, canonical}));
+    sources_.push_back(std::make_unique<Source>(Source{drd_LineSource(file, options_.progress),
+                                                       static_cast<int>(deck_.files.size()) - 1, canonical}));
     current_ = sources_.back().get();
 }
 

@@ -58,11 +58,20 @@ drd_ReadOptions DeckOptions(const DeckRequest& request) {
     drd_ReadOptions options;
     options.followIncludes = !request.keepIncludesShut;
     options.typeInfo = &InfoOf;
+    options.progress = request.progress;
     return options;
 }
 
 drd_Deck ReadDeck(const std::string& path, const DeckRequest& request, drd_Findings& findings) {
     return drd_ReadDeck(path, DeckOptions(request), findings);
+}
+
+drd_Deck ReadDeckWatched(const std::string& path, const DeckRequest& request, drd_Findings& findings,
+                         RunReport& report) {
+    report.Watched().Begin("reading", path);
+    DeckRequest watched = request;
+    watched.progress = &report.Watched().Work();
+    return ReadDeck(path, watched, findings);
 }
 
 void AddFindings(const drd_Deck& deck, const drd_Findings& findings, RunReport& report) {
@@ -81,8 +90,9 @@ void AddFindings(const drd_Deck& deck, const drd_Findings& findings, RunReport& 
 
 ExitCode RunCheckDeck(const std::string& path, const DeckRequest& request, RunReport& report) {
     drd_Findings findings;
-    const drd_Deck deck = ReadDeck(path, request, findings);
+    const drd_Deck deck = ReadDeckWatched(path, request, findings, report);
     const bool unreadable = deck.files.size() == 1 && findings.Counts().contains("deck-unreadable");
+    report.Watched().Begin("checking", path);
     if (!unreadable) drd_CheckDeck(deck, DeckOptions(request), findings);
     AddFindings(deck, findings, report);
     if (unreadable) return ExitCode::FILE_SYSTEM_REFUSED;

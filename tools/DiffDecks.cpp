@@ -141,7 +141,7 @@ void Fill(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& s
 bool ReadSide(const std::string& path, drd_Deck& deck, const DeckRequest& request, RunReport& report) {
     if (!IsDeck(path)) return ReadDeckOfModel(path, deck, report);
     drd_Findings findings;
-    deck = ReadDeck(path, request, findings);
+    deck = ReadDeckWatched(path, request, findings, report);
     if (!findings.HasErrors()) return true;
     // A deck with faults in its text can be compared as far as it was read; one that isn't there can't.
     AddFindings(deck, findings, report);

@@ -20,10 +20,19 @@ struct Folder {
 static_assert(std::atomic<Use>::is_always_lock_free);
 Folder theFolders[whf_SignalCleanUp::kMost];
 
+using Function = void (*)() noexcept;
+std::atomic<Function> theFunction = nullptr;
+static_assert(std::atomic<Function>::is_always_lock_free);
+
+void CleanUp() {
+    whf_SignalCleanUp::Remove();
+    if (const Function function = theFunction.load(); function != nullptr) function();
+}
+
 } // namespace
 
 void whf_SignalCleanUp::Install() {
-    plt_AtEndingSignals(&whf_SignalCleanUp::Remove);
+    plt_AtEndingSignals(&CleanUp);
 }
 
 int whf_SignalCleanUp::Set(int at, const char* name, int folder) noexcept {
@@ -44,6 +53,10 @@ int whf_SignalCleanUp::Set(int at, const char* name, int folder) noexcept {
 
 void whf_SignalCleanUp::Clear(int place) noexcept {
     if (place >= 0) theFolders[place].use.store(Use::FREE);
+}
+
+void whf_SignalCleanUp::AlsoCall(void (*function)() noexcept) noexcept {
+    theFunction.store(function);
 }
 
 void whf_SignalCleanUp::Remove() noexcept {

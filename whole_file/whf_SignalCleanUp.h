@@ -17,6 +17,9 @@ public:
     /// where there is none left.
     static int Set(int at, const char* name, int folder) noexcept;
     static void Clear(int place) noexcept;
+    /// A function to be called before the process ends by a signal; only calls that are safe within a signal
+    /// handler.
+    static void AlsoCall(void (*function)() noexcept) noexcept;
     /// Removes all that is set; only calls that are safe within a signal handler.
     static void Remove() noexcept;
 
