@@ -1,5 +1,6 @@
 #include "deck_reader/drd_Check.h"
 #include "deck_reader/drd_Text.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 #include "tools/DeckCommands.h"
@@ -43,12 +44,12 @@ const fnd_Code& CodeOf(const drd_Code& code) {
 } // namespace
 
 bool IsDeck(const std::string& path) {
-    const std::string extension = drd_FoldKey(std::filesystem::path(path).extension().string());
+    const std::string extension = drd_FoldKey(plt_Path(path).extension().string());
     if (extension == ".inp") return true;
     if (extension == ".json") return false;
     std::error_code error;
-    if (!std::filesystem::is_regular_file(path, error)) return false;
-    std::ifstream file(path, std::ios::binary);
+    if (!std::filesystem::is_regular_file(plt_Path(path), error)) return false;
+    std::ifstream file(plt_Path(path), std::ios::binary);
     char first = '\0';
     return static_cast<bool>(file >> first) && first == '*';
 }
