@@ -169,15 +169,15 @@ const FindingCase frameCases[] = {
     {"PartAsNull", Model(R"("parts": {"P": null})"), {"@/parts/P: found null, expected an object"}},
     {"PartUnknownMember",
      Model(R"("parts": {"P": {"meshs": {}}})"),
-     {"@/parts/P/meshs: found an unknown member 'meshs', expected one of solverInput, mesh, "
-      "sectionAssignments, materialOrientations, beamOrientations; did you mean 'mesh'?"}},
+     {"@/parts/P/meshs: found an unknown member 'meshs'; did you mean 'mesh'? Expected one of "
+      "solverInput, mesh, sectionAssignments, materialOrientations, beamOrientations"}},
     {"AssemblyAsArray",
      Model(R"("assembly": [])"),
      {"@/assembly: found an array of 0 items, expected an object"}},
     {"AssemblyUnknownMember",
      Model(R"("assembly": {"instance": {}})"),
-     {"@/assembly/instance: found an unknown member 'instance', expected one of name, solverInput, "
-      "instances, mesh, sets, sectionAssignments, connectorOrientations; did you mean 'instances'?"}},
+     {"@/assembly/instance: found an unknown member 'instance'; did you mean 'instances'? Expected one "
+      "of name, solverInput, instances, mesh, sets, sectionAssignments, connectorOrientations"}},
     {"InstancesAsArray",
      Model(R"("assembly": {"instances": []})"),
      {"@/assembly/instances: found an array of 0 items, expected an object of instances"}},
