@@ -59,7 +59,8 @@ class Schema:
         for each in node.get("anyOf", ()):
             if "enum" in each:
                 return each["enum"][0]
-        return key
+        twins = [other for other in self.keys if short(other) == short(key)]
+        return re.sub(r"^[a-z]+[A-Z]?_", "", key) if len(twins) == 1 else key
 
     # -- Places
 
