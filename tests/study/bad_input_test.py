@@ -82,7 +82,7 @@ class BadInput(StudyTest):
         model["models"]["Default Model"]["loads"]["F"]["region"] = "BAR-1.NOWHERE"
         self.write_model(model)
         run = self.refused(self.table(f"{FORCE}\n1\n"), "the template is wrong")
-        self.assertIn("/loads/F/region: found set 'NOWHERE'", run.stderr)
+        self.assertRegex(run.stderr, r"error: found set 'NOWHERE', .* \(/models/Default Model/loads/F/region\) \[no-such-set\]")
         self.refused("table.csv", "the template can't be read", code=3, template="none.json")
         (self.folder / "broken.json").write_text("{")
         self.refused("table.csv", "the template is wrong", template="broken.json")
@@ -103,7 +103,7 @@ class BadInput(StudyTest):
         self.write_model(dict(MODEL, parameters={"f": FORCE.replace("component1", "componnt1")}))
         run = self.run_program("check", "template.json")
         self.assertEqual(run.returncode, 0)
-        self.assertIn("warning: /parameters/f: found no 'componnt1'", run.stderr)
+        self.assertRegex(run.stderr, r"warning: found no 'componnt1' .* \(/parameters/f\) \[no-such-place\]")
         self.assertIn("did you mean 'component1'?", run.stderr)
 
     def test_TableThatIsALedger_IsRefused(self):
