@@ -29,7 +29,7 @@ drd_Deck drd_ReadDeckText(std::string_view text, const std::string& name, const 
 }
 
 void drd_Parser::OpenMain(const std::string& path) {
-    OpenFile(path, {-1, 0});
+    OpenFile(plt_Path(path), {-1, 0});
     if (deck_.files.empty()) deck_.files.push_back({path, {-1, 0}});
 }
 

@@ -9,7 +9,7 @@
 
 namespace {
 
-bool IsDigit(char c) {
+bool IsDigitOfReal(char c) {
     return c >= '0' && c <= '9';
 }
 
@@ -19,7 +19,7 @@ const char* EndOf(const char* at, const char* last) {
     if (at != last && *at == '-') ++at;
     const auto passDigits = [&at, last] {
         const char* const begin = at;
-        while (at != last && IsDigit(*at)) ++at;
+        while (at != last && IsDigitOfReal(*at)) ++at;
         return at != begin;
     };
     bool hasDigits = passDigits();

@@ -298,7 +298,10 @@ int plt_List(int folder, const std::function<bool(const char* name)>& take) {
 }
 
 std::FILE* plt_OpenStream(const char* path, const char* mode) {
-    return _wfopen(plt_Wide(path).c_str(), plt_Wide(mode).c_str());
+    std::wstring asBytes = plt_Wide(mode);
+    // Ends of lines are what who writes them says.
+    if (asBytes.find(L'b') == std::wstring::npos) asBytes += L'b';
+    return _wfopen(plt_Wide(path).c_str(), asBytes.c_str());
 }
 
 std::FILE* plt_StreamOf(int file) {
