@@ -11,7 +11,8 @@
 
 /// The store of a model file that is right; else null, with the code.
 std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
-                                   std::list<mdf_MeshOrigin>* origins = nullptr);
+                                   std::list<mdf_MeshOrigin>* origins = nullptr,
+                                   const mdf_ModelChoice& choice = {});
 /// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
 /// there is to say of it, for which everything that can fail is done before the file stands. What `write`
 /// raises beyond that comes through.

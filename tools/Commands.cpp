@@ -135,10 +135,10 @@ class OutputIsLost {};
 } // namespace
 
 std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
-                                   std::list<mdf_MeshOrigin>* origins) {
+                                   std::list<mdf_MeshOrigin>* origins, const mdf_ModelChoice& choice) {
     mdf_Report found;
     found.fileName = path;
-    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
+    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found, choice);
     report.AddAll(found);
     report.Times().End("reading");
     code = ExitCode::DONE;
@@ -198,7 +198,7 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code, nullptr, {request.modelName});
     if (odb == nullptr) return code;
     code = WriteDeck(*odb, request.model, target, report);
     return code == ExitCode::DONE && request.verify ? VerifyDeck(*odb, target, report) : code;
@@ -206,10 +206,10 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
 
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
                    RunReport& report) {
-    const odiK_Model* model = odb.FindModel(odb_Odb::DefaultModelName());
+    const odiK_Model* model = odb.DeckModel();
     if (model == nullptr) {
-        report.Error(modelFile, std::string("there is no model named \"") + odb_Odb::DefaultModelName() +
-                                    "\" to write a deck from");
+        report.Error(modelFile, "there is no model named " + fnd_Quoted(odb.DeckModelName().View()) +
+                                    " to write a deck from");
         return ExitCode::MODEL_IS_WRONG;
     }
     const std::vector<dck_KindCount> counts = dck_CountsOfDeck(*model);
@@ -218,8 +218,8 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     whf_File deck(target);
     fnd_List list;
     try {
-        dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
-        dck_CheckMeshes(odb, odb_Odb::DefaultModelName(), list);
+        dck_CheckDeck(odb, odb.DeckModelName(), list);
+        dck_CheckMeshes(odb, odb.DeckModelName(), list);
         report.Times().End("checking");
         const auto write = [&](qio_ostream& device) {
             oif_Writer(odb).WriteInput(device);
@@ -237,20 +237,19 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     }
 }
 
-ExitCode RunCheck(const std::string& model, RunReport& report) {
+ExitCode RunCheck(const std::string& model, const std::string& modelName, RunReport& report) {
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, nullptr, {modelName});
     if (odb == nullptr) return code;
     fnd_List list;
-    dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
-    dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
+    dck_CheckDeck(*odb, odb->DeckModelName(), list);
+    dck_CheckMeshes(*odb, odb->DeckModelName(), list);
     report.AddAll(model, list.findings);
     fnd_List raised;
     dck_Rehearse(*odb, report.Foretold(), raised);
     report.AddAll(model, raised.findings);
     report.Print(fnd_Visible(model) + ": no errors\n");
-    const std::vector<dck_LeftOut> leftOut =
-        dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));
+    const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(*odb, *odb->DeckModel());
     if (report.AsJson()) report.Member("leftOut") = JsonOf(leftOut);
     PrintLeftOut(leftOut, WidthOf(leftOut), report);
     return code;
@@ -259,7 +258,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
     ExitCode code;
     std::list<mdf_MeshOrigin> origins;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins, {{}, false});
     if (odb == nullptr) return code;
     ordered_json& models = report.Member("models") = ordered_json::object();
     for (const auto& [name, entry] : odb->Models()) {
@@ -285,13 +284,13 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     mdf_Report found;
-    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found);
+    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found, {}, {{}, false});
     report.AddAll(found);
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
     const std::string place = request.output.empty() ? request.model : request.output;
     mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
-                       std::filesystem::path(place).parent_path().string(), found.parameters);
+                       std::filesystem::path(place).parent_path().string(), found.parameters, found.schema);
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
     if (request.check) {

@@ -6,10 +6,10 @@
 #include "tools/Commands.h"
 #include "tools/DeckCommands.h"
 #include "tools/OutOfMemory.h"
-#include "whole_file/whf_SignalCleanUp.h"
 #include "tools/StandardStreams.h"
 #include "tools/StudyCommand.h"
 #include "tools/ViewCommand.h"
+#include "whole_file/whf_SignalCleanUp.h"
 
 #include <CLI/CLI.hpp>
 
@@ -50,7 +50,10 @@ struct CommandLine {
     StudyCommand study;
     bool textOfDeck = false;
     std::string model;
+    std::string modelName;
     std::string schemaOutput;
+    std::string schemaClass;
+    std::string classFamily;
     std::string stepType;
     bool json = false;
     int threads = 0;
@@ -70,6 +73,8 @@ struct CommandLine {
     CLI::App* viewCommand = app.add_subcommand("view", "Write a page that shows a model, step by step");
     CLI::App* variablesCommand =
         app.add_subcommand("variables", "List the variables that output requests can ask for");
+    CLI::App* classesCommand =
+        app.add_subcommand("classes", "List the classes of objects that model files know");
     CLI::App* schemaCommand =
         app.add_subcommand("schema", "Print the JSON Schema of model files, for editors and generators");
 
@@ -100,8 +105,20 @@ struct CommandLine {
                          "Only those of one procedure, by the class of its step, such as StaticStep")
             ->type_name("TYPE");
         AddJson(variablesCommand);
+        schemaCommand
+            ->add_option("CLASS", schemaClass,
+                         "One class alone, as a table to read: StaticStep, Pressure, Part, ...")
+            ->type_name("");
         schemaCommand->add_option("--output", schemaOutput, "File to write (default: the standard output)")
             ->type_name("FILE");
+        AddJson(schemaCommand);
+        classesCommand
+            ->add_option("FAMILY", classFamily, "One family alone: steps, loads, sections, materials, ...")
+            ->type_name("");
+        AddJson(classesCommand);
+        AddModelName(writeCommand, write.modelName);
+        AddModelName(checkCommand, modelName);
+        AddModelName(viewCommand, view.modelName);
     }
 
     /// What is wrong, in the words of the command line's reader but for a command that isn't known.
@@ -118,7 +135,8 @@ struct CommandLine {
     ExitCode Run(RunReport& report) const {
         thr_SetUsualThreads(threads);
         if (*writeCommand) return RunWrite(write, report);
-        if (*checkCommand) return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, report);
+        if (*checkCommand)
+            return IsDeck(model) ? RunCheckDeck(model, deck, report) : RunCheck(model, modelName, report);
         if (*diffCommand) {
             return static_cast<ExitCode>(textOfDeck ? RunTextOfDeck(diff.first, diff.deck, report)
                                                     : RunDiff(diff, report));
@@ -131,7 +149,8 @@ struct CommandLine {
         if (*viewCommand) return RunView(view, report);
         if (*studyCommand) return RunStudy(study, report);
         if (*variablesCommand) return RunVariables(stepType, report);
-        return RunSchema(schemaOutput, report);
+        if (*classesCommand) return RunClasses(classFamily, report);
+        return schemaClass.empty() ? RunSchema(schemaOutput, report) : RunSchemaOf(schemaClass, report);
     }
 
 private:
@@ -144,6 +163,12 @@ private:
             ->check(CLI::Range(1, 64))
             ->type_name("N");
         AddJson(command);
+    }
+    static void AddModelName(CLI::App* command, std::string& name) {
+        command
+            ->add_option("--model", name,
+                         "Which model of the file (default: the only one, or \"Default Model\")")
+            ->type_name("NAME");
     }
     void AddMeshFile(CLI::App* command, std::string& file) {
         command->add_option("MESH", file, "Mesh file: MSH, UNV, MED, VTU, VTK or STL")

@@ -288,13 +288,50 @@ class Refusals(ProgramTest):
         self.assertEqual(message["line"], 2)
         self.assertGreater(message["column"], 0)
 
-    def test_NoDefaultModel_IsCodeOne(self):
+    def named(self, *names):
+        """A model file with copies of the model under these names."""
         model = json.loads(json.dumps(MODEL))
-        model["models"]["Study"] = model["models"].pop("Default Model")
+        content = model["models"].pop("Default Model")
+        model["models"] = {name: content for name in names}
+        return model
+
+    def test_TheOnlyModel_IsWrittenWhateverItsName(self):
+        self.put("model.json", MODEL)
+        self.assertEqual(self.run_program("write", "model.json", "--job", "expected").returncode, 0)
+        expected = (self.folder / "expected.inp").read_bytes()
+        for name in ["Study", "a/b~c", "default model"]:
+            with self.subTest(name=name):
+                self.put("model.json", self.named(name))
+                for verb in [["write", "--job", "deck"], ["check"], ["info"], ["format", "-o", "again.json"]]:
+                    self.assertEqual(self.run_program(verb[0], "model.json", *verb[1:]).returncode, 0)
+                self.assertEqual((self.folder / "deck.inp").read_bytes(), expected)
+                self.assertEqual(list(json.loads((self.folder / "again.json").read_text())["models"]), [name])
+
+    def test_OneOfSeveralModels_IsChosenByItsName(self):
+        model = self.named("A", "B")
+        model["models"]["B"] = {"steps": [{"name": "Start", "class": "InitialStep"}]}
         self.put("model.json", model)
+        for name, has in [("A", True), ("B", False)]:
+            run = self.run_program("write", "model.json", "--model", name, "--job", name)
+            self.assertEqual(run.returncode, 0, run.errors)
+            self.assertEqual(b"*Element" in (self.folder / f"{name}.inp").read_bytes(), has)
+            self.assertEqual(self.run_program("check", "model.json", "--model", name).returncode, 0)
+        self.assertEqual(self.run_program("info", "model.json").returncode, 0)
+        self.assertEqual(self.run_program("format", "model.json").returncode, 0)
+
+    def test_SeveralModels_NoneNamedAndNoneTheDefault_IsCodeOneAndListsThem(self):
+        self.put("model.json", self.named("Sketch", "Defalt Model"))
         run = self.run_program("write", "model.json")
         self.assert_refused(run, 1)
-        self.assertIn("'Default Model'", run.errors)
+        self.assertIn("did you mean 'Defalt Model'? there are 'Sketch', 'Defalt Model'", run.errors)
+        run = self.run_program("write", "model.json", "--model", "Sketsh")
+        self.assert_refused(run, 1)
+        self.assertIn("found no model named 'Sketsh'", run.errors)
+        self.assertIn("did you mean 'Sketch'?", run.errors)
+
+    def test_SchemaMember_IsAccepted(self):
+        self.put("model.json", {"$schema": "./model.schema.json", **MODEL})
+        self.assertEqual(self.run_program("write", "model.json").returncode, 0)
 
     def test_WrongUsage_IsCodeTwo(self):
         for arguments in [[], ["write"], ["frobnicate"], ["write", "model.json", "--frob"],
@@ -310,7 +347,7 @@ class Refusals(ProgramTest):
     def test_UnknownCommand_IsNamed(self):
         self.assert_refused(self.run_program("wirte", "model.json"), 2,
                             "qrxdeck: error: there is no command 'wirte'; "
-                            "the commands are write, check, diff, flatten, info, mesh, new, format, study, view, variables, schema\n"
+                            "the commands are write, check, diff, flatten, info, mesh, new, format, study, view, variables, classes, schema\n"
                             "Run with --help for more information.\n")
 
     def test_WrongUsage_IsToldInJson(self):
@@ -819,7 +856,7 @@ class OtherCommands(ProgramTest):
         self.assertEqual(model["parts"]["ROD"]["mesh"], {"nodes": 2, "elements": 1, "elementTypes": {"R2D2": 1}})
         self.assertEqual(model["parts"]["ROD"]["sets"], {"node": {"TIP": 1}, "element": {}, "surface": {}})
         self.assertEqual(model["instances"]["ROD-1"]["translation"], [0, 1, 0])
-        self.assertEqual([step["class"] for step in model["steps"]], ["kprC_InitialStep"])
+        self.assertEqual([step["class"] for step in model["steps"]], ["InitialStep"])
 
     def test_Schema_IsJsonAndTheSameInAFile(self):
         run = self.run_program("schema")

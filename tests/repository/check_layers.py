@@ -73,8 +73,8 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h",
-          "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
+SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/ioctl.h", "sys/mman.h", "sys/resource.h",
+          "sys/single_threaded.h", "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
 SYSTEM_LAYERS = {"foundation", "whole_file", "mesh_file", "study", "tools"}
 
 # What instructions of the processor are reached through, each with a portable way beside it.
