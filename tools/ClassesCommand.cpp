@@ -90,6 +90,25 @@ std::string TargetOf(const ordered_json& schema) {
     return schema.contains("$ref") ? schema["$ref"].get<std::string>().substr(kLead) : std::string();
 }
 
+/// JSON as people write it: what fits a line stands in one.
+std::string LaidOut(const ordered_json& value, const std::string& indent) {
+    if (!value.is_structured() || value.empty()) return value.dump();
+    const auto joined = [&](const char* separator, const std::string& inner) {
+        std::string text;
+        for (const auto& [name, item] : value.items()) {
+            text += (text.empty() ? "" : separator) +
+                    (value.is_object() ? ordered_json(name).dump() + ": " : std::string()) +
+                    LaidOut(item, inner);
+        }
+        return text;
+    };
+    const char* ends = value.is_object() ? "{}" : "[]";
+    const std::string line = ends[0] + joined(", ", indent) + ends[1];
+    if (line.find('\n') == std::string::npos && indent.size() + line.size() < OutputWidth() - 20) return line;
+    const std::string inner = indent + "  ";
+    return ends[0] + ("\n" + inner) + joined((",\n" + inner).c_str(), inner) + "\n" + indent + ends[1];
+}
+
 /// One class, or one part of the frame, out of the schema.
 class ClassTable {
 public:
@@ -105,19 +124,12 @@ public:
             text += "\n" + Emphasis("In each of the states") + "\n" + FieldsText(definitions_[state]);
         }
         const ordered_json& examples = definition_.value("examples", ordered_json::array());
-        if (!examples.empty()) text += "\n" + Emphasis("Example") + "\n  " + Indented(examples[0]) + "\n";
+        if (!examples.empty())
+            text += "\n" + Emphasis("Example") + "\n  " + LaidOut(examples[0], "  ") + "\n";
         return text;
     }
 
 private:
-    static std::string Indented(const ordered_json& example) {
-        std::string text;
-        const std::string lines = example.dump(2);
-        for (const char c : lines.size() < 90 ? example.dump() : lines)
-            text += c == '\n' ? "\n  " : std::string(1, c);
-        return text;
-    }
-
     std::string FieldsText(const ordered_json& object) const {
         WrappedTable table;
         table.Heading({"member", "value", "default", "meaning"});
@@ -184,7 +196,7 @@ private:
         const bool mayBeNull = std::any_of(choices.begin(), choices.end(), [](const ordered_json& choice) {
             return choice.contains("type") && choice["type"] == "null";
         });
-        return mayBeNull ? first + " or null" : first;
+        return mayBeNull && !first.ends_with(" or null") ? first + " or null" : first;
     }
 
     std::string TypeOfDefinition(const std::string& target) const {

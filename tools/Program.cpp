@@ -75,8 +75,9 @@ struct CommandLine {
         app.add_subcommand("variables", "List the variables that output requests can ask for");
     CLI::App* classesCommand =
         app.add_subcommand("classes", "List the classes of objects that model files know");
-    CLI::App* schemaCommand =
-        app.add_subcommand("schema", "Print the JSON Schema of model files, for editors and generators");
+    CLI::App* schemaCommand = app.add_subcommand(
+        "schema",
+        "Print the JSON Schema of model files, for editors and generators, or one class as a table");
 
     CommandLine() {
         app.set_version_flag("--version", "qrxdeck " QRX_VERSION);

@@ -37,6 +37,45 @@ std::vector<std::string> LinesOf(const std::string& text, std::size_t width) {
     return lines;
 }
 
+constexpr std::size_t kIndent = 2;
+constexpr std::size_t kGap = 2;
+/// The last column is no use with less.
+constexpr std::size_t kLeastText = 24;
+
+std::string SideBySide(const std::vector<std::string>& row, const std::vector<std::size_t>& widths) {
+    std::vector<std::vector<std::string>> cells;
+    std::size_t height = 1;
+    for (std::size_t i = 0; i < row.size(); ++i) {
+        cells.push_back(LinesOf(row[i], widths[i]));
+        height = std::max(height, cells.back().size());
+    }
+    std::string text;
+    for (std::size_t line = 0; line < height; ++line) {
+        std::string shown(kIndent, ' ');
+        for (std::size_t i = 0; i < cells.size(); ++i) {
+            const std::string& cell = line < cells[i].size() ? cells[i][line] : std::string();
+            const std::size_t used = WidthOf(cell);
+            shown += cell;
+            if (i + 1 < cells.size()) shown.append((used < widths[i] ? widths[i] - used : 0) + kGap, ' ');
+        }
+        shown.erase(shown.find_last_not_of(' ') + 1);
+        text += shown + "\n";
+    }
+    return text;
+}
+
+/// For narrow terminals: the last cell below the others.
+std::string Stacked(const std::vector<std::string>& row, std::size_t width) {
+    std::string others;
+    for (std::size_t i = 0; i + 1 < row.size(); ++i) others += (i == 0 ? "" : "  ") + row[i];
+    std::string text;
+    for (const std::string& line : LinesOf(others, width - kIndent))
+        text += std::string(kIndent, ' ') + line + "\n";
+    for (const std::string& line : LinesOf(row.back(), width - 3 * kIndent))
+        text += std::string(3 * kIndent, ' ') + line + "\n";
+    return text;
+}
+
 } // namespace
 
 std::size_t OutputWidth() {
@@ -59,8 +98,6 @@ std::string Wrapped(const std::string& text) {
 }
 
 std::string WrappedTable::Text() const {
-    constexpr std::size_t kIndent = 2;
-    constexpr std::size_t kGap = 2;
     const std::size_t columns = rows_.empty() ? heading_.size() : rows_.front().size();
     if (columns == 0) return {};
     const std::size_t width = OutputWidth();
@@ -70,35 +107,20 @@ std::string WrappedTable::Text() const {
     };
     measure(heading_);
     std::ranges::for_each(rows_, measure);
-    // What is left for the last column is at least a third of the line; the others give way beyond that.
-    const std::size_t most = (width * 2 / 3 - kIndent) / std::max<std::size_t>(1, columns - 1) - kGap;
+    // Names, in the first, stay in one piece; the columns between them and the last have half of the line.
+    const std::size_t most = width / 2 / std::max<std::size_t>(1, columns - 1) - kGap;
     std::size_t before = kIndent;
     for (std::size_t i = 0; i + 1 < columns; ++i) {
-        // Names, in the first, stay in one piece.
         if (i > 0) widths[i] = std::min(widths[i], most);
         before += widths[i] + kGap;
     }
-    widths.back() = width > before + most ? width - before : most;
+    const bool isNarrow = width < before + kLeastText;
+    widths.back() = isNarrow ? width - 2 * kIndent : width - before;
 
     std::string text;
     const auto add = [&](const std::vector<std::string>& row, bool isHeading) {
-        std::vector<std::vector<std::string>> cells;
-        std::size_t height = 1;
-        for (std::size_t i = 0; i < row.size(); ++i) {
-            cells.push_back(LinesOf(row[i], widths[i]));
-            height = std::max(height, cells.back().size());
-        }
-        for (std::size_t line = 0; line < height; ++line) {
-            std::string shown(kIndent, ' ');
-            for (std::size_t i = 0; i < cells.size(); ++i) {
-                const std::string& cell = line < cells[i].size() ? cells[i][line] : std::string();
-                shown += cell;
-                const std::size_t used = WidthOf(cell);
-                if (i + 1 < cells.size()) shown.append((used < widths[i] ? widths[i] - used : 0) + kGap, ' ');
-            }
-            shown.erase(shown.find_last_not_of(' ') + 1);
-            text += (isHeading ? Emphasis(shown) : shown) + "\n";
-        }
+        const std::string shown = isNarrow ? Stacked(row, width) : SideBySide(row, widths);
+        text += isHeading ? Emphasis(shown) : shown;
     };
     if (!heading_.empty()) add(heading_, true);
     for (const auto& row : rows_) add(row, false);
