@@ -37,6 +37,8 @@ fi
 scripts/install-dependencies.sh test python
 # Without npm's registry all else is tested, and the page's tests say that they are skipped.
 scripts/install-dependencies.sh viewer || echo "test.sh: the page can't be built here; its tests are skipped" >&2
+# Without its packages the manual isn't built; what it shows is tried all the same.
+scripts/install-dependencies.sh docs || echo "test.sh: the manual can't be built here; that test is skipped" >&2
 for preset in "${presets[@]}"; do
     echo "== $preset"
     sanitized=OFF

@@ -276,7 +276,7 @@ private:
 
 int main(int argc, char** argv) {
     std::vector<char*> arguments(argv, argv + argc);
-    std::string defaults[] = {"--benchmark_repetitions=5", "--benchmark_min_time=0.05",
+    std::string defaults[] = {"--benchmark_repetitions=15", "--benchmark_min_time=0.05",
                               "--benchmark_enable_random_interleaving=true"};
     // Those of the command line come later and win.
     for (std::size_t i = 0; i < std::size(defaults); ++i) {

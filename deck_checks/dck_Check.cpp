@@ -6,6 +6,7 @@
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "foundation/thr_Poll.h"
+#include "foundation/thr_Progress.h"
 #include "store_interface/model/odb_Odb.h"
 
 #include <algorithm>
@@ -14,11 +15,16 @@ namespace {
 
 class Counter final : public qio_ostream {
 public:
+    explicit Counter(thr_Progress* progress) : progress_(progress) {}
     void Write(const char*, std::size_t length) override {
         thr_Poll::Now();
         bytes += static_cast<long long>(length);
+        if (progress_ != nullptr) progress_->Set(bytes);
     }
     long long bytes = 0;
+
+private:
+    thr_Progress* progress_;
 };
 
 } // namespace
@@ -43,12 +49,13 @@ void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& 
     dck_CheckLoss(model, below);
 }
 
-void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink) {
+void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink,
+                  thr_Progress* progress) {
     constexpr long long kHuge = 1'000'000'000;
     const fnd_Path root;
     const fnd_Path models(root, "models");
     const fnd_Path place(models, store.DeckModelName().View());
-    Counter counter;
+    Counter counter(progress);
     try {
         oif_Writer(store).WriteInput(counter);
     } catch (const QRXBasException& failure) {

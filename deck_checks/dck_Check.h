@@ -7,6 +7,7 @@
 class odb_Odb;
 class odiK_Mesh;
 struct mq_Quality;
+struct thr_Progress;
 
 /// Everything that can be said of a store's model before its deck is written, whether
 /// the store was filled in memory or from a file: errors that a model file would be refused for, and warnings
@@ -21,7 +22,9 @@ void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink&
 void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
 /// Writes the deck to nowhere: says what is raised, unless it stands among the `told`
 /// ones, and how large a huge deck will be.
-void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink);
+/// `progress`: counts the deck's bytes meanwhile.
+void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink,
+                  thr_Progress* progress = nullptr);
 /// The quality of all meshes: elements of negative or zero size, mid-side nodes far away, nodes and elements
 /// that stand twice, nodes of no element, faces that three solids share.
 void dck_CheckMeshes(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);

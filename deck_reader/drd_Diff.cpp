@@ -95,12 +95,11 @@ drd_Differ::Match drd_Differ::MatchBlocks(drd_BlockEnm kind, Pair parents) const
     const auto nameOf = [kind](const drd_Block& block) {
         return kind == drd_BlockEnm::ASSEMBLY ? std::string() : drd_FoldCase(block.name);
     };
-    // By name; of several under one name the first with the first.
     const Items& others = blocksOfSecond_[static_cast<std::size_t>(parents.second)];
-    std::unordered_map<std::string, std::vector<int>> byName;
-    for (auto other = others.rbegin(); other != others.rend(); ++other) {
-        const drd_Block& block = Second().blocks[static_cast<std::size_t>(*other)];
-        if (block.kind == kind) byName[nameOf(block)].push_back(*other);
+    drd_Waiting byName;
+    for (const int other : others) {
+        const drd_Block& block = Second().blocks[static_cast<std::size_t>(other)];
+        if (block.kind == kind) byName.Put(nameOf(block), other);
     }
     Items taken;
     for (const int own : blocksOfFirst_[static_cast<std::size_t>(parents.first)]) {
@@ -109,14 +108,13 @@ drd_Differ::Match drd_Differ::MatchBlocks(drd_BlockEnm kind, Pair parents) const
         std::string name = nameOf(block);
         const auto renamed = renames_.find(name);
         if (renamed != renames_.end()) name = renamed->second;
-        const auto found = byName.find(name);
-        if (found == byName.end() || found->second.empty()) {
+        const int partner = byName.Take(name);
+        if (partner < 0) {
             match.onlyFirst.push_back(own);
             continue;
         }
-        match.pairs.push_back({own, found->second.back()});
-        taken.push_back(found->second.back());
-        found->second.pop_back();
+        match.pairs.push_back({own, partner});
+        taken.push_back(partner);
     }
     std::sort(taken.begin(), taken.end());
     for (const int other : others) {
@@ -230,21 +228,20 @@ void drd_Differ::RenamesOfBlock(Pair blocks) {
         return items;
     };
     const Match match = MatchByName(named(first_, blocks.first), named(second_, blocks.second));
-    std::unordered_map<std::uint64_t, int> bySignature;
-    for (const int item : match.onlySecond) bySignature.emplace(second_.NamelessSignature(item), item);
+    drd_Waiting bySignature;
+    for (const int item : match.onlySecond) bySignature.Put(second_.NamelessSignature(item), item);
     for (const int item : match.onlyFirst) {
-        const auto found = bySignature.find(first_.NamelessSignature(item));
-        if (found == bySignature.end()) continue;
+        const int partner = bySignature.Take(first_.NamelessSignature(item));
+        if (partner < 0) continue;
         const drd_Keyword& keyword = FirstKeyword(item);
         const std::string_view parameter = drd_NameParameter(*keyword.row);
         std::string before = drd_FoldName(keyword.Value(parameter));
-        std::string after = drd_FoldName(SecondKeyword(found->second).Value(parameter));
+        std::string after = drd_FoldName(SecondKeyword(partner).Value(parameter));
         const drd_Block& block = First().blocks[static_cast<std::size_t>(blocks.first)];
         if (block.kind == drd_BlockEnm::INSTANCE) {
             const std::string instance = drd_FoldCase(block.name) + ".";
             renames_.emplace(instance + before, instance + after);
         }
         renames_.emplace(std::move(before), std::move(after));
-        bySignature.erase(found);
     }
 }

@@ -103,12 +103,12 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
                                    const Context& context) {
     const std::vector<Condition> before = ConditionsOf(first_, first, word.fields);
     const std::vector<Condition> after = ConditionsOf(second_, second, word.fields);
-    std::unordered_map<std::string, std::vector<std::size_t>> byTarget;
-    for (std::size_t i = after.size(); i-- > 0;) byTarget[after[i].target].push_back(i);
+    drd_Waiting byTarget;
+    for (std::size_t i = 0; i < after.size(); ++i) byTarget.Put(after[i].target, static_cast<int>(i));
     std::vector<char> isTaken(after.size(), 0);
     for (const Condition& condition : before) {
-        const auto found = byTarget.find(condition.target);
-        if (found == byTarget.end() || found->second.empty()) {
+        const int partner = byTarget.Take(condition.target);
+        if (partner < 0) {
             Tell(drd_ChangeEnm::REMOVED, std::string(word.word),
                  context + WordsOf(First(), condition, word) + " removed",
                  condition.line < 0 ? FirstKeyword(condition.keyword).place
@@ -117,9 +117,8 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
                  drd_Nowhere);
             continue;
         }
-        CompareCondition(condition, after[found->second.back()], word, context);
-        isTaken[found->second.back()] = 1;
-        found->second.pop_back();
+        CompareCondition(condition, after[static_cast<std::size_t>(partner)], word, context);
+        isTaken[static_cast<std::size_t>(partner)] = 1;
     }
     for (std::size_t i = 0; i < after.size(); ++i) {
         if (isTaken[i] != 0) continue;

@@ -57,11 +57,11 @@ void drd_Differ::CompareItems(const Items& first, const Items& second, const Con
         Items second;
     };
     std::vector<Alike> kinds;
-    std::unordered_map<std::string_view, std::size_t> index;
+    drd_TextMap index;
     const auto listsOf = [&](const drd_Keyword& keyword) -> Alike& {
-        const auto [place, isNew] = index.try_emplace(keyword.key, kinds.size());
+        const auto [place, isNew] = index.TryEmplace(keyword.key, static_cast<int>(kinds.size()));
         if (isNew) kinds.emplace_back();
-        return kinds[place->second];
+        return kinds[static_cast<std::size_t>(place)];
     };
     for (const int item : first) {
         if (!IsIgnored(FirstKeyword(item))) listsOf(FirstKeyword(item)).first.push_back(item);
@@ -103,19 +103,16 @@ template <class KeyOf>
 drd_Differ::Match drd_Differ::MatchByKey(const Items& first, const Items& second, const KeyOf& keyOf) const {
     Match match;
     std::vector<int> taken;
-    std::unordered_map<decltype(keyOf(second_, 0)), std::vector<int>> byKey;
-    for (auto item = second.rbegin(); item != second.rend(); ++item) {
-        byKey[keyOf(second_, *item)].push_back(*item);
-    }
+    drd_Waiting byKey;
+    for (const int item : second) byKey.Put(keyOf(second_, item), item);
     for (const int item : first) {
-        const auto found = byKey.find(keyOf(first_, item));
-        if (found == byKey.end() || found->second.empty()) {
+        const int partner = byKey.Take(keyOf(first_, item));
+        if (partner < 0) {
             match.onlyFirst.push_back(item);
             continue;
         }
-        match.pairs.push_back({item, found->second.back()});
-        taken.push_back(found->second.back());
-        found->second.pop_back();
+        match.pairs.push_back({item, partner});
+        taken.push_back(partner);
     }
     match.onlySecond = Without(second, taken);
     return match;
@@ -135,20 +132,16 @@ drd_Differ::Match drd_Differ::MatchBySignature(const Items& first, const Items& 
 
 /// Of the things without partner those that differ in their name alone.
 void drd_Differ::MatchRenamed(Match& match, const Context& context) {
-    std::unordered_map<std::uint64_t, std::vector<int>> bySignature;
-    for (auto item = match.onlySecond.rbegin(); item != match.onlySecond.rend(); ++item) {
-        bySignature[second_.NamelessSignature(*item)].push_back(*item);
-    }
+    drd_Waiting bySignature;
+    for (const int item : match.onlySecond) bySignature.Put(second_.NamelessSignature(item), item);
     std::vector<int> taken;
     Items left;
     for (const int item : match.onlyFirst) {
-        const auto found = bySignature.find(first_.NamelessSignature(item));
-        if (found == bySignature.end() || found->second.empty()) {
+        const int partner = bySignature.Take(first_.NamelessSignature(item));
+        if (partner < 0) {
             left.push_back(item);
             continue;
         }
-        const int partner = found->second.back();
-        found->second.pop_back();
         taken.push_back(partner);
         const drd_Keyword& after = SecondKeyword(partner);
         Tell(drd_ChangeEnm::RENAMED, std::string(drd_WordOf(after.row->defines)),

@@ -259,30 +259,30 @@ std::string drd_Differ::BlockWords(const drd_Deck& deck, int block) const {
 }
 
 void drd_Differ::CompareSets() {
-    std::unordered_map<std::string, int> others;
+    drd_TextMap others;
     const auto& second = second_.Names().Sets();
     for (std::size_t i = 0; i < second.size(); ++i) {
-        others.emplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
-                       static_cast<int>(i));
+        others.TryEmplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
+                          static_cast<int>(i));
     }
     std::vector<char> isTaken(second.size(), 0);
     const auto& first = first_.Names().Sets();
     for (std::size_t i = 0; i < first.size(); ++i) {
         const std::optional<int> block = PartnerOf(first[i].block);
         if (!block) continue;
-        const auto found =
-            others.find(SetKey(first[i].kind, *block, first_.Name("\"" + first[i].name + "\"")));
-        if (found == others.end()) {
+        const int* found =
+            others.Find(SetKey(first[i].kind, *block, first_.Name("\"" + first[i].name + "\"")));
+        if (found == nullptr) {
             Tell(drd_ChangeEnm::REMOVED, std::string(drd_WordOf(first[i].kind)),
                  std::string(drd_WordOf(first[i].kind)) + " " + BlockWords(First(), first[i].block) +
                      first[i].name + " removed",
                  PlaceOfSet(First(), first[i]), drd_Nowhere);
             continue;
         }
-        isTaken[static_cast<std::size_t>(found->second)] = 1;
-        CompareSet({static_cast<int>(i), found->second}, std::string(drd_WordOf(first[i].kind)) + " " +
-                                                             BlockWords(First(), first[i].block) +
-                                                             first[i].name + ": ");
+        isTaken[static_cast<std::size_t>(*found)] = 1;
+        CompareSet({static_cast<int>(i), *found}, std::string(drd_WordOf(first[i].kind)) + " " +
+                                                      BlockWords(First(), first[i].block) + first[i].name +
+                                                      ": ");
     }
     std::vector<char> hasPartner(Second().blocks.size(), 0);
     for (const int partner : partners_) {
@@ -368,44 +368,43 @@ void drd_Differ::RenamesOfSets() {
             key += std::to_string(m.instance) + "." + std::to_string(m.label) + ",";
         return key;
     };
-    std::unordered_map<std::string, int> names;
+    drd_TextMap names;
     const auto& second = second_.Names().Sets();
     for (std::size_t i = 0; i < second.size(); ++i) {
-        names.emplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
-                      static_cast<int>(i));
+        names.TryEmplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
+                         static_cast<int>(i));
     }
-    std::unordered_map<std::string, int> lonely;
+    drd_Waiting lonely;
     std::vector<char> isKnown(second.size(), 0);
     const auto& first = first_.Names().Sets();
     std::vector<int> without;
     for (std::size_t i = 0; i < first.size(); ++i) {
         const std::optional<int> block = PartnerOf(first[i].block);
         if (!block) continue;
-        const auto found = names.find(SetKey(first[i].kind, *block, drd_FoldCase(first[i].name)));
-        if (found == names.end()) {
+        const int* found = names.Find(SetKey(first[i].kind, *block, drd_FoldCase(first[i].name)));
+        if (found == nullptr) {
             without.push_back(static_cast<int>(i));
         } else {
-            isKnown[static_cast<std::size_t>(found->second)] = 1;
+            isKnown[static_cast<std::size_t>(*found)] = 1;
         }
     }
     if (without.empty()) return;
     for (std::size_t i = 0; i < second.size(); ++i) {
         if (isKnown[i] != 0) continue;
-        lonely.emplace(keyOf(second[i].kind, second[i].block, MembersOfSecond(static_cast<int>(i))),
-                       static_cast<int>(i));
+        lonely.Put(keyOf(second[i].kind, second[i].block, MembersOfSecond(static_cast<int>(i))),
+                   static_cast<int>(i));
     }
     for (const int i : without) {
         const drd_Set& set = first[static_cast<std::size_t>(i)];
-        const auto found = lonely.find(keyOf(set.kind, *PartnerOf(set.block), MembersInSecond(i)));
-        if (found == lonely.end()) continue;
+        const int partner = lonely.Take(keyOf(set.kind, *PartnerOf(set.block), MembersInSecond(i)));
+        if (partner < 0) continue;
         const std::string before = drd_FoldCase(set.name);
-        const std::string after = drd_FoldCase(second[static_cast<std::size_t>(found->second)].name);
+        const std::string after = drd_FoldCase(second[static_cast<std::size_t>(partner)].name);
         const drd_Block& block = First().blocks[static_cast<std::size_t>(set.block)];
         if (block.kind == drd_BlockEnm::INSTANCE) {
             const std::string instance = drd_FoldCase(block.name) + ".";
             renames_.emplace(instance + before, instance + after);
         }
         renames_.emplace(before, after);
-        lonely.erase(found);
     }
 }

@@ -3,6 +3,7 @@
 
 #include "deck_reader/drd_Canonical.h"
 #include "deck_reader/drd_Diff.h"
+#include "deck_reader/drd_TextMap.h"
 
 #include <optional>
 

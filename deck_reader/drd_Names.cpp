@@ -88,9 +88,10 @@ drd_Names::drd_Names(const drd_Deck& deck) : deck_(deck) {
     for (std::size_t i = 0; i < deck.blocks.size(); ++i) {
         const drd_Block& block = deck.blocks[i];
         if (block.kind == drd_BlockEnm::ASSEMBLY && assembly_ < 0) assembly_ = static_cast<int>(i);
-        if (block.kind == drd_BlockEnm::PART) parts_.emplace(drd_FoldCase(block.name), static_cast<int>(i));
+        if (block.kind == drd_BlockEnm::PART)
+            parts_.TryEmplace(drd_FoldCase(block.name), static_cast<int>(i));
         if (block.kind == drd_BlockEnm::INSTANCE)
-            instances_.emplace(drd_FoldCase(block.name), static_cast<int>(i));
+            instances_.TryEmplace(drd_FoldCase(block.name), static_cast<int>(i));
     }
     AddSets();
     AddDefinitions();
@@ -99,10 +100,10 @@ drd_Names::drd_Names(const drd_Deck& deck) : deck_(deck) {
 void drd_Names::AddSets() {
     for (std::size_t i = 0; i < deck_.setParts.size(); ++i) {
         const drd_SetPart& part = deck_.setParts[i];
-        const auto [place, isNew] = index_.try_emplace(KeyOf(part.kind, part.block, drd_FoldCase(part.name)),
-                                                       static_cast<int>(sets_.size()));
+        const auto [place, isNew] = index_.TryEmplace(KeyOf(part.kind, part.block, drd_FoldCase(part.name)),
+                                                      static_cast<int>(sets_.size()));
         if (isNew) sets_.push_back({part.kind, part.block, part.name, {}});
-        sets_[static_cast<std::size_t>(place->second)].parts.push_back(static_cast<int>(i));
+        sets_[static_cast<std::size_t>(place)].parts.push_back(static_cast<int>(i));
     }
 }
 
@@ -117,7 +118,7 @@ void drd_Names::AddDefinitions() {
         int block = kind == drd_KindEnm::LOAD_CASE
                         ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
                         : (IsScoped(kind) ? keyword.block : -1);
-        if (!index_.try_emplace(KeyOf(kind, block, name), static_cast<int>(i)).second &&
+        if (!index_.TryEmplace(KeyOf(kind, block, name), static_cast<int>(i)).second &&
             kind != drd_KindEnm::CONTACT_PAIR && kind != drd_KindEnm::DERIVED) {
             definedTwice_.push_back(static_cast<int>(i));
         }
@@ -125,13 +126,11 @@ void drd_Names::AddDefinitions() {
 }
 
 int drd_Names::FindPart(std::string_view value) const {
-    const auto found = parts_.find(drd_FoldName(value));
-    return found == parts_.end() ? -1 : found->second;
+    return parts_.NumberOr(drd_FoldName(value), -1);
 }
 
 int drd_Names::FindInstance(std::string_view name) const {
-    const auto found = instances_.find(drd_FoldCase(name));
-    return found == instances_.end() ? -1 : found->second;
+    return instances_.NumberOr(drd_FoldCase(name), -1);
 }
 
 int drd_Names::PartOf(int instance) const {
@@ -163,8 +162,7 @@ const drd_LabelIndex* drd_Names::Elements(int block) const {
 }
 
 int drd_Names::FindScoped(drd_KindEnm kind, const std::string& folded, int block) const {
-    const auto found = index_.find(KeyOf(kind, block, folded));
-    if (found != index_.end()) return found->second;
+    if (const int* found = index_.Find(KeyOf(kind, block, folded))) return *found;
     const int part = PartOf(block);
     return part >= 0 ? FindScoped(kind, folded, part) : -1;
 }
@@ -184,12 +182,12 @@ drd_Target drd_Names::TargetOf(drd_KindEnm kind, int index) const {
 drd_Target drd_Names::FindInInstances(drd_KindEnm kind, const std::string& folded) const {
     // Names of instances may have dots too, so that every dot can be the one.
     for (std::size_t dot = folded.find('.'); dot != std::string::npos; dot = folded.find('.', dot + 1)) {
-        const auto instance = instances_.find(folded.substr(0, dot));
-        if (instance == instances_.end()) continue;
-        const int index = FindScoped(kind, folded.substr(dot + 1), instance->second);
+        const int* instance = instances_.Find(std::string_view(folded).substr(0, dot));
+        if (instance == nullptr) continue;
+        const int index = FindScoped(kind, folded.substr(dot + 1), *instance);
         if (index < 0) continue;
         drd_Target target = TargetOf(kind, index);
-        target.instance = instance->second;
+        target.instance = *instance;
         return target;
     }
     return {};
@@ -199,8 +197,8 @@ drd_Target drd_Names::Find(drd_KindEnm kind, std::string_view name, int block) c
     const std::string folded = drd_FoldName(name);
     if (folded.empty()) return {};
     if (!IsScoped(kind)) {
-        const auto found = index_.find(KeyOf(kind, -1, folded));
-        return found == index_.end() ? drd_Target() : TargetOf(kind, found->second);
+        const int* found = index_.Find(KeyOf(kind, -1, folded));
+        return found == nullptr ? drd_Target() : TargetOf(kind, *found);
     }
     int index = FindScoped(kind, folded, block);
     const drd_BlockEnm blockKind = deck_.blocks[static_cast<std::size_t>(block)].kind;
@@ -232,12 +230,12 @@ bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block
     const std::size_t dot = folded.rfind('.');
     if (dot == std::string::npos || !drd_ReadInt(std::string_view(folded).substr(dot + 1), label))
         return false;
-    const auto instance = instances_.find(folded.substr(0, dot));
-    if (instance == instances_.end()) return false;
-    if (HasLabel(kind, label, instance->second)) {
+    const int* instance = instances_.Find(std::string_view(folded).substr(0, dot));
+    if (instance == nullptr) return false;
+    if (HasLabel(kind, label, *instance)) {
         target.label = label;
-        target.instance = instance->second;
-        target.block = instance->second;
+        target.instance = *instance;
+        target.block = *instance;
     }
     return true;
 }

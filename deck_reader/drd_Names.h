@@ -2,6 +2,7 @@
 #define QRX_DECK_READER_DRD_NAMES_H
 
 #include "deck_reader/drd_Deck.h"
+#include "deck_reader/drd_TextMap.h"
 
 #include <memory>
 #include <string>
@@ -114,9 +115,9 @@ private:
     std::vector<drd_Set> sets_;
     std::vector<int> definedTwice_;
     // By kind, block (-1: any) and folded name.
-    std::unordered_map<std::string, int> index_;
-    std::unordered_map<std::string, int> instances_;
-    std::unordered_map<std::string, int> parts_;
+    drd_TextMap index_;
+    drd_TextMap instances_;
+    drd_TextMap parts_;
     int assembly_ = -1;
     mutable std::unordered_map<int, std::unique_ptr<drd_LabelIndex>> nodes_;
     mutable std::unordered_map<int, std::unique_ptr<drd_LabelIndex>> elements_;

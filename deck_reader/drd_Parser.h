@@ -3,10 +3,10 @@
 
 #include "deck_reader/drd_LineSource.h"
 #include "deck_reader/drd_Reader.h"
+#include "deck_reader/drd_TextMap.h"
 
 #include <filesystem>
 #include <memory>
-#include <unordered_map>
 
 /// Reads one deck: takes line by line from the files on the stack of includes and fills the deck.
 class drd_Parser {
@@ -84,8 +84,8 @@ private:
     void (drd_Parser::*bulk_)(std::string_view) = nullptr;
     int type_ = -1; // of the elements that are being read
     int nodesOfType_ = 0;
-    std::unordered_map<std::string, int> typeIndex_;
-    std::unordered_map<std::string, int> ownerIndex_;
+    drd_TextMap typeIndex_;
+    drd_TextMap ownerIndex_;
     std::vector<std::string_view> fields_;
     bool toldDataBeforeKeyword_ = false;
 };

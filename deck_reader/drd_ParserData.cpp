@@ -30,11 +30,10 @@ bool IsAtEnd(const char* at) {
     return at == nullptr || (PassEmptyField(at) && at == nullptr);
 }
 
-int IndexOf(std::string_view name, std::unordered_map<std::string, int>& index,
-            std::vector<std::string>& names) {
-    const auto [place, isNew] = index.try_emplace(std::string(name), static_cast<int>(names.size()));
+int IndexOf(std::string_view name, drd_TextMap& index, std::vector<std::string>& names) {
+    const auto [place, isNew] = index.TryEmplace(name, static_cast<int>(names.size()));
     if (isNew) names.emplace_back(name);
-    return place->second;
+    return place;
 }
 
 } // namespace

@@ -1,5 +1,7 @@
 #include "foundation/thr_InOrder.h"
 
+#include "foundation/thr_Poll.h"
+
 #include <algorithm>
 #include <atomic>
 #include <condition_variable>
@@ -42,6 +44,7 @@ public:
             }
             lock.unlock();
             if (slot.failure) std::rethrow_exception(slot.failure);
+            thr_Poll::Now();
             take(slot.text.get(), static_cast<std::size_t>(slot.end - slot.text.get()));
             lock.lock();
             slot.isMade = false;
@@ -147,7 +150,11 @@ void thr_ForEach(int threads, std::size_t count, const std::function<void(std::s
     std::exception_ptr failure;
     const auto work = [&] {
         try {
-            for (std::size_t i = next++; i < count; i = next++) task(i);
+            for (std::size_t i = next++; i < count; i = next++) {
+                // In the threads made here there is none to ask.
+                thr_Poll::Now();
+                task(i);
+            }
         } catch (...) {
             next = count;
             const std::lock_guard lock(mutex);

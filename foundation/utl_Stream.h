@@ -75,6 +75,7 @@ public:
     void PrintItems(std::size_t count, std::size_t room, const LayOut& layOut);
     /// How many threads PrintItems() may use; 0, as at first, stands for the process's usual number.
     void SetThreads(int threads) { threads_ = threads; }
+    int Threads() const { return threads_; }
 
     /// Passes all pending text on to the device.
     void Flush();

@@ -164,6 +164,7 @@ bool mdf_BulkReader::ReadPieces(Pieces& pieces, mdf_Numbers& numbers, std::vecto
             piece.done = 0;
             piece.at = piece.begin;
         }
+        if (progress_ != nullptr) progress_->Add(piece.end - piece.begin);
     });
     for (const Piece& piece : pieces) {
         numbers.AddMarks(piece.marks, before + piece.first * length);

@@ -1,6 +1,7 @@
 #ifndef QRX_MODEL_FILE_MDF_BULKREADER_H
 #define QRX_MODEL_FILE_MDF_BULKREADER_H
 
+#include "foundation/thr_Progress.h"
 #include "model_file/mdf_ValueData.h"
 
 #include <cstddef>
@@ -10,8 +11,9 @@
 /// them, is left to the reader of documents: it finds `at` there.
 class mdf_BulkReader {
 public:
-    /// `at` is where the next number or row begins, `end` the end of the document.
-    mdf_BulkReader(const char*& at, const char* end, int threads) : at_(at), end_(end), threads_(threads) {}
+    /// `at` is where the next number or row begins, `end` the end of the document; null for no progress.
+    mdf_BulkReader(const char*& at, const char* end, int threads, thr_Progress* progress)
+        : at_(at), end_(end), threads_(threads), progress_(progress) {}
 
     /// True when all was read, up to the bracket that closes the array.
     bool ReadNumbers(mdf_Numbers& numbers);
@@ -33,6 +35,7 @@ private:
     const char*& at_;
     const char* end_;
     int threads_;
+    thr_Progress* progress_;
 };
 
 #endif

@@ -122,7 +122,7 @@ bool mdf_DeckMesh::ChooseBlock() {
         if (known.empty()) return Fail("found no nodes", "a deck with a mesh");
         return Fail(request_.options.part.empty() ? "found " + drd_Counted(known.size(), "mesh") + "es"
                                                   : "found no mesh " + fnd_Quoted(request_.options.part),
-                    "\"part\": " + fnd_OneOf(known));
+                    "\"part\": " + fnd_OneOf(known, request_.options.part));
     }
     source_ = deck_->MeshOf(deck_->blocks[static_cast<std::size_t>(block_)]);
     origin_.format = "deck";

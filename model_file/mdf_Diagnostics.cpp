@@ -6,25 +6,27 @@
 #include <algorithm>
 #include <charconv>
 
-namespace {
-
-constexpr int kMaxFindings = 50;
-
-} // namespace
-
 void mdf_Diagnostics::Take(fnd_Finding finding) {
-    int& count = finding.IsError() ? numErrors_ : numWarnings_;
-    if (count++ >= kMaxFindings) return;
-    report_->findings.push_back(std::move(finding));
+    const bool isError = finding.IsError();
+    int& count = isError ? numErrors_ : numWarnings_;
+    if (count++ < report_->most) {
+        report_->findings.push_back(std::move(finding));
+    } else {
+        ++(isError ? report_->moreErrors : report_->moreWarnings);
+    }
 }
 
 bool mdf_Diagnostics::WantsHint() {
-    return numErrors_ < kMaxFindings;
+    return numErrors_ < kMostHints;
 }
 
 void mdf_Diagnostics::Expected(const fnd_Path& path, const mdf_Value& found, const std::string& expected,
                                const std::string& hint) {
     Add("wrong-value", path, "found " + mdf_Shown(found), expected, hint);
+}
+
+std::string_view mdf_GivenWord(const mdf_Value& value) {
+    return value.IsString() ? std::string_view(value.String()) : std::string_view();
 }
 
 std::string mdf_Shown(const mdf_Value& value) {
@@ -67,10 +69,19 @@ std::string mdf_Report::Line(const fnd_Finding& finding) const {
     return mdf_LineOf(fileName, finding);
 }
 
-std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding) {
-    std::string line = fnd_Visible(fileName) + ":";
+std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding, const mdf_LineStyle& style) {
+    std::string line = style.place + fnd_Visible(fileName) + ":";
     if (finding.line > 0) line += std::to_string(finding.line) + ":" + std::to_string(finding.column) + ":";
-    line.append(" ").append(fnd_SeverityWord(finding.code->severity)).append(": ");
-    if (!finding.place.empty()) line += fnd_Visible(finding.place) + ": ";
-    return line + finding.Text();
+    const fnd_Severity severity = finding.code->severity;
+    const char* const paint = severity == fnd_Severity::ERROR     ? style.error
+                              : severity == fnd_Severity::WARNING ? style.warning
+                                                                  : style.note;
+    line.append(style.end).append(" ").append(paint).append(fnd_SeverityWord(severity)).append(":");
+    line.append(style.end).append(" ").append(finding.Text());
+    const bool isOfRun = finding.code->name.starts_with("run-");
+    if (isOfRun && finding.place.empty()) return line;
+    line.append(" ").append(style.dim);
+    if (!finding.place.empty()) line.append("(").append(fnd_Visible(finding.place)).append(")");
+    if (!isOfRun) line.append(finding.place.empty() ? "[" : " [").append(finding.code->name).append("]");
+    return line.append(style.end);
 }

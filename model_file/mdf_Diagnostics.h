@@ -8,7 +8,7 @@
 
 #include <map>
 
-/// Collects what there is to say of a file; keeps at most fifty errors and as many warnings.
+/// Collects what there is to say of a file, as much of it as the report keeps.
 class mdf_Diagnostics final : public fnd_Sink {
 public:
     explicit mdf_Diagnostics(mdf_Report& report) : report_(&report) {}
@@ -30,6 +30,8 @@ private:
     int numWarnings_ = 0;
 };
 
+/// The text of a string, for lists of what is near it; empty for any other value.
+std::string_view mdf_GivenWord(const mdf_Value& value);
 /// A value as messages show it: short texts and numbers as they stand, else what kind of thing it is.
 std::string mdf_Shown(const mdf_Value& value);
 

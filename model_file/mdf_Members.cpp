@@ -19,7 +19,7 @@ void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
         if (std::find(known.begin(), known.end(), member.name) != known.end()) continue;
         diagnostics.Add("unknown-member", fnd_Path(path, member.name),
                         "found an unknown member " + fnd_Quoted(member.name),
-                        known.empty() ? std::string("none") : fnd_OneOf(known),
+                        known.empty() ? std::string("none") : fnd_OneOf(known, member.name),
                         fnd_DidYouMean(diagnostics, member.name, [&known](fnd_Nearest& nearest) {
                             for (const std::string& name : known) nearest.Try(name);
                         }));

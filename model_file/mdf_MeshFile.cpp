@@ -113,7 +113,7 @@ void mdf_MeshFileReader::ReadElementTypes(mdf_MeshFileRequest& request, const md
             std::vector<std::string> names;
             for (int i = 0; i < cel_kKinds; ++i)
                 names.emplace_back(cel_CellOf(static_cast<cel_KindEnm>(i)).name);
-            diagnostics_.Add("wrong-value", place, "found " + fnd_Quoted(member.name), fnd_OneOf(names),
+            diagnostics_.Add("wrong-value", place, "found " + fnd_Quoted(member.name), fnd_OneOf(names, member.name),
                              fnd_DidYouMean(member.name, names));
         } else if (member.value.IsNull()) {
             request.elementTypes[*kind] = "";

@@ -25,7 +25,8 @@ std::string Found(const mdf_Value* value) {
 /// The nearest of the names, and all of them.
 std::string HintOf(const std::string& wanted, const std::vector<std::string>& names) {
     const std::string nearest = fnd_DidYouMean(wanted, names);
-    return nearest.empty() ? fnd_ThereAre(names) : nearest + " " + fnd_ThereAre(names);
+    const std::string all = fnd_ThereAre(names, wanted);
+    return nearest.empty() ? all : nearest + " " + all;
 }
 
 void ChooseModel(odb_Odb& odb, const mdf_ModelChoice& choice, const std::vector<std::string>& names,
@@ -113,7 +114,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& 
     }
     mdf_Value root;
     std::vector<fnd_Finding> errors;
-    mdf_Parse(text, root, errors);
+    mdf_Parse(text, root, errors, report.progress);
     // The text has gone into the document; of a large file there is no room for both beside the store.
     if (file->CanBeReadAgain())
         std::string().swap(text);
@@ -132,7 +133,7 @@ std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::str
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
-    mdf_Parse(text, root, errors);
+    mdf_Parse(text, root, errors, report.progress);
     std::unique_ptr<odb_Odb> odb = mdf_ReadDocument(root, errors, report, nullptr, given, choice);
     mdf_Locate(text, report.findings);
     return odb;

@@ -17,6 +17,7 @@
 inline constexpr char mdf_kFormat[] = "qrx-model/1";
 
 class mdf_FileText;
+struct thr_Progress;
 class odiK_Mesh;
 using mdf_GivenMeshes = std::vector<cow_CountedHld<odiK_Mesh>>;
 inline const mdf_GivenMeshes mdf_NoGivenMeshes;
@@ -49,11 +50,16 @@ struct mdf_MeshOrigin {
     mdf_Value given;
 };
 
-/// Everything that was found in one file, in the order of reading, with lines and columns. Errors beyond the
-/// fiftieth are not kept.
+/// Everything that was found in one file, in the order of reading, with lines and columns.
 struct mdf_Report {
     std::string fileName;
     std::vector<fnd_Finding> findings;
+    /// So many errors are kept, and as many other findings; the rest is counted.
+    int most = 50;
+    int moreErrors = 0;
+    int moreWarnings = 0;
+    /// Shows how far reading has come; null: nobody looks.
+    thr_Progress* progress = nullptr;
     /// The file, or one that it names, could not be read; a finding says why.
     bool unreadable = false;
     std::list<mdf_MeshOrigin> meshOrigins;
@@ -67,11 +73,24 @@ struct mdf_Report {
     /// none. A file that has changed meanwhile gives none. mdf_Locate does the same for a text.
     void Locate(std::span<fnd_Finding> findings) const;
     bool HasErrors() const;
-    /// "model.json:3:14: error: /models/A: text", or without a line or place that isn't known.
+    /// mdf_LineOf() of the file.
     std::string Line(const fnd_Finding& finding) const;
 };
-/// The same of any file.
-std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding);
+
+/// What the parts of a line are set off with on a terminal, by escape sequences; none as it is made.
+struct mdf_LineStyle {
+    const char* place = "";
+    const char* error = "";
+    const char* warning = "";
+    const char* note = "";
+    const char* dim = "";
+    /// Behind each.
+    const char* end = "";
+};
+/// "model.json:3:14: error: text (/models/A) [code]", as editors read it, or without what isn't known. What
+/// runs of the program tell of themselves shows no code.
+std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding,
+                       const mdf_LineStyle& style = {});
 
 /// Which of a file's models decks are written from.
 struct mdf_ModelChoice {

@@ -1,5 +1,7 @@
 #include "model_file/mdf_Parser.h"
 
+#include "foundation/thr_Poll.h"
+#include "foundation/thr_Progress.h"
 #include "model_file/mdf_BulkReader.h"
 #include "model_file/mdf_Locate.h"
 #include "model_file/mdf_Token.h"
@@ -46,8 +48,10 @@ std::size_t NumbersAhead(const char* at, const char* end, int depth) {
 /// Goes through a document once, from token to token.
 class DocumentReader {
 public:
-    DocumentReader(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors)
-        : begin_(text.data()), at_(begin_), end_(begin_ + text.size()), builder_(root), errors_(errors) {}
+    DocumentReader(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors,
+                   thr_Progress* progress)
+        : begin_(text.data()), at_(begin_), end_(begin_ + text.size()), builder_(root), errors_(errors),
+          progress_(progress) {}
 
     /// False after an error of syntax.
     bool Read();
@@ -95,6 +99,7 @@ private:
     /// The numbers that were read in bulk last, and whether they were integers then.
     std::pair<const mdf_Numbers*, bool> triedInBulk_{nullptr, false};
     int threads_ = 0;
+    thr_Progress* progress_;
 };
 
 bool DocumentReader::Read() {
@@ -165,6 +170,7 @@ bool DocumentReader::ReadName() {
     std::string_view name;
     if (!ReadString(name)) return false;
     builder_.Key(name);
+    if (progress_ != nullptr) progress_->Set(at_ - begin_);
     Skip();
     if (!Passes(':')) return Fail(at_, "':'");
     behindComma_ = false;
@@ -189,6 +195,7 @@ bool DocumentReader::ReadBehindValue() {
 }
 
 bool DocumentReader::MayNest() {
+    thr_Poll::Now();
     if (builder_.Depth() < static_cast<std::size_t>(mdf_maxDepth)) return true;
     SyntaxError(OffsetOf(at_),
                 "arrays and objects are nested deeper than " + std::to_string(mdf_maxDepth) + " levels");
@@ -278,7 +285,7 @@ inline bool DocumentReader::Add(mdf_Numbers& numbers, const mdf_Number& number, 
 bool DocumentReader::ReadNumbers(mdf_Numbers& numbers, int depth) {
     do {
         if (depth == 0 && MayReadInBulk(numbers, 1)) {
-            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadNumbers(numbers);
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_, progress_).ReadNumbers(numbers);
             if (!behindComma_ || !IsAtNumber()) break;
         }
         if (!Add(numbers, mdf_ReadNumber(at_, end_), depth)) return false;
@@ -295,7 +302,7 @@ bool DocumentReader::ReadRows(mdf_Rows& rows) {
     if (!MayNest()) return false;
     do {
         if (rows.ends.empty() && rows.length > 0 && MayReadInBulk(rows.numbers, rows.length)) {
-            behindComma_ = !mdf_BulkReader(at_, end_, threads_).ReadRows(rows);
+            behindComma_ = !mdf_BulkReader(at_, end_, threads_, progress_).ReadRows(rows);
             if (!behindComma_ || Peek() != '[') break;
         }
         builder_.BeginRow(rows);
@@ -398,10 +405,12 @@ void DocumentReader::SyntaxError(std::size_t offset, std::string text) {
 
 } // namespace
 
-bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors) {
+bool mdf_Parse(std::string_view text, mdf_Value& root, std::vector<fnd_Finding>& errors,
+               thr_Progress* progress) {
     const std::size_t errorsBefore = errors.size();
     root = mdf_Value();
-    if (!DocumentReader(text, root, errors).Read()) root = mdf_Value();
+    if (progress != nullptr) progress->Begin(static_cast<long long>(text.size()));
+    if (!DocumentReader(text, root, errors, progress).Read()) root = mdf_Value();
     return errors.size() == errorsBefore;
 }
 

@@ -26,7 +26,7 @@ void mdf_PlaceReader::ReportNoInstance(const std::string& name, const fnd_Path& 
     if (hint.empty() && diagnostics_.WantsHint()) {
         std::vector<std::string> known;
         for (const auto& [each, entry] : model_.Instances()) known.emplace_back(each.View());
-        hint = fnd_ThereAre(known);
+        hint = fnd_ThereAre(known, name);
     }
     diagnostics_.Add("no-such-name", path, "found instance " + fnd_Quoted(name), "the name of an instance",
                      std::move(hint));

@@ -94,7 +94,7 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
     }
     if (const cls_ClassEntry* entry = choice.Find(name->String()))
         return std::unique_ptr<cls_Record>(entry->create());
-    diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names)),
+    diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names, name->String())),
                           diagnostics_.WantsHint() ? choice.DidYouMean(name->String()) : std::string());
     return nullptr;
 }
@@ -228,7 +228,7 @@ bool mdf_RecordReader::ReadWord(cow_String& value, const mdf_Value& json, const 
         return true;
     }
     const std::vector<std::string> words(field.words.begin(), field.words.end());
-    diagnostics_.Expected(path, json, fnd_OneOf(words),
+    diagnostics_.Expected(path, json, fnd_OneOf(words, mdf_GivenWord(json)),
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }
@@ -259,7 +259,7 @@ bool mdf_RecordReader::ReadInt(int& value, const mdf_Value& json, const fnd_Path
         }
     }
     std::string expected = mayBeUnset ? "an integer of 32 bits or null" : "an integer of 32 bits";
-    if (!words.empty()) expected += ", or " + fnd_OneOf(words);
+    if (!words.empty()) expected += ", or " + fnd_OneOf(words, mdf_GivenWord(json));
     diagnostics_.Expected(path, json, expected,
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
@@ -281,7 +281,7 @@ bool mdf_RecordReader::ReadEnum(const cls_EnumType& type, void* value, const mdf
         words.emplace_back(listed.name);
         shown.push_back(std::string(listed.name) + " (" + std::to_string(listed.value) + ")");
     }
-    diagnostics_.Expected(path, json, fnd_OneOf(wordsOnly ? words : shown),
+    diagnostics_.Expected(path, json, fnd_OneOf(wordsOnly ? words : shown, mdf_GivenWord(json)),
                           json.IsString() ? fnd_DidYouMean(json.String(), words) : std::string());
     return false;
 }

@@ -138,26 +138,26 @@ py::dict pyx_Store::Trees() const {
     return trees;
 }
 
-long long pyx_Store::WriteDeck(const std::string& path) const {
-    return Replace(path, "deck", [this](qio_ostream& device) {
+long long pyx_Store::WriteDeck(const std::string& path, int threads) const {
+    return Replace(path, "deck", [this, threads](qio_ostream& device) {
         PolledDevice polled(device);
-        oif_Writer(*odb_).WriteInput(polled);
+        oif_Writer(*odb_, threads).WriteInput(polled);
     });
 }
 
-void pyx_Store::WriteDeckTo(const py::object& write) const {
+void pyx_Store::WriteDeckTo(const py::object& write, int threads) const {
     pyx_Released([&] {
         FunctionDevice device(write);
-        oif_Writer(*odb_).WriteInput(device);
+        oif_Writer(*odb_, threads).WriteInput(device);
         device.Flush();
     });
 }
 
-py::bytes pyx_Store::Deck() const {
+py::bytes pyx_Store::Deck(int threads) const {
     qio_StringDevice text;
     pyx_Released([&] {
         PolledDevice polled(text);
-        oif_Writer(*odb_).WriteInput(polled);
+        oif_Writer(*odb_, threads).WriteInput(polled);
     });
     return text.Text();
 }
@@ -222,9 +222,9 @@ std::string pyx_Store::Page(const std::string& title) const {
 void pyx_Store::Add(py::module_& module) {
     py::class_<pyx_Store>(module, "Store")
         .def("trees", &pyx_Store::Trees)
-        .def("write_deck", &pyx_Store::WriteDeck)
-        .def("write_deck_to", &pyx_Store::WriteDeckTo)
-        .def("deck", &pyx_Store::Deck)
+        .def("write_deck", &pyx_Store::WriteDeck, py::arg("path"), py::arg("threads") = 0)
+        .def("write_deck_to", &pyx_Store::WriteDeckTo, py::arg("write"), py::arg("threads") = 0)
+        .def("deck", &pyx_Store::Deck, py::arg("threads") = 0)
         .def("model_file", &pyx_Store::ModelFile)
         .def_property_readonly("parameters", &pyx_Store::Parameters)
         .def("set_parameters", &pyx_Store::SetParameters)

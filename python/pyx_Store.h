@@ -17,11 +17,11 @@ public:
 
     /// {model: its tree} as Python's models take it.
     py::dict Trees() const;
-    /// Replaces the file as a whole; gives its bytes.
-    long long WriteDeck(const std::string& path) const;
+    /// Replaces the file as a whole; gives its bytes. `threads` is oif_Writer's.
+    long long WriteDeck(const std::string& path, int threads) const;
     /// Hands the deck to a function, block by block.
-    void WriteDeckTo(const py::object& write) const;
-    py::bytes Deck() const;
+    void WriteDeckTo(const py::object& write, int threads) const;
+    py::bytes Deck(int threads) const;
     /// The text of the model file; the folder is where paths of mesh files begin.
     py::bytes ModelFile(const std::string& folder) const;
     /// [(name, pointers, unit, limits, description)].

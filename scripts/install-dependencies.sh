@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -14,16 +14,18 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python] ...
           of viewer/package-lock.json
   cluster test, and the schedulers that run the shards of studies
   python  build, and what the package for Python is built, used and tested with
+  docs    build, and what the manual is built and checked with
 END
 }
 
 build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libmd-dev)
-test=(libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema)
+test=(mold libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema bash-completion zsh fish groff-base)
 bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)
 
 cluster=(slurmctld slurmd slurm-client munge snakemake iproute2 util-linux)
 python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind11 python3-numpy python3-pytest mypy)
+docs=(doxygen python3-sphinx python3-myst-parser python3-breathe furo python3-sphinxcontrib.spelling hunspell-en-gb)
 
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
@@ -37,9 +39,10 @@ for task in "$@"; do
         build) ;;
         test) packages+=("${test[@]}") ;;
         bench) packages+=("${bench[@]}") ;;
-        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}") ;;
+        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}" "${docs[@]}") ;;
         cluster) packages+=("${test[@]}" "${cluster[@]}") ;;
         python) packages+=("${python[@]}") ;;
+        docs) packages+=("${docs[@]}") ;;
         viewer) packages+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;

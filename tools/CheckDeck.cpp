@@ -85,7 +85,7 @@ ExitCode RunCheckDeck(const std::string& path, const DeckRequest& request, RunRe
     if (!unreadable) drd_CheckDeck(deck, DeckOptions(request), findings);
     AddFindings(deck, findings, report);
     if (unreadable) return ExitCode::FILE_SYSTEM_REFUSED;
-    if (findings.HasErrors()) return ExitCode::MODEL_IS_WRONG;
+    if (findings.HasErrors() || report.HasStrictErrors()) return ExitCode::MODEL_IS_WRONG;
     report.Print(path + ": no errors\n");
     return ExitCode::DONE;
 }

@@ -6,6 +6,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odiK_Repositories.h"
 #include "tools/Commands.h"
+#include "tools/Terminal.h"
 #include "tools/WrappedTable.h"
 
 #include <sstream>
@@ -71,11 +72,11 @@ std::vector<Family> Families() {
     return families;
 }
 
-std::string TextOf(const Family& family) {
-    std::string text = Emphasis(family.name) + ": " + family.title + "\n";
+std::string TextOf(const Family& family, bool colours) {
+    std::string text = Emphasis(family.name, colours) + ": " + family.title + "\n";
     WrappedTable table;
     for (const auto& [name, doc] : family.entries) table.Row({name, doc});
-    return text + table.Text();
+    return text + table.Text(colours);
 }
 
 ordered_json SchemaOfFiles() {
@@ -104,7 +105,7 @@ std::string LaidOut(const ordered_json& value, const std::string& indent) {
     };
     const char* ends = value.is_object() ? "{}" : "[]";
     const std::string line = ends[0] + joined(", ", indent) + ends[1];
-    if (line.find('\n') == std::string::npos && indent.size() + line.size() < OutputWidth() - 20) return line;
+    if (line.find('\n') == std::string::npos && indent.size() + line.size() < TextWidth() - 20) return line;
     const std::string inner = indent + "  ";
     return ends[0] + ("\n" + inner) + joined((",\n" + inner).c_str(), inner) + "\n" + indent + ends[1];
 }
@@ -112,8 +113,8 @@ std::string LaidOut(const ordered_json& value, const std::string& indent) {
 /// One class, or one part of the frame, out of the schema.
 class ClassTable {
 public:
-    ClassTable(const ordered_json& definitions, const std::string& name)
-        : definitions_(definitions), definition_(definitions[name]) {}
+    ClassTable(const ordered_json& definitions, const std::string& name, bool colours)
+        : definitions_(definitions), definition_(definitions[name]), colours_(colours) {}
 
     std::string Text(const std::string& heading) const {
         std::string text = heading + Wrapped(definition_["description"]) + "\n";
@@ -121,11 +122,12 @@ public:
         text += "\n" + FieldsText(definition_);
         if (properties.contains("states")) {
             const std::string state = TargetOf(properties["states"]["additionalProperties"]);
-            text += "\n" + Emphasis("In each of the states") + "\n" + FieldsText(definitions_[state]);
+            text +=
+                "\n" + Emphasis("In each of the states", colours_) + "\n" + FieldsText(definitions_[state]);
         }
         const ordered_json& examples = definition_.value("examples", ordered_json::array());
         if (!examples.empty())
-            text += "\n" + Emphasis("Example") + "\n  " + LaidOut(examples[0], "  ") + "\n";
+            text += "\n" + Emphasis("Example", colours_) + "\n  " + LaidOut(examples[0], "  ") + "\n";
         return text;
     }
 
@@ -144,7 +146,7 @@ private:
             if (!words.empty()) meaning += (meaning.empty() ? "" : ": ") + words;
             table.Row({name, TypeOf(field), byDefault, meaning});
         }
-        return table.Text();
+        return table.Text(colours_);
     }
 
     /// The words of an enumeration.
@@ -222,6 +224,7 @@ private:
 
     const ordered_json& definitions_;
     const ordered_json& definition_;
+    bool colours_;
 };
 
 /// The definitions that a word means: of the frame, or of classes by short name, whole name, or alias.
@@ -245,16 +248,26 @@ std::vector<std::string> DefinitionsOf(const std::string& word, const ordered_js
     return byName.empty() ? byAlias : byName;
 }
 
-std::string HeadingOf(const std::string& name) {
+std::string HeadingOf(const std::string& name, bool colours) {
     const cls_ClassEntry* entry = cls_Classes().FindByName(name);
-    if (entry == nullptr) return Emphasis(fnd_LowerCase(name)) + "\n";
+    if (entry == nullptr) return Emphasis(fnd_LowerCase(name), colours) + "\n";
     const std::vector<std::string> words = mdf_ClassChoice::WordsOf(*entry);
     std::string others;
     for (std::size_t i = 1; i < words.size(); ++i) others += (i == 1 ? "also " : ", ") + words[i];
-    return Emphasis(words.front()) + " (" + others + ")\n";
+    return Emphasis(words.front(), colours) + " (" + others + ")\n";
 }
 
 } // namespace
+
+std::vector<std::string> ClassFamilies() {
+    std::vector<std::string> names;
+    for (const Family& family : Families()) names.push_back(family.name);
+    return names;
+}
+
+std::vector<std::string> ClassNames() {
+    return mdf_ClassChoice::Of(cls_Record::TypeId()).Names();
+}
 
 ExitCode RunClasses(const std::string& family, RunReport& report) {
     std::vector<std::string> known;
@@ -265,7 +278,7 @@ ExitCode RunClasses(const std::string& family, RunReport& report) {
         known.push_back(each.name);
         if (!family.empty() && !omu_EqualInAnyCapitals(each.name, family)) continue;
         isFound = true;
-        text += (text.empty() ? "" : "\n") + TextOf(each);
+        text += (text.empty() ? "" : "\n") + TextOf(each, report.OutputHasColours());
         for (const auto& [name, doc] : each.entries) all[each.name][name] = doc;
     }
     if (!isFound) {
@@ -292,11 +305,13 @@ ExitCode RunSchemaOf(const std::string& className, RunReport& report) {
                          (nearest.empty() ? std::string("\"qrxdeck classes\" lists them") : nearest));
         return ExitCode::WRONG_USAGE;
     }
+    const bool colours = report.OutputHasColours();
     std::string text;
     ordered_json& told = report.Member("classes") = ordered_json::object();
     for (const std::string& name : names) {
         told[name] = definitions[name];
-        text += (text.empty() ? "" : "\n") + ClassTable(definitions, name).Text(HeadingOf(name));
+        text += (text.empty() ? "" : "\n") +
+                ClassTable(definitions, name, colours).Text(HeadingOf(name, colours));
     }
     report.Print(text);
     return ExitCode::DONE;

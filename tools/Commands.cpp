@@ -6,6 +6,7 @@
 #include "deck_checks/dck_LeftOut.h"
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
+#include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
@@ -24,6 +25,7 @@
 #include <cerrno>
 #include <cstdio>
 #include <filesystem>
+#include <limits>
 #include <sstream>
 #include <system_error>
 #include <utility>
@@ -34,16 +36,6 @@ namespace {
 
 std::string ReasonText(int error) {
     return std::generic_category().message(error == 0 ? EIO : error);
-}
-
-/// The path of the deck; empty for a job name that names no file.
-std::string TargetOf(const WriteRequest& request) {
-    const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
-                                                          : std::filesystem::path(request.job);
-    if (!job.has_filename() || job.filename() == "." || job.filename() == "..") return {};
-    std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
-    target += ".inp";
-    return target.string();
 }
 
 std::string Grouped(long long count) {
@@ -132,13 +124,135 @@ void Summarise(const std::string& target, long long bytes, const std::vector<dck
 /// The standard output takes nothing; the reason has been told.
 class OutputIsLost {};
 
+/// Hands bytes on and counts them.
+class WatchedDevice final : public qio_ostream {
+public:
+    WatchedDevice(qio_ostream& to, thr_Progress& work) : to_(to), work_(work) {}
+    void Write(const char* text, std::size_t bytes) override {
+        to_.Write(text, bytes);
+        work_.Add(static_cast<long long>(bytes));
+    }
+
+private:
+    qio_ostream& to_;
+    thr_Progress& work_;
+};
+
+/// Keeps the first failure.
+class StandardOutputDevice final : public qio_ostream {
+public:
+    void Write(const char* text, std::size_t bytes) override {
+        if (error == 0) error = WriteToStandardOutput({text, bytes});
+    }
+    int error = 0;
+};
+
+class NullDevice final : public qio_ostream {
+public:
+    void Write(const char*, std::size_t) override {}
+};
+
+/// Everything that is to be said of a model before its deck is written; false when it is not to be written.
+bool IsFitToWrite(const odb_Odb& odb, const std::string& modelFile, fnd_List& list, RunReport& report) {
+    report.Watched().Begin("checking", modelFile);
+    dck_CheckDeck(odb, odb.DeckModelName(), list);
+    dck_CheckMeshes(odb, odb.DeckModelName(), list);
+    report.Times().End("checking");
+    if (!report.IsStrict()) return true;
+    report.AddAll(modelFile, std::exchange(list.findings, {}));
+    return !report.HasStrictErrors();
+}
+
+/// Writes the deck where nothing else is printed. All of it or, when a deck can't express the model, nothing:
+/// a first writing goes nowhere.
+ExitCode WriteDeckToOutput(const odb_Odb& odb, const std::string& modelFile, RunReport& report) {
+    report.LeaveOutput();
+    fnd_List list;
+    StandardOutputDevice output;
+    try {
+        if (!IsFitToWrite(odb, modelFile, list, report)) return ExitCode::MODEL_IS_WRONG;
+        report.AddAll(modelFile, list.findings);
+        NullDevice nowhere;
+        oif_Writer(odb).WriteInput(nowhere);
+        report.Watched().End();
+        oif_Writer(odb).WriteInput(output);
+    } catch (const QRXBasException& failure) {
+        report.WriterError(failure.what(), failure.Context());
+        return ExitCode::CANNOT_BE_EXPRESSED;
+    }
+    if (output.error == 0) return ExitCode::DONE;
+    report.Error("standard output", ReasonText(output.error));
+    return ExitCode::FILE_SYSTEM_REFUSED;
+}
+
+/// Why the request can't be met; empty when it can.
+std::string ProblemOf(const WriteRequest& request, const std::string& target, bool asJson) {
+    if (target.empty() && request.job.empty())
+        return "a model from the standard input has no name: --job NAME or -o FILE says where its deck goes";
+    if (target.empty()) return "the job " + fnd_Quoted(request.job) + " names no file";
+    if (!request.outputDir.empty() && std::filesystem::path(request.job).is_absolute()) {
+        return "the job " + fnd_Quoted(request.job) +
+               " is an absolute path, so it can't stand in the folder " + fnd_Quoted(request.outputDir);
+    }
+    if (target != kStandardStream) return {};
+    if (asJson) return "with a deck on the standard output there is no place for --json";
+    if (request.verify) return "a deck on the standard output can't be read back: --verify needs a file";
+    return {};
+}
+
 } // namespace
+
+std::string DeckTargetOf(const WriteRequest& request) {
+    if (!request.output.empty()) return request.output;
+    if (request.job == kStandardStream) return kStandardStream;
+    if (request.job.empty() && request.model == kStandardStream) return {};
+    const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
+                                                          : std::filesystem::path(request.job);
+    if (!job.has_filename() || job.filename() == "." || job.filename() == "..") return {};
+    std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
+    if (request.job.empty() || job.extension() != ".inp") target += ".inp";
+    return target.string();
+}
+
+std::string InputName(const std::string& path) {
+    return path == kStandardStream ? "<stdin>" : path;
+}
+
+bool ReadInput(const std::string& path, std::string& text, fnd_Finding& error) {
+    if (path != kStandardStream) return mdf_ReadFile(path, text, error);
+    const int number = ReadStandardInput(text);
+    if (number != 0) error = fnd_Make("unreadable-file", {}, "it can't be read: " + ReasonText(number));
+    return number == 0;
+}
+
+std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& found,
+                                        const mdf_ModelChoice& choice) {
+    if (path != kStandardStream) return mdf_ReadModelFile(path, found, choice);
+    found.fileName = InputName(path);
+    std::string text;
+    fnd_Finding error;
+    if (!ReadInput(path, text, error)) {
+        found.unreadable = true;
+        found.findings.push_back(std::move(error));
+        return nullptr;
+    }
+    std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, found.fileName, found, {}, choice);
+    const auto kept = std::make_shared<mdf_FileText>("");
+    kept->Keep(std::move(text));
+    found.text = kept;
+    return odb;
+}
 
 std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
                                    std::list<mdf_MeshOrigin>* origins, const mdf_ModelChoice& choice) {
     mdf_Report found;
-    found.fileName = path;
-    std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found, choice);
+    report.Watched().Begin("reading", InputName(path));
+    found.progress = &report.Watched().Work();
+    if (report.ShowsAll()) found.most = std::numeric_limits<int>::max();
+    std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found, choice);
+    if (odb != nullptr) {
+        for (const auto& [name, model] : odb->Models()) report.Ignore(*model);
+    }
     report.AddAll(found);
     report.Times().End("reading");
     code = ExitCode::DONE;
@@ -182,15 +296,9 @@ bool ReplaceFile(whf_File& file, const whf_File::Write& write, const whf_File::R
 }
 
 ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
-    const std::string target = TargetOf(request);
-    if (target.empty()) {
-        report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) + " names no file");
-        return ExitCode::WRONG_USAGE;
-    }
-    if (!request.outputDir.empty() && std::filesystem::path(request.job).is_absolute()) {
-        report.Error("qrxdeck", "the job " + fnd_Quoted(request.job) +
-                                    " is an absolute path, so it can't stand in the folder " +
-                                    fnd_Quoted(request.outputDir));
+    const std::string target = DeckTargetOf(request);
+    if (const std::string problem = ProblemOf(request, target, report.AsJson()); !problem.empty()) {
+        report.Error("qrxdeck", problem);
         return ExitCode::WRONG_USAGE;
     }
     if (!CanWriteToStandardOutput()) {
@@ -200,7 +308,8 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code, nullptr, {request.modelName});
     if (odb == nullptr) return code;
-    code = WriteDeck(*odb, request.model, target, report);
+    if (target == kStandardStream) return WriteDeckToOutput(*odb, InputName(request.model), report);
+    code = WriteDeck(*odb, InputName(request.model), target, report);
     return code == ExitCode::DONE && request.verify ? VerifyDeck(*odb, target, report) : code;
 }
 
@@ -218,15 +327,16 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     whf_File deck(target);
     fnd_List list;
     try {
-        dck_CheckDeck(odb, odb.DeckModelName(), list);
-        dck_CheckMeshes(odb, odb.DeckModelName(), list);
-        report.Times().End("checking");
+        if (!IsFitToWrite(odb, modelFile, list, report)) return ExitCode::MODEL_IS_WRONG;
         const auto write = [&](qio_ostream& device) {
-            oif_Writer(odb).WriteInput(device);
+            report.Watched().Begin("writing", target);
+            WatchedDevice watched(device, report.Watched().Work());
+            oif_Writer(odb).WriteInput(watched);
             report.Times().End("writing");
         };
         const auto tell = [&](long long bytes) {
             report.Times().End("syncing");
+            report.Watched().End();
             report.AddAll(modelFile, list.findings);
             Summarise(target, bytes, counts, leftOut, report);
         };
@@ -241,14 +351,20 @@ ExitCode RunCheck(const std::string& model, const std::string& modelName, RunRep
     ExitCode code;
     const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, nullptr, {modelName});
     if (odb == nullptr) return code;
+    const std::string file = InputName(model);
+    report.Watched().Begin("checking", file);
     fnd_List list;
     dck_CheckDeck(*odb, odb->DeckModelName(), list);
     dck_CheckMeshes(*odb, odb->DeckModelName(), list);
-    report.AddAll(model, list.findings);
+    report.AddAll(file, list.findings);
+    report.Watched().Begin("rehearsing the deck of", file);
     fnd_List raised;
-    dck_Rehearse(*odb, report.Foretold(), raised);
-    report.AddAll(model, raised.findings);
-    report.Print(fnd_Visible(model) + ": no errors\n");
+    dck_Rehearse(*odb, report.Foretold(), raised, &report.Watched().Work());
+    report.AddAll(file, raised.findings);
+    if (report.HasStrictErrors())
+        code = ExitCode::MODEL_IS_WRONG;
+    else
+        report.Print(fnd_Visible(file) + ": no errors\n");
     const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(*odb, *odb->DeckModel());
     if (report.AsJson()) report.Member("leftOut") = JsonOf(leftOut);
     PrintLeftOut(leftOut, WidthOf(leftOut), report);
@@ -277,28 +393,30 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
 }
 
 ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
+    const std::string file = InputName(request.model);
     std::string text;
     fnd_Finding unreadable;
-    if (!mdf_ReadFile(request.model, text, unreadable)) {
-        report.Add(request.model, unreadable);
+    if (!ReadInput(request.model, text, unreadable)) {
+        report.Add(file, unreadable);
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     mdf_Report found;
-    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, request.model, found, {}, {{}, false});
+    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, file, found, {}, {{}, false});
     report.AddAll(found);
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
-    const std::string place = request.output.empty() ? request.model : request.output;
+    const bool toOutput = request.output.empty() || request.output == kStandardStream;
+    const std::string place = toOutput ? file : request.output;
     mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
                        std::filesystem::path(place).parent_path().string(), found.parameters, found.schema);
     const bool isCanonical = formatted.view() == text;
-    report.Member("formatted") = {{"file", request.model}, {"wasCanonical", isCanonical}};
+    report.Member("formatted") = {{"file", file}, {"wasCanonical", isCanonical}};
     if (request.check) {
-        if (!isCanonical) report.Print(fnd_Visible(request.model) + "\n");
+        if (!isCanonical) report.Print(fnd_Visible(file) + "\n");
         return isCanonical ? ExitCode::DONE : ExitCode::MODEL_IS_WRONG;
     }
-    if (mdf_HasComments(text)) report.Warning(request.model, "its comments are left out");
-    if (request.output.empty()) {
+    if (mdf_HasComments(text)) report.Warning(file, "its comments are left out");
+    if (toOutput) {
         if (report.AsJson()) report.Member("formatted")["text"] = formatted.str();
         report.Print(formatted.str());
         return ExitCode::DONE;
@@ -334,7 +452,8 @@ ExitCode RunVariables(const std::string& stepType, RunReport& report) {
 ExitCode RunSchema(const std::string& output, RunReport& report) {
     std::ostringstream schema;
     mdf_WriteSchema(schema);
-    if (output.empty()) {
+    if (output.empty() || output == kStandardStream) {
+        if (report.AsJson()) report.Member("schema") = ordered_json::parse(schema.str());
         report.Print(schema.str());
         return ExitCode::DONE;
     }

@@ -11,10 +11,13 @@ struct WriteRequest {
     std::string model;
     /// The one to write of a file with several models; may be empty.
     std::string modelName;
-    /// Empty: the model file's name without extension. May hold a folder, relative to the output folder.
+    /// Empty: the model file's name without extension. May hold a folder, relative to the output folder; with
+    /// ".inp" or without. "-": the standard output.
     std::string job;
     /// Empty: the current one.
     std::string outputDir;
+    /// The deck's file as it stands, in place of both; "-": the standard output.
+    std::string output;
     /// Reads the deck back and holds it against the store.
     bool verify = false;
 };
@@ -43,6 +46,8 @@ struct NewRequest {
     bool force = false;
 };
 
+/// The path of the deck; "-" for the standard output, empty for a job name that names no file.
+std::string DeckTargetOf(const WriteRequest& request);
 ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 /// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
@@ -64,5 +69,8 @@ ExitCode RunSchema(const std::string& output, RunReport& report);
 ExitCode RunSchemaOf(const std::string& className, RunReport& report);
 /// The classes that model files know, or those of one family.
 ExitCode RunClasses(const std::string& family, RunReport& report);
+/// What the two take.
+std::vector<std::string> ClassFamilies();
+std::vector<std::string> ClassNames();
 
 #endif

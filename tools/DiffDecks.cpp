@@ -4,10 +4,10 @@
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "model_file/mdf_ModelFile.h"
+#include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
 
 #include <algorithm>
-#include <cstdlib>
 #include <filesystem>
 
 #include <unistd.h>
@@ -41,8 +41,7 @@ private:
 /// Reads the deck of a model.
 bool ReadDeckOfModel(const std::string& path, drd_Deck& deck, RunReport& report) {
     mdf_Report found;
-    found.fileName = path;
-    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelFile(path, found);
+    const std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found);
     if (odb == nullptr || found.HasErrors()) {
         report.AddAll(found);
         return false;
@@ -62,7 +61,7 @@ bool ReadDeckOfModel(const std::string& path, drd_Deck& deck, RunReport& report)
     deck = ReadDeck(folder.Job() + ".inp", {}, findings);
     const bool isWhole = qio_LastReport().opened && qio_LastReport().error == 0;
     if (!isWhole) report.Error(path, "its deck can't be written");
-    deck.files[0].name = "deck of " + path;
+    deck.files[0].name = "deck of " + InputName(path);
     return isWhole;
 }
 
@@ -118,8 +117,7 @@ void PrintComments(const drd_DiffResult& result, RunReport& report) {
 }
 
 void Print(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& second, RunReport& report) {
-    const char* noColor = std::getenv("NO_COLOR");
-    const Colours colours(::isatty(STDOUT_FILENO) == 1 && (noColor == nullptr || *noColor == '\0'));
+    const Colours colours(report.OutputHasColours());
     for (const drd_Difference& difference : result.differences) {
         report.Print(
             colours.Of(difference.change, difference.text) + "\n" +

@@ -10,7 +10,7 @@ namespace {
 
 /// Writes to the file, replaced as a whole, or to the standard output when the name is empty.
 bool WriteOut(const std::string& output, const std::function<void(qio_ostream&)>& write, RunReport& report) {
-    if (output.empty()) {
+    if (output.empty() || output == kStandardStream) {
         qio_StringDevice text;
         write(text);
         if (report.AsJson()) report.Member("deck") = text.Text();

@@ -1,9 +1,11 @@
 #include "tools/OutOfMemory.h"
 
+#include "tools/ProgressLine.h"
 #include "tools/RunReport.h"
-#include "whole_file/whf_SignalCleanUp.h"
 #include "tools/StandardStreams.h"
+#include "whole_file/whf_SignalCleanUp.h"
 
+#include <atomic>
 #include <new>
 
 #include <unistd.h>
@@ -20,12 +22,16 @@ void OutOfMemory::Install(bool asJson) {
     std::set_new_handler(&OutOfMemory::End);
 }
 
-void OutOfMemory::MarkWritten() noexcept {
-    isWritten = true;
+void OutOfMemory::MarkWritten(bool written) noexcept {
+    isWritten = written;
 }
 
 void OutOfMemory::End() noexcept {
+    // Of several threads that find none at a time, one tells.
+    static std::atomic_flag isEnding;
+    while (isEnding.test_and_set()) ::pause();
     whf_SignalCleanUp::Remove();
+    ProgressLine::Erase();
     const ExitCode code = isWritten ? ExitCode::REPORT_LOST : ExitCode::FILE_SYSTEM_REFUSED;
     if (tellsAsJson && !isWritten) {
         WriteToStandardOutput(

@@ -8,7 +8,7 @@ public:
     /// From now on a request for memory that can't be met ends the process with the exit code of a refusal,
     /// or with that of a lost report once MarkWritten() was called. `asJson`: told as a JSON object too.
     static void Install(bool asJson);
-    static void MarkWritten() noexcept;
+    static void MarkWritten(bool written = true) noexcept;
     /// The end itself; asks for no memory.
     [[noreturn]] static void End() noexcept;
 };

@@ -4,6 +4,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/StandardStreams.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <system_error>
 
@@ -13,10 +14,8 @@ namespace {
 
 constexpr std::size_t kBufferBytes = std::size_t{64} * 1024;
 
-void PutError(std::string line) {
-    line += '\n';
-    WriteToStandardError(line);
-}
+constexpr mdf_LineStyle kColours{"\033[1m", "\033[1;31m", "\033[1;35m", "\033[1;36m", "\033[2m", "\033[0m"};
+constexpr long kMostShown = 50;
 
 } // namespace
 
@@ -32,13 +31,113 @@ double RunTimes::Whole() const {
     return whole;
 }
 
-RunReport::RunReport(bool asJson) : asJson_(asJson) {
+RunReport::RunReport(const ReportOptions& options)
+    : options_(options),
+      style_(!options.json && HasColours(StreamEnm::ERRORS, options.colour) ? kColours : mdf_LineStyle()),
+      progress_(options.progress && !options.json && IsLiveTerminal(StreamEnm::ERRORS)) {
+    Clear();
+}
+
+void RunReport::Clear() {
+    root_ = ordered_json::object();
+    if (!runFile_.empty()) root_["file"] = runFile_;
     root_["exitCode"] = 0;
     root_["messages"] = ordered_json::array();
+    fileRead_.clear();
+    textRead_.reset();
+    foretold_.clear();
+    modelIgnores_.clear();
+    ignored_.clear();
+    for (const std::string& code : options_.ignored) ignored_.push_back({nullptr, code, 0});
+    strictErrors_ = 0;
+    std::ranges::fill(shown_, 0);
+    std::ranges::fill(more_, 0);
+    prepared_.clear();
+}
+
+void RunReport::BeginRun(const std::string& file) {
+    runFile_ = file;
+    times_ = RunTimes();
+    Clear();
+}
+
+void RunReport::EndRun(ExitCode code) {
+    progress_.End();
+    TellIgnored();
+    TellMore();
+    if (AsJson()) {
+        root_["exitCode"] = static_cast<int>(code);
+        runs_.push_back(std::move(root_));
+    } else {
+        Put(pending_);
+        pending_.clear();
+    }
+    runFile_.clear();
+    Clear();
+}
+
+void RunReport::Ignore(const odiK_Model& model) {
+    for (const odiK_IgnoredFinding& entry : model.ignore) {
+        modelIgnores_.push_back(entry);
+        ignored_.push_back({&modelIgnores_.back(), modelIgnores_.back().code.View(), 0});
+    }
+}
+
+bool RunReport::IsIgnored(const fnd_Finding& finding) {
+    if (finding.IsError()) return false;
+    for (Ignored& ignored : ignored_) {
+        const bool is =
+            ignored.entry != nullptr ? ignored.entry->Is(finding) : ignored.code == finding.code->name;
+        if (is) ++ignored.count;
+        if (is) return true;
+    }
+    return false;
+}
+
+bool RunReport::HasRoomFor(fnd_Severity severity) {
+    const auto place = static_cast<std::size_t>(severity);
+    if (AsJson() || ShowsAll() || shown_[place] < kMostShown) {
+        ++shown_[place];
+        return true;
+    }
+    ++more_[place];
+    return false;
+}
+
+void RunReport::TellIgnored() {
+    if (AsJson()) {
+        for (const Ignored& ignored : ignored_) {
+            if (ignored.count == 0) continue;
+            root_["ignored"].push_back({{"code", ignored.code}, {"count", ignored.count}});
+            if (ignored.entry != nullptr)
+                root_["ignored"].back()["reason"] = std::string(ignored.entry->reason.View());
+        }
+        return;
+    }
+    for (const Ignored& ignored : ignored_) {
+        if (ignored.count == 0 || ignored.entry == nullptr) continue;
+        Print("ignored: " + std::to_string(ignored.count) + " " + std::string(ignored.code) + ", " +
+              fnd_Visible(ignored.entry->reason.View()) + "\n");
+    }
+}
+
+void RunReport::TellMore() {
+    std::string text;
+    for (const fnd_Severity severity : {fnd_Severity::ERROR, fnd_Severity::WARNING, fnd_Severity::NOTE}) {
+        const long count = more_[static_cast<std::size_t>(severity)];
+        if (count == 0) continue;
+        if (AsJson()) root_["more"][std::string(fnd_SeverityWord(severity)) + "s"] = count;
+        text += (text.empty() ? "" : ", ") + fnd_Counted(count, fnd_SeverityWord(severity));
+    }
+    std::ranges::fill(more_, 0);
+    if (!text.empty() && !AsJson())
+        PutError(fnd_Visible(lastFile_) + ": ... and " + text + " more; --all shows them");
 }
 
 void RunReport::AddAll(const mdf_Report& report) {
     for (const fnd_Finding& finding : report.findings) Add(report.fileName, finding);
+    more_[static_cast<std::size_t>(fnd_Severity::ERROR)] += report.moreErrors;
+    more_[static_cast<std::size_t>(fnd_Severity::WARNING)] += report.moreWarnings;
     fileRead_ = report.fileName;
     textRead_ = report.text;
 }
@@ -57,7 +156,7 @@ void RunReport::Warning(const std::string& file, const std::string& text) {
 }
 
 void RunReport::WriterError(const std::string& text, const std::string& context) {
-    if (asJson_) {
+    if (AsJson()) {
         root_["messages"].push_back({{"severity", "error"}, {"text", text}, {"context", context}});
         return;
     }
@@ -66,7 +165,7 @@ void RunReport::WriterError(const std::string& text, const std::string& context)
 }
 
 void RunReport::Print(const std::string& text) {
-    if (asJson_) return;
+    if (AsJson() || isOutputLeft_) return;
     pending_ += text;
     if (pending_.size() < kBufferBytes) return;
     Put(pending_);
@@ -74,7 +173,10 @@ void RunReport::Print(const std::string& text) {
 }
 
 bool RunReport::PrepareForSuccess() {
-    if (asJson_) {
+    TellIgnored();
+    for (Ignored& ignored : ignored_) ignored.count = 0;
+    if (AsJson() && !runFile_.empty()) return true;
+    if (AsJson()) {
         prepared_ = JsonText(ExitCode::DONE);
         return true;
     }
@@ -84,7 +186,10 @@ bool RunReport::PrepareForSuccess() {
 }
 
 ExitCode RunReport::Finish(ExitCode code) {
-    if (!asJson_) {
+    progress_.End();
+    TellIgnored();
+    TellMore();
+    if (!AsJson()) {
         Put(pending_);
     } else if (code == ExitCode::DONE && !prepared_.empty()) {
         Put(prepared_);
@@ -96,15 +201,26 @@ ExitCode RunReport::Finish(ExitCode code) {
 }
 
 std::string RunReport::JsonText(ExitCode code) {
+    if (!runs_.empty()) root_ = {{"exitCode", 0}, {"runs", std::move(runs_)}};
     root_["exitCode"] = static_cast<int>(code);
     // File names may hold bytes that are no UTF-8.
     return root_.dump(2, ' ', false, ordered_json::error_handler_t::replace) + "\n";
 }
 
-void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
-    if (finding.code->name == "cannot-be-written") foretold_.push_back(finding);
-    if (!asJson_) {
-        PutError(mdf_LineOf(file, finding));
+void RunReport::Add(const std::string& file, const fnd_Finding& found) {
+    if (found.code->name == "cannot-be-written") foretold_.push_back(found);
+    if (IsIgnored(found)) return;
+    fnd_Finding finding = found;
+    const bool isOfRun = finding.code->name.starts_with("run-");
+    if (options_.strict && finding.code->severity == fnd_Severity::WARNING && !isOfRun) {
+        finding.code = &raised_.emplace_back(*finding.code);
+        raised_.back().severity = fnd_Severity::ERROR;
+        ++strictErrors_;
+    }
+    lastFile_ = file;
+    if (!HasRoomFor(finding.code->severity)) return;
+    if (!AsJson()) {
+        PutError(mdf_LineOf(file, finding, style_));
         return;
     }
     prepared_.clear();
@@ -124,9 +240,15 @@ void RunReport::Add(const std::string& file, const fnd_Finding& finding) {
 
 bool RunReport::Put(std::string_view text) {
     if (isOutputLost_) return false;
-    const int error = WriteToStandardOutput(text);
+    int error = 0;
+    progress_.Aside([&] { error = WriteToStandardOutput(text); });
     if (error == 0) return true;
     isOutputLost_ = true;
     PutError("standard output: error: " + std::generic_category().message(error));
     return false;
+}
+
+void RunReport::PutError(std::string line) {
+    line += '\n';
+    progress_.Aside([&line] { WriteToStandardError(line); });
 }

@@ -2,10 +2,15 @@
 #define QRX_TOOLS_RUNREPORT_H
 
 #include "model_file/mdf_ModelFile.h"
+#include "store_interface/model/odiK_Model.h"
+#include "tools/ProgressLine.h"
+#include "tools/Terminal.h"
 
 #include <nlohmann/json.hpp>
 
 #include <chrono>
+#include <deque>
+#include <list>
 #include <string>
 #include <utility>
 #include <vector>
@@ -35,14 +40,51 @@ private:
     std::vector<std::pair<const char*, double>> parts_;
 };
 
+/// How the runs of one call are to be told of.
+struct ReportOptions {
+    bool json = false;
+    ColourWhenEnm colour = ColourWhenEnm::AUTO;
+    /// No end of messages.
+    bool all = false;
+    /// Warnings count as errors.
+    bool strict = false;
+    /// Codes of what isn't told.
+    std::vector<std::string> ignored;
+    /// Shows on a terminal how far the run has come.
+    bool progress = false;
+
+    static ReportOptions AsJson(bool json) {
+        ReportOptions options;
+        options.json = json;
+        return options;
+    }
+};
+
 /// What a run has to say: as text, messages at once on the standard error; or all of it as one JSON object on
-/// the standard output when the run ends, and nothing on the standard error.
+/// the standard output when the run ends, and nothing on the standard error. One call may be several runs,
+/// each on a file of its own.
 class RunReport {
 public:
-    explicit RunReport(bool asJson);
+    explicit RunReport(bool asJson) : RunReport(ReportOptions::AsJson(asJson)) {}
+    explicit RunReport(const ReportOptions& options);
 
-    bool AsJson() const { return asJson_; }
+    bool AsJson() const { return options_.json; }
+    bool ShowsAll() const { return options_.all; }
     RunTimes& Times() { return times_; }
+    ProgressLine& Watched() { return progress_; }
+    bool OutputHasColours() const { return HasColours(StreamEnm::OUTPUT, options_.colour); }
+
+    /// Of several runs, the one on the file begins. In JSON each is an object of its own.
+    void BeginRun(const std::string& file);
+    void EndRun(ExitCode code);
+    /// From now on says nothing of what the model says to pass over.
+    void Ignore(const odiK_Model& model);
+    bool IsStrict() const { return options_.strict; }
+    /// The standard output belongs to what the command writes; nothing is printed there any more.
+    void LeaveOutput() { isOutputLeft_ = true; }
+    /// Whether there was a warning that counts as an error.
+    bool HasStrictErrors() const { return strictErrors_ > 0; }
+
     void AddAll(const mdf_Report& report);
     void Add(const std::string& file, const fnd_Finding& finding);
     /// What was found in a file; with lines if it is the one whose report was added last.
@@ -69,17 +111,42 @@ public:
     ExitCode Finish(ExitCode code);
 
 private:
+    struct Ignored {
+        const odiK_IgnoredFinding* entry; // null: asked for on the command line
+        std::string_view code;
+        long long count;
+    };
+
     /// False, with the reason told, when it can't be written.
     bool Put(std::string_view text);
+    void PutError(std::string line);
     std::string JsonText(ExitCode code);
+    bool IsIgnored(const fnd_Finding& finding);
+    /// Whether one more of the severity is shown; those beyond are counted.
+    bool HasRoomFor(fnd_Severity severity);
+    void TellIgnored();
+    void TellMore();
+    void Clear();
 
-    bool asJson_;
+    const ReportOptions options_;
+    const mdf_LineStyle style_;
+    ProgressLine progress_;
     RunTimes times_;
+    std::string runFile_; // empty: the call is one run
+    nlohmann::ordered_json runs_;
+    std::list<odiK_IgnoredFinding> modelIgnores_;
+    std::vector<Ignored> ignored_;
+    std::deque<fnd_Code> raised_; // codes of warnings that are errors here
+    int strictErrors_ = 0;
+    long shown_[3] = {}; // by severity
+    long more_[3] = {};  // not shown
+    std::string lastFile_;
     std::string fileRead_;
     std::shared_ptr<const mdf_FileText> textRead_;
     std::vector<fnd_Finding> foretold_;
     bool isWritten_ = false;
     bool isOutputLost_ = false;
+    bool isOutputLeft_ = false;
     std::string pending_;  // printed, not yet written
     std::string prepared_; // the JSON object of a run that is done; empty when there is more to say
     nlohmann::ordered_json root_;

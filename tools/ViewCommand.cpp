@@ -130,6 +130,11 @@ ExitCode WritePage(const odb_Odb& odb, const ShownDeck* deck, const ViewRequest&
 } // namespace
 
 ExitCode RunView(const ViewRequest& request, RunReport& report) {
+    if (request.model == kStandardStream && request.output.empty()) {
+        report.Error("qrxdeck",
+                     "a model from the standard input has no name: -o FILE says where its page goes");
+        return ExitCode::WRONG_USAGE;
+    }
     ExitCode code;
     std::unique_ptr<ShownDeck> deck;
     std::unique_ptr<odb_Odb> odb;
@@ -141,6 +146,7 @@ ExitCode RunView(const ViewRequest& request, RunReport& report) {
                   ? ReadModel(request.model, report, code, nullptr, {request.modelName})
                   : ReadMesh(request.model, report, code);
     }
+    report.Watched().End();
     if (odb == nullptr) return code;
     if (odb->DeckModel() == nullptr) {
         report.Error(request.model,

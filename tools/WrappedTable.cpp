@@ -1,25 +1,11 @@
 #include "tools/WrappedTable.h"
 
+#include "tools/Terminal.h"
+
 #include <algorithm>
-#include <cstdlib>
-#include <cstring>
 #include <sstream>
 
-#include <sys/ioctl.h>
-#include <unistd.h>
-
 namespace {
-
-bool IsTerminal() {
-    return ::isatty(STDOUT_FILENO) == 1;
-}
-
-bool TakesColours() {
-    const char* no = std::getenv("NO_COLOR");
-    const char* terminal = std::getenv("TERM");
-    return IsTerminal() && (no == nullptr || *no == '\0') &&
-           (terminal == nullptr || std::strcmp(terminal, "dumb") != 0);
-}
 
 /// Characters, not bytes.
 std::size_t WidthOf(const std::string& text) {
@@ -78,29 +64,21 @@ std::string Stacked(const std::vector<std::string>& row, std::size_t width) {
 
 } // namespace
 
-std::size_t OutputWidth() {
-    constexpr std::size_t kUsual = 100;
-    constexpr std::size_t kLeast = 40;
-    winsize size{};
-    if (!IsTerminal() || ::ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) != 0 || size.ws_col == 0) return kUsual;
-    return std::max<std::size_t>(size.ws_col, kLeast);
-}
-
-std::string Emphasis(const std::string& text) {
-    return TakesColours() ? "\033[1m" + text + "\033[0m" : text;
+std::string Emphasis(const std::string& text, bool colours) {
+    return colours ? "\033[1m" + text + "\033[0m" : text;
 }
 
 std::string Wrapped(const std::string& text) {
     std::string wrapped;
-    for (const std::string& line : LinesOf(text, OutputWidth()))
+    for (const std::string& line : LinesOf(text, TextWidth()))
         wrapped += (wrapped.empty() ? "" : "\n") + line;
     return wrapped;
 }
 
-std::string WrappedTable::Text() const {
+std::string WrappedTable::Text(bool colours) const {
     const std::size_t columns = rows_.empty() ? heading_.size() : rows_.front().size();
     if (columns == 0) return {};
-    const std::size_t width = OutputWidth();
+    const std::size_t width = TextWidth();
     std::vector<std::size_t> widths(columns);
     const auto measure = [&widths](const std::vector<std::string>& row) {
         for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], WidthOf(row[i]));
@@ -120,7 +98,7 @@ std::string WrappedTable::Text() const {
     std::string text;
     const auto add = [&](const std::vector<std::string>& row, bool isHeading) {
         const std::string shown = isNarrow ? Stacked(row, width) : SideBySide(row, widths);
-        text += isHeading ? Emphasis(shown) : shown;
+        text += isHeading ? Emphasis(shown, colours) : shown;
     };
     if (!heading_.empty()) add(heading_, true);
     for (const auto& row : rows_) add(row, false);

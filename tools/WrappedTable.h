@@ -4,10 +4,8 @@
 #include <string>
 #include <vector>
 
-/// How many characters a line of the standard output should have: the terminal's width, or 100 elsewhere.
-std::size_t OutputWidth();
-/// The text as headings look on a terminal that takes colours; elsewhere as it is.
-std::string Emphasis(const std::string& text);
+/// The text as headings look where there are colours.
+std::string Emphasis(const std::string& text, bool colours);
 /// The text in lines that fit the output.
 std::string Wrapped(const std::string& text);
 
@@ -16,7 +14,7 @@ class WrappedTable {
 public:
     void Heading(std::vector<std::string> cells) { heading_ = std::move(cells); }
     void Row(std::vector<std::string> cells) { rows_.push_back(std::move(cells)); }
-    std::string Text() const;
+    std::string Text(bool colours) const;
 
 private:
     std::vector<std::string> heading_;

@@ -726,12 +726,15 @@ class Model:
         document = _file_of([self])
         return {**document, "parameters": parameters} if parameters else document
 
-    def write(self, target):
-        """Writes the deck to a path, which is replaced as a whole or not at all, or to a binary file."""
+    def write(self, target, *, threads=0):
+        """Writes the deck to a path, which is replaced as a whole or not at all, or to a binary file.
+
+        Large meshes are laid out by as many threads, 0: one a core; the deck is the same with any number.
+        """
         if hasattr(target, "write"):
-            self._store().write_deck_to(target.write)
+            self._store().write_deck_to(target.write, threads)
         else:
-            self._store().write_deck(_records.file_path(target))
+            self._store().write_deck(_records.file_path(target), threads)
 
     def deck(self):
         """The deck as a text."""

@@ -1,4 +1,5 @@
 #include "store_interface/model/ddb_Assembly.h"
+#include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/amplitudes/kamC_Amplitude.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/conditions/kbcC_BC.h"
@@ -14,6 +15,7 @@ cls_MetadataRegistrar::cls_MetadataRegistrar() {
     registrar_.AddView(ddb_BaseInstance::Class, 0);
     registrar_.AddView(ddb_PartInstance::Class, ddb_BaseInstance::TypeId());
     registrar_.Add<kprC_PropagatingObject>();
+    registrar_.Add<odiK_IgnoredFinding>();
     cls_RegisterStepRecords(registrar_);
     cls_RegisterMaterialRecords(registrar_);
     cls_RegisterAmplitudeRecords(registrar_);

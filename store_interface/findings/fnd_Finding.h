@@ -41,7 +41,7 @@ struct fnd_Finding {
     long column = 0;
 
     bool IsError() const { return code->severity == fnd_Severity::ERROR; }
-    /// "found ..., expected ...; hint".
+    /// "found ..., expected ...; hint", or with the hint ahead of a long list.
     std::string Text() const;
 };
 

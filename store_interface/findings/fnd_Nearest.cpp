@@ -4,7 +4,9 @@
 
 #include <algorithm>
 #include <bit>
+#include <cstdlib>
 #include <cstring>
+#include <numeric>
 
 namespace {
 
@@ -13,6 +15,17 @@ unsigned long long LettersOf(const char* text, std::size_t length) {
     unsigned long long letters = 0;
     for (std::size_t i = 0; i < length; ++i) letters |= 1ULL << (static_cast<unsigned char>(text[i]) & 63U);
     return letters;
+}
+
+/// Characters that one has and the other has not, less for a common beginning.
+int Unlikeness(std::string_view name, std::string_view word) {
+    int counts[256] = {};
+    for (const char c : name) ++counts[static_cast<unsigned char>(c)];
+    for (const char c : word) --counts[static_cast<unsigned char>(c)];
+    int unlike = 0;
+    for (const int count : counts) unlike += std::abs(count);
+    const auto [end, other] = std::mismatch(name.begin(), name.end(), word.begin(), word.end());
+    return unlike - static_cast<int>(end - name.begin());
 }
 
 } // namespace
@@ -87,12 +100,28 @@ std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>
     return nearest.Hint();
 }
 
-std::string fnd_ThereAre(const std::vector<std::string>& known) {
+std::vector<std::size_t> fnd_PlacesOfNearest(const std::vector<std::string>& words, std::string_view name) {
+    std::vector<std::size_t> places(words.size());
+    std::iota(places.begin(), places.end(), std::size_t{0});
+    if (words.size() <= fnd_kListed) return places;
+    // Fast, since a model may have a great many names.
+    const std::string lower = fnd_LowerCase(name);
+    std::vector<int> unlike;
+    for (const std::string& word : words) unlike.push_back(Unlikeness(lower, fnd_LowerCase(word)));
+    std::ranges::stable_sort(places, {}, [&unlike](std::size_t i) { return unlike[i]; });
+    places.resize(fnd_kListed);
+    std::ranges::sort(places);
+    return places;
+}
+
+std::string fnd_ThereAre(const std::vector<std::string>& known, std::string_view name) {
     if (known.empty()) return "there is none";
-    constexpr std::size_t kShown = 10;
     std::string list = known.size() == 1 ? "there is " : "there are ";
-    for (std::size_t i = 0; i < known.size() && i < kShown; ++i) {
-        list += (i == 0 ? "" : ", ") + fnd_Quoted(known[i]);
+    const char* separator = "";
+    for (const std::size_t i : fnd_PlacesOfNearest(known, name)) {
+        list.append(separator).append(fnd_Quoted(known[i]));
+        separator = ", ";
     }
-    return known.size() > kShown ? list + ", ..." : list;
+    if (known.size() > fnd_kListed) list += ", ... (" + std::to_string(known.size() - fnd_kListed) + " more)";
+    return list;
 }

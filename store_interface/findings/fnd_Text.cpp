@@ -1,5 +1,7 @@
 #include "store_interface/findings/fnd_Text.h"
 
+#include "store_interface/findings/fnd_Nearest.h"
+
 #include <algorithm>
 #include <charconv>
 
@@ -50,10 +52,16 @@ std::string fnd_Counted(long long count, const char* singular) {
     return std::to_string(count) + " " + singular + (count == 1 ? "" : "s");
 }
 
-std::string fnd_OneOf(const std::vector<std::string>& words) {
+std::string fnd_OneOf(const std::vector<std::string>& words, std::string_view given) {
     if (words.size() == 1) return words.front();
     std::string text("one of ");
-    for (std::size_t i = 0; i < words.size(); ++i) text.append(i == 0 ? "" : ", ").append(words[i]);
+    const char* separator = "";
+    for (const std::size_t i : fnd_PlacesOfNearest(words, given)) {
+        text.append(separator).append(words[i]);
+        separator = ", ";
+    }
+    if (words.size() > fnd_kListed)
+        text += ", ... (" + std::to_string(words.size() - fnd_kListed) + " more)";
     return text;
 }
 

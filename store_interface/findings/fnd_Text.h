@@ -15,8 +15,8 @@ std::string fnd_Visible(std::string_view text);
 std::string fnd_Shown(double value);
 /// "1 row", "2 rows".
 std::string fnd_Counted(long long count, const char* singular);
-/// "one of a, b, c".
-std::string fnd_OneOf(const std::vector<std::string>& words);
+/// "one of a, b, c"; of more than ten those nearest to what was given instead, and how many more there are.
+std::string fnd_OneOf(const std::vector<std::string>& words, std::string_view given = {});
 /// The text with A to Z as a to z.
 std::string fnd_LowerCase(std::string_view text);
 constexpr char fnd_LowerCase(char c) {

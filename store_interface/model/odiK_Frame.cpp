@@ -90,12 +90,35 @@ const cls_FieldTable& odiK_ModelData::Fields() {
                 "analysisProduct", "without it EXPLICIT when an analysis step is explicit, else STANDARD")
             .Meanings(kAnalysisProducts)
             .Field<&R::cyclicSymmetry>("cyclicSymmetry", "the sector of a cyclic model")
+            .Field<&R::ignore>("ignore", "warnings and notes that are known and not to be told, with reasons")
             .Tree<cls_TreeEnm::Datums>("datums", "coordinate systems, points, axes and planes")
             .Tree<cls_TreeEnm::Parts>("parts", "parts by name")
             .Tree<cls_TreeEnm::Assembly>("assembly", "the instances, and what spans them")
             .Example(
                 R"({"description": "A plate under pressure", "materials": {"Steel": {"elastic": {"table": [[210000, 0.3]]}}}})");
     return fields;
+}
+
+const cls_FieldTable& odiK_IgnoredFinding::Fields() {
+    using R = odiK_IgnoredFinding;
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::code>("code", "the code that the finding is told with")
+            .Required()
+            .Field<&R::reason>("reason", "why it is meant to be so; for people")
+            .FreeText()
+            .Required()
+            .Field<&R::place>("place", "JSON pointer, as the finding is told with: only there and below it; "
+                                       "without it wherever it is found")
+            .Example(R"({"code": "unused-nodes", "reason": "reference points of the customer's drawing"})");
+    return fields;
+}
+
+bool odiK_IgnoredFinding::Is(const fnd_Finding& finding) const {
+    if (finding.code->name != code.View()) return false;
+    if (!finding.place.starts_with(place.View())) return false;
+    const std::size_t end = place.View().size();
+    return end == 0 || end == finding.place.size() || finding.place[end] == '/';
 }
 
 const cls_FieldTable& odiK_Datum::Fields() {

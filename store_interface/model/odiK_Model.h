@@ -1,6 +1,7 @@
 #ifndef QRX_STORE_ODIK_MODEL_H
 #define QRX_STORE_ODIK_MODEL_H
 
+#include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odiK_Assembly.h"
 #include "store_interface/model/odiK_Datum.h"
 #include "store_interface/model/odiK_Mesh.h"
@@ -88,6 +89,23 @@ struct odiK_MemberInput {
 };
 
 /// The data of a model besides its tree, its steps and its repositories.
+/// A kind of finding that is known and meant to be as it is.
+class odiK_IgnoredFinding final : public cls_RecordOf<odiK_IgnoredFinding> {
+public:
+    static constexpr cls_ClassInfo Class{"odiK_IgnoredFinding",
+                                         "a kind of finding that is known, and not to be told"};
+
+    cow_String code;
+    cow_String reason;
+    /// JSON pointer into the model file; empty: wherever it is found.
+    cow_String place;
+
+    /// Whether it is this one, in a place at or below the own.
+    bool Is(const fnd_Finding& finding) const;
+
+    static const cls_FieldTable& Fields();
+};
+
 struct odiK_ModelData : cls_RecordOf<odiK_ModelData> {
     static constexpr cls_ClassInfo Class{"odiK_ModelData", "A model: all that one deck is written from."};
 
@@ -108,6 +126,7 @@ struct odiK_ModelData : cls_RecordOf<odiK_ModelData> {
     int analysisProduct = cls_UnsetInt;
     /// Null: none.
     mdl_ObjCow<ddb_ModelSectorDefinition> cyclicSymmetry;
+    cow_List<odiK_IgnoredFinding> ignore;
 
     static const cls_FieldTable& Fields();
 };

@@ -1,10 +1,14 @@
 #include "store_interface/model/odiK_ModelRules.h"
 
+#include "store_interface/findings/fnd_Nearest.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/constraints/kcoC_Constraints.h"
 #include "store_interface/records/interactions/kinC_ContactExp.h"
+
+#include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -90,10 +94,30 @@ void CheckSector(const odiK_Model& model, const fnd_Path& root, fnd_Sink& sink) 
              "the sector definition is idle, since symmetryType is NONE");
 }
 
+void CheckIgnored(const odiK_Model& model, const fnd_Path& root, fnd_Sink& sink) {
+    const fnd_Path list(root, "ignore");
+    for (int i = 0; i < model.ignore.Length(); ++i) {
+        const fnd_Path entry(list, static_cast<std::size_t>(i));
+        const fnd_Path place(entry, "code");
+        const std::string_view name = model.ignore[i].code.View();
+        const auto* const code = std::ranges::find(fnd_Codes, name, &fnd_Code::name);
+        if (code == std::end(fnd_Codes)) {
+            sink.Add("no-such-name", place, "found " + fnd_Quoted(name), "the code of a warning or a note",
+                     fnd_DidYouMean(sink, name, [](fnd_Nearest& nearest) {
+                         for (const fnd_Code& known : fnd_Codes) nearest.Try(known.name);
+                     }));
+        } else if (code->severity == fnd_Severity::ERROR) {
+            sink.Add("wrong-value", place, "found the error " + fnd_Quoted(name),
+                     "a warning or a note: errors can't be passed over");
+        }
+    }
+}
+
 } // namespace
 
 void odiK_CheckModelRules(const odiK_Model& model, fnd_Sink& sink) {
     const fnd_Path root;
+    CheckIgnored(model, root, sink);
     CheckSector(model, root, sink);
     CheckEquations(model, root, sink);
     CheckGeneralContact(model, root, sink);

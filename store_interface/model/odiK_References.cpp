@@ -76,7 +76,7 @@ std::string odiK_References::Hint(const Names& names, const std::string& name, f
     const std::string nearest = fnd_DidYouMean(sink, name, [&names](fnd_Nearest& known) {
         for (const std::string& each : names.inOrder) known.Try(each);
     });
-    return nearest.empty() ? fnd_ThereAre(names.inOrder) : nearest;
+    return nearest.empty() ? fnd_ThereAre(names.inOrder, name) : nearest;
 }
 
 void odiK_References::CheckClass(const cls_Field& field, const std::string& name, const std::string& place,

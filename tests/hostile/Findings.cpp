@@ -1,6 +1,7 @@
 #include "hostile/Findings.h"
 
 #include "model_file/mdf_ModelFile.h"
+#include "store_interface/findings/fnd_Text.h"
 
 std::vector<std::string> Findings(std::string_view text) {
     mdf_Report report;
@@ -9,13 +10,18 @@ std::vector<std::string> Findings(std::string_view text) {
     std::vector<std::string> findings;
     for (const fnd_Finding& each : report.findings) {
         const std::string line = report.Line(each);
-        // What the program prints begins with the file, the place in it and the kind.
+        // What the program prints begins with the file, the place in it and the kind, and ends with the
+        // pointer and the code; here the pointer stands in front.
         const std::string place =
             each.line > 0 ? std::to_string(each.line) + ":" + std::to_string(each.column) + ":" : "";
         const std::string kind = fnd_SeverityWord(each.code->severity);
         const std::string head = "m.json:" + place + " " + kind + ": ";
         EXPECT_EQ(line.substr(0, head.size()), head);
-        std::string finding = line.substr(head.size());
+        const std::string pointer = each.place.empty() ? "" : "(" + fnd_Visible(each.place) + ") ";
+        const std::string tail = " " + pointer + "[" + std::string(each.code->name) + "]";
+        EXPECT_TRUE(line.ends_with(tail)) << line;
+        std::string finding = line.substr(head.size(), line.size() - head.size() - tail.size());
+        if (!each.place.empty()) finding = fnd_Visible(each.place) + ": " + finding;
         constexpr std::string_view prefix = "/models/Default Model";
         if (finding.starts_with(prefix)) finding.replace(0, prefix.size(), "@");
         if (each.code->name == "syntax") {

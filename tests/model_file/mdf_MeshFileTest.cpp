@@ -222,7 +222,7 @@ TEST_F(MeshFiles, Members_OfTheWrongKind_AreTold) {
                   .find("/surfaceElements: found 'cloth', expected one of shell, membrane"),
               std::string::npos);
     EXPECT_NE(Refused(R"({"file": "two.msh", "elementTypes": {"tetra11": "C3D10"}})")
-                  .find("/elementTypes/tetra11: found 'tetra11', expected one of vertex"),
+                  .find("/elementTypes/tetra11: found 'tetra11'; did you mean 'tetra10'? Expected one of "),
               std::string::npos);
     EXPECT_NE(Refused(R"({"file": "two.msh", "nodes": {}})").find("/nodes: found an unknown member 'nodes'"),
               std::string::npos);

@@ -12,8 +12,12 @@
 
 namespace {
 
+/// The line of a message without its kind and its code.
 std::string Line(const std::string& fileName, const fnd_Finding& error) {
-    const std::string line = mdf_LineOf(fileName, error);
+    std::string line = mdf_LineOf(fileName, error);
+    const std::string code = " [" + std::string(error.code->name) + "]";
+    EXPECT_TRUE(line.ends_with(code)) << line;
+    line.resize(line.size() - code.size());
     const std::string severity = " error: ";
     const std::size_t place = line.find(severity);
     return place == std::string::npos ? line
@@ -157,7 +161,7 @@ TEST(ModelFileErrors, Members_OfOneName_AreReportedByPointerAndTheFirstStays) {
     EXPECT_EQ(errors[0].Text(), "the member 'x~y' stands more than once, expected names that differ");
     EXPECT_EQ(errors[1].place, "/a~1b");
     EXPECT_EQ(Line("m.json", errors[2]),
-              "m.json:1:62: /a~1b: the member 'a/b' stands more than once, expected names that differ");
+              "m.json:1:62: the member 'a/b' stands more than once, expected names that differ (/a~1b)");
     ASSERT_EQ(root.Size(), 2u);
     EXPECT_EQ(root.Find("a/b")->Items()[1].Find("x~y")->Int(), 1);
     EXPECT_EQ(root.Find("c")->Int(), 5);

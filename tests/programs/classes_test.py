@@ -94,7 +94,7 @@ class ClassesTest(unittest.TestCase):
             self.assertEqual((run.returncode, run.stderr), (0, ""), name)
 
     def test_ATerminal_GetsLinesOfItsWidth(self):
-        for columns in [40, 60, 132]:
+        for columns in [40, 60, 100]:
             for arguments in [["classes", "steps"], ["schema", "Pressure"]]:
                 code, text = on_terminal(columns, *arguments, NO_COLOR="1")
                 self.assertEqual(code, 0)
@@ -102,7 +102,7 @@ class ClassesTest(unittest.TestCase):
                 # What no line break can help is longer.
                 long = [line for line in text.splitlines() if len(line) > columns and " " in line.strip()]
                 self.assertEqual(long, [], f"{columns} {arguments}")
-        self.assertLess(len(on_terminal(132, "classes")[1].splitlines()), len(on_terminal(60, "classes")[1].splitlines()))
+        self.assertLess(len(on_terminal(100, "classes")[1].splitlines()), len(on_terminal(60, "classes")[1].splitlines()))
 
     def test_Colours_AreForTerminalsThatWantThem(self):
         self.assertIn("\033[1mloads\033[0m", on_terminal(80, "classes", "loads")[1])

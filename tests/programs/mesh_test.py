@@ -80,7 +80,7 @@ class MeshTest(unittest.TestCase):
         (self.folder / "x.msh").write_text("hello")
         run = self.run_program("new", "x.msh")
         self.assertEqual(run.returncode, 1)
-        self.assertEqual(run.stderr, "x.msh: error: x.msh: the file begins with 'hello', expected a mesh as MSH, VTU, VTK, UNV, STL or MED\n")
+        self.assertEqual(run.stderr, "x.msh: error: x.msh: the file begins with 'hello', expected a mesh as MSH, VTU, VTK, UNV, STL or MED [mesh-file]\n")
         self.assertEqual(sorted(os.listdir(self.folder)), ["x.msh"])
 
     def test_mesh_of_the_bracket_has_the_measures_of_its_geometry(self):
@@ -126,8 +126,8 @@ class MeshTest(unittest.TestCase):
                 "elements": [{"type": "C3D4", "labels": [7], "connectivity": [[1, 3, 2, 4]]}]}
         (self.folder / "m.json").write_text(json.dumps(model_of(mesh)))
         self.assertRegex(self.run_program("check", "m.json").stderr,
-                         r"(?m)^m\.json:\d+:\d+: warning: /models/Default Model/parts/P/mesh: "
-                         "1 element of negative or zero size: 7$")
+                         r"(?m)^m\.json:\d+:\d+: warning: "
+                         r"1 element of negative or zero size: 7 \(/models/Default Model/parts/P/mesh\) \[inverted-elements\]$")
 
     def test_files_that_cant_be_read_end_in_one_message(self):
         os.mkfifo(self.folder / "pipe.msh")

@@ -77,6 +77,12 @@ def without_positions(text):
     return re.sub(r"^([^:\n]+):\d+:\d+: ", r"\1: ", text, flags=re.MULTILINE)
 
 
+def by_place(text):
+    """The same, each with its place ahead of its text and without its code."""
+    return re.sub(r"^([^:\n]+: (?:error|warning|note): )(.*) \((/.*)\) \[[a-z-]+\]$", r"\1\3: \2",
+                  without_positions(text), flags=re.MULTILINE)
+
+
 def large_model(nodes):
     def enlarge(model):
         mesh = model["parts"]["ROD"]["mesh"]
@@ -137,7 +143,7 @@ class Write(ProgramTest):
         self.assertEqual(self.entries("in"), [b"rod.v2.json"])
 
     def test_JobNamesOfEveryKind_NameTheDeck(self):
-        for job in ["a.b", "with blank", " ", "ä€漢", "job.inp", ".hidden", "-", "100% %s", "it's \"quoted\"",
+        for job in ["a.b", "with blank", " ", "ä€漢", ".hidden", "--", "100% %s", "it's \"quoted\"",
                     "line\nend", "XXXXXX", "~", "x" * 250]:
             with self.subTest(job=job):
                 run = self.run_program("write", "model.json", "--job=" + job)
@@ -145,6 +151,14 @@ class Write(ProgramTest):
                 self.assertEqual((self.folder / (job + ".inp")).read_bytes(), DECK)
                 (self.folder / (job + ".inp")).unlink()
         self.assertEqual(self.entries(), [b"model.json"])
+
+    def test_JobWithItsExtension_GetsNoSecondOne(self):
+        for job, deck in [("job.inp", "job.inp"), ("job.v2", "job.v2.inp"), (".inp", ".inp.inp"),
+                          ("job.inp.inp", "job.inp.inp")]:
+            with self.subTest(job=job):
+                self.assertEqual(self.run_program("write", "model.json", "--job", job).returncode, 0)
+                self.assertEqual((self.folder / deck).read_bytes(), DECK)
+                (self.folder / deck).unlink()
 
     def test_JobThatIsNoUtf8_NamesTheDeck(self):
         run = self.run_program("write", "model.json", "--job", b"\xff\xfe")
@@ -237,8 +251,8 @@ class Refusals(ProgramTest):
             with self.subTest(command=command):
                 run = self.run_program(command, "model.json")
                 self.assert_refused(run, 1)
-                self.assertRegex(without_positions(run.errors), r"^model\.json: error: "
-                                 r"/models/Default Model/assembly/instances/ROD-1/part: .*RUD")
+                self.assertRegex(without_positions(run.errors), r"^model\.json: error: .*'RUD'.* "
+                                 r"\(/models/Default Model/assembly/instances/ROD-1/part\) \[no-such-name\]$")
 
     def test_WrongModel_HasPointerInJson(self):
         self.put("model.json", changed(lambda model: model.update(parts=3)))
@@ -263,9 +277,12 @@ class Refusals(ProgramTest):
       { "name": "Pull", "class": "kprC_StaticStep",
         "timePeriod": "long" } ] } } }''')
         run = self.run_program("check", "model.json")
-        self.assertEqual((run.returncode, [line.split(" found ")[0] for line in run.errors.splitlines()]), (1, [
-            "model.json:5:31: error: /models/Default Model/materials/Steel/densitty:",
-            "model.json:9:9: error: /models/Default Model/steps/1/timePeriod:"]))
+        self.assertEqual((run.returncode, run.errors.splitlines()), (1, [
+            "model.json:5:31: error: found an unknown member 'densitty'; did you mean 'density'? Expected one of %s "
+            "(/models/Default Model/materials/Steel/densitty) [unknown-member]"
+            % re.search("Expected (one of .*) [(]/models", run.errors)[1][7:],
+            "model.json:9:9: error: found 'long', expected a number (/models/Default Model/steps/1/timePeriod) "
+            "[wrong-value]"]))
         message = json.loads(self.run_program("check", "model.json", "--json").output)["messages"][1]
         self.assertEqual((message["line"], message["column"], message["pointer"]),
                          (9, 9, "/models/Default Model/steps/1/timePeriod"))
@@ -335,8 +352,7 @@ class Refusals(ProgramTest):
 
     def test_WrongUsage_IsCodeTwo(self):
         for arguments in [[], ["write"], ["frobnicate"], ["write", "model.json", "--frob"],
-                          ["write", "model.json", "other.json"], ["write", "model.json", "--job"],
-                          ["check"], ["write", "model.json", "check"], ["schema", "--output"],
+                          ["write", "model.json", "--job"], ["check"], ["schema", "--output"],
                           ["write", "model.json", "--job", "folder/"], ["write", "model.json", "--job", "."],
                           ["write", "model.json", "--job", "a/.."]]:
             with self.subTest(arguments=arguments):
@@ -344,10 +360,19 @@ class Refusals(ProgramTest):
                 self.assert_refused(run, 2)
                 self.assertRegex(run.errors, r"^qrxdeck: error: ")
 
-    def test_UnknownCommand_IsNamed(self):
+    def test_UnknownCommand_GetsTheNearest(self):
         self.assert_refused(self.run_program("wirte", "model.json"), 2,
-                            "qrxdeck: error: there is no command 'wirte'; "
-                            "the commands are write, check, diff, flatten, info, mesh, new, format, study, view, variables, classes, schema\n"
+                            "qrxdeck: error: there is no command 'wirte'; did you mean 'write'?\n"
+                            "Run with --help for more information.\n")
+        self.assert_refused(self.run_program("help", "chekc"), 2,
+                            "qrxdeck: error: there is no command 'chekc'; did you mean 'check'?\n")
+        run = self.run_program("frobnicate")
+        self.assert_refused(run, 2)
+        self.assertIn("the commands are write, check, diff, flatten, info, mesh, new, format, study, view, ", run.errors)
+
+    def test_UnknownOption_GetsTheNearest(self):
+        self.assert_refused(self.run_program("write", "model.json", "--jbo=x"), 2,
+                            "qrxdeck: error: the command write has no option '--jbo'; did you mean '--job'?\n"
                             "Run with --help for more information.\n")
 
     def test_WrongUsage_IsToldInJson(self):
@@ -438,7 +463,8 @@ class CannotBeExpressed(ProgramTest):
         run = self.run_program("write", "model.json")
         self.assertEqual((run.returncode, run.output), (4, ""))
         lines = run.errors.splitlines()
-        self.assertRegex(lines[0], r"^model\.json:\d+:\d+: warning: .*/steps/2/class: found a complex frequency step")
+        self.assertRegex(lines[0], r"^model\.json:\d+:\d+: warning: found a complex frequency step, .*"
+                                   r" \(/models/Default Model/steps/2/class\) \[cannot-be-written\]$")
         self.assertEqual(lines[1:], ["Unimplemented function to write out *Step card", "step 'Whirl'"])
         self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
         self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
@@ -488,7 +514,7 @@ class WrongDatum(ProgramTest):
                 self.assertEqual(self.entries(), [b"model.inp", b"model.json"])
                 check = self.run_program("check", "model.json")
                 self.assertEqual(check.returncode, 0)
-                self.assertIn("/interactions/Edge: writing fails with", check.errors)
+                self.assertIn("/interactions/Edge: writing fails with", by_place(check.errors))
 
     def test_InteractionsThatNoDeckCarries_AreToldAsLeftOut(self):
         self.put("model.json", changed(lambda model: model.update(
@@ -681,7 +707,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(empty_set))
         run = self.run_program("check", "model.json")
         self.assertEqual(run.returncode, 0)
-        self.assertRegex(run.errors, r"^model\.json:\d+:\d+: warning: /models/Default Model/parts/ROD/mesh/sets/1")
+        self.assertRegex(run.errors, r"^model\.json:\d+:\d+: warning: .* \(/models/Default Model/parts/ROD/mesh/sets/1\) ")
         result = json.loads(self.run_program("check", "model.json", "--json").output)
         self.assertEqual((result["exitCode"], [m["severity"] for m in result["messages"]]), (0, ["warning"]))
 
@@ -689,7 +715,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(lambda model: model.update(
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}})))
         run = self.run_program("check", "model.json")
-        self.assertEqual((run.returncode, without_positions(run.errors)),
+        self.assertEqual((run.returncode, by_place(run.errors)),
                          (0, "model.json: warning: /models/Default Model/materials/RING/membraneElastic: no "
                              "gasket section names this material, so this will not stand in the deck\n"
                              "model.json: note: /models/Default Model/materials: nothing uses 1 of the "
@@ -703,7 +729,7 @@ class OtherCommands(ProgramTest):
             materials={"RING": {"density": {"table": [[1]]}, "membraneElastic": {"table": [[2, 0.3]]}}},
             sections={"S": {"class": "kseC_GasketSection", "materialName": "RING"}})))
         run = self.run_program("write", "model.json")
-        self.assertIn("/materials/RING/density: the material is a gasket behaviour", run.errors)
+        self.assertIn("/materials/RING/density: the material is a gasket behaviour", by_place(run.errors))
         self.assertRegex(run.output, r" +1  other options of gasket materials \(a gasket behaviour has no place "
                                      r"for them\): RING density\n$")
 
@@ -818,7 +844,7 @@ class OtherCommands(ProgramTest):
                       "boundaryConditions/Wire/connectors/0", "boundaryConditions/Wire/datum",
                       "boundaryConditions/Wire/states/Initial/amplitude", "boundaryConditions/Wire/states/Cases/u1"]:
             self.assertIn("model.json: error: /models/Default Model/" + place + ": found ",
-                          without_positions(run.errors))
+                          by_place(run.errors))
         self.assertEqual(len(run.errors.splitlines()), 9, run.errors)
 
     def test_Check_OfASubmodelWithANegativeTolerance_Warns(self):
@@ -830,7 +856,7 @@ class OtherCommands(ProgramTest):
         self.put("model.json", changed(conditions))
         run = self.run_program("check", "model.json")
         cut = "model.json: warning: /models/Default Model/boundaryConditions/Cut/"
-        self.assertEqual((run.returncode, without_positions(run.errors).splitlines()), (0, [
+        self.assertEqual((run.returncode, by_place(run.errors).splitlines()), (0, [
             cut + "shellThickness: found -1.5, expected 0 or more",
             cut + "absoluteExteriorTolerance: found -0.5, expected 0 or more",
             cut + "exteriorTolerance: found -2.5, expected 0 or more"]))
@@ -844,7 +870,7 @@ class OtherCommands(ProgramTest):
         run = self.run_program("check", "model.json")
         steps = "model.json: warning: /models/Default Model/steps/"
         self.assertEqual((run.returncode, run.output), (0, "model.json: no errors\n"))
-        self.assertEqual(without_positions(run.errors).splitlines(), [
+        self.assertEqual(by_place(run.errors).splitlines(), [
             steps + "1/loadCases: found load cases, expected none: this procedure allows none",
             steps + "2/suppressed: found true, which changes nothing: a suppressed step is written like any "
                     "other",
@@ -936,12 +962,12 @@ class Format(ProgramTest):
     def test_WrongModel_IsCodeOneAndNothingIsWritten(self):
         self.put("model.json", '{"format": "qrx-model/1"}')
         self.assert_refused(self.run_program("format", "model.json", "-o", "out.json"), 1,
-                            "model.json:1:1: error: /models: found nothing, expected an object of models\n")
+                            "model.json:1:1: error: found nothing, expected an object of models (/models) [missing-field]\n")
         self.assertEqual(self.entries(), [b"model.json"])
 
     def test_FileThatCannotBeReadOrWritten_IsCodeThree(self):
         self.assert_refused(self.run_program("format", "none.json"), 3,
-                            "none.json: error: the file can't be read: No such file or directory\n")
+                            "none.json: error: the file can't be read: No such file or directory [unreadable-file]\n")
         run = self.run_program("format", "model.json", "-o", "none/out.json")
         self.assert_refused(run, 3, "none/out.json: error: cannot open the folder 'none': "
                             "No such file or directory\n")

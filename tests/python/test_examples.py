@@ -1,7 +1,9 @@
 """The examples as scripts: their decks are those of the model files, byte for byte."""
 
 import os
+import shutil
 import subprocess
+import sys
 
 import pytest
 
@@ -9,9 +11,7 @@ from conftest import ROOT, example_scripts, module_of, run
 
 
 def test_EveryExample_HasAScript():
-    # A study's template is a model file by its nature: what varies is what it names.
     folders = {path.parent.name for path in (ROOT / "examples").glob("*/*.json")} | {"in_memory"}
-    folders -= {"plate_study"}
     assert {path.parent.name for path in example_scripts()} == folders
 
 
@@ -32,3 +32,15 @@ def test_Script_WritesTheDeckOfTheModelFile(path, program, tmp_path):
 @pytest.mark.parametrize("path", example_scripts(), ids=lambda path: path.stem)
 def test_ModelOfAScript_HasNoErrors(path):
     assert [finding for finding in module_of(path).model().check() if finding.is_error] == []
+
+
+def test_StudyScript_WritesTheDecksOfTheStudy(program, tmp_path):
+    for name in ("make_study.py", "plate_study.json", "plate_study.py"):
+        shutil.copy(ROOT / "examples" / "plate_study" / name, tmp_path)
+    for name in ("make_study.py", "plate_study.py"):
+        subprocess.run([sys.executable, tmp_path / name], cwd=tmp_path, check=True, capture_output=True)
+    run(program, "study", tmp_path / "plate_study.json", tmp_path / "plates.csv", "--out", tmp_path / "program")
+    decks = sorted(path.name for path in (tmp_path / "plates").iterdir())
+    assert len(decks) == 200
+    for name in decks:
+        assert (tmp_path / "plates" / name).read_bytes() == (tmp_path / "program" / name).read_bytes()

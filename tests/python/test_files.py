@@ -138,6 +138,14 @@ def test_Threads_WriteModelsAtOnce(tmp_path):
         assert (tmp_path / f"{number}.inp").read_text() == expected[number % 4]
 
 
+def test_DeckOfAnyNumberOfThreads_IsTheSame(tmp_path):
+    model = large(100000)
+    expected = model.deck()
+    for threads in (1, 2, 5):
+        model.write(tmp_path / "large.inp", threads=threads)
+        assert (tmp_path / "large.inp").read_text() == expected
+
+
 def test_OtherThreads_GoOnWhileADeckIsWritten():
     model = large(300000)
     counted = []
@@ -165,6 +173,7 @@ import numpy as np, os, pathlib, sys, qrx, time
 sys.path.insert(0, {tests!r})
 from test_files import large
 model = large(2000000)
+model.save("large.json")
 print("ready", flush=True)
 try:
     while True:
@@ -174,7 +183,7 @@ except KeyboardInterrupt:
 """
 
 
-@pytest.mark.parametrize("run", ["model.write('large.inp')", "model.deck()", "model.check()"])
+@pytest.mark.parametrize("run", ["model.write('large.inp')", "model.deck()", "model.check()", "qrx.load('large.json')"])
 def test_Interrupt_EndsALongRunAndLeavesNothing(tmp_path, run):
     tests = str(pathlib.Path(__file__).parent)
     process = subprocess.Popen(
@@ -187,7 +196,7 @@ def test_Interrupt_EndsALongRunAndLeavesNothing(tmp_path, run):
     assert process.communicate(timeout=60)[0] == "interrupted\n"
     assert time.monotonic() - begin < 20
     assert process.returncode == 0
-    assert [name for name in os.listdir(tmp_path) if name != "large.inp"] == []
+    assert [name for name in os.listdir(tmp_path) if name not in ("large.inp", "large.json")] == []
 
 
 def test_CommandLine_IsTheProgram(tmp_path, program):

@@ -1,5 +1,7 @@
 #include "store_interface/findings/fnd_Nearest.h"
 
+#include "store_interface/findings/fnd_Text.h"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -73,6 +75,38 @@ TEST(Nearest, SinkThatHasHadEnough_IsNotSearchedFor) {
         fnd_DidYouMean(list, "name", [&](fnd_Nearest&) { ++searches; });
     }
     EXPECT_EQ(searches, 50);
+}
+
+TEST(Lists, UpToTenNames_AreListedAsTheyAre) {
+    const std::vector<std::string> names = {"C", "B", "A"};
+    EXPECT_EQ(fnd_OneOf(names, "A"), "one of C, B, A");
+    EXPECT_EQ(fnd_OneOf({"A"}, "B"), "A");
+    EXPECT_EQ(fnd_ThereAre(names, "A"), "there are 'C', 'B', 'A'");
+    EXPECT_EQ(fnd_ThereAre({"A"}, "B"), "there is 'A'");
+    EXPECT_EQ(fnd_ThereAre({}, "B"), "there is none");
+}
+
+TEST(Lists, MoreThanTenNames_AreCutToThoseMostLikeTheGivenOneInTheirOrder) {
+    std::vector<std::string> names;
+    for (char c = 'a'; c <= 'z'; ++c) names.push_back(std::string(3, c));
+    names.insert(names.begin() + 20, "inner");
+    names.insert(names.begin() + 5, "INNERMOST");
+    // Nine have letters of it; of all others none has any, so the first is taken.
+    EXPECT_EQ(fnd_OneOf(names, "innermos"),
+              "one of aaa, eee, INNERMOST, iii, mmm, nnn, ooo, rrr, sss, inner, ... (18 more)");
+    EXPECT_EQ(fnd_ThereAre(names, "innermos").substr(0, 35), "there are 'aaa', 'eee', 'INNERMOST'");
+    EXPECT_EQ(fnd_OneOf(names), "one of aaa, bbb, ccc, ddd, eee, fff, ggg, hhh, iii, jjj, ... (18 more)");
+}
+
+TEST(FindingText, LongExpectations_StandBehindTheHint) {
+    const std::string list = "one of first, second, third, fourth, fifth, sixth";
+    EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "did you mean 'sixth'?").Text(),
+              "found 'x'; did you mean 'sixth'? Expected " + list);
+    EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "see above").Text(),
+              "found 'x'; see above; expected " + list);
+    EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list).Text(), "found 'x', expected " + list);
+    EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", "a number", "see above").Text(),
+              "found 'x', expected a number; see above");
 }
 
 } // namespace

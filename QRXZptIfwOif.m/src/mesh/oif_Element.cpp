@@ -3,6 +3,7 @@
 #include "base/oif_KeywordLine.h"
 #include "base/oif_ModelInfo.h"
 #include "foundation/num_Digits.h"
+#include "foundation/thr_InOrder.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "store_interface/model/odiK_Mesh.h"
 
@@ -95,32 +96,56 @@ void oif_Element::Write(utl_Stream& stream) const {
     if (withHeader_) stream.Flush();
 }
 
+/// What the labels behind connectivity say of the fields that they need.
+struct oif_Element::LabelScan {
+    int largest = 0;
+    bool areNatural = true;
+};
+
+template <class LabelOf>
+oif_Element::LabelScan oif_Element::Scan(int threads, const std::vector<int>& connectivity,
+                                         const LabelOf& labelOf) {
+    constexpr std::size_t pieceLength = std::size_t{1} << 18;
+    std::vector<LabelScan> pieces((connectivity.size() + pieceLength - 1) / pieceLength);
+    thr_ForEach(threads, pieces.size(), [&](std::size_t piece) {
+        const std::size_t begin = piece * pieceLength;
+        const std::size_t end = std::min(begin + pieceLength, connectivity.size());
+        int largest = 0;
+        int least = 0;
+        for (std::size_t i = begin; i < end; ++i) {
+            const int label = labelOf(connectivity[i]);
+            largest = std::max(largest, label);
+            least = std::min(least, label);
+        }
+        pieces[piece] = {largest, least == 0};
+    });
+    LabelScan whole;
+    for (const LabelScan& piece : pieces) {
+        whole.largest = std::max(whole.largest, piece.largest);
+        whole.areNatural = whole.areNatural && piece.areNatural;
+    }
+    return whole;
+}
+
 void oif_Element::WriteConnectivity(utl_Stream& stream) const {
     const std::vector<int>& connectivity = elements_->elementConnectivity();
-    // The first walk finds the widest label, and with it any index that has no label.
+    // A walk before the text finds the widest label, and with it any index that has no label.
+    const auto itself = [](int index) { return index; };
+    LabelScan indices = Scan(stream.Threads(), connectivity, itself);
     if (!mesh_) {
-        const auto largest = std::max_element(connectivity.begin(), connectivity.end());
-        WriteRows(
-            stream, [](int index) { return index; }, largest == connectivity.end() ? 0 : *largest,
-            std::ranges::all_of(connectivity, [](int index) { return index >= 0; }));
+        // Where all are negative, the widest is that nearest to 0.
+        if (!connectivity.empty()) indices.largest = *std::ranges::max_element(connectivity);
+        WriteRows(stream, itself, indices);
         return;
     }
     const odiK_NodeData& nodes = mesh_->mesh().Nodes();
-    int largestIndex = 0;
-    unsigned outside = 0;
-    const auto count = static_cast<unsigned>(nodes.NumNodes());
-    for (const int index : connectivity) {
-        largestIndex = std::max(largestIndex, index);
-        outside |= static_cast<unsigned>(static_cast<unsigned>(index) >= count);
-    }
-    if (outside != 0) {
+    if (!indices.areNatural || indices.largest >= nodes.NumNodes()) {
         for (const int index : connectivity) nodes.labels.CheckIndex(index);
     }
     int first = 0;
     if (nodes.index.IsRun(first)) {
-        WriteRows(
-            stream, [first](int index) { return first + index; },
-            connectivity.empty() ? 0 : first + largestIndex, first >= 0);
+        WriteRows(stream, [first](int index) { return first + index; },
+                  {connectivity.empty() ? 0 : first + indices.largest, first >= 0});
         return;
     }
     // The blocks of the label list, so that a look-up reads two addresses and no counts.
@@ -138,22 +163,14 @@ void oif_Element::WriteConnectivity(utl_Stream& stream) const {
     const auto labelOf = [table = blocks.data(), shift, mask, begin](int index) {
         return table[(begin + index) >> shift][(begin + index) & mask];
     };
-    int largest = 0;
-    bool areNatural = true;
-    for (const int index : connectivity) {
-        const int label = labelOf(index);
-        largest = std::max(largest, label);
-        areNatural = areNatural && label >= 0;
-    }
-    WriteRows(stream, labelOf, largest, areNatural);
+    WriteRows(stream, labelOf, Scan(stream.Threads(), connectivity, labelOf));
 }
 
 template <class LabelOf>
-void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode,
-                            bool areNatural) const {
+void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, const LabelScan& scan) const {
     const std::vector<int>& labels = elements_->userElementLabelsAsFlatArray();
     const int numNodes = elements_->numNodesPerElement();
-    const int nodeWidth = std::min(NumDigits(largestNode) + 1, kWidestNodeField);
+    const int nodeWidth = std::min(NumDigits(scan.largest) + 1, kWidestNodeField);
     int largestElement = 0;
     for (const int label : labels) largestElement = std::max(largestElement, label);
     const int elementWidth = NumDigits(largestElement);
@@ -171,7 +188,7 @@ void oif_Element::WriteRows(utl_Stream& stream, const LabelOf& labelOf, int larg
         };
     };
     const std::size_t room = RoomOfRow(numNodes);
-    if (areNatural && largestNode <= static_cast<int>(num_mostInField)) {
+    if (scan.areNatural && scan.largest <= static_cast<int>(num_mostInField)) {
         stream.PrintItems(labels.size(), room, layOut(std::true_type()));
     } else {
         stream.PrintItems(labels.size(), room, layOut(std::false_type()));

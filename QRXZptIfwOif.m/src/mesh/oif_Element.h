@@ -25,9 +25,13 @@ public:
     void Write(utl_Stream& stream) const override;
 
 private:
+    struct LabelScan;
+
     void WriteConnectivity(utl_Stream& stream) const;
     template <class LabelOf>
-    void WriteRows(utl_Stream& stream, const LabelOf& labelOf, int largestNode, bool areNatural) const;
+    static LabelScan Scan(int threads, const std::vector<int>& connectivity, const LabelOf& labelOf);
+    template <class LabelOf>
+    void WriteRows(utl_Stream& stream, const LabelOf& labelOf, const LabelScan& scan) const;
 
     int firstNumber_;
     int secondNumber_;
