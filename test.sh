@@ -6,11 +6,15 @@ usage() {
     cat <<'END'
 usage: test.sh [--long] [PRESET ...]
        test.sh --cluster
+       test.sh --packages
+       test.sh windows | libcxx
 
 Presets: release unless given, whose tests also run on libraries built with the sanitizers; asan
 (everything built with them, the tests too) and debug. --long adds the tests labelled "long",
 which the asan preset always leaves out. --cluster runs studies on Slurm and Snakemake instead, as
-root and in namespaces of its own; it installs both.
+root and in namespaces of its own; it installs both. --packages builds all packages twice, and, as root,
+installs them into a fresh Debian system in a folder. windows builds the program for Windows and runs it
+under Wine; libcxx builds it with clang and libc++. Both compare the golden decks.
 END
 }
 
@@ -18,10 +22,12 @@ cd "$(dirname "${BASH_SOURCE[0]}")"
 select=(--label-exclude '^long$')
 presets=()
 cluster=false
+packages=false
 for argument in "$@"; do
     case $argument in
         --long) select=() ;;
         --cluster) cluster=true ;;
+        --packages) packages=true ;;
         -h | --help) usage; exit 0 ;;
         -*) usage >&2; exit 2 ;;
         *) presets+=("$argument") ;;
@@ -32,6 +38,23 @@ if $cluster; then
     scripts/build.sh release qrxdeck
     exec python3 tests/cluster/cluster_test.py build/release/tools/qrxdeck
 fi
+if $packages; then
+    scripts/install-dependencies.sh packages python
+    exec python3 tests/packages/packages_test.py .
+fi
+# They have no test programs of their own: what they built is run as it is.
+case ${presets[*]-} in
+    windows)
+        scripts/install-dependencies.sh build windows
+        scripts/build-windows.sh
+        exec python3 tests/windows/windows_test.py . build/windows build/windows-package/qrxdeck-*-windows-x86_64.zip
+        ;;
+    libcxx)
+        scripts/install-dependencies.sh build libcxx
+        scripts/build.sh libcxx all
+        exec python3 tests/libcxx/golden_decks_test.py . build/libcxx/tools/qrxdeck build/libcxx/examples/two_instances
+        ;;
+esac
 [ ${#presets[@]} -gt 0 ] || presets=(release)
 
 scripts/install-dependencies.sh test python

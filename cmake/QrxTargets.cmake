@@ -23,11 +23,14 @@ check_pie_supported(LANGUAGES CXX)
 check_cxx_compiler_flag(-fcf-protection=full QRX_HAS_CF_PROTECTION)
 check_cxx_compiler_flag(-fstack-clash-protection QRX_HAS_STACK_CLASH_PROTECTION)
 add_library(qrx_hardened INTERFACE)
-target_compile_options(qrx_hardened INTERFACE
-    $<$<CONFIG:Release>:-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-protector-strong
-        $<$<BOOL:${QRX_HAS_CF_PROTECTION}>:-fcf-protection=full>
-        $<$<BOOL:${QRX_HAS_STACK_CLASH_PROTECTION}>:-fstack-clash-protection>>)
-target_link_options(qrx_hardened INTERFACE $<$<CONFIG:Release>:LINKER:-z,relro,-z,now>)
+# Linkers for Windows guard programs without being told.
+if(NOT WIN32)
+    target_compile_options(qrx_hardened INTERFACE
+        $<$<CONFIG:Release>:-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-protector-strong
+            $<$<BOOL:${QRX_HAS_CF_PROTECTION}>:-fcf-protection=full>
+            $<$<BOOL:${QRX_HAS_STACK_CLASH_PROTECTION}>:-fstack-clash-protection>>)
+    target_link_options(qrx_hardened INTERFACE $<$<CONFIG:Release>:LINKER:-z,relro,-z,now>)
+endif()
 
 # What the second build of each library is made with, that the tests are linked to as well. Optimising would cost
 # more time than it saves the tests.

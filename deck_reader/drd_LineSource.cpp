@@ -1,5 +1,7 @@
 #include "deck_reader/drd_LineSource.h"
 
+#include "foundation/thr_Progress.h"
+
 #include <algorithm>
 
 namespace {
@@ -8,7 +10,8 @@ constexpr std::size_t kBufferBytes = std::size_t{1} << 18;
 
 } // namespace
 
-drd_LineSource::drd_LineSource(std::FILE* file) : file_(file), buffer_(kBufferBytes + 1) {
+drd_LineSource::drd_LineSource(std::FILE* file, thr_Progress* progress)
+    : file_(file), progress_(progress), buffer_(kBufferBytes + 1) {
     // The buffer here is the only one.
     std::setvbuf(file, nullptr, _IONBF, 0);
     at_ = end_ = buffer_.data();
@@ -45,6 +48,7 @@ void drd_LineSource::Fill() {
     if (2 * kept > buffer_.size()) buffer_.resize(2 * buffer_.size());
     const std::size_t room = buffer_.size() - 1 - kept;
     const std::size_t got = std::fread(buffer_.data() + kept, 1, room, file_.get());
+    if (progress_ != nullptr) progress_->Add(static_cast<long long>(got));
     if (got < room) {
         hasFailed_ = std::ferror(file_.get()) != 0;
         atEnd_ = true;

@@ -8,6 +8,8 @@
 #include <string_view>
 #include <vector>
 
+struct thr_Progress;
+
 /// The lines of one file or text, without their ends: "\n", "\r\n" or "\r". A byte order mark is passed over.
 /// A file goes through a buffer of fixed size; a line beyond kLongestLine is cut there, so that no file can
 /// fill the memory with one line. At a zero byte, which no text has, the source ends.
@@ -15,8 +17,8 @@ class drd_LineSource {
 public:
     static constexpr std::size_t kLongestLine = std::size_t{1} << 20;
 
-    /// Takes over an open file.
-    explicit drd_LineSource(std::FILE* file);
+    /// Takes over an open file; null for no progress.
+    explicit drd_LineSource(std::FILE* file, thr_Progress* progress = nullptr);
     explicit drd_LineSource(std::string_view text);
 
     /// The next line; false behind the last. The line lives until the next call, and the byte behind it is
@@ -62,6 +64,7 @@ private:
     void Inspect(char* from);
 
     std::unique_ptr<std::FILE, Closer> file_;
+    thr_Progress* progress_ = nullptr;
     std::vector<char> buffer_;
     std::string cut_;
     const char* at_ = nullptr;

@@ -1,6 +1,7 @@
 #include "deck_reader/drd_Parser.h"
 
 #include "deck_reader/drd_Text.h"
+#include "platform/plt_Files.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -57,8 +58,9 @@ void drd_Parser::OpenFile(const std::filesystem::path& path, drd_Place includedA
         return;
     }
     errno = 0;
-    std::FILE* file =
-        !isMain && !std::filesystem::is_regular_file(path, error) ? nullptr : std::fopen(path.c_str(), "rb");
+    std::FILE* file = !isMain && !std::filesystem::is_regular_file(path, error)
+                          ? nullptr
+                          : plt_OpenStream(path.string().c_str(), "rb");
     if (file == nullptr || std::filesystem::is_directory(path, error)) {
         const int reason = errno;
         if (file != nullptr) std::fclose(file);
@@ -68,8 +70,8 @@ void drd_Parser::OpenFile(const std::filesystem::path& path, drd_Place includedA
         return;
     }
     deck_.files.push_back({path.string(), includedAt});
-    sources_.push_back(std::make_unique<Source>(
-        Source{drd_LineSource(file), static_cast<int>(deck_.files.size()) - 1, canonical}));
+    sources_.push_back(std::make_unique<Source>(Source{drd_LineSource(file, options_.progress),
+                                                       static_cast<int>(deck_.files.size()) - 1, canonical}));
     current_ = sources_.back().get();
 }
 

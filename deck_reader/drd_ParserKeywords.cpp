@@ -1,5 +1,6 @@
 #include "deck_reader/drd_Parser.h"
 #include "deck_reader/drd_Text.h"
+#include "platform/plt_Files.h"
 
 #include <algorithm>
 
@@ -127,8 +128,8 @@ bool drd_Parser::Include(const drd_Keyword& keyword) {
         return true;
     }
     const std::filesystem::path folder =
-        std::filesystem::path(deck_.files[static_cast<std::size_t>(keyword.place.file)].name).parent_path();
-    OpenFile(folder / name, keyword.place);
+        plt_Path(deck_.files[static_cast<std::size_t>(keyword.place.file)].name).parent_path();
+    OpenFile(folder / plt_Path(name), keyword.place);
     return true;
 }
 

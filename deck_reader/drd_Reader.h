@@ -6,6 +6,8 @@
 #include <string>
 #include <string_view>
 
+struct thr_Progress;
+
 /// What is known of an element type; all zero for an unknown one.
 struct drd_TypeInfo {
     int minNodes = 0;
@@ -20,6 +22,8 @@ struct drd_ReadOptions {
     /// What is known of element types; null: of none. Tells a record that goes on behind a comma from one
     /// that merely ends with it.
     drd_TypeInfo (*typeInfo)(std::string_view type) = nullptr;
+    /// Counts the bytes that are read; null: nobody looks.
+    thr_Progress* progress = nullptr;
 };
 
 /// Lines above this many bytes are longer than the language allows.

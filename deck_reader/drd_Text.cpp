@@ -1,5 +1,7 @@
 #include "deck_reader/drd_Text.h"
 
+#include "foundation/num_ReadReal.h"
+
 #include <algorithm>
 #include <array>
 #include <charconv>
@@ -188,7 +190,7 @@ bool drd_ReadReal(std::string_view field, double& value) {
         field = withE;
     }
     double number = 0.0;
-    auto result = std::from_chars(field.data(), field.data() + field.size(), number);
+    const auto result = num_ReadReal(field.data(), field.data() + field.size(), number);
     if (result.ptr != field.data() + field.size()) return false;
     if (result.ec == std::errc::result_out_of_range) {
         // Too small is zero, too large is as large as can be; which of them the exponent's sign tells.

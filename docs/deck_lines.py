@@ -120,9 +120,22 @@ def gone(whole, rest):
 
 
 def aligned(lines, begin, end):
-    """A piece that was cut out shows as well one or more lines up where these repeat: begin at a keyword or comment."""
-    while begin > 0 and end > begin and not lines[begin].startswith("*") and lines[begin - 1] == lines[end - 1]:
-        begin, end = begin - 1, end - 1
-    while begin > 0 and end > begin and lines[begin - 1] == lines[end - 1] and lines[begin - 1].startswith("*"):
-        begin, end = begin - 1, end - 1
-    return lines[begin:end]
+    """A piece that was cut out shows as well some lines up or down where these repeat. The one that reads best: it ends
+    where something ends, begins with a keyword or comment, and doesn't begin with the end of something else."""
+    size = end - begin
+    shifts = [begin]
+    while shifts[-1] > 0 and lines[shifts[-1] - 1] == lines[shifts[-1] + size - 1]:
+        shifts.append(shifts[-1] - 1)
+    down = begin
+    while down + size < len(lines) and lines[down] == lines[down + size]:
+        down += 1
+        shifts.append(down)
+
+    def score(place):
+        piece = [line for line in lines[place:place + size] if not BANNER.match(line)]
+        if not piece:
+            return 0
+        return 4 * piece[-1].startswith("*End") + 2 * piece[0].startswith("*") - 4 * piece[0].startswith("*End")
+
+    best = max(shifts, key=lambda place: (score(place), -abs(place - begin)))
+    return lines[best:best + size]

@@ -1,5 +1,7 @@
 #include "foundation/qio_Device.h"
 
+#include "platform/plt_Files.h"
+
 #include <cerrno>
 
 namespace {
@@ -16,11 +18,11 @@ std::size_t WriteToFile(const char* text, std::size_t bytes, std::FILE* file) {
 }
 
 constexpr qio_System kStandardSystem{
-    [](const char* path, const char* mode) { return std::fopen(path, mode); },
+    plt_OpenStream,
     WriteToFile,
     [](std::FILE* file) { return std::fflush(file); },
     [](std::FILE* file) { return std::fclose(file); },
-    [](const char* path) { return std::remove(path); },
+    [](const char* path) { return plt_Remove(plt_kHere, path); },
 };
 
 thread_local qio_Report lastReport;

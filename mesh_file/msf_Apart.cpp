@@ -1,14 +1,12 @@
 #include "mesh_file/msf_Apart.h"
 
 #include "mesh_file/msf_Source.h"
+#include "platform/plt_Files.h"
+#include "platform/plt_Process.h"
 
 #include <cerrno>
 #include <cstdint>
-#include <cstring>
-#include <sys/resource.h>
-#include <sys/wait.h>
 #include <system_error>
-#include <unistd.h>
 
 namespace {
 
@@ -20,9 +18,9 @@ public:
     void Bytes(const void* data, std::size_t size) {
         const char* at = static_cast<const char*>(data);
         while (size > 0) {
-            const ssize_t written = write(pipe_, at, size);
+            const ssize_t written = plt_Write(pipe_, at, size);
             if (written < 0 && errno == EINTR) continue;
-            if (written <= 0) _exit(1);
+            if (written <= 0) plt_EndNow(1);
             at += written;
             size -= static_cast<std::size_t>(written);
         }
@@ -100,7 +98,7 @@ private:
     void Bytes(void* data, std::size_t size) {
         char* at = static_cast<char*>(data);
         while (whole_ && size > 0) {
-            const ssize_t got = ::read(pipe_, at, size);
+            const ssize_t got = plt_Read(pipe_, at, size);
             if (got < 0 && errno == EINTR) continue;
             whole_ = got > 0;
             if (!whole_) return;
@@ -131,38 +129,22 @@ private:
 
 void msf_ReadApart(void (*readHere)(const msf_Input& input, const msf_Options& options, msf_Mesh& mesh),
                    const msf_Input& input, const msf_Options& options, msf_Mesh& mesh) {
-    int ends[2];
-    if (pipe(ends) != 0) FailForTheSystem();
-    const pid_t child = fork();
-    if (child < 0) {
-        const int error = errno;
-        close(ends[0]);
-        close(ends[1]);
-        errno = error;
-        FailForTheSystem();
-    }
-    if (child == 0) {
-        close(ends[0]);
-        const rlimit noCore{0, 0};
-        setrlimit(RLIMIT_CORE, &noCore);
-        Sender sender(ends[1]);
+    const auto work = [&](int pipe) {
+        Sender sender(pipe);
         try {
             readHere(input, options, mesh);
             sender.Mesh(mesh);
         } catch (const msf_Failure& failure) {
             sender.Problem(failure.problem);
-        } catch (...) {
-            _exit(1);
         }
-        _exit(0);
-    }
-    close(ends[1]);
+        return true;
+    };
     msf_Problem problem;
-    const bool whole = Receiver(ends[0]).Mesh(mesh, problem);
-    close(ends[0]);
-    int status = 0;
-    while (waitpid(child, &status, 0) < 0 && errno == EINTR) continue;
-    if (!whole || status != 0) {
+    bool whole = false;
+    const auto take = [&](int pipe) { whole = Receiver(pipe).Mesh(mesh, problem); };
+    const plt_ApartEnm ended = plt_RunApart(work, take);
+    if (ended == plt_ApartEnm::NO_PROCESS) FailForTheSystem();
+    if (!whole || ended == plt_ApartEnm::DIED) {
         mesh = msf_Mesh();
         msf_Fail("", "the library that reads the format failed on the file", "a whole file");
     }

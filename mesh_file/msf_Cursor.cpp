@@ -1,5 +1,7 @@
 #include "mesh_file/msf_Cursor.h"
 
+#include "foundation/num_ReadReal.h"
+
 #include <algorithm>
 #include <charconv>
 
@@ -76,7 +78,7 @@ double msf_Cursor::Real(const char* expected) {
     const char* begin = bytes_.data() + at_;
     if (begin != end && *begin == '+') ++begin;
     double value = 0.0;
-    const auto [stop, error] = std::from_chars(begin, end, value);
+    const auto [stop, error] = num_ReadReal(begin, end, value);
     if (error == std::errc() && (stop == end || IsBlank(*stop))) {
         word_ = at_;
         at_ = static_cast<std::size_t>(stop - bytes_.data());
@@ -89,7 +91,7 @@ double msf_Cursor::Real(const char* expected) {
     std::replace(word.begin(), word.end(), 'd', 'e');
     const char* const first = word.data() + (word.front() == '+' ? 1 : 0);
     const char* const last = word.data() + word.size();
-    const auto [rest, problem] = std::from_chars(first, last, value);
+    const auto [rest, problem] = num_ReadReal(first, last, value);
     const bool tiny = problem == std::errc::result_out_of_range && word.find("e-") != std::string::npos;
     if (rest != last || (problem != std::errc() && !tiny)) FailAtWord("found " + msf_Shown(given), expected);
     return tiny ? 0.0 : value;

@@ -1,11 +1,8 @@
 #include "mesh_file/msf_Source.h"
 
+#include <algorithm>
 #include <cerrno>
-#include <fcntl.h>
-#include <sys/mman.h>
-#include <sys/stat.h>
 #include <system_error>
-#include <unistd.h>
 
 namespace {
 
@@ -56,26 +53,11 @@ std::string msf_Counted(long long count, const char* thing) {
     return std::to_string(count) + " " + thing + (count == 1 ? "" : "s");
 }
 
-msf_MappedFile::msf_MappedFile(const std::string& path) {
-    // A pipe without a writer would hang an ordinary open.
-    const int file = open(path.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
-    if (file < 0) FailWithReason(errno);
-    struct stat status {};
-    if (fstat(file, &status) != 0 || !S_ISREG(status.st_mode)) {
-        const bool folder = S_ISDIR(status.st_mode);
-        close(file);
-        FailToOpen(folder ? "the file can't be read: it is a directory"
-                          : "the file can't be read: it is no regular file");
+msf_MappedFile::msf_MappedFile(const std::string& path) : file_(path) {
+    switch (file_.Error()) {
+    case 0: return;
+    case EISDIR: FailToOpen("the file can't be read: it is a directory");
+    case ENOTSUP: FailToOpen("the file can't be read: it is no regular file");
+    default: FailWithReason(file_.Error());
     }
-    size_ = static_cast<std::size_t>(status.st_size);
-    void* mapped = size_ == 0 ? nullptr : mmap(nullptr, size_, PROT_READ, MAP_PRIVATE, file, 0);
-    const int error = errno;
-    close(file);
-    if (mapped == MAP_FAILED) FailWithReason(error);
-    begin_ = static_cast<const char*>(mapped);
-    if (mapped != nullptr) madvise(mapped, size_, MADV_SEQUENTIAL);
-}
-
-msf_MappedFile::~msf_MappedFile() {
-    if (begin_ != nullptr) munmap(const_cast<char*>(begin_), size_);
 }

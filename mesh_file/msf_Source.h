@@ -1,6 +1,8 @@
 #ifndef QRX_MESH_FILE_MSF_SOURCE_H
 #define QRX_MESH_FILE_MSF_SOURCE_H
 
+#include "platform/plt_MappedFile.h"
+
 #include <cstddef>
 #include <string>
 #include <string_view>
@@ -34,15 +36,10 @@ class msf_MappedFile {
 public:
     /// Raises msf_Failure for what is no regular file, or can't be opened.
     explicit msf_MappedFile(const std::string& path);
-    msf_MappedFile(const msf_MappedFile&) = delete;
-    msf_MappedFile& operator=(const msf_MappedFile&) = delete;
-    ~msf_MappedFile();
-
-    std::string_view Bytes() const { return {begin_, size_}; }
+    std::string_view Bytes() const { return file_.Bytes(); }
 
 private:
-    const char* begin_ = nullptr;
-    std::size_t size_ = 0;
+    plt_MappedFile file_;
 };
 
 #endif

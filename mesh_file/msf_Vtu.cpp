@@ -2,6 +2,7 @@
 #include "mesh_file/msf_VtkGrid.h"
 
 #include <algorithm>
+#ifdef QRX_HAS_PUGIXML
 #include <pugixml.hpp>
 #include <zlib.h>
 
@@ -347,10 +348,19 @@ void VtuReader::Decompress(msf_NumberArray& array, std::string_view stored, cons
 
 } // namespace
 
-bool msf_IsVtu(std::string_view bytes) {
-    return bytes.substr(0, 1024).find("<VTKFile") != std::string_view::npos;
-}
-
 void msf_ReadVtu(const msf_Input& input, const msf_Options& options, msf_Mesh& mesh) {
     VtuReader(input.bytes, options, mesh).Read();
+}
+
+#else
+
+void msf_ReadVtu(const msf_Input&, const msf_Options&, msf_Mesh&) {
+    msf_Fail("", "found a VTU file, and this program was built without pugixml and zlib",
+             "a program built where both are installed, or the mesh as MSH, VTK or UNV");
+}
+
+#endif
+
+bool msf_IsVtu(std::string_view bytes) {
+    return bytes.substr(0, 1024).find("<VTKFile") != std::string_view::npos;
 }

@@ -2,6 +2,7 @@
 
 #include "deck_reader/drd_Reader.h"
 #include "deck_reader/drd_Text.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 
@@ -30,11 +31,11 @@ const char* EndingOf(drd_KindEnm kind) {
 } // namespace
 
 bool mdf_DeckMesh::IsDeck(const std::string& path) {
-    if (drd_FoldKey(std::filesystem::path(path).extension().string()) == ".inp") return true;
+    if (drd_FoldKey(plt_Path(path).extension().string()) == ".inp") return true;
     std::error_code error;
-    if (!std::filesystem::is_regular_file(path, error)) return false;
+    if (!std::filesystem::is_regular_file(plt_Path(path), error)) return false;
     // The formats of meshers begin with other characters.
-    std::ifstream file(path, std::ios::binary);
+    std::ifstream file(plt_Path(path), std::ios::binary);
     char first = '\0';
     return static_cast<bool>(file.get(first)) && first == '*';
 }

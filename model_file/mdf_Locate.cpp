@@ -2,6 +2,7 @@
 
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
+#include "platform/plt_Files.h"
 
 #include <algorithm>
 #include <charconv>
@@ -177,7 +178,7 @@ private:
 };
 
 long long TimeOf(const std::string& path, std::error_code& error) {
-    return std::filesystem::last_write_time(path, error).time_since_epoch().count();
+    return std::filesystem::last_write_time(plt_Path(path), error).time_since_epoch().count();
 }
 
 } // namespace
@@ -232,16 +233,16 @@ std::vector<std::size_t> mdf_RepeatedMembers(std::string_view text, std::size_t 
 
 mdf_FileText::mdf_FileText(const std::string& path) : path_(path) {
     std::error_code error;
-    isFile_ = std::filesystem::is_regular_file(path, error);
+    isFile_ = std::filesystem::is_regular_file(plt_Path(path), error);
     if (!isFile_) return;
-    size_ = static_cast<long long>(std::filesystem::file_size(path, error));
+    size_ = static_cast<long long>(std::filesystem::file_size(plt_Path(path), error));
     time_ = TimeOf(path, error);
     isFile_ = !error;
 }
 
 bool mdf_FileText::IsUnchanged() const {
     std::error_code error;
-    return static_cast<long long>(std::filesystem::file_size(path_, error)) == size_ && !error &&
+    return static_cast<long long>(std::filesystem::file_size(plt_Path(path_), error)) == size_ && !error &&
            TimeOf(path_, error) == time_ && !error;
 }
 

@@ -3,6 +3,7 @@
 #include "mesh_file/msf_MeshFile.h"
 #include "model_file/mdf_DeckMesh.h"
 #include "model_file/mdf_MeshImport.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_TextRules.h"
 
 #include <cmath>
@@ -22,7 +23,7 @@ bool mdf_MeshFileReader::Read(odiK_Mesh& mesh, const mdf_Value& json, const fnd_
     const fnd_Path place(path, "file");
     if (mdf_DeckMesh::IsDeck(request.path)) {
         std::error_code error;
-        if (!std::filesystem::is_regular_file(request.path, error)) {
+        if (!std::filesystem::is_regular_file(plt_Path(request.path), error)) {
             diagnostics_.Add("unreadable-file", place, request.path + ": there is no such file");
             diagnostics_.SetUnreadable();
             return false;
@@ -97,7 +98,7 @@ void mdf_MeshFileReader::ReadFileName(mdf_MeshFileRequest& request, const mdf_Va
         diagnostics_.Expected(path, json, "the path of a mesher's file");
         return;
     }
-    request.path = (std::filesystem::path(diagnostics_.FileName()).parent_path() / json.String()).string();
+    request.path = (plt_Path(diagnostics_.FileName()).parent_path() / plt_Path(json.String())).string();
 }
 
 void mdf_MeshFileReader::ReadElementTypes(mdf_MeshFileRequest& request, const mdf_Value& json,

@@ -1,6 +1,7 @@
 #include "model_file/mdf_MeshShelf.h"
 
 #include "model_file/mdf_Pointer.h"
+#include "platform/plt_Files.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -45,7 +46,7 @@ mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& p
     if (!changed) return place;
     const mdf_Value* file = json.IsObject() ? json.Find("file") : nullptr;
     if (file == nullptr || !file->IsString()) return {};
-    const std::string state = StateOf(std::filesystem::path(modelFile).parent_path() / file->String());
+    const std::string state = StateOf(plt_Path(modelFile).parent_path() / plt_Path(file->String()));
     return state.empty() ? Key() : place + "\n" + state + "\n" + mdf_JsonText(json);
 }
 

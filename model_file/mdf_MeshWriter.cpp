@@ -1,5 +1,7 @@
 #include "model_file/mdf_MeshWriter.h"
 
+#include "platform/plt_Files.h"
+
 #include <filesystem>
 
 namespace {
@@ -24,13 +26,14 @@ const odiK_Instance* InstanceOf(const odiK_Model& model, int meshIndex) {
 } // namespace
 
 void mdf_MeshWriter::WriteOrigin(const mdf_MeshOrigin& origin) {
-    const std::filesystem::path given(origin.given.Find("file")->String());
+    const std::filesystem::path given = plt_Path(origin.given.Find("file")->String());
     out_.BeginObject();
     for (const mdf_Member& member : origin.given.Members()) {
         out_.Key(member.name);
         if (member.name == "file" && given.is_relative()) {
             out_.String(
-                std::filesystem::proximate(origin.path, folder_.empty() ? "." : folder_).generic_string());
+                std::filesystem::proximate(plt_Path(origin.path), plt_Path(folder_.empty() ? "." : folder_))
+                    .generic_string());
         } else {
             out_.Value(member.value);
         }

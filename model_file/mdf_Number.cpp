@@ -1,5 +1,7 @@
 #include "model_file/mdf_Number.h"
 
+#include "foundation/num_ReadReal.h"
+
 #include <algorithm>
 #include <charconv>
 #include <cmath>
@@ -93,7 +95,7 @@ mdf_Number mdf_ReadAnyNumber(const char* at, const char* end) {
         if (std::from_chars(at, parts.end, value).ec == std::errc()) return Whole(value, parts.end);
     }
     number.kind = parts.isWhole ? mdf_Number::Kind::LARGE : mdf_Number::Kind::REAL;
-    const bool isInRange = std::from_chars(at, parts.end, number.value).ec == std::errc();
+    const bool isInRange = num_ReadReal(at, parts.end, number.value).ec == std::errc();
     if (isInRange && !std::isinf(number.value)) return number;
     if (PowerOf(parts) > 0) {
         number.kind = mdf_Number::Kind::BEYOND;

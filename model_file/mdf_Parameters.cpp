@@ -1,5 +1,6 @@
 #include "model_file/mdf_Parameters.h"
 
+#include "foundation/num_ReadReal.h"
 #include "model_file/mdf_Members.h"
 #include "model_file/mdf_Pointer.h"
 #include "model_file/mdf_Writer.h"
@@ -21,7 +22,7 @@ std::string_view Trimmed(std::string_view text) {
 std::optional<double> NumberOf(std::string_view text) {
     text = Trimmed(text);
     double value = 0.0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+    const auto [end, error] = num_ReadReal(text.data(), text.data() + text.size(), value);
     if (error != std::errc() || end != text.data() + text.size() || !(value - value == 0.0))
         return std::nullopt;
     return value;

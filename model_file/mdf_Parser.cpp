@@ -7,6 +7,7 @@
 #include "model_file/mdf_Token.h"
 #include "model_file/mdf_TreeBuilder.h"
 #include "model_file/mdf_Utf8.h"
+#include "platform/plt_Files.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -425,13 +426,13 @@ bool mdf_ReadFile(const std::string& path, std::string& text, fnd_Finding& error
     std::FILE* opened = nullptr;
     do {
         errno = 0;
-        opened = std::fopen(path.c_str(), "rb");
+        opened = plt_OpenStream(path.c_str(), "rb");
     } while (opened == nullptr && errno == EINTR);
     const std::unique_ptr<std::FILE, int (*)(std::FILE*)> file(opened, std::fclose);
     if (!file) return fail(errno);
     std::setvbuf(file.get(), nullptr, _IONBF, 0);
     std::error_code unknown;
-    const std::uintmax_t size = std::filesystem::file_size(path, unknown);
+    const std::uintmax_t size = std::filesystem::file_size(plt_Path(path), unknown);
     // One byte more finds the end in the same read; pipes, of unknown size, take further rounds.
     text.resize(unknown ? 1 : static_cast<std::size_t>(size) + 1);
     std::size_t length = 0;

@@ -1,5 +1,6 @@
 #include "model_file/mdf_Writer.h"
 
+#include "foundation/num_ReadReal.h"
 #include "model_file/mdf_Utf8.h"
 
 #include <algorithm>
@@ -108,7 +109,7 @@ void mdf_Writer::Real(float value) {
     std::array<char, 40> digits;
     char* end = std::to_chars(digits.data(), digits.data() + digits.size() - 2, value).ptr;
     double read = 0.0;
-    const bool isRead = std::from_chars(digits.data(), end, read).ec == std::errc();
+    const bool isRead = num_ReadReal(digits.data(), end, read).ec == std::errc();
     // A text half way between two floats may round to the other one.
     if (isRead && std::isfinite(value) && static_cast<float>(read) == value) {
         RealText(digits.data(), end);

@@ -1,6 +1,7 @@
 #include "python/pyx_Errors.h"
 
 #include "foundation/nex_Exception.h"
+#include "platform/plt_Files.h"
 #include "python/pyx_Hooks.h"
 #include "whole_file/whf_File.h"
 
@@ -30,7 +31,7 @@ void pyx_RaiseUnreadable(const std::vector<fnd_Finding>& findings) {
         const std::string path = text.substr(0, end);
         // The system says its number again.
         errno = 0;
-        std::FILE* file = std::fopen(path.c_str(), "rb");
+        std::FILE* file = plt_OpenStream(path.c_str(), "rb");
         const int error = file == nullptr ? errno : 0;
         if (file != nullptr) std::fclose(file);
         throw pyx_FileRefused{error, text.substr(end + 2), path};

@@ -4,7 +4,7 @@ set -euo pipefail
 
 usage() {
     cat <<'END'
-usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs] ...
+usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs|packages|windows|libcxx] ...
 
   build   compiler, build tools and libraries of qrxdeck (default)
   test    build, and what the tests need
@@ -15,6 +15,9 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs]
   cluster test, and the schedulers that run the shards of studies
   python  build, and what the package for Python is built, used and tested with
   docs    build, and what the manual is built and checked with
+  packages  build, and what packages are built and tested with
+  windows   build, and what qrxdeck.exe is built and tested with
+  libcxx    build, and clang with its own standard library
 END
 }
 
@@ -27,23 +30,30 @@ cluster=(slurmctld slurmd slurm-client munge snakemake iproute2 util-linux)
 python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind11 python3-numpy python3-pytest mypy)
 docs=(doxygen python3-sphinx python3-myst-parser python3-breathe furo python3-sphinxcontrib.spelling hunspell-en-gb)
 
+packages=(dpkg-dev gzip xz-utils lintian debootstrap python3)
+windows=(g++-mingw-w64-x86-64-posix libz-mingw-w64-dev wine64 wine unzip python3)
+libcxx=(clang-16 libc++-16-dev libc++abi-16-dev python3)
+
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.
 command -v node >/dev/null && command -v npm >/dev/null || viewer+=(nodejs npm)
 
 [ $# -gt 0 ] || set -- build
 with_page=false
-packages=("${build[@]}")
+wanted=("${build[@]}")
 for task in "$@"; do
     case $task in
         build) ;;
-        test) packages+=("${test[@]}") ;;
-        bench) packages+=("${bench[@]}") ;;
-        dev) packages+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}" "${docs[@]}") ;;
-        cluster) packages+=("${test[@]}" "${cluster[@]}") ;;
-        python) packages+=("${python[@]}") ;;
-        docs) packages+=("${docs[@]}") ;;
-        viewer) packages+=("${viewer[@]}") && with_page=true ;;
+        test) wanted+=("${test[@]}") ;;
+        bench) wanted+=("${bench[@]}") ;;
+        dev) wanted+=("${test[@]}" "${bench[@]}" "${dev[@]}" "${python[@]}" "${docs[@]}") ;;
+        cluster) wanted+=("${test[@]}" "${cluster[@]}") ;;
+        python) wanted+=("${python[@]}") ;;
+        docs) wanted+=("${docs[@]}") ;;
+        packages) wanted+=("${packages[@]}") ;;
+        windows) wanted+=("${windows[@]}") ;;
+        libcxx) wanted+=("${libcxx[@]}") ;;
+        viewer) wanted+=("${viewer[@]}") && with_page=true ;;
         -h | --help) usage; exit 0 ;;
         *) usage >&2; exit 2 ;;
     esac
@@ -59,13 +69,13 @@ install_page_packages() {
 }
 
 if ! command -v dpkg-query >/dev/null; then
-    echo "install-dependencies: not a Debian system; make sure that these are there: ${packages[*]}" >&2
+    echo "install-dependencies: not a Debian system; make sure that these are there: ${wanted[*]}" >&2
     if $with_page && command -v npm >/dev/null; then install_page_packages; fi
     exit 0
 fi
 
 missing=()
-for package in "${packages[@]}"; do
+for package in "${wanted[@]}"; do
     status=$(dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null || true)
     [ "$status" = installed ] || missing+=("$package")
 done

@@ -1,12 +1,11 @@
 #include "study/sty_DeckText.h"
 
+#include "platform/plt_Files.h"
 #include "store_interface/model/odb_Odb.h"
 #include "study/sty_File.h"
 
 #include <algorithm>
 #include <cerrno>
-
-#include <sys/uio.h>
 
 namespace {
 
@@ -16,7 +15,6 @@ constexpr std::size_t kFewMeshes = 2;
 constexpr std::size_t kMostMeshBytes = std::size_t{256} << 20;
 constexpr std::size_t kMostSummed = 8;
 constexpr std::size_t kBytesOfMark = std::size_t{2} * 1024;
-constexpr int kMostVectors = 64;
 
 } // namespace
 
@@ -141,9 +139,9 @@ std::string sty_DeckText::Sha256() {
 }
 
 int sty_DeckText::WriteTo(int file) const {
-    std::vector<iovec> vectors;
+    std::vector<plt_Piece> left;
     const auto add = [&](std::string_view text) {
-        if (!text.empty()) vectors.push_back({const_cast<char*>(text.data()), text.size()});
+        if (!text.empty()) left.push_back({text.data(), text.size()});
     };
     const std::string_view own = own_;
     std::size_t written = 0;
@@ -153,21 +151,20 @@ int sty_DeckText::WriteTo(int file) const {
         written = piece.ownEnd;
     }
     add(own.substr(written));
-    for (std::size_t first = 0; first < vectors.size();) {
-        const int count = static_cast<int>(std::min<std::size_t>(vectors.size() - first, kMostVectors));
+    for (std::size_t first = 0; first < left.size();) {
         errno = 0;
-        const ssize_t taken = ::writev(file, vectors.data() + first, count);
+        const ssize_t taken = plt_WritePieces(file, left.data() + first, left.size() - first);
         if (taken <= 0) {
             if (errno == EINTR) continue;
             return errno != 0 ? errno : EIO;
         }
-        for (auto left = static_cast<std::size_t>(taken); left > 0;) {
-            iovec& vector = vectors[first];
-            const std::size_t step = std::min(left, vector.iov_len);
-            vector.iov_base = static_cast<char*>(vector.iov_base) + step;
-            vector.iov_len -= step;
-            left -= step;
-            if (vector.iov_len == 0) ++first;
+        for (auto bytes = static_cast<std::size_t>(taken); bytes > 0;) {
+            plt_Piece& piece = left[first];
+            const std::size_t step = std::min(bytes, piece.bytes);
+            piece.text += step;
+            piece.bytes -= step;
+            bytes -= step;
+            if (piece.bytes == 0) ++first;
         }
     }
     return 0;

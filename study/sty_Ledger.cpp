@@ -1,15 +1,12 @@
 #include "study/sty_Ledger.h"
 
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "study/sty_Json.h"
 
 #include <cerrno>
 #include <charconv>
 #include <cstdio>
-
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace {
 
@@ -199,10 +196,9 @@ long long sty_Ledger::TakeUp(sty_DoneRows& done) {
 }
 
 void sty_Ledger::Open() {
-    file_ = sty_Descriptor(::openat(folder_.Number(), name_.c_str(),
-                                    O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0666));
-    struct stat found = {};
-    if (!file_.IsOpen() || ::fstat(file_.Number(), &found) != 0)
+    file_ = sty_Descriptor(plt_OpenToAppend(folder_.Number(), name_.c_str()));
+    plt_Status found = {};
+    if (!file_.IsOpen() || plt_InspectOpen(file_.Number(), &found) != 0)
         throw sty_Refused("cannot open " + fnd_Quoted(Path()) + ": " + sty_ReasonOf(errno));
     bytes_ = found.st_size;
 }
@@ -211,7 +207,7 @@ void sty_Ledger::Append(const std::string& line) {
     const std::lock_guard<std::mutex> lock(mutex_);
     if (const int error = whf_WriteAll(file_.Number(), line); error != 0) {
         // A line that is cut off would spoil the next one.
-        static_cast<void>(::ftruncate(file_.Number(), bytes_) == 0);
+        plt_Truncate(file_.Number(), bytes_);
         throw sty_Refused("cannot write " + fnd_Quoted(Path()) + ": " + sty_ReasonOf(error));
     }
     bytes_ += static_cast<long long>(line.size());

@@ -1,3 +1,4 @@
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "study/sty_Identity.h"
 #include "study/sty_Study.h"
@@ -5,9 +6,6 @@
 #include <algorithm>
 #include <cerrno>
 #include <filesystem>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace {
 
@@ -23,7 +21,7 @@ struct LinePlace {
 std::vector<std::string> LedgersIn(const std::string& folder) {
     std::vector<std::string> ledgers;
     std::error_code error;
-    for (const auto& entry : std::filesystem::directory_iterator(folder, error)) {
+    for (const auto& entry : std::filesystem::directory_iterator(plt_Path(folder), error)) {
         if (sty_Ledger::IsLedger(entry.path().filename().string())) ledgers.push_back(entry.path().string());
     }
     std::ranges::sort(ledgers);
@@ -32,7 +30,7 @@ std::vector<std::string> LedgersIn(const std::string& folder) {
 
 std::string LineAt(const sty_Descriptor& file, const LinePlace& place, const std::string& path) {
     std::string line(static_cast<std::size_t>(place.bytes), '\0');
-    if (::pread(file.Number(), line.data(), line.size(), place.begin) != place.bytes)
+    if (plt_ReadAt(file.Number(), line.data(), line.size(), place.begin) != place.bytes)
         throw sty_Refused("cannot read " + fnd_Quoted(path) + ": " + sty_ReasonOf(errno));
     return line;
 }
@@ -83,7 +81,7 @@ private:
 
 sty_Merged sty_Merge(const std::string& path) {
     std::error_code error;
-    if (!std::filesystem::is_directory(path, error)) throw sty_NoStudy("there is no such folder");
+    if (!std::filesystem::is_directory(plt_Path(path), error)) throw sty_NoStudy("there is no such folder");
     sty_Folder folder(path);
     const std::optional<std::string> text = folder.Read(sty_Folder::kIdentity);
     const std::optional<sty_Identity> identity = text ? sty_Identity::Of(*text) : std::nullopt;
@@ -97,7 +95,7 @@ sty_Merged sty_Merge(const std::string& path) {
     std::vector<LinePlace> places;
     for (const std::string& ledger : ledgers) {
         const auto number = static_cast<short>(files.size());
-        files.emplace_back(::open(ledger.c_str(), O_RDONLY | O_CLOEXEC));
+        files.emplace_back(plt_OpenToRead(ledger.c_str()));
         sty_ForEachLine(ledger, [&](std::string_view line, long long begin) {
             const std::optional<sty_Entry> entry = sty_EntryOf(line);
             if (!entry || entry->row < 1 || entry->row > identity->rows) return;

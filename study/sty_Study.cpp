@@ -1,6 +1,7 @@
 #include "study/sty_Study.h"
 
 #include "foundation/nex_Exception.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odb_Odb.h"
 #include "study/sty_Identity.h"
@@ -119,7 +120,7 @@ private:
     }
 
     void CheckTableIsNoLedger() const {
-        const std::filesystem::path table(request_.table);
+        const std::filesystem::path table = plt_Path(request_.table);
         bool isLedger = false;
         if (sty_Ledger::IsLedger(table.filename().string())) {
             sty_ForEachLine(request_.table, [&](std::string_view line, long long begin) {
@@ -166,7 +167,7 @@ private:
     /// What a run that was killed was about to put in its place.
     void RemoveUnplaced() const {
         const auto folderOf = [&](long long row) {
-            return std::filesystem::path(layout_.PathOf(row, {})).parent_path().string();
+            return plt_Path(layout_.PathOf(row, {})).parent_path().string();
         };
         for (long long row = rows_.first; row <= rows_.last; row += sty_Layout::kMostEntries)
             folder_->RemoveUnplaced(folderOf(row), PlacerName());
@@ -195,7 +196,7 @@ private:
         const std::string sameDivision =
             own.substr(own.find("-of-") == std::string::npos ? 0 : own.find("-of-"));
         std::error_code error;
-        for (const auto& entry : std::filesystem::directory_iterator(request_.out, error)) {
+        for (const auto& entry : std::filesystem::directory_iterator(plt_Path(request_.out), error)) {
             const std::string name = entry.path().filename().string();
             if (!sty_Ledger::IsLedger(name) || name.ends_with(sameDivision)) continue;
             sty_ForEachLine(entry.path().string(), [&](std::string_view line, long long) {

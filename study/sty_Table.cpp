@@ -1,8 +1,10 @@
 #include "study/sty_Table.h"
 
+#include "foundation/num_ReadReal.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Pointer.h"
 #include "model_file/mdf_Utf8.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "study/sty_Json.h"
 
@@ -72,7 +74,7 @@ bool ReadNumber(std::string_view text, mdf_Value& value) {
         return true;
     }
     double number = 0.0;
-    if (std::from_chars(text.data(), end, number).ec != std::errc()) return false;
+    if (num_ReadReal(text.data(), end, number).ec != std::errc()) return false;
     value = mdf_Value(number);
     return true;
 }
@@ -129,7 +131,7 @@ std::string ProblemOfDeckName(std::string_view name) {
 } // namespace
 
 sty_Table::Kind sty_Table::KindOf(const std::string& path) {
-    const std::string ending = fnd_LowerCase(std::filesystem::path(path).extension().string());
+    const std::string ending = fnd_LowerCase(plt_Path(path).extension().string());
     if (ending == ".csv") return Kind::CSV;
     if (ending == ".tsv" || ending == ".tab") return Kind::TSV;
     if (ending == ".jsonl" || ending == ".ndjson") return Kind::JSON_LINES;

@@ -1,5 +1,6 @@
 #include "deck_reader/drd_Check.h"
 #include "deck_reader/drd_Text.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 #include "tools/DeckCommands.h"
@@ -43,12 +44,12 @@ const fnd_Code& CodeOf(const drd_Code& code) {
 } // namespace
 
 bool IsDeck(const std::string& path) {
-    const std::string extension = drd_FoldKey(std::filesystem::path(path).extension().string());
+    const std::string extension = drd_FoldKey(plt_Path(path).extension().string());
     if (extension == ".inp") return true;
     if (extension == ".json") return false;
     std::error_code error;
-    if (!std::filesystem::is_regular_file(path, error)) return false;
-    std::ifstream file(path, std::ios::binary);
+    if (!std::filesystem::is_regular_file(plt_Path(path), error)) return false;
+    std::ifstream file(plt_Path(path), std::ios::binary);
     char first = '\0';
     return static_cast<bool>(file >> first) && first == '*';
 }
@@ -57,11 +58,20 @@ drd_ReadOptions DeckOptions(const DeckRequest& request) {
     drd_ReadOptions options;
     options.followIncludes = !request.keepIncludesShut;
     options.typeInfo = &InfoOf;
+    options.progress = request.progress;
     return options;
 }
 
 drd_Deck ReadDeck(const std::string& path, const DeckRequest& request, drd_Findings& findings) {
     return drd_ReadDeck(path, DeckOptions(request), findings);
+}
+
+drd_Deck ReadDeckWatched(const std::string& path, const DeckRequest& request, drd_Findings& findings,
+                         RunReport& report) {
+    report.Watched().Begin("reading", path);
+    DeckRequest watched = request;
+    watched.progress = &report.Watched().Work();
+    return ReadDeck(path, watched, findings);
 }
 
 void AddFindings(const drd_Deck& deck, const drd_Findings& findings, RunReport& report) {
@@ -80,8 +90,9 @@ void AddFindings(const drd_Deck& deck, const drd_Findings& findings, RunReport& 
 
 ExitCode RunCheckDeck(const std::string& path, const DeckRequest& request, RunReport& report) {
     drd_Findings findings;
-    const drd_Deck deck = ReadDeck(path, request, findings);
+    const drd_Deck deck = ReadDeckWatched(path, request, findings, report);
     const bool unreadable = deck.files.size() == 1 && findings.Counts().contains("deck-unreadable");
+    report.Watched().Begin("checking", path);
     if (!unreadable) drd_CheckDeck(deck, DeckOptions(request), findings);
     AddFindings(deck, findings, report);
     if (unreadable) return ExitCode::FILE_SYSTEM_REFUSED;

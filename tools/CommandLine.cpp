@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/OutOfMemory.h"
+#include "tools/Program.h"
 #include "tools/VariableList.h"
 
 #include <algorithm>
@@ -52,7 +53,7 @@ std::vector<std::string> SplitAtCommas(const std::string& text) {
 } // namespace
 
 CommandLine::CommandLine() : app_(kAbout, kProgram) {
-    app_.set_version_flag("--version", "qrxdeck " QRX_VERSION, "Print the version");
+    app_.set_version_flag("--version", ProgramVersion(), "Print the version");
     app_.set_help_flag("-h,--help", "Print this help");
     app_.require_subcommand(1);
     // Options of the program may stand behind the command too.

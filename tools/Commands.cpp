@@ -10,6 +10,7 @@
 #include "model_file/mdf_ModelFile.h"
 #include "model_file/mdf_Parser.h"
 #include "model_file/mdf_Token.h"
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
@@ -190,7 +191,7 @@ std::string ProblemOf(const WriteRequest& request, const std::string& target, bo
     if (target.empty() && request.job.empty())
         return "a model from the standard input has no name: --job NAME or -o FILE says where its deck goes";
     if (target.empty()) return "the job " + fnd_Quoted(request.job) + " names no file";
-    if (!request.outputDir.empty() && std::filesystem::path(request.job).is_absolute()) {
+    if (!request.outputDir.empty() && plt_Path(request.job).is_absolute()) {
         return "the job " + fnd_Quoted(request.job) +
                " is an absolute path, so it can't stand in the folder " + fnd_Quoted(request.outputDir);
     }
@@ -206,10 +207,10 @@ std::string DeckTargetOf(const WriteRequest& request) {
     if (!request.output.empty()) return request.output;
     if (request.job == kStandardStream) return kStandardStream;
     if (request.job.empty() && request.model == kStandardStream) return {};
-    const std::filesystem::path job = request.job.empty() ? std::filesystem::path(request.model).stem()
-                                                          : std::filesystem::path(request.job);
+    const std::filesystem::path job =
+        request.job.empty() ? plt_Path(request.model).stem() : plt_Path(request.job);
     if (!job.has_filename() || job.filename() == "." || job.filename() == "..") return {};
-    std::filesystem::path target = std::filesystem::path(request.outputDir) / job;
+    std::filesystem::path target = plt_Path(request.outputDir) / job;
     if (request.job.empty() || job.extension() != ".inp") target += ".inp";
     return target.string();
 }
@@ -407,8 +408,8 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     std::ostringstream formatted;
     const bool toOutput = request.output.empty() || request.output == kStandardStream;
     const std::string place = toOutput ? file : request.output;
-    mdf_WriteModelFile(*odb, formatted, found.meshOrigins,
-                       std::filesystem::path(place).parent_path().string(), found.parameters, found.schema);
+    mdf_WriteModelFile(*odb, formatted, found.meshOrigins, plt_Path(place).parent_path().string(),
+                       found.parameters, found.schema);
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", file}, {"wasCanonical", isCanonical}};
     if (request.check) {

@@ -10,6 +10,8 @@
 struct DeckRequest {
     /// Includes stay what they are.
     bool keepIncludesShut = false;
+    /// Where the bytes are counted; null: nobody looks.
+    thr_Progress* progress = nullptr;
 };
 
 struct DiffRequest {
@@ -33,6 +35,9 @@ struct FlattenRequest {
 bool IsDeck(const std::string& path);
 /// Reads a deck with what the store knows of element types.
 drd_Deck ReadDeck(const std::string& path, const DeckRequest& request, drd_Findings& findings);
+/// The same, and shows how far it is.
+drd_Deck ReadDeckWatched(const std::string& path, const DeckRequest& request, drd_Findings& findings,
+                         RunReport& report);
 drd_ReadOptions DeckOptions(const DeckRequest& request = {});
 /// Hands findings of a deck on to the report.
 void AddFindings(const drd_Deck& deck, const drd_Findings& findings, RunReport& report);

@@ -4,13 +4,12 @@
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
 #include "model_file/mdf_ModelFile.h"
+#include "platform/plt_Files.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
 
 #include <algorithm>
 #include <filesystem>
-
-#include <unistd.h>
 
 using nlohmann::ordered_json;
 
@@ -19,23 +18,18 @@ namespace {
 /// A fresh folder that goes with the object.
 class TemporaryDeck {
 public:
-    TemporaryDeck() {
-        std::error_code error;
-        path_ = std::filesystem::temp_directory_path(error).string() + "/qrxdeck-XXXXXX";
-        made_ = ::mkdtemp(path_.data()) != nullptr;
-    }
+    TemporaryDeck() : path_(plt_MakeTemporaryFolder("qrxdeck-")) {}
     TemporaryDeck(const TemporaryDeck&) = delete;
     TemporaryDeck& operator=(const TemporaryDeck&) = delete;
     ~TemporaryDeck() {
         std::error_code error;
-        if (made_) std::filesystem::remove_all(path_, error);
+        if (IsMade()) std::filesystem::remove_all(plt_Path(path_), error);
     }
-    bool IsMade() const { return made_; }
+    bool IsMade() const { return !path_.empty(); }
     std::string Job() const { return path_ + "/deck"; }
 
 private:
     std::string path_;
-    bool made_ = false;
 };
 
 /// Reads the deck of a model.
@@ -147,7 +141,7 @@ void Fill(const drd_DiffResult& result, const drd_Deck& first, const drd_Deck& s
 bool ReadSide(const std::string& path, drd_Deck& deck, const DeckRequest& request, RunReport& report) {
     if (!IsDeck(path)) return ReadDeckOfModel(path, deck, report);
     drd_Findings findings;
-    deck = ReadDeck(path, request, findings);
+    deck = ReadDeckWatched(path, request, findings, report);
     if (!findings.HasErrors()) return true;
     // A deck with faults in its text can be compared as far as it was read; one that isn't there can't.
     AddFindings(deck, findings, report);

@@ -1,3 +1,4 @@
+#include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 #include "tools/CommandParts.h"
@@ -176,9 +177,9 @@ private:
 } // namespace
 
 ExitCode RunNew(const NewRequest& request, RunReport& report) {
-    const fs::path mesh(request.mesh);
+    const fs::path mesh = plt_Path(request.mesh);
     const fs::path output =
-        request.output.empty() ? fs::path(mesh.stem().string() + ".json") : fs::path(request.output);
+        plt_Path(request.output.empty() ? mesh.stem().string() + ".json" : request.output);
     std::error_code ignored;
     if (!request.force && fs::exists(fs::symlink_status(output, ignored))) {
         report.Error(output.string(), "the file is there already; --force overwrites it");

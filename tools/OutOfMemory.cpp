@@ -1,5 +1,6 @@
 #include "tools/OutOfMemory.h"
 
+#include "platform/plt_Process.h"
 #include "tools/ProgressLine.h"
 #include "tools/RunReport.h"
 #include "tools/StandardStreams.h"
@@ -7,8 +8,6 @@
 
 #include <atomic>
 #include <new>
-
-#include <unistd.h>
 
 namespace {
 
@@ -42,5 +41,5 @@ void OutOfMemory::End() noexcept {
         WriteToStandardError(isWritten ? "qrxdeck: error: not enough memory to report what was written\n"
                                        : "qrxdeck: error: not enough memory\n");
     }
-    ::_exit(static_cast<int>(code));
+    plt_EndNow(static_cast<int>(code));
 }

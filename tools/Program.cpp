@@ -2,6 +2,7 @@
 
 #include "tools/CommandLine.h"
 #include "tools/OutOfMemory.h"
+#include "tools/ProgressLine.h"
 #include "tools/StandardStreams.h"
 #include "whole_file/whf_SignalCleanUp.h"
 
@@ -61,6 +62,7 @@ ExitCode Main(int argc, char** argv) {
 int RunProgram(int argc, char** argv) {
     SecureStandardStreams();
     whf_SignalCleanUp::Install();
+    whf_SignalCleanUp::AlsoCall(&ProgressLine::Erase);
     OutOfMemory::Install(false);
     try {
         return static_cast<int>(Main(argc, argv));

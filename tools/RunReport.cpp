@@ -48,7 +48,7 @@ void RunReport::Clear() {
     foretold_.clear();
     modelIgnores_.clear();
     ignored_.clear();
-    for (const std::string& code : options_.ignored) ignored_.push_back({nullptr, code, 0});
+    for (const std::string& code : options_.ignored) ignored_.push_back({nullptr, code, {}, 0});
     strictErrors_ = 0;
     std::ranges::fill(shown_, 0);
     std::ranges::fill(more_, 0);
@@ -77,17 +77,21 @@ void RunReport::EndRun(ExitCode code) {
 }
 
 void RunReport::Ignore(const odiK_Model& model) {
+    const fnd_Path root;
+    const fnd_Path models(root, "models");
+    const std::string within = fnd_Path(models, model.Name().View()).Text();
     for (const odiK_IgnoredFinding& entry : model.ignore) {
         modelIgnores_.push_back(entry);
-        ignored_.push_back({&modelIgnores_.back(), modelIgnores_.back().code.View(), 0});
+        ignored_.push_back({&modelIgnores_.back(), modelIgnores_.back().code.View(), within, 0});
     }
 }
 
 bool RunReport::IsIgnored(const fnd_Finding& finding) {
     if (finding.IsError()) return false;
     for (Ignored& ignored : ignored_) {
-        const bool is =
-            ignored.entry != nullptr ? ignored.entry->Is(finding) : ignored.code == finding.code->name;
+        const bool is = ignored.entry == nullptr
+                            ? ignored.code == finding.code->name
+                            : finding.place.starts_with(ignored.within) && ignored.entry->Is(finding);
         if (is) ++ignored.count;
         if (is) return true;
     }
@@ -105,8 +109,10 @@ bool RunReport::HasRoomFor(fnd_Severity severity) {
 }
 
 void RunReport::TellIgnored() {
+    const std::vector<Ignored> told = ignored_;
+    for (Ignored& ignored : ignored_) ignored.count = 0;
     if (AsJson()) {
-        for (const Ignored& ignored : ignored_) {
+        for (const Ignored& ignored : told) {
             if (ignored.count == 0) continue;
             root_["ignored"].push_back({{"code", ignored.code}, {"count", ignored.count}});
             if (ignored.entry != nullptr)
@@ -114,7 +120,7 @@ void RunReport::TellIgnored() {
         }
         return;
     }
-    for (const Ignored& ignored : ignored_) {
+    for (const Ignored& ignored : told) {
         if (ignored.count == 0 || ignored.entry == nullptr) continue;
         Print("ignored: " + std::to_string(ignored.count) + " " + std::string(ignored.code) + ", " +
               fnd_Visible(ignored.entry->reason.View()) + "\n");
@@ -174,7 +180,7 @@ void RunReport::Print(const std::string& text) {
 
 bool RunReport::PrepareForSuccess() {
     TellIgnored();
-    for (Ignored& ignored : ignored_) ignored.count = 0;
+    TellMore();
     if (AsJson() && !runFile_.empty()) return true;
     if (AsJson()) {
         prepared_ = JsonText(ExitCode::DONE);

@@ -114,6 +114,7 @@ private:
     struct Ignored {
         const odiK_IgnoredFinding* entry; // null: asked for on the command line
         std::string_view code;
+        std::string within; // the model's pointer
         long long count;
     };
 

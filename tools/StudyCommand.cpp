@@ -1,52 +1,20 @@
 #include "tools/StudyCommand.h"
 
+#include "platform/plt_Files.h"
+#include "platform/plt_Process.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/OutOfMemory.h"
 #include "tools/StandardStreams.h"
 
 #include <charconv>
 #include <chrono>
-#include <csignal>
 #include <cstdio>
 #include <filesystem>
-
-#include <unistd.h>
 
 namespace {
 
 constexpr int kMostShards = 1'000'000;
 constexpr int kMostJobs = 1024;
-constexpr int kEndingSignals[] = {SIGINT, SIGTERM, SIGHUP};
-
-volatile std::sig_atomic_t theSignal = 0;
-
-void NoteSignal(int signal) {
-    theSignal = signal;
-}
-
-/// While it lives, the first signal that would end the process only asks for an end; the second one ends it.
-class PoliteSignals {
-public:
-    PoliteSignals() {
-        for (std::size_t i = 0; i < std::size(kEndingSignals); ++i) {
-            ::sigaction(kEndingSignals[i], nullptr, &former_[i]);
-            if (former_[i].sa_handler == SIG_IGN) continue;
-            struct sigaction action = {};
-            action.sa_handler = NoteSignal;
-            action.sa_flags = static_cast<int>(SA_RESETHAND) | SA_RESTART;
-            ::sigaction(kEndingSignals[i], &action, nullptr);
-        }
-    }
-    PoliteSignals(const PoliteSignals&) = delete;
-    PoliteSignals& operator=(const PoliteSignals&) = delete;
-    ~PoliteSignals() {
-        for (std::size_t i = 0; i < std::size(kEndingSignals); ++i)
-            ::sigaction(kEndingSignals[i], &former_[i], nullptr);
-    }
-
-private:
-    struct sigaction former_[std::size(kEndingSignals)] = {};
-};
 
 std::string TimeText(double seconds) {
     char text[32];
@@ -77,7 +45,7 @@ public:
     void Warn(const std::string& text) override { report_.Warning("qrxdeck", text); }
     bool Pause(const sty_Counts& counts) override {
         if (!report_.AsJson()) Show(counts);
-        return theSignal != 0;
+        return plt_PoliteSignals::Came() != 0;
     }
     void End() {
         if (shown_) WriteToStandardError("\r\033[K");
@@ -101,7 +69,7 @@ private:
     }
 
     RunReport& report_;
-    const bool isTerminal_ = ::isatty(STDERR_FILENO) != 0;
+    const bool isTerminal_ = plt_IsTerminal(plt_kStandardError);
     double next_ = 10.0;
     bool shown_ = false;
 };
@@ -162,7 +130,7 @@ ExitCode Wrong(const std::string& text, RunReport& report) {
 }
 
 std::string AbsolutePath(const std::string& path) {
-    return std::filesystem::absolute(path).lexically_normal().string();
+    return std::filesystem::absolute(plt_Path(path)).lexically_normal().string();
 }
 
 ExitCode Emit(const StudyCommand& command, RunReport& report) {
@@ -177,9 +145,8 @@ ExitCode Emit(const StudyCommand& command, RunReport& report) {
     request.model = AbsolutePath(request.model);
     request.table = AbsolutePath(request.table);
     request.out = AbsolutePath(request.out);
-    std::error_code error;
-    std::string program = std::filesystem::read_symlink("/proc/self/exe", error).string();
-    if (error) program = "qrxdeck";
+    std::string program = plt_ProgramPath();
+    if (program.empty()) program = "qrxdeck";
     const std::string script =
         command.emit == "slurm" ? sty_SlurmScript(request, program) : sty_Snakefile(request, program);
     if (report.AsJson()) report.Member("script") = script;
@@ -218,10 +185,7 @@ ExitCode Merge(const std::string& folder, RunReport& report) {
 /// The end that the signal would have been, now that all is told.
 [[noreturn]] void EndBySignal(RunReport& report) {
     report.Finish(ExitCode::MODEL_IS_WRONG);
-    const int signal = theSignal;
-    std::signal(signal, SIG_DFL);
-    ::raise(signal);
-    ::_exit(128 + signal);
+    plt_EndBySignal(plt_PoliteSignals::Came());
 }
 
 } // namespace
@@ -234,7 +198,7 @@ ExitCode RunStudy(const StudyCommand& command, RunReport& report) {
     sty_Request request = command.request;
     if (request.model.empty() || request.table.empty())
         return Wrong("study needs a template and a table", report);
-    if (request.out.empty()) request.out = std::filesystem::path(request.table).stem().string();
+    if (request.out.empty()) request.out = plt_Path(request.table).stem().string();
     if (request.out.empty())
         return Wrong("the table " + fnd_Quoted(request.table) + " names no file", report);
     if (request.jobs < 0 || request.jobs > kMostJobs)
@@ -253,7 +217,7 @@ ExitCode RunStudy(const StudyCommand& command, RunReport& report) {
     Progress progress(report);
     sty_Outcome outcome;
     {
-        const PoliteSignals signals;
+        const plt_PoliteSignals signals;
         outcome = sty_Run(request, progress);
         progress.End();
     }

@@ -2,6 +2,8 @@
 
 #include "foundation/nex_Exception.h"
 #include "foundation/qio_Device.h"
+#include "platform/plt_Files.h"
+#include "platform/plt_Process.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "tools/CommandParts.h"
 #include "tools/DeckCommands.h"
@@ -12,9 +14,6 @@
 #include <filesystem>
 #include <fstream>
 
-#include <sys/wait.h>
-#include <unistd.h>
-
 using nlohmann::ordered_json;
 
 namespace {
@@ -24,20 +23,20 @@ constexpr char kNoPage[] = "this qrxdeck was built without the page that shows m
 
 std::string TargetOf(const ViewRequest& request) {
     if (!request.output.empty()) return request.output;
-    return std::filesystem::path(request.model).stem().string() + ".html";
+    return plt_Path(request.model).stem().string() + ".html";
 }
 
 /// Whether the file begins as JSON does, a comment ahead of it or not.
 bool IsModelFile(const std::string& path) {
-    std::ifstream file(path, std::ios::binary);
+    std::ifstream file(plt_Path(path), std::ios::binary);
     char first = '\0';
     return !(file >> first) || first == '{' || first == '/' || first == '\xEF';
 }
 
 /// The store of a model whose one part has the mesh of a mesher's file.
 std::unique_ptr<odb_Odb> ReadMesh(const std::string& path, RunReport& report, ExitCode& code) {
-    const nlohmann::json mesh = {{"file", std::filesystem::absolute(path).string()}};
-    const std::string part = std::filesystem::path(path).stem().string();
+    const nlohmann::json mesh = {{"file", std::filesystem::absolute(plt_Path(path)).string()}};
+    const std::string part = plt_Path(path).stem().string();
     const nlohmann::json model = {
         {"format", mdf_kFormat},
         {"models", {{odb_Odb::DefaultModelName(), {{"parts", {{part, {{"mesh", mesh}}}}}}}}}};
@@ -50,19 +49,6 @@ std::unique_ptr<odb_Odb> ReadMesh(const std::string& path, RunReport& report, Ex
            : found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED
                               : ExitCode::MODEL_IS_WRONG;
     return odb;
-}
-
-/// Lets the desktop open the file; false when it has no program for it.
-bool Open(const std::string& file) {
-    const std::string path = std::filesystem::absolute(file).string();
-    const pid_t child = fork();
-    if (child < 0) return false;
-    if (child == 0) {
-        for (const char* program : {"xdg-open", "open"}) execlp(program, program, path.c_str(), nullptr);
-        _exit(127);
-    }
-    int status = 0;
-    return waitpid(child, &status, 0) == child && WIFEXITED(status) && WEXITSTATUS(status) == 0;
 }
 
 /// Writes the file as a whole, and tells of it as a member of the report.
@@ -115,13 +101,13 @@ private:
 
 ExitCode WritePage(const odb_Odb& odb, const ShownDeck* deck, const ViewRequest& request, RunReport& report) {
     const std::string target = TargetOf(request);
-    const std::string title = std::filesystem::path(request.model).stem().string();
+    const std::string title = plt_Path(request.model).stem().string();
     vpg_PageData data = vpg_DataOf(odb, title);
     if (deck != nullptr) data.header = deck->Header(data.header);
     const std::string html = vpg_Html(data, title);
     const auto write = [&html](qio_ostream& device) { device.Write(html.data(), html.size()); };
     if (!Write(target, "page", "page", write, report)) return ExitCode::FILE_SYSTEM_REFUSED;
-    if (request.open && !Open(target)) {
+    if (request.open && !plt_OpenOnDesktop(std::filesystem::absolute(plt_Path(target)).string())) {
         report.Warning(target, "there is no program that opens it; any browser shows it");
     }
     return ExitCode::DONE;

@@ -1,12 +1,11 @@
 #ifndef QRX_WHOLE_FILE_WHF_FILE_H
 #define QRX_WHOLE_FILE_WHF_FILE_H
 
+#include "platform/plt_Files.h"
+
 #include <functional>
 #include <stdexcept>
 #include <string>
-
-#include <sys/stat.h>
-#include <sys/types.h>
 
 class qio_ostream;
 
@@ -16,19 +15,19 @@ struct whf_System {
     ssize_t (*readlink)(const char* path, char* buffer, std::size_t bytes);
     int (*openFolder)(int at, const char* name, int flags);
     /// Never follows a link at the name itself.
-    int (*inspect)(int at, const char* name, struct stat* found);
+    int (*inspect)(int at, const char* name, plt_Status* found);
     /// As faccessat, for writing.
     int (*mayWrite)(int at, const char* name);
     int (*makeFolder)(int at, const char* name);
     /// As fstat.
-    int (*inspectOpen)(int file, struct stat* found);
+    int (*inspectOpen)(int file, plt_Status* found);
     /// As flock: alone, without waiting.
     int (*lock)(int file);
     /// As openat, for a new file to be written.
-    int (*create)(int at, const char* name, mode_t mode);
+    int (*create)(int at, const char* name, plt_Mode mode);
     int (*sync)(int file);
-    int (*chown)(int file, uid_t owner, gid_t group);
-    int (*chmod)(int file, mode_t mode);
+    int (*chown)(int file, plt_Owner owner, plt_Group group);
+    int (*chmod)(int file, plt_Mode mode);
     int (*close)(int file);
     int (*rename)(int fromFolder, const char* from, int toFolder, const char* to);
     int (*remove)(int at, const char* name);

@@ -3,27 +3,19 @@
 #include "whole_file/whf_SignalCleanUp.h"
 
 #include <cerrno>
-#include <memory>
 #include <random>
 #include <string_view>
-
-#include <dirent.h>
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace {
 
 constexpr std::string_view kScratchPrefix = ".qrxdeck-";
-constexpr int kFolderFlags = O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC;
-
-bool IsOurs(const struct stat& found) {
-    return S_ISDIR(found.st_mode) && found.st_uid == ::geteuid() && (found.st_mode & 077) == 0;
-}
+constexpr int kFolderFlags = plt_kFolder | plt_kAlone;
 
 void RemoveIfLeft(int folder, const char* name, const whf_System& system) {
     const whf_Descriptor opened(system.openFolder(folder, name, kFolderFlags), system);
-    struct stat found = {};
-    if (opened.Number() < 0 || system.inspectOpen(opened.Number(), &found) != 0 || !IsOurs(found)) return;
+    plt_Status found = {};
+    if (opened.Number() < 0 || system.inspectOpen(opened.Number(), &found) != 0) return;
+    if (!plt_IsPrivateFolder(found)) return;
     if (system.lock(opened.Number()) != 0) return;
     system.remove(opened.Number(), whf_Scratch::kFileName);
     system.removeFolder(folder, name);
@@ -40,17 +32,10 @@ int whf_Descriptor::Close() noexcept {
 }
 
 void whf_Scratch::RemoveLeavings(int folder, const whf_System& system) {
-    const int listed = ::openat(folder, ".", O_RDONLY | O_DIRECTORY | O_CLOEXEC);
-    if (listed < 0) return;
-    const std::unique_ptr<DIR, int (*)(DIR*)> entries(::fdopendir(listed), ::closedir);
-    if (entries == nullptr) {
-        ::close(listed);
-        return;
-    }
-    while (const dirent* entry = ::readdir(entries.get())) {
-        if (std::string_view(entry->d_name).starts_with(kScratchPrefix))
-            RemoveIfLeft(folder, entry->d_name, system);
-    }
+    plt_List(folder, [&](const char* name) {
+        if (std::string_view(name).starts_with(kScratchPrefix)) RemoveIfLeft(folder, name, system);
+        return true;
+    });
 }
 
 whf_Scratch::whf_Scratch(int folder, const std::string& folderName, const whf_System& system)
@@ -85,11 +70,11 @@ bool whf_Scratch::Make(const std::string& folderName) {
     const int openError =
         whf_ErrorOf([&] { return number = system_.openFolder(folder_, name_.c_str(), kFolderFlags); });
     whf_Descriptor opened(number, system_);
-    struct stat found = {};
-    struct stat named = {};
+    plt_Status found = {};
+    plt_Status named = {};
     int error = openError;
     if (error == 0) error = whf_ErrorOf([&] { return system_.inspectOpen(number, &found); });
-    if (error == 0 && !IsOurs(found)) error = EPERM;
+    if (error == 0 && !plt_IsPrivateFolder(found)) error = EPERM;
     if (error != 0) {
         system_.removeFolder(folder_, name_.c_str());
         fail(error);

@@ -1,7 +1,7 @@
 #ifndef QRX_WHOLE_FILE_WHF_SIGNALCLEANUP_H
 #define QRX_WHOLE_FILE_WHF_SIGNALCLEANUP_H
 
-#include <csignal>
+#include "platform/plt_Process.h"
 
 /// Removes folders and the file in each when a signal, or a lack of memory, ends the process. Several threads
 /// may have folders at once; those beyond kMost are left to the next run beside them.
@@ -17,20 +17,14 @@ public:
     /// where there is none left.
     static int Set(int at, const char* name, int folder) noexcept;
     static void Clear(int place) noexcept;
+    /// A function to be called before the process ends by a signal; only calls that are safe within a signal
+    /// handler.
+    static void AlsoCall(void (*function)() noexcept) noexcept;
     /// Removes all that is set; only calls that are safe within a signal handler.
     static void Remove() noexcept;
 
     /// Holds the signals back for as long as it lives.
-    class Block {
-    public:
-        Block() noexcept;
-        Block(const Block&) = delete;
-        Block& operator=(const Block&) = delete;
-        ~Block();
-
-    private:
-        sigset_t former_;
-    };
+    using Block = plt_SignalBlock;
 };
 
 #endif

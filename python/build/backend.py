@@ -20,7 +20,7 @@ import tomllib
 import zipfile
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
-TREE = ["CMakeLists.txt", "README.md", "pyproject.toml", "cmake", "foundation", "store_interface", "keyword_layer",
+TREE = ["CMakeLists.txt", "README.md", "pyproject.toml", "cmake", "platform", "foundation", "store_interface", "keyword_layer",
         "QRXZptIfwOif.m", "deck_checks", "whole_file", "deck_reader", "mesh_file", "model_file", "view_page", "viewer",
         "study", "tools", "examples", "python", "scripts", "docs"]
 

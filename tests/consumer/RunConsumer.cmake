@@ -46,7 +46,8 @@ else()
     separate_arguments(library UNIX_COMMAND "${output}")
     separate_arguments(flags UNIX_COMMAND "${FLAGS}")
     set(program ${WORK_DIR}/qrx_consumer)
-    run(${COMPILER} -std=c++20 ${flags} ${SOURCE_DIR}/main.cpp -o ${program} ${library})
+    # What the standard is, pkg-config says.
+    run(${COMPILER} ${flags} ${SOURCE_DIR}/main.cpp -o ${program} ${library})
     # A shared library of a tree that the system doesn't know.
     set(ENV{LD_LIBRARY_PATH} ${prefix}/${LIBDIR})
 endif()

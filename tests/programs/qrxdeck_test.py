@@ -903,7 +903,7 @@ class OtherCommands(ProgramTest):
     def test_Version_IsOnALineOfItsOwn(self):
         run = self.run_program("--version")
         self.assertEqual((run.returncode, run.errors), (0, ""))
-        self.assertRegex(run.output, r"^qrxdeck \d+\.\d+\.\d+\n$")
+        self.assertRegex(run.output, r"^qrxdeck \d+\.\d+\.\d+( \([0-9a-f]{12}\+?\))?\n$")
 
     def test_Help_NamesCommandsAndExitCodes(self):
         run = self.run_program("--help")

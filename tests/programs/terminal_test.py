@@ -12,6 +12,7 @@ import pty
 import re
 import select
 import shutil
+import signal
 import struct
 import subprocess
 import sys
@@ -418,6 +419,15 @@ class Strictness(Program):
         self.ignoring({"code": "empty-material", "reason": "x", "place": place + "Spa"})
         self.assertIn("empty-material]", self.run_program("check", "bridge.json").errors)
 
+    def test_IgnoreInTheModel_IsOfThatModelAlone(self):
+        model = changed(with_warning)
+        model["models"]["Other"] = changed(with_warning)["models"]["Default Model"]
+        model["models"]["Other"]["ignore"] = [{"code": "empty-material", "reason": "x"}]
+        self.put("bridge.json", model)
+        run = self.run_program("check", "bridge.json")
+        self.assertIn("(/models/Default Model/materials/Spare) [empty-material]", run.errors)
+        self.assertNotIn("/models/Other", run.errors)
+
     def test_IgnoreInTheModel_IsOfWarningsAndNotesWithAReason(self):
         for entry, found in (({"code": "unusd", "reason": "x"}, "did you mean 'unused'?"),
                              ({"code": "syntax", "reason": "x"}, "errors can't be passed over"),
@@ -481,6 +491,35 @@ class Watching(Program):
             shown.append(re.sub(r"^.*\r(\x1b\[K)?", "", line))
         self.assertTrue(shown[0].startswith("bridge.inp: "), shown[0])
         self.assertNotIn("reading bridge.json", "\n".join(shown))
+
+    def test_DecksThatAreRead_ShowToo(self):
+        with open(self.folder / "large.inp", "w", encoding="utf-8") as deck:
+            deck.write("*Heading\n*Part, name=P\n*Node\n")
+            deck.writelines(f"{i}, {i}., 0., 0.\n" for i in range(1, 4000001))
+            deck.write("*End Part\n")
+        code, seen = self.on_terminal("check", "large.inp")
+        self.assertEqual(code, 0)
+        self.assertRegex(b" ".join(self.LINE.findall(seen)), rb"(reading|checking) large\.inp")
+
+    def test_RunThatIsEnded_TakesTheLineAway(self):
+        self.put("bridge.json", changed(with_many_nodes(3000000)))
+        ours, theirs = pty.openpty()
+        run = subprocess.Popen([PROGRAM, "write", "bridge.json", "--threads", "1"], cwd=self.folder,
+                               env=self.environment, stdin=theirs, stdout=theirs, stderr=theirs)
+        os.close(theirs)
+        self.addCleanup(os.close, ours)
+        seen = b""
+        while not self.LINE.search(seen):
+            self.assertTrue(select.select([ours], [], [], 60)[0])
+            seen += os.read(ours, 4096)
+        run.send_signal(signal.SIGINT)
+        self.assertEqual(run.wait(), -signal.SIGINT)
+        while select.select([ours], [], [], 0.2)[0]:
+            try:
+                seen += os.read(ours, 4096)
+            except OSError:
+                break
+        self.assertTrue(seen.endswith(ERASE), seen[-80:])
 
     def test_ShortRun_ShowsNothing(self):
         code, seen = self.on_terminal("write", "bridge.json")

@@ -51,7 +51,7 @@ def test_Wheel_InAnEmptyEnvironmentWithoutNetwork_Works(tmp_path):
 
     run("-m", "pip", "install", "--no-index", "--disable-pip-version-check", made)
     assert run("-c", "import qrx; print(qrx.__file__)").startswith(str(place))
-    assert run("-m", "qrx", "--version") == f"qrxdeck {qrx.__version__}\n"
+    assert run("-m", "qrx", "--version").split()[:2] == ["qrxdeck", qrx.__version__]
     rod.model().save(tmp_path / "rod.json")
     code = "import qrx; m = qrx.load('rod.json'); m.materials['Steel'].density = 7.85e-9; m.write('rod.inp')"
     run("-c", code)

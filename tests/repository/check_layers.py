@@ -9,19 +9,20 @@ import re
 import sys
 
 DECK_WRITER = "QRXZptIfwOif.m/src"
-CORE = ["foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "whole_file"]
+CORE = ["platform", "foundation", "store_interface", "keyword_layer", DECK_WRITER, "deck_checks", "whole_file"]
 
 # What a layer may include besides its own headers.
 ALLOWED = {
-    "foundation": [],
+    "platform": [],
+    "foundation": ["platform"],
     "store_interface": ["foundation"],
     "keyword_layer": ["foundation", "store_interface"],
     DECK_WRITER: ["foundation", "store_interface", "keyword_layer"],
     "deck_checks": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
-    "whole_file": ["foundation"],
-    "mesh_file": ["foundation"],
-    "deck_reader": ["foundation"],
-    "model_file": ["foundation", "store_interface", "mesh_file", "deck_reader"],
+    "whole_file": ["platform", "foundation"],
+    "mesh_file": ["platform", "foundation"],
+    "deck_reader": ["platform", "foundation"],
+    "model_file": ["platform", "foundation", "store_interface", "mesh_file", "deck_reader"],
     "view_page": ["foundation", "store_interface", "keyword_layer", DECK_WRITER],
     "study": CORE + ["model_file"],
     "tools": CORE + ["mesh_file", "model_file", "deck_reader", "view_page", "study"],
@@ -73,9 +74,10 @@ STANDARD = set("""
     cstdint cstdio cstdlib cstring ctime cuchar cwchar cwctype
     """.split())
 # The operating system's own headers, for the output device and the programs.
-SYSTEM = {"dirent.h", "fcntl.h", "unistd.h", "sys/file.h", "sys/ioctl.h", "sys/mman.h", "sys/resource.h",
-          "sys/single_threaded.h", "sys/stat.h", "sys/types.h", "sys/uio.h", "sys/wait.h", "sys/xattr.h"}
-SYSTEM_LAYERS = {"foundation", "whole_file", "mesh_file", "study", "tools"}
+SYSTEM = {"aclapi.h", "dirent.h", "fcntl.h", "io.h", "process.h", "shellapi.h", "unistd.h", "windows.h", "sys/file.h",
+          "sys/ioctl.h", "sys/mman.h", "sys/resource.h", "sys/single_threaded.h", "sys/stat.h", "sys/types.h", "sys/uio.h",
+          "sys/wait.h", "sys/xattr.h"}
+SYSTEM_LAYERS = {"foundation", "platform"}
 
 # What instructions of the processor are reached through, each with a portable way beside it.
 PROCESSOR = {"emmintrin.h"}

@@ -1,5 +1,7 @@
 #include "materials/oif_MaterialTable.h"
 
+#include "foundation/num_ReadReal.h"
+
 #include <charconv>
 #include <cstring>
 #include <vector>
@@ -36,7 +38,7 @@ double NumberIn(const cow_String& cell) {
     std::string_view text = cell.View();
     text.remove_prefix(std::min(text.find_first_not_of(' '), text.size()));
     double number = 0.0;
-    std::from_chars(text.data(), text.data() + text.size(), number);
+    num_ReadReal(text.data(), text.data() + text.size(), number);
     return number;
 }
 

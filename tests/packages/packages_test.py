@@ -1,0 +1,229 @@
+#!/usr/bin/env python3
+"""Builds the packages twice, looks at them, and installs them into a fresh Debian root.
+
+usage: packages_test.py REPOSITORY [--built FOLDER] [--root FOLDER]
+
+With --built the packages are taken from there and not built. With --root a root is kept there for the next time. What
+isn't there for a part of it (lintian, debootstrap, root's rights) skips that part, with a message.
+"""
+
+import argparse
+import gzip
+import json
+import os
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+import tarfile
+import tempfile
+import unittest
+
+OPTIONS = None
+# The licence is the owners' to choose, and so is the address that answers for the packages.
+LICENCE_TAGS = {"copyright-without-copyright-notice", "bogus-mail-host", "no-copyright-file", "initial-upload-closes-no-bugs"}
+# Programs with the addresses of an environment that is not Debian's own build.
+SUITE = "bookworm"
+
+
+def run(*command, **options):
+    done = subprocess.run([str(word) for word in command], capture_output=True, text=True, **options)
+    if done.returncode != 0:
+        raise AssertionError(f"{' '.join(str(word) for word in command)} ended with {done.returncode}:\n"
+                             f"{done.stdout[-3000:]}{done.stderr[-3000:]}")
+    return done.stdout
+
+
+def build(folder):
+    """Builds the packages of the last commit from an archive of its sources, in a folder of this name."""
+    folder.mkdir(parents=True)
+    archive = folder / "sources.tar"
+    run("git", "-C", OPTIONS.repository, "archive", "-o", archive, "HEAD")
+    with tarfile.open(archive) as sources:
+        sources.extractall(folder / "sources", filter="tar")
+    modules = OPTIONS.repository / "viewer" / "node_modules"
+    if modules.exists():
+        (folder / "sources" / "viewer" / "node_modules").symlink_to(modules.resolve())
+    run(folder / "sources" / "scripts" / "build-packages.sh", folder / "packages")
+    return folder / "packages"
+
+
+class Packages(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.scratch = pathlib.Path(cls.enterClassContext(tempfile.TemporaryDirectory()))
+        cls.folder = OPTIONS.built or build(cls.scratch / "a")
+        cls.debs = sorted(cls.folder.glob("*.deb"))
+
+    def deb(self, name):
+        found = [deb for deb in self.debs if deb.name.startswith(name + "_")]
+        self.assertEqual(len(found), 1, name)
+        return found[0]
+
+    def unpacked(self, name):
+        folder = self.scratch / "unpacked" / name
+        if not folder.exists():
+            folder.mkdir(parents=True)
+            run("dpkg-deb", "-x", self.deb(name), folder)
+        return folder
+
+    def test_SameSourcesInAnotherFolder_MakeTheSameBytes(self):
+        if OPTIONS.built:
+            self.skipTest("the packages were given")
+        # Nothing of the first build may serve the second.
+        os.environ["CCACHE_DISABLE"] = "1"
+        again = build(self.scratch / "another folder, with a longer name")
+        del os.environ["CCACHE_DISABLE"]
+        names = sorted(path.name for path in self.folder.iterdir())
+        self.assertGreaterEqual(len(names), 3)
+        self.assertEqual(names, sorted(path.name for path in again.iterdir()))
+        for name in names:
+            self.assertEqual((self.folder / name).read_bytes(), (again / name).read_bytes(), name)
+
+    def test_Lintian_FindsNothingButTheLicence(self):
+        if shutil.which("lintian") is None:
+            self.skipTest("no lintian; scripts/install-dependencies.sh packages")
+        for deb in self.debs:
+            found = subprocess.run(["lintian", "--allow-root", "--tag-display-limit", "0", deb], capture_output=True,
+                                   text=True).stdout
+            tags = [line for line in found.splitlines() if re.match(r"[EW]: ", line)
+                    and line.split(": ", 2)[2].split()[0] not in LICENCE_TAGS]
+            self.assertEqual(tags, [], deb.name)
+
+    def test_Contents_AreDescribed(self):
+        for name, parts in (("qrxdeck", {"nlohmann-json", "CLI11"}), ("libqrxptinputfilewriter-dev", {"libstdc++"})):
+            docs = self.unpacked(name) / "usr/share/doc" / name
+            self.assertIn("not yet chosen", (docs / "copyright").read_text())
+            self.assertIn(f"{name} (", gzip.decompress((docs / "changelog.gz").read_bytes()).decode())
+            described = json.loads((docs / f"{name}.spdx.json").read_text())
+            self.assertEqual(described["spdxVersion"], "SPDX-2.3")
+            ids = [package["SPDXID"] for package in described["packages"]]
+            self.assertEqual(len(ids), len(set(ids)))
+            self.assertLessEqual(parts, {package["name"] for package in described["packages"]})
+            for relation in described["relationships"]:
+                self.assertIn(relation["relatedSpdxElement"], ids)
+            for package in described["packages"]:
+                self.assertLessEqual({"name", "versionInfo", "downloadLocation", "licenseDeclared"}, set(package))
+        notices = {path.name for path in (self.unpacked("qrxdeck") / "usr/share/doc/qrxdeck/notices").iterdir()}
+        self.assertLessEqual({"nlohmann-json3-dev", "libcli11-dev"}, notices)
+
+    def test_EveryLibraryThatTheProgramLoads_IsInItsDescription(self):
+        packages = json.loads(next(self.unpacked("qrxdeck").rglob("qrxdeck.spdx.json")).read_text())["packages"]
+        names = {package["name"].lower() for package in packages}
+        needed = re.findall(r"\(NEEDED\).*\[lib([^.]+?)(?:_serial)?\.so", run(
+            "readelf", "-d", self.unpacked("qrxdeck") / "usr/bin/qrxdeck"))
+        # The C library and the compiler's are every program's.
+        for library in set(needed) - {"c", "m", "gcc_s"}:
+            known = {"z": "zlib", "md": "libmd", "stdc++": "libstdc++"}.get(library, library)
+            self.assertIn(known, names)
+
+    def test_SharedLibrary_ShowsItsOwnNamesAndNoOthers(self):
+        folder = self.unpacked("libqrxptinputfilewriter-dev")
+        shared = next(path for path in folder.rglob("*.so.*") if not path.is_symlink())
+        self.assertRegex(run("readelf", "-d", shared), r"soname: \[libQRXZptInputFileWriter\.so\.\d+\.\d+\]")
+        shown = {line.split()[-1].split("@")[0]
+                 for line in run("nm", "-D", "--defined-only", shared).splitlines() if " A " not in line}
+        self.assertGreater(len(shown), 1000)
+        of_others = [name for name in shown if re.match(r"_Z(T[VTISC])?N?K?(St|S[absiod])|_ZN9__gnu_cxx", name)]
+        self.assertEqual(of_others, [])
+        # All that is compiled of this library, and not within one source alone, can be linked to.
+        own = set()
+        for line in run("nm", "--defined-only", next(folder.rglob("*.a"))).splitlines():
+            words = line.split()
+            if len(words) == 3 and words[1] in "TDBR":
+                own.add(words[2])
+        self.assertGreater(len(own), 1000)
+        self.assertEqual(sorted(own - shown)[:10], [])
+
+    def test_Archive_HasProgramAndLibrary(self):
+        archive = next(path for path in self.folder.glob("*.tar.gz") if "sources" not in path.name)
+        with tarfile.open(archive) as content:
+            names = [re.sub(r"^[^/]+/", "", name) for name in content.getnames()]
+            times = {member.mtime for member in content.getmembers()}
+        self.assertIn("bin/qrxdeck", names)
+        self.assertTrue(any(name.endswith("QRXZptInputFileWriterConfig.cmake") for name in names))
+        self.assertEqual(len(times), 1)
+
+
+class InAFreshRoot(unittest.TestCase):
+    """What a user does who has nothing but the packages."""
+
+    @classmethod
+    def setUpClass(cls):
+        if os.geteuid() != 0 or shutil.which("debootstrap") is None:
+            raise unittest.SkipTest("a fresh root takes root's rights and debootstrap")
+        cls.root = OPTIONS.root or pathlib.Path(cls.enterClassContext(tempfile.TemporaryDirectory()))
+        if not (cls.root / "usr/bin/apt-get").exists():
+            run("debootstrap", "--variant=minbase", SUITE, cls.root)
+        cls.addClassCleanup(shutil.rmtree, cls.root / "tmp/packages", ignore_errors=True)
+        shutil.copytree(Packages.folder if hasattr(Packages, "folder") else OPTIONS.built, cls.root / "tmp/packages",
+                        dirs_exist_ok=True)
+        shutil.copytree(OPTIONS.repository / "tests/consumer/project", cls.root / "tmp/consumer", dirs_exist_ok=True)
+        cls.there("rm -rf /tmp/work && mkdir /tmp/work && apt-get -q update")
+        cls.there("apt-get -q install -y --no-install-recommends /tmp/packages/*.deb g++ cmake make pkg-config")
+
+    @classmethod
+    def there(cls, script):
+        environment = {"PATH": "/usr/sbin:/usr/bin:/sbin:/bin", "HOME": "/root", "LC_ALL": "C.UTF-8",
+                       "DEBIAN_FRONTEND": "noninteractive"}
+        return run("chroot", cls.root, "sh", "-ec", "cd /tmp/work 2>/dev/null || cd /tmp\n" + script, env=environment)
+
+    def test_CommandsOfTheReadme_DoWhatItSays(self):
+        readme = (OPTIONS.repository / "README.md").read_text(encoding="utf-8")
+        blocks = re.findall(r"^<!-- files: (\S+) -->\n```sh\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
+        self.assertGreater(len(blocks), 0)
+        for file, commands in blocks:
+            shutil.copy(OPTIONS.repository / file, self.root / "tmp/work")
+            self.there(commands)
+        self.assertTrue((self.root / "tmp/work/part.inp").read_text(encoding="utf-8").startswith("*Heading\n"))
+        # And the lines that it shows of a deck.
+        for example in ("bracket.json", "bracket.msh"):
+            shutil.copy(OPTIONS.repository / "examples/bracket" / example, self.root / "tmp/work")
+        self.there("qrxdeck write bracket.json && qrxdeck check bracket.inp")
+        shown = re.findall(r"^```inp\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
+        self.assertGreater(len(shown), 0)
+        for lines in shown:
+            self.assertIn(lines, (self.root / "tmp/work/bracket.inp").read_text(encoding="utf-8"))
+
+    def test_Version_TellsTheCommit(self):
+        self.assertRegex(self.there("qrxdeck --version"), r"^qrxdeck \d+\.\d+\.\d+ \([0-9a-f]{12}\+?\)\n$")
+
+    def test_Python_WritesTheSameDeck(self):
+        if not any(path.name.startswith("python3-qrx_") for path in (self.root / "tmp/packages").iterdir()):
+            self.skipTest("no package for Python was built")
+        shutil.copy(OPTIONS.repository / "examples/assembly/assembly.json", self.root / "tmp/work")
+        self.there("qrxdeck write assembly.json --job program && python3 -c \"import qrx; "
+                   "qrx.load('assembly.json').write('python.inp')\" && cmp program.inp python.inp")
+
+    def test_ProgramThatUsesTheLibrary_IsBuiltBothWays(self):
+        expected = (r"^/models/Default Model/parts/ROD: 1 element has no section \[no-section\]\n"
+                    r"consumer\.inp: 278 bytes\n$")
+        version = re.search(r" VERSION ([\d.]+)", (OPTIONS.repository / "CMakeLists.txt").read_text())[1]
+        self.there(f"cmake -S ../consumer -B built -D EXPECTED_VERSION={version} && cmake --build built")
+        self.assertRegex(self.there("built/qrx_consumer"), expected)
+        self.there("g++ ../consumer/main.cpp -o dynamic $(pkg-config --cflags --libs QRXZptInputFileWriter)")
+        self.assertIn("libQRXZptInputFileWriter.so", self.there("ldd ./dynamic"))
+        self.assertRegex(self.there("./dynamic"), expected)
+
+    @classmethod
+    def tearDownClass(cls):
+        cls.there("apt-get -q purge -y qrxdeck libqrxptinputfilewriter-dev python3-qrx || true")
+        left = [path for path in (cls.root / "usr").rglob("*qrx*")]
+        if left:
+            raise AssertionError(f"left behind: {left[:5]}")
+
+
+def main():
+    global OPTIONS
+    parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
+    parser.add_argument("repository", type=pathlib.Path)
+    parser.add_argument("--built", type=pathlib.Path)
+    parser.add_argument("--root", type=pathlib.Path)
+    OPTIONS, rest = parser.parse_known_args()
+    OPTIONS.repository = OPTIONS.repository.resolve()
+    unittest.main(argv=[sys.argv[0], *rest], verbosity=2)
+
+
+if __name__ == "__main__":
+    main()
