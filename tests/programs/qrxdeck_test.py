@@ -776,7 +776,7 @@ class OtherCommands(ProgramTest):
             "name": "Initial", "class": "InitialStep", "procedure": "initial", "perturbation": False,
             "explicit": False, "suppressed": False})
         self.assertEqual(model["steps"][2], {
-            "name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+            "name": "Cases", "class": "StaticLinearPerturbationStep",
             "procedure": "static linear perturbation", "perturbation": True, "explicit": False,
             "suppressed": False, "nlgeom": False, "increments": {}, "loadCases": ["down", "up"]})
         self.assertEqual(model["steps"][3], {
