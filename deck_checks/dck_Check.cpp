@@ -54,7 +54,7 @@ void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fn
     constexpr long long kHuge = 1'000'000'000;
     const fnd_Path root;
     const fnd_Path models(root, "models");
-    const fnd_Path place(models, odb_Odb::DefaultModelName());
+    const fnd_Path place(models, store.DeckModelName().View());
     Counter counter(progress);
     try {
         oif_Writer(store).WriteInput(counter);
@@ -74,7 +74,7 @@ void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fn
 }
 
 std::vector<fnd_Finding> dck_Check(const odb_Odb& store) {
-    const cow_String name = odb_Odb::DefaultModelName();
+    const cow_String& name = store.DeckModelName();
     // Completes the model, or raises.
     static_cast<void>(store.ddb().model(name));
     fnd_List list;

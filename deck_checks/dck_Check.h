@@ -9,7 +9,7 @@ class odiK_Mesh;
 struct mq_Quality;
 struct thr_Progress;
 
-/// Everything that can be said of the model "Default Model" of a store before its deck is written, whether
+/// Everything that can be said of a store's model before its deck is written, whether
 /// the store was filled in memory or from a file: errors that a model file would be refused for, and warnings
 /// of what the deck can't say, what writing raises, what no step writes. Places are JSON pointers into the
 /// model file that the store would make. Raises when the model can't be completed or isn't there.
@@ -20,7 +20,7 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
 void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
 /// The part that only the deck writer's rules tell. To be asked of a model without errors.
 void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
-/// Writes the deck of "Default Model" to nowhere: says what is raised, unless it stands among the `told`
+/// Writes the deck to nowhere: says what is raised, unless it stands among the `told`
 /// ones, and how large a huge deck will be.
 /// `progress`: counts the deck's bytes meanwhile.
 void dck_Rehearse(const odb_Odb& store, const std::vector<fnd_Finding>& told, fnd_Sink& sink,

@@ -57,7 +57,7 @@ void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
         FindOnRegion(bc, place, sink);
         if (bc.DynTypeId() == kbcC_SymmetryBC::TypeId()) {
             sink.Add("comment-only", place, "decks tell of a symmetry record in a comment only", {},
-                     "for symmetry take kbcC_TypeBC with XSYMM, YSYMM or ZSYMM");
+                     "for symmetry take TypeBC with XSYMM, YSYMM or ZSYMM");
         }
         if (const auto* motion = nex_canDynamicCastPtr<kbcC_ConnectorBC>(&bc)) {
             if (!elementSets) elementSets = ElementSetsOf(model);

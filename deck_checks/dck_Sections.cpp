@@ -101,7 +101,7 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
             const auto& [section, count] = misfit;
             sink.Add("wrong-section", place,
                      Elements(count) + " of type " + Quoted(elements.type) + " can't take the section " +
-                         Quoted(name) + " (" + Text(cls_Classes().NameOf(section->DynTypeId())) + ")");
+                         Quoted(name) + " (" + Text(cls_Classes().ShortNameOf(section->DynTypeId())) + ")");
         }
     }
     if (without > 0) {

@@ -193,10 +193,10 @@ void CheckSteps(const odiK_Model& model, RecordWalk& walk, const fnd_Path& place
         const bool isInitial = type == kprC_InitialStep::TypeId();
         if (i == 0 && !isInitial) {
             sink.Add("initial-step", fnd_Path(step, "class"),
-                     "found " + fnd_Quoted(cls_Classes().NameOf(type).View()),
-                     "kprC_InitialStep as the first step");
+                     "found " + fnd_Quoted(cls_Classes().ShortNameOf(type).View()),
+                     "InitialStep as the first step");
         } else if (i > 0 && isInitial) {
-            sink.Add("initial-step", fnd_Path(step, "class"), "found a second kprC_InitialStep",
+            sink.Add("initial-step", fnd_Path(step, "class"), "found a second InitialStep",
                      "it in the first place alone");
         }
         walk.Name(model.steps.NameAt(i), fnd_Path(step, "name"));

@@ -79,7 +79,7 @@ class Schema:
         if target is not None:
             if target in self.names:
                 yield target, self.definitions[target]
-            else:
+            elif target in self.definitions:
                 yield from self.alternatives(self.definitions[target])
             return
         found = False

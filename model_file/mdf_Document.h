@@ -8,6 +8,7 @@
 /// those of the parser included.
 std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
                                           mdf_Report& report, mdf_MeshShelf* shelf = nullptr,
-                                          const mdf_GivenMeshes& given = {});
+                                          const mdf_GivenMeshes& given = {},
+                                          const mdf_ModelChoice& choice = {});
 
 #endif

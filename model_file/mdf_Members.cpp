@@ -1,7 +1,5 @@
 #include "model_file/mdf_Members.h"
 
-#include "store_interface/records/cls_ClassRegistrar.h"
-
 #include <algorithm>
 
 std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields, const std::vector<std::string>& others) {
@@ -35,7 +33,14 @@ std::string mdf_MeaningWord(const cls_IntMeaning& meaning) {
     return word;
 }
 
-std::string_view mdf_ShortClassName(const cls_ClassEntry& entry) {
-    const std::string_view name(entry.info.name);
-    return name.substr(name.find('_') + 1);
+std::string mdf_WordOfNumber(const cls_Field& field, int number) {
+    for (const cls_IntMeaning& meaning : field.meanings) {
+        if (meaning.value != number) continue;
+        const std::string word = mdf_MeaningWord(meaning);
+        for (const cls_IntMeaning& other : field.meanings) {
+            if (omu_EqualInAnyCapitals(mdf_MeaningWord(other), word))
+                return other.value == number ? word : std::string();
+        }
+    }
+    return {};
 }

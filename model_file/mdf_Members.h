@@ -3,8 +3,6 @@
 
 #include "model_file/mdf_Diagnostics.h"
 
-struct cls_ClassEntry;
-
 /// The members that an object of these fields may have.
 std::vector<std::string> mdf_MembersOf(const cls_FieldTable& fields,
                                        const std::vector<std::string>& others = {});
@@ -13,8 +11,7 @@ void mdf_CheckMembers(mdf_Diagnostics& diagnostics, const mdf_Value& object,
                       const std::vector<std::string>& known, const fnd_Path& path);
 /// The word of a meaning: what stands before "(", "," or ":".
 std::string mdf_MeaningWord(const cls_IntMeaning& meaning);
-
-/// A class by its name without the prefix of its family, "BeamSection" of "kseC_BeamSection".
-std::string_view mdf_ShortClassName(const cls_ClassEntry& entry);
+/// The word of a field that a reader takes for the number, or nothing.
+std::string mdf_WordOfNumber(const cls_Field& field, int number);
 
 #endif

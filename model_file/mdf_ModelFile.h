@@ -66,6 +66,8 @@ struct mdf_Report {
     /// The file, for Locate().
     std::shared_ptr<const mdf_FileText> text;
     std::vector<mdf_Parameter> parameters;
+    /// Where the file says that its schema is; for editors.
+    std::string schema;
 
     /// Gives findings on the file's content, whoever found them, their lines and columns, where they have
     /// none. A file that has changed meanwhile gives none. mdf_Locate does the same for a text.
@@ -90,21 +92,32 @@ struct mdf_LineStyle {
 std::string mdf_LineOf(const std::string& fileName, const fnd_Finding& finding,
                        const mdf_LineStyle& style = {});
 
+/// Which of a file's models decks are written from.
+struct mdf_ModelChoice {
+    /// Empty: the only one, or of several "Default Model".
+    std::string name;
+    /// Whether a file is wrong that doesn't tell.
+    bool needed = true;
+};
+
 /// Reads a model file, or its text, into a store. Null when there are errors; warnings alone don't hinder.
 /// The store's models are complete: every name is resolved and every status is known.
-std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report);
+std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report,
+                                           const mdf_ModelChoice& choice = {});
 /// `given`: meshes that are in memory already, shared, not copied; the member "mesh" of a part or an instance
 /// names one by its place.
 std::unique_ptr<odb_Odb> mdf_ReadModelText(std::string_view text, const std::string& fileName,
-                                           mdf_Report& report, const mdf_GivenMeshes& given = {});
+                                           mdf_Report& report, const mdf_GivenMeshes& given = {},
+                                           const mdf_ModelChoice& choice = {});
 
 /// Writes all models of a store as a model file; fields that have their default are left out. False when the
 /// stream failed.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out);
 /// The same, where meshes that came from mesher's files stay in these; `folder` is the model file's own, from
-/// which their paths count. And with the parameters that the file had.
+/// which their paths count. And with the parameters and the schema that the file had.
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& out, const std::list<mdf_MeshOrigin>& origins,
-                        const std::string& folder, const std::vector<mdf_Parameter>& parameters = {});
+                        const std::string& folder, const std::vector<mdf_Parameter>& parameters = {},
+                        const std::string& schema = {});
 
 /// Writes the JSON Schema (draft 2020-12) of model files, with the documentation of every field.
 bool mdf_WriteSchema(std::ostream& out);

@@ -138,12 +138,12 @@ void mdf_ModelReader::ReadStep(const mdf_Value& json, bool isFirst, const fnd_Pa
     }
     const bool isInitial = record->DynTypeId() == kprC_InitialStep::TypeId();
     if (isInitial && !isFirst) {
-        diagnostics_.Add("initial-step", classPath, "found a second kprC_InitialStep",
+        diagnostics_.Add("initial-step", classPath, "found a second InitialStep",
                          "it in the first place alone");
     } else if (isFirst && !isInitial) {
         diagnostics_.Add("initial-step", classPath,
-                         "found " + fnd_Quoted(cls_Classes().NameOf(record->DynTypeId()).View()),
-                         "kprC_InitialStep as the first step");
+                         "found " + fnd_Quoted(cls_Classes().ShortNameOf(record->DynTypeId()).View()),
+                         "InitialStep as the first step");
     }
     model_.steps.Append(cow_String(name), static_cast<const kprC_Step&>(*record));
 }

@@ -195,9 +195,14 @@ bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream) {
 }
 
 bool mdf_WriteModelFile(const odb_Odb& odb, std::ostream& stream, const std::list<mdf_MeshOrigin>& origins,
-                        const std::string& folder, const std::vector<mdf_Parameter>& parameters) {
+                        const std::string& folder, const std::vector<mdf_Parameter>& parameters,
+                        const std::string& schema) {
     mdf_Writer out(stream);
     out.BeginObject();
+    if (!schema.empty()) {
+        out.Key("$schema");
+        out.String(schema);
+    }
     out.Key("format");
     out.String(mdf_kFormat);
     mdf_WriteParameters(out, parameters);

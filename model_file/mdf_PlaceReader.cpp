@@ -112,3 +112,26 @@ void mdf_PlaceReader::ReportNoSet(const Names& names, const fnd_Path& path) {
                                for (const auto& set : sets) nearest.Try(set->name.View());
                            }));
 }
+
+rgnC_Region mdf_PlaceReader::ReadRegions(const mdf_Value& array, const fnd_Path& path) {
+    const int errorsBefore = diagnostics_.NumErrors();
+    cow_List<rgnC_Region> regions;
+    for (std::size_t i = 0; i < array.Size(); ++i) {
+        const fnd_Path place(path, i);
+        const rgnC_Region region = ReadRegion(array.Item(i), place);
+        if (diagnostics_.NumErrors() != errorsBefore) continue;
+        const odiK_Instance* owner = model_.FindInstance(region.InstanceName());
+        if (region.FlagWord() != 1 || (owner != nullptr && !owner->isPartInstance)) {
+            diagnostics_.Expected(place, array.Item(i), "a node set: only of such can several be given");
+            continue;
+        }
+        regions.Append(region);
+    }
+    if (array.Empty()) diagnostics_.Expected(path, array, "one region or several");
+    if (diagnostics_.NumErrors() != errorsBefore) return {};
+    if (regions.Length() == 1) return regions[0];
+    const rgnC_Region joined = model_.JoinNodeSets(regions);
+    // A complete model takes no set that it hasn't.
+    if (!joined.HasValue()) diagnostics_.Expected(path, array, "regions that the model has joined already");
+    return joined;
+}

@@ -9,6 +9,8 @@ public:
     mdf_PlaceReader(odiK_Model& model, const mdf_References& references, mdf_Diagnostics& diagnostics)
         : model_(model), references_(references), diagnostics_(diagnostics) {}
 
+    /// Reads an array of regions of nodes, which are taken together as an internal set of the assembly.
+    rgnC_Region ReadRegions(const mdf_Value& array, const fnd_Path& path);
     rgnC_Region ReadRegion(const mdf_Value& value, const fnd_Path& path);
     bool ReadDatum(dtmC_DatumRef& datum, const mdf_Value& json, const fnd_Path& path);
     /// Reports that there is no instance of the name.

@@ -1,5 +1,6 @@
 #include "model_file/mdf_RecordReader.h"
 
+#include "model_file/mdf_ClassChoice.h"
 #include "store_interface/findings/fnd_RecordRules.h"
 #include "store_interface/findings/fnd_TextRules.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -69,41 +70,20 @@ bool mdf_RecordReader::ReadField(cls_Record& record, const cls_Field& field, con
     return true;
 }
 
-const mdf_RecordReader::Choice& mdf_RecordReader::ChoiceOf(unsigned base) {
-    // Classes are the same for all readers, of which there is one a variant, until a program adds its own.
-    thread_local std::unordered_map<unsigned, Choice> choices;
-    thread_local std::size_t known = 0;
-    if (known != cls_Classes().All().size()) {
-        known = cls_Classes().All().size();
-        choices.clear();
-    }
-    const auto [place, isNew] = choices.try_emplace(base);
-    Choice& choice = place->second;
-    if (!isNew) return choice;
-    choice.classes = cls_Classes().ConcreteClasses(base);
-    for (const cls_ClassEntry* entry : choice.classes) {
-        choice.names.emplace_back(entry->info.name);
-        // By a short name that two have, neither is known.
-        const auto [entryOfName, isFirst] =
-            choice.byName.emplace(fnd_LowerCase(mdf_ShortClassName(*entry)), entry);
-        if (!isFirst) entryOfName->second = nullptr;
-    }
-    for (const cls_ClassEntry* entry : choice.classes) choice.byName[fnd_LowerCase(entry->info.name)] = entry;
-    return choice;
-}
-
 std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const mdf_Value& object,
                                                          const fnd_Path& path) {
     if (!object.IsObject()) {
         diagnostics_.Expected(path, object, "an object");
         return nullptr;
     }
-    const Choice& choice = ChoiceOf(base);
-    const std::vector<std::string>& names = choice.names;
+    const mdf_ClassChoice& choice = mdf_ClassChoice::Of(base);
+    const std::vector<std::string>& names = choice.Names();
     const mdf_Value* name = object.Find("class");
     const fnd_Path place(path, "class");
     if (name == nullptr) {
-        if (choice.classes.size() == 1) return std::unique_ptr<cls_Record>(choice.classes.front()->create());
+        if (choice.Classes().size() == 1) {
+            return std::unique_ptr<cls_Record>(choice.Classes().front()->create());
+        }
         diagnostics_.Add("missing-field", place, "found nothing",
                          (names.empty() ? std::string("no object here") : fnd_OneOf(names)));
         return nullptr;
@@ -112,14 +92,10 @@ std::unique_ptr<cls_Record> mdf_RecordReader::NewVariant(unsigned base, const md
         diagnostics_.Expected(place, *name, "the name of a class");
         return nullptr;
     }
-    const auto entry = choice.byName.find(fnd_LowerCase(name->String()));
-    if (entry != choice.byName.end() && entry->second != nullptr) {
-        return std::unique_ptr<cls_Record>(entry->second->create());
-    }
+    if (const cls_ClassEntry* entry = choice.Find(name->String()))
+        return std::unique_ptr<cls_Record>(entry->create());
     diagnostics_.Expected(place, *name, (names.empty() ? "no object here" : fnd_OneOf(names, name->String())),
-                          fnd_DidYouMean(diagnostics_, name->String(), [&names](fnd_Nearest& nearest) {
-                              for (const std::string& each : names) nearest.Try(each);
-                          }));
+                          diagnostics_.WantsHint() ? choice.DidYouMean(name->String()) : std::string());
     return nullptr;
 }
 
@@ -190,7 +166,9 @@ bool mdf_RecordReader::ReadValue(const cls_FieldType& type, void* value, const m
     case cls_FieldKind::Variant:
         return ReadHolder(static_cast<const cls_HolderType&>(type), value, json, path);
     case cls_FieldKind::Region:
-        *static_cast<rgnC_Region*>(value) = places_.ReadRegion(json, path);
+        *static_cast<rgnC_Region*>(value) = field.mayBeSeveral && json.IsArray()
+                                                ? places_.ReadRegions(json, path)
+                                                : places_.ReadRegion(json, path);
         return true;
     case cls_FieldKind::Datum: return places_.ReadDatum(*static_cast<dtmC_DatumRef*>(value), json, path);
     case cls_FieldKind::Attribute:
@@ -521,13 +499,26 @@ mdl_GivenEnm mdf_RecordReader::ReadAttribute(const cls_AttributeType& type, void
                : mdl_GivenEnm::ABSENT;
 }
 
+/// The pairs of a contact mustn't depend on the order of members; names of no step come first.
+std::vector<const mdf_Member*> mdf_RecordReader::InOrder(const kprC_PropagatingObject& object,
+                                                         const mdf_Value& states) const {
+    std::vector<const mdf_Member*> members;
+    for (const mdf_Member& member : states.Members()) members.push_back(&member);
+    if (!mdf_UsesPairs(object, states)) return members;
+    std::ranges::stable_sort(members, {}, [this](const mdf_Member* member) {
+        return model_.steps.IndexOf(cow_String(member->name));
+    });
+    return members;
+}
+
 void mdf_RecordReader::ReadStates(kprC_PropagatingObject& object, const mdf_Value& states,
                                   const fnd_Path& path) {
     if (!states.IsObject()) {
         diagnostics_.Expected(path, states, "an object of states by step");
         return;
     }
-    for (const mdf_Member& member : states.Members()) {
+    for (const mdf_Member* const each : InOrder(object, states)) {
+        const mdf_Member& member = *each;
         const fnd_Path place(path, member.name);
         if (references_.IsWrong(member.name)) continue;
         if (!model_.steps.IsMember(cow_String(member.name))) {
@@ -563,25 +554,31 @@ void mdf_RecordReader::ReadState(kprC_PropagatingObject& object, const std::stri
         const cls_Field& field = fields[i];
         const mdf_Value* member = field.notModelData ? nullptr : json.Find(field.name);
         if (member == nullptr) continue;
-        const fnd_Path place(path, field.name);
-        void* value = field.In(record);
-        if (field.type->Kind() == cls_FieldKind::Attribute) {
-            given.marks[i] = ReadAttribute(static_cast<const cls_AttributeType&>(*field.type), value, *member,
-                                           place, field);
-            continue;
-        }
-        const bool isList = field.type->Kind() == cls_FieldKind::List;
-        if (isList && member->IsNull() &&
-            static_cast<const cls_ListType&>(*field.type).ItemType().Kind() == cls_FieldKind::Attribute) {
-            static_cast<const cls_ListType&>(*field.type).Clear(value);
-            given.marks[i] = mdl_GivenEnm::VALUE;
-            continue;
-        }
-        const bool mayBeUnset = cls_IsUnset(*field.type, value);
-        if (ReadValue(*field.type, value, *member, place, field, mayBeUnset))
-            given.marks[i] = mdl_GivenEnm::VALUE;
+        ReadStateField(object, given.marks[i], field, field.In(record), *member, fnd_Path(path, field.name));
     }
     if (diagnostics_.NumErrors() != errorsBefore) return;
     fnd_RecordCheck check(diagnostics_, path);
     fnd_RecordRules::All().Run(record, check);
+}
+
+void mdf_RecordReader::ReadStateField(kprC_PropagatingObject& object, mdl_GivenEnm& mark,
+                                      const cls_Field& field, void* value, const mdf_Value& json,
+                                      const fnd_Path& path) {
+    if (field.type->Kind() == cls_FieldKind::Attribute) {
+        mark = ReadAttribute(static_cast<const cls_AttributeType&>(*field.type), value, json, path, field);
+        return;
+    }
+    const bool isList = field.type->Kind() == cls_FieldKind::List;
+    if (isList && json.IsNull() &&
+        static_cast<const cls_ListType&>(*field.type).ItemType().Kind() == cls_FieldKind::Attribute) {
+        static_cast<const cls_ListType&>(*field.type).Clear(value);
+        mark = mdl_GivenEnm::VALUE;
+        return;
+    }
+    const mdf_PairList* pairs = isList ? mdf_PairListOf(field) : nullptr;
+    const bool isRead =
+        pairs != nullptr && mdf_IsOfPairs(*pairs, json)
+            ? ReadPairs(object, *pairs, field, value, json, path)
+            : ReadValue(*field.type, value, json, path, field, cls_IsUnset(*field.type, value));
+    if (isRead) mark = mdl_GivenEnm::VALUE;
 }

@@ -2,10 +2,9 @@
 #define QRX_MODEL_FILE_MDF_RECORDREADER_H
 
 #include "model_file/mdf_Members.h"
+#include "model_file/mdf_PairLists.h"
 #include "model_file/mdf_PlaceReader.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
-
-#include <unordered_map>
 
 /// Reads records of any class from JSON objects by their field tables. Parts, instances, sets and datums of
 /// the model must be there; the names of other objects are looked up at
@@ -35,15 +34,6 @@ public:
     mdf_PlaceReader& Places() { return places_; }
 
 private:
-    /// The classes that a record may be of where one derived from a base stands.
-    struct Choice {
-        std::vector<const cls_ClassEntry*> classes;
-        std::vector<std::string> names;
-        // By the whole name and by the short one, in small letters; null where a short name tells two.
-        std::unordered_map<std::string, const cls_ClassEntry*> byName;
-    };
-    static const Choice& ChoiceOf(unsigned base);
-
     bool ReadValue(const cls_FieldType& type, void* value, const mdf_Value& json, const fnd_Path& path,
                    const cls_Field& field, bool mayBeUnset);
     bool ReadInt(int& value, const mdf_Value& json, const fnd_Path& path, const cls_Field& field,
@@ -67,8 +57,16 @@ private:
     bool ReadMap(const cls_MapType& type, void* value, const mdf_Value& json, const fnd_Path& path,
                  const cls_Field& field);
     bool ReadHolder(const cls_HolderType& type, void* value, const mdf_Value& json, const fnd_Path& path);
+    /// Reads a list that gives pairs of the object and what belongs to them in one.
+    bool ReadPairs(kprC_PropagatingObject& object, const mdf_PairList& row, const cls_Field& field,
+                   void* list, const mdf_Value& json, const fnd_Path& path);
     mdl_GivenEnm ReadAttribute(const cls_AttributeType& type, void* attribute, const mdf_Value& json,
                                const fnd_Path& path, const cls_Field& field);
+    /// Reads one field of a state; marks it as given unless it was refused.
+    void ReadStateField(kprC_PropagatingObject& object, mdl_GivenEnm& mark, const cls_Field& field,
+                        void* value, const mdf_Value& json, const fnd_Path& path);
+    std::vector<const mdf_Member*> InOrder(const kprC_PropagatingObject& object,
+                                           const mdf_Value& states) const;
     void ReadState(kprC_PropagatingObject& object, const std::string& stepName, const mdf_Value& json,
                    const fnd_Path& path);
 

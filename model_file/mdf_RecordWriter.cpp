@@ -87,19 +87,6 @@ bool SameZeros(const cls_FieldType& type, const void* a, const void* b) {
     }
 }
 
-/// The word that a reader takes for the number, or nothing.
-std::string WordOf(const cls_Field& field, int number) {
-    for (const cls_IntMeaning& meaning : field.meanings) {
-        if (meaning.value != number) continue;
-        const std::string word = mdf_MeaningWord(meaning);
-        for (const cls_IntMeaning& other : field.meanings) {
-            if (omu_EqualInAnyCapitals(mdf_MeaningWord(other), word))
-                return other.value == number ? word : std::string();
-        }
-    }
-    return {};
-}
-
 /// Lists of such items stand in lines as long as they fit.
 bool IsShort(const cls_FieldType& type) {
     switch (type.Kind()) {
@@ -139,8 +126,9 @@ void mdf_RecordWriter::WriteField(const cls_Field& field, const cls_Record& reco
 
 void mdf_RecordWriter::WriteMember(const cls_Field& field, const cls_Record& record) {
     out_.Key(field.name);
-    const std::string word =
-        field.meanings.empty() ? std::string() : WordOf(field, *static_cast<const int*>(field.In(record)));
+    const std::string word = field.meanings.empty()
+                                 ? std::string()
+                                 : mdf_WordOfNumber(field, *static_cast<const int*>(field.In(record)));
     if (!word.empty()) {
         out_.String(word);
     } else if (field.verbatim) {
@@ -175,7 +163,7 @@ void mdf_RecordWriter::WriteRecord(const cls_Record& record, unsigned base) {
 
 void mdf_RecordWriter::WriteClass(const cls_Record& record) {
     out_.Key("class");
-    out_.String(cls_Classes().NameOf(record.DynTypeId()).View());
+    out_.String(cls_Classes().ShortNameOf(record.DynTypeId()).View());
 }
 
 void mdf_RecordWriter::WriteStates(const kprC_PropagatingObject& object) {

@@ -1,194 +1,20 @@
-#include "model_file/mdf_Members.h"
+#include "model_file/mdf_ClassChoice.h"
+#include "model_file/mdf_Example.h"
 #include "model_file/mdf_MeshFile.h"
 #include "model_file/mdf_ModelFile.h"
+#include "model_file/mdf_RecordReader.h"
+#include "model_file/mdf_SchemaFrame.h"
 #include "store_interface/model/odiK_Repositories.h"
-#include "store_interface/records/cls_ClassRegistrar.h"
-
-#include <nlohmann/json.hpp>
+#include "store_interface/records/interactions/kinC_ContactExp.h"
 
 #include <cctype>
 #include <cstring>
 #include <ostream>
+#include <set>
 
 namespace {
 
 using Json = nlohmann::ordered_json;
-
-// The frame of a model file; members that hold records are added from the classes.
-constexpr char kFrame[] = R"({
-  "$schema": "https://json-schema.org/draft/2020-12/schema",
-  "title": "QRX model file",
-  "description": "A model store on disk: everything that a keyword deck is written from. Comments are allowed.",
-  "type": "object",
-  "additionalProperties": false,
-  "required": ["format", "models"],
-  "properties": {
-    "format": {"description": "what this file is", "const": "qrx-model/1"},
-    "parameters": {
-      "description": "Short names for what a study varies; a column of its table is one of them, or a pointer.",
-      "type": "object",
-      "propertyNames": {"minLength": 1, "pattern": "^[^/]", "not": {"const": "name"}},
-      "additionalProperties": {
-        "anyOf": [
-          {"$ref": "#/$defs/POINTERS"},
-          {
-            "type": "object",
-            "additionalProperties": false,
-            "required": ["pointers"],
-            "properties": {
-              "pointers": {"description": "what it stands for", "$ref": "#/$defs/POINTERS"},
-              "unit": {"description": "for people", "type": "string"},
-              "limits": {"description": "what its numbers may be: \"> 0, <= 20\", or \"0.5 .. 20\" with both ends", "type": "string"},
-              "description": {"description": "for people", "type": "string"}
-            }
-          }
-        ]
-      }
-    },
-    "models": {
-      "description": "Models by name; decks are written from \"Default Model\".",
-      "type": "object",
-      "required": ["Default Model"],
-      "additionalProperties": {"$ref": "#/$defs/MODEL"}
-    }
-  },
-  "$defs": {
-    "NAME": {
-      "description": "A name that can stand in a deck.",
-      "type": "string", "minLength": 1, "maxLength": 80, "pattern": "^[^\"\\u0000-\\u001f\\u007f]*$"
-    },
-    "POINTER": {
-      "description": "A JSON pointer to a value of this file.",
-      "type": "string", "pattern": "^/models/"
-    },
-    "POINTERS": {
-      "description": "One place, or several that get the same value.",
-      "anyOf": [{"$ref": "#/$defs/POINTER"}, {"type": "array", "items": {"$ref": "#/$defs/POINTER"}, "minItems": 1}]
-    },
-    "LINE": {
-      "description": "A text that can stand on one line of a deck.",
-      "type": "string", "pattern": "^[^\\u0000-\\u001f\\u007f]*$"
-    },
-    "TEXT": {
-      "description": "Deck text, with whatever keywords are in it: a string as it stands, or an array of strings, each of which becomes a line.",
-      "anyOf": [{"type": "string"}, {"type": "array", "items": {"type": "string"}}]
-    },
-    "INT": {"type": "integer", "minimum": -2147483648, "maximum": 2147483647},
-    "TRIPLE": {"type": "array", "items": {"type": "number"}, "minItems": 3, "maxItems": 3},
-    "COMPLEX": {
-      "description": "A complex number: real and imaginary part, or an object. In the form POLAR real is the magnitude and imag the phase in degrees.",
-      "anyOf": [
-        {"type": "array", "items": {"type": "number"}, "minItems": 2, "maxItems": 2},
-        {
-          "type": "object",
-          "additionalProperties": false,
-          "properties": {
-            "form": {"description": "how the two numbers are to be read", "anyOf": [{"enum": ["RECTANGULAR", "POLAR"]}, {"type": "string"}, {"type": "integer"}], "default": "RECTANGULAR"},
-            "real": {"description": "real part, or magnitude", "type": "number", "default": 0},
-            "imag": {"description": "imaginary part, or phase", "type": "number", "default": 0}
-          }
-        }
-      ]
-    },
-    "TABLE": {
-      "description": "Rows of numbers, all of one length.",
-      "type": "array", "items": {"type": "array", "items": {"type": "number"}}
-    },
-    "LABELS": {
-      "description": "User labels in order, or a range of them.",
-      "anyOf": [
-        {"type": "array", "items": {"type": "integer", "minimum": 1, "maximum": 2147483647}},
-        {
-          "type": "object",
-          "additionalProperties": false,
-          "required": ["from", "to"],
-          "properties": {
-            "from": {"description": "first label", "type": "integer", "minimum": 1},
-            "to": {"description": "no label is above it", "type": "integer", "minimum": 1},
-            "by": {"description": "from one label to the next", "type": "integer", "minimum": 1, "default": 1}
-          }
-        }
-      ]
-    },
-    "FACETS": {
-      "description": "Element label and face: S1 to S6 on solids and plane elements, SPOS and SNEG on shells, END1 and END2 on lines, or the facet's id from 0 (6 is the double side of a shell).",
-      "type": "array",
-      "items": {
-        "type": "array", "minItems": 2, "maxItems": 2,
-        "prefixItems": [{"type": "integer", "minimum": 1}, {"type": ["string", "integer"]}]
-      }
-    },
-    "REGION": {
-      "description": "A set of the assembly (\"SET\") or of an instance (\"INSTANCE.SET\"), as an object where a name has a dot; null for none.",
-      "anyOf": [
-        {"type": ["string", "null"]},
-        {
-          "type": "object",
-          "additionalProperties": false,
-          "required": ["set"],
-          "properties": {
-            "instance": {"description": "the instance that has the set", "$ref": "#/$defs/NAME"},
-            "set": {"description": "the set", "$ref": "#/$defs/NAME"}
-          }
-        }
-      ]
-    },
-    "NODES": {
-      "description": "User labels, and for each three coordinates (single precision).",
-      "type": "object",
-      "additionalProperties": false,
-      "required": ["labels", "coordinates"],
-      "properties": {
-        "labels": {"description": "labels that differ", "$ref": "#/$defs/LABELS"},
-        "coordinates": {"description": "x, y and z of each node: lengths", "type": "array", "items": {"$ref": "#/$defs/TRIPLE"}}
-      }
-    },
-    "ELEMENTS": {
-      "description": "Elements of one type, each with a row of node labels. In the assembly's mesh an end may be a text: instance, dot, label.",
-      "type": "object",
-      "additionalProperties": false,
-      "required": ["type", "labels", "connectivity"],
-      "properties": {
-        "type": {"description": "the element type, as the deck says it", "$ref": "#/$defs/NAME"},
-        "labels": {"description": "labels that differ in the whole mesh", "$ref": "#/$defs/LABELS"},
-        "connectivity": {
-          "description": "the nodes of each element",
-          "type": "array",
-          "items": {"type": "array", "items": {"type": ["integer", "string"]}, "minItems": 1}
-        },
-        "controls": {"description": "element controls", "$ref": "#/$defs/bme_ElemCtrlParams"}
-      }
-    },
-    "MESH": {
-      "description": "Nodes, elements and sets. Elements find their nodes by label, sets their members. Or a mesher's file, whose cells and groups they are.",
-      "type": "object",
-      "additionalProperties": false,
-      "properties": {
-        "file": {"description": "a mesher's file (MSH, UNV, MED, VTU, VTK, STL), relative to the model file; it takes the place of nodes and elements", "type": "string", "minLength": 1},
-        "part": {"description": "the mesh to take of a file with several", "type": "string"},
-        "scale": {"description": "coordinates of the file are multiplied by it", "type": "number", "exclusiveMinimum": 0, "default": 1},
-        "elementTypes": {"description": "element types by kind of cell, such as tetra10; null: such cells make no elements", "type": "object", "additionalProperties": {"anyOf": [{"$ref": "#/$defs/NAME"}, {"type": "null"}]}},
-        "surfaceElements": {"description": "what surface cells become; shells where there are no solids", "type": "string"},
-        "groups": {"description": "names of sets by group, or by group, '@' and dimension; null leaves the group out", "type": "object", "additionalProperties": {"anyOf": [{"$ref": "#/$defs/NAME"}, {"type": "null"}]}},
-        "groupArrays": {"description": "integer arrays of cells whose values become groups NAME_VALUE, in formats without groups", "type": "array", "items": {"type": "string"}},
-        "controls": {"description": "element controls by element type, for a file's elements", "type": "object", "additionalProperties": {"$ref": "#/$defs/bme_ElemCtrlParams"}},
-        "nodes": {"description": "the nodes in the order of the deck", "$ref": "#/$defs/NODES"},
-        "elements": {"description": "the elements type by type, in the order of the deck", "type": "array", "items": {"$ref": "#/$defs/ELEMENTS"}},
-        "sets": {"description": "node sets, element sets and surfaces", "type": "array", "items": {"$ref": "#/$defs/SET"}}
-      }
-    },
-    "MEMBERS": {
-      "description": "Members of a set of the assembly in one instance; without an instance, in the assembly's own mesh.",
-      "type": "object",
-      "additionalProperties": false,
-      "properties": {
-        "instance": {"description": "the instance that they lie in", "$ref": "#/$defs/NAME"},
-        "labels": {"description": "nodes or elements", "$ref": "#/$defs/LABELS"},
-        "facets": {"description": "faces of elements", "$ref": "#/$defs/FACETS"}
-      }
-    }
-  }
-})";
 
 Json Reference(const std::string& definition) {
     return {{"$ref", "#/$defs/" + definition}};
@@ -198,64 +24,140 @@ Json Nullable(const Json& type) {
     return {{"anyOf", {type, {{"type", "null"}}}}};
 }
 
-// What a value in a model file looks like; `base` decides whether a variant needs "class".
+Json ArrayOf(const Json& item) {
+    return {{"type", "array"}, {"items", item}};
+}
+
+/// An object whose members are named by whoever writes the file.
+Json MapOf(const Json& item) {
+    return {{"type", "object"}, {"propertyNames", Reference("NAME")}, {"additionalProperties", item}};
+}
+
+/// A pattern for one of the words in any capitals.
+std::string PatternOf(const std::vector<std::string>& words) {
+    std::string pattern = "^(?:";
+    const char* separator = "";
+    for (const std::string& word : words) {
+        pattern += std::exchange(separator, "|");
+        for (const char c : word) {
+            const auto letter = static_cast<unsigned char>(c);
+            if (std::isalpha(letter) != 0) {
+                pattern += {'[', static_cast<char>(std::toupper(letter)),
+                            static_cast<char>(std::tolower(letter)), ']'};
+            } else {
+                if (std::strchr(".^$*+?()[]{}|\\/", c) != nullptr) pattern += '\\';
+                pattern += c;
+            }
+        }
+    }
+    return pattern + ")$";
+}
+
+/// The words, which editors offer, in any capitals.
+Json WordsOf(const std::vector<std::string>& words, const std::vector<std::string>& others = {}) {
+    std::vector<std::string> all(words);
+    for (const std::string& other : others) {
+        const auto same = [&](const std::string& word) { return omu_EqualInAnyCapitals(word, other); };
+        if (!other.empty() && std::ranges::none_of(all, same)) all.push_back(other);
+    }
+    return {{{"enum", words}}, {{"type", "string"}, {"pattern", PatternOf(all)}}};
+}
+
+bool RefersToRepository(const cls_Field& field) {
+    if (field.refersTo == nullptr) return false;
+    return std::ranges::any_of(odiK_Repositories(), [&](const odiK_Repository& repository) {
+        return repository.kind != nullptr && std::string_view(repository.kind) == field.refersTo;
+    });
+}
+
+/// What a value in a model file looks like. Whatever several places have is a definition that they share.
 class SchemaMaker {
 public:
     Json Make() {
-        Json schema = Json::parse(kFrame);
-        Json& definitions = schema["$defs"];
-        definitions["MESH"]["properties"]["surfaceElements"]["enum"] = mdf_SurfaceFamilies();
-        definitions["DATUM"] = FrameOf<odiK_Datum>();
-        definitions["SET"] = FrameOf<odiK_SetHead>();
-        definitions["ASSEMBLY_SET"] = FrameOf<odiK_SetHead>();
-        definitions["PART"] = FrameOf<odiK_Part>();
-        definitions["INSTANCE"] = FrameOf<odiK_Instance>();
-        definitions["ASSEMBLY"] = FrameOf<odiK_Assembly>();
-        definitions["MODEL"] = FrameOf<odiK_ModelData>();
-        AddMembersOfSets(definitions);
-        for (const odiK_Repository& repository : odiK_Repositories()) {
-            definitions["MODEL"]["properties"][repository.member] = RepositoryOf(repository);
-        }
+        Json schema = Json::parse(mdf_kSchemaFrame);
+        definitions_ = std::move(schema["$defs"]);
+        definitions_["MESH"]["properties"]["surfaceElements"]["enum"] = mdf_SurfaceFamilies();
+        EnumOf(omu_EnumTableOf(omi_complex::FormEnm()), false);
+        Define("DATUM", FrameOf<odiK_Datum>());
+        Define("SET", FrameOf<odiK_SetHead>());
+        Define("ASSEMBLY_SET", FrameOf<odiK_SetHead>());
+        Define("PART", FrameOf<odiK_Part>());
+        Define("INSTANCE", FrameOf<odiK_Instance>());
+        Define("ASSEMBLY", FrameOf<odiK_Assembly>());
+        AddMembersOfSets();
+        Json model = FrameOf<odiK_ModelData>();
+        for (const odiK_Repository& repository : odiK_Repositories())
+            model["properties"][repository.member] = RepositoryOf(repository);
+        Define("MODEL", std::move(model));
+        FindStates();
         for (const cls_ClassEntry& entry : cls_Classes().All()) {
-            if (entry.create != nullptr) definitions[entry.info.name] = RecordOf(entry);
+            if (entry.create == nullptr) continue;
+            Define(entry.info.name, states_.count(entry.info.Id()) != 0 ? StateOf(entry) : RecordOf(entry));
         }
+        // Only now is it known where a class has to be said.
+        for (const cls_ClassEntry& entry : cls_Classes().All()) {
+            if (entry.create != nullptr && !IsChosen(entry.info.Id()))
+                definitions_[entry.info.name]["examples"][0].erase("class");
+        }
+        schema["$defs"] = std::move(definitions_);
         return schema;
     }
 
 private:
-    static Json ArrayOf(const Json& item) { return {{"type", "array"}, {"items", item}}; }
-    static Json MapOf(const Json& item) { return {{"type", "object"}, {"additionalProperties", item}}; }
+    void Define(const std::string& name, Json definition) { definitions_[name] = std::move(definition); }
 
-    static void AddMembersOfSets(Json& definitions) {
-        const Json& members = definitions["MEMBERS"]["properties"];
+    void AddMembersOfSets() {
+        const Json members = definitions_["MEMBERS"]["properties"];
         for (const char* member : {"labels", "facets"})
-            definitions["SET"]["properties"][member] = members[member];
-        Json& set = definitions["ASSEMBLY_SET"];
+            definitions_["SET"]["properties"][member] = members[member];
+        definitions_["SET"]["examples"] = {{{"name", "FIXED"}, {"kind", "node"}, {"labels", {1, 2, 3}}}};
+        Json& set = definitions_["ASSEMBLY_SET"];
         set["properties"]["members"] = ArrayOf(Reference("MEMBERS"));
         set["properties"]["members"]["description"] = "its members, instance by instance";
         set["required"].push_back("members");
+        set["examples"] = {{{"name", "FIXED"},
+                            {"kind", "node"},
+                            {"members", {{{"instance", "PART-1"}, {"labels", {1, 2, 3}}}}}}};
     }
 
-    static Json RepositoryOf(const odiK_Repository& repository) {
+    /// The states of objects, and what these derive from.
+    void FindStates() {
+        for (const cls_ClassEntry& entry : cls_Classes().All()) {
+            if (entry.create == nullptr) continue;
+            const std::unique_ptr<cls_Record> record(entry.create());
+            const auto* object = nex_canDynamicCastPtr<kprC_PropagatingObject>(record.get());
+            if (object == nullptr) continue;
+            const std::unique_ptr<cls_Record> state(object->NewState(0));
+            for (unsigned id = state->DynTypeId(); cls_Classes().Find(id) != nullptr;
+                 id = cls_Classes().Find(id)->baseId)
+                states_.insert(id);
+        }
+    }
+
+    bool IsChosen(unsigned classId) const { return chosen_.count(classId) != 0; }
+
+    Json RepositoryOf(const odiK_Repository& repository) {
         const Json item = VariantOf(repository.ItemTypeId());
         Json schema = repository.IsInOrder() ? ArrayOf(item) : MapOf(item);
-        schema["description"] = repository.IsInOrder() ? "the first is the kprC_InitialStep, no other is one"
-                                                       : std::string(repository.plural) + " by name";
-        if (!repository.ReachesDeck())
-            schema["description"] =
-                schema["description"].get<std::string>() + "; in no deck: " + repository.whyNotInDeck;
+        std::string description = repository.IsInOrder()
+                                      ? "steps in their order; the first is the InitialStep, no other is one"
+                                      : std::string(repository.plural) + " by name";
+        if (!repository.ReachesDeck()) description.append("; in no deck: ").append(repository.whyNotInDeck);
+        schema["description"] = description;
         return schema;
     }
 
     /// An object of the frame, whose class is known by its place.
     template <class T>
-    static Json FrameOf() {
+    Json FrameOf() {
         const T byDefault;
-        return ObjectOf(T::Class.doc, T::Fields(), byDefault, Json::object(), Json::array());
+        Json object = ObjectOf(T::Class.doc, T::Fields(), byDefault, Json::object(), Json::array());
+        object["examples"] = {Json::parse(T::Fields().Example())};
+        return object;
     }
 
-    static Json ObjectOf(const char* doc, const cls_FieldTable& fields, const cls_Record& byDefault,
-                         Json properties, Json required) {
+    Json ObjectOf(const char* doc, const cls_FieldTable& fields, const cls_Record& byDefault, Json properties,
+                  Json required) {
         for (const cls_Field& field : fields.All()) {
             if (field.notModelData) continue;
             properties[field.name] = FieldOf(field, byDefault);
@@ -267,27 +169,40 @@ private:
         return object;
     }
 
-    static Json VariantOf(unsigned base) {
-        Json choices = Json::array();
-        for (const cls_ClassEntry* entry : cls_Classes().ConcreteClasses(base)) {
-            choices.push_back(Reference(entry->info.name));
+    /// A record of the class or of one derived from it: its "class" decides what else it has.
+    Json VariantOf(unsigned base) {
+        const mdf_ClassChoice& choice = mdf_ClassChoice::Of(base);
+        if (choice.Classes().empty()) return Json(false);
+        if (choice.Classes().size() == 1) return Reference(choice.Classes().front()->info.name);
+        const std::string name = std::string("ANY_") + cls_Classes().Find(base)->info.name;
+        if (definitions_.contains(name)) return Reference(name);
+        Json words = Json::array({Json{{"enum", choice.Names()}}});
+        Json branches = Json::array();
+        for (const cls_ClassEntry* entry : choice.Classes()) {
+            chosen_.insert(entry->info.Id());
+            const std::string className = entry->info.name;
+            words.push_back(Reference(className + "/properties/class"));
+            branches.push_back({{"if",
+                                 {{"required", {"class"}},
+                                  {"properties", {{"class", Reference(className + "/properties/class")}}}}},
+                                {"then", Reference(className)}});
         }
-        if (choices.size() == 1) return choices.front();
-        for (Json& choice : choices) choice["required"] = {"class"};
-        return choices.empty() ? Json(false) : Json{{"oneOf", choices}};
+        Define(name, {{"description", cls_Classes().Find(base)->info.doc},
+                      {"type", "object"},
+                      {"required", {"class"}},
+                      {"properties", {{"class", {{"description", "which class it is"}, {"anyOf", words}}}}},
+                      {"allOf", branches}});
+        return Reference(name);
     }
 
-    /// The whole name for those who complete it; the short one is taken too.
     static Json ClassOf(const cls_ClassEntry& entry) {
-        const std::string shortName = PatternOf(std::string(mdf_ShortClassName(entry)));
-        const std::string whole = PatternOf(entry.info.name);
-        return {{"description", "the class of the record"},
-                {"anyOf",
-                 {{{"const", entry.info.name}},
-                  {{"type", "string"}, {"pattern", "^(" + whole + "|" + shortName + ")$"}}}}};
+        const bool isTwin = mdf_ClassChoice::IsTwin(entry);
+        std::vector<std::string> words = mdf_ClassChoice::WordsOf(entry);
+        if (isTwin) words.erase(words.begin());
+        return {{"description", "the class of the record"}, {"anyOf", WordsOf({words.front()}, words)}};
     }
 
-    static Json RecordOf(const cls_ClassEntry& entry) {
+    Json RecordOf(const cls_ClassEntry& entry) {
         const std::unique_ptr<cls_Record> byDefault(entry.create());
         Json properties = Json::object();
         Json required = Json::array();
@@ -300,68 +215,71 @@ private:
         }
         Json record = ObjectOf(entry.info.doc, entry.fields(), *byDefault, properties, required);
         if (const auto* object = nex_canDynamicCastPtr<kprC_PropagatingObject>(byDefault.get())) {
-            record["properties"]["states"] = MapOf(StateOf(*object));
-            record["properties"]["states"]["description"] = "states by the name of their step";
+            const std::unique_ptr<cls_Record> state(object->NewState(0));
+            record["properties"]["states"] =
+                MapOf(Reference(cls_Classes().Find(state->DynTypeId())->info.name));
+            record["properties"]["states"]["description"] = "what it is from a step on, by the step's name";
         }
+        record["examples"] = {mdf_ExampleOf(entry)};
         return record;
     }
 
-    static Json StateOf(const kprC_PropagatingObject& object) {
-        const std::unique_ptr<cls_Record> state(object.NewState(0));
-        Json properties = Json::object();
-        for (const cls_Field& field : state->DynFields().All()) {
-            if (!field.notModelData) properties[field.name] = FieldOf(field, *state);
-        }
+    Json StateOf(const cls_ClassEntry& entry) {
+        const std::unique_ptr<cls_Record> byDefault(entry.create());
+        Json state = ObjectOf(entry.info.doc, entry.fields(), *byDefault, Json::object(), Json::array());
+        Json& properties = state["properties"];
         properties["deactivated"] = {
             {"description", "true ends the object in this step"}, {"type", "boolean"}, {"default", false}};
-        properties["status"] = TypeOf(cls_TypeOf<mdl_PropagationStatusEnm>::Instance(), nullptr);
+        properties["status"] = EnumOf(omu_EnumTableOf(mdl_PropagationStatusEnm()), false);
         properties["status"]["description"] = "takes the place of the status that follows from the states";
-        return {{"type", "object"}, {"additionalProperties", false}, {"properties", properties}};
+        state["examples"] = {Json::parse(entry.fields().Example())};
+        return state;
     }
 
-    static Json FieldOf(const cls_Field& field, const cls_Record& byDefault) {
-        Json schema = {{"description", field.doc}};
+    static std::string DescriptionOf(const cls_Field& field) {
+        std::string text = field.Documentation();
+        if (field.refersTo != nullptr) {
+            const bool hasVowel = std::strchr("aeiou", *field.refersTo) != nullptr;
+            text.append(hasVowel ? "; the name of an " : "; the name of a ").append(field.refersTo);
+        }
+        if (field.notInDeck != nullptr) text.append("; in no deck: ").append(field.notInDeck);
+        return text;
+    }
+
+    Json FieldOf(const cls_Field& field, const cls_Record& byDefault) {
+        Json schema = {{"description", DescriptionOf(field)}};
+        if (field.unit != nullptr) schema["x-unit"] = field.unit;
         Json type = TypeOf(*field.type, &field);
         if (cls_IsUnset(*field.type, field.In(byDefault))) {
             type = Nullable(type);
             schema["default"] = nullptr;
         } else {
-            const Json value = DefaultOf(*field.type, field.In(byDefault));
+            const Json value = DefaultOf(field, field.In(byDefault));
             if (!value.is_null() && !field.required) schema["default"] = value;
-        }
-        if (field.refersTo != nullptr) {
-            schema["description"] = std::string(field.doc) + " (name of a " + field.refersTo + ")";
         }
         schema.update(type);
         return schema;
     }
 
-    /// A pattern for the word in any capitals.
-    static std::string PatternOf(const std::string& word) {
-        std::string pattern;
-        for (const char c : word) {
-            const auto letter = static_cast<unsigned char>(c);
-            if (std::isalpha(letter) != 0) {
-                pattern += {'[', static_cast<char>(std::toupper(letter)),
-                            static_cast<char>(std::tolower(letter)), ']'};
-            } else {
-                if (std::strchr(".^$*+?()[]{}|\\/", c) != nullptr) pattern += '\\';
-                pattern += c;
-            }
-        }
-        return pattern;
-    }
-
-    static Json DefaultOf(const cls_FieldType& type, const void* value) {
-        switch (type.Kind()) {
+    static Json DefaultOf(const cls_Field& field, const void* value) {
+        switch (field.type->Kind()) {
         case cls_FieldKind::Bool: return *static_cast<const bool*>(value);
-        case cls_FieldKind::Int: return *static_cast<const int*>(value);
+        case cls_FieldKind::Int: {
+            const int number = *static_cast<const int*>(value);
+            const std::string word = mdf_WordOfNumber(field, number);
+            return word.empty() ? Json(number) : Json(word);
+        }
         case cls_FieldKind::Double: return *static_cast<const double*>(value);
         case cls_FieldKind::Float: return *static_cast<const float*>(value);
         case cls_FieldKind::Enum: {
-            const auto& enumeration = static_cast<const cls_EnumType&>(type);
+            const auto& enumeration = static_cast<const cls_EnumType&>(*field.type);
             const omu_EnumRow* row = enumeration.Table().Row(enumeration.Get(value));
             return row == nullptr ? Json() : Json(row->name);
+        }
+        case cls_FieldKind::Triple: {
+            double xyz[3];
+            static_cast<const cls_TripleType&>(*field.type).Get(value, xyz);
+            return {xyz[0], xyz[1], xyz[2]};
         }
         case cls_FieldKind::String: {
             const auto& text = *static_cast<const cow_String*>(value);
@@ -371,44 +289,30 @@ private:
         }
     }
 
-    static Json TypeOf(const cls_FieldType& type, const cls_Field* field) {
+    Json TypeOf(const cls_FieldType& type, const cls_Field* field) {
         switch (type.Kind()) {
         case cls_FieldKind::Bool: return {{"type", "boolean"}};
         case cls_FieldKind::Int: return IntOf(field);
         case cls_FieldKind::Double:
         case cls_FieldKind::Float: return {{"type", "number"}};
         case cls_FieldKind::String: return StringOf(field);
-        case cls_FieldKind::Enum: {
-            Json values = Json::array();
-            for (const omu_EnumRow& row : static_cast<const cls_EnumType&>(type).Table().rows) {
-                values.push_back(row.name);
-            }
-            if (field != nullptr && field->wordsOnly) return {{"enum", values}};
-            // Any capitals, the texts and the numbers are taken too.
-            return {{"anyOf", {{{"enum", values}}, {{"type", "string"}}, {{"type", "integer"}}}}};
-        }
+        case cls_FieldKind::Enum:
+            return EnumOf(static_cast<const cls_EnumType&>(type).Table(),
+                          field != nullptr && field->wordsOnly);
         case cls_FieldKind::Triple: return Reference("TRIPLE");
         case cls_FieldKind::Segment:
             return {{"type", "array"}, {"items", Reference("TRIPLE")}, {"minItems", 2}, {"maxItems", 2}};
         case cls_FieldKind::Complex: return Reference("COMPLEX");
         case cls_FieldKind::Table: return Reference("TABLE");
-        case cls_FieldKind::List: {
-            Json item = TypeOf(static_cast<const cls_ListType&>(type).ItemType(), nullptr);
-            // A null item is the default of its place.
-            if (field != nullptr && field->defaultItems != nullptr) item = Nullable(item);
-            Json list = {{"type", "array"}, {"items", item}};
-            if (field != nullptr && field->length > 0) list["minItems"] = list["maxItems"] = field->length;
-            return list;
-        }
+        case cls_FieldKind::List: return ListOf(static_cast<const cls_ListType&>(type), field);
         case cls_FieldKind::Map:
-            return {
-                {"type", "object"},
-                {"additionalProperties", TypeOf(static_cast<const cls_MapType&>(type).ItemType(), nullptr)}};
+            return MapOf(TypeOf(static_cast<const cls_MapType&>(type).ItemType(), nullptr));
         case cls_FieldKind::Record: return VariantOf(static_cast<const cls_HolderType&>(type).ClassId());
         case cls_FieldKind::Optional:
         case cls_FieldKind::Variant:
             return Nullable(VariantOf(static_cast<const cls_HolderType&>(type).ClassId()));
-        case cls_FieldKind::Region: return Reference("REGION");
+        case cls_FieldKind::Region:
+            return Reference(field != nullptr && field->mayBeSeveral ? "REGIONS" : "REGION");
         case cls_FieldKind::Datum: return {{"type", {"string", "null"}}};
         case cls_FieldKind::Attribute: return AttributeOf(static_cast<const cls_AttributeType&>(type), field);
         case cls_FieldKind::Tree: return TreeOf(type, *field);
@@ -416,39 +320,102 @@ private:
         return {};
     }
 
-    static Json IntOf(const cls_Field* field) {
-        if (field == nullptr || field->meanings.empty()) return Reference("INT");
-        Json words = Json::array();
-        std::string inAnyCapitals;
-        for (const cls_IntMeaning& meaning : field->meanings) {
-            const std::string word = mdf_MeaningWord(meaning);
-            words.push_back(word);
-            inAnyCapitals += (inAnyCapitals.empty() ? "" : "|") + PatternOf(word);
+    /// Words in any capitals, the texts that decks have for them, and the numbers: nothing else is taken.
+    Json EnumOf(const omu_EnumTable& table, bool wordsOnly) {
+        const std::string name = table.typeName + std::string(wordsOnly ? ".BY_WORD" : "");
+        if (!definitions_.contains(name)) {
+            std::vector<std::string> words;
+            std::vector<std::string> texts;
+            std::vector<int> numbers;
+            for (const omu_EnumRow& row : table.rows) {
+                words.emplace_back(row.name);
+                texts.emplace_back(row.text);
+                if (row.deck != nullptr) texts.emplace_back(row.deck);
+                numbers.push_back(row.value);
+            }
+            Json choices = WordsOf(words, texts);
+            if (!wordsOnly) choices.push_back({{"enum", numbers}});
+            Define(name, {{"anyOf", choices}});
         }
-        return {{"anyOf",
-                 {Reference("INT"),
-                  {{"enum", words}},
-                  {{"type", "string"}, {"pattern", "^(" + inAnyCapitals + ")$"}}}}};
+        return Reference(name);
     }
 
-    static Json AttributeOf(const cls_AttributeType& type, const cls_Field* field) {
+    static Json IntOf(const cls_Field* field) {
+        if (field == nullptr || field->meanings.empty()) return Reference("INT");
+        std::vector<std::string> words;
+        for (const cls_IntMeaning& meaning : field->meanings) words.push_back(mdf_MeaningWord(meaning));
+        Json choices = WordsOf(words);
+        choices.push_back(Reference("INT"));
+        return {{"anyOf", choices}};
+    }
+
+    Json ListOf(const cls_ListType& type, const cls_Field* field) {
+        const bool isOfAttributes = type.ItemType().Kind() == cls_FieldKind::Attribute;
+        Json item = TypeOf(type.ItemType(), isOfAttributes ? field : nullptr);
+        // A null item is the default of its place.
+        if (field != nullptr && field->defaultItems != nullptr) item = Nullable(item);
+        if (const mdf_PairList* pairs = field == nullptr ? nullptr : mdf_PairListOf(*field))
+            item = {{"anyOf", {item, PairOf(*pairs, *field)}}};
+        Json list = ArrayOf(item);
+        if (field != nullptr && field->length > 0) list["minItems"] = list["maxItems"] = field->length;
+        // Of a state: null ends what was set before.
+        return isOfAttributes ? Nullable(list) : list;
+    }
+
+    /// A pair with what belongs to it.
+    Json PairOf(const mdf_PairList& pairs, const cls_Field& field) {
+        const kinC_SurfacePair byDefault;
+        const auto& list = static_cast<const cls_ListType&>(*field.type);
+        const auto& value = static_cast<const cls_AttributeType&>(list.ItemType()).ValueType();
+        Json properties = Json::object();
+        Json required = Json::array();
+        if (pairs.value != nullptr && *pairs.value != '\0') {
+            properties[pairs.value] = TypeOf(value, &field);
+            properties[pairs.value]["description"] = field.doc;
+            required.push_back(pairs.value);
+        } else if (pairs.value != nullptr) {
+            const cls_ClassEntry& entry =
+                *cls_Classes().Find(static_cast<const cls_HolderType&>(value).ClassId());
+            const std::unique_ptr<cls_Record> record(entry.create());
+            properties = ObjectOf("", entry.fields(), *record, properties, required)["properties"];
+        }
+        return ObjectOf("a pair of surfaces, and what holds for it", kinC_SurfacePair::Fields(), byDefault,
+                        properties, required);
+    }
+
+    Json AttributeOf(const cls_AttributeType& type, const cls_Field* field) {
         const Json value = TypeOf(type.ValueType(), field);
-        const Json state = TypeOf(cls_TypeOf<mdl_PropAttributeStateEnm>::Instance(), nullptr);
-        return {{"anyOf",
-                 {value,
-                  {{"type", "null"}},
-                  {{"type", "object"},
-                   {"additionalProperties", false},
-                   {"required", {"state"}},
-                   {"properties", {{"value", value}, {"state", state}}}}}}};
+        const std::string ofValue =
+            value.size() != 1 ? ""
+            : value.contains("$ref")
+                ? value["$ref"].get<std::string>().substr(std::strlen("#/$defs/"))
+                : (value.contains("type") && value["type"].is_string() ? value["type"].get<std::string>()
+                                                                       : "");
+        const std::string name = ofValue.empty() ? "" : "SET_OR_CLEARED." + ofValue;
+        if (!name.empty() && definitions_.contains(name)) return Reference(name);
+        Json whole = {
+            {"description", "with its attribute state, which otherwise follows from the steps"},
+            {"type", "object"},
+            {"additionalProperties", false},
+            {"required", {"state"}},
+            {"properties",
+             {{"value", value}, {"state", EnumOf(omu_EnumTableOf(mdl_PropAttributeStateEnm()), false)}}}};
+        whole["properties"]["value"]["description"] = "the value";
+        whole["properties"]["state"]["description"] = "the state that the attribute has in this step";
+        Json attribute = {
+            {"anyOf", {value, {{"description", "cleared in this step"}, {"type", "null"}}, whole}}};
+        if (name.empty()) return attribute;
+        Define(name, std::move(attribute));
+        return Reference(name);
     }
 
     static Json StringOf(const cls_Field* field) {
-        if (field != nullptr && field->verbatim) return Reference("TEXT");
-        if (field != nullptr && field->nameOf != nullptr) return Reference("NAME");
-        if (field != nullptr && !field->words.empty()) return {{"enum", field->words}};
-        if (field != nullptr && field->freeText) return {{"type", "string"}};
-        return Reference("LINE");
+        if (field == nullptr) return Reference("LINE");
+        if (field->verbatim) return Reference("TEXT");
+        if (field->nameOf != nullptr) return Reference("NAME");
+        if (!field->words.empty()) return {{"anyOf", WordsOf({field->words.begin(), field->words.end()})}};
+        if (field->freeText) return {{"type", "string"}};
+        return Reference(RefersToRepository(*field) ? "REFERENCE" : "LINE");
     }
 
     static Json TreeOf(const cls_FieldType& type, const cls_Field& field) {
@@ -466,11 +433,16 @@ private:
         }
         return {};
     }
+
+    Json definitions_;
+    /// Classes of states, and those of places where several may stand.
+    std::set<unsigned> states_;
+    std::set<unsigned> chosen_;
 };
 
 } // namespace
 
 bool mdf_WriteSchema(std::ostream& out) {
-    out << SchemaMaker().Make().dump(2) << '\n';
+    out << SchemaMaker().Make().dump(1) << '\n';
     return static_cast<bool>(out.flush());
 }

@@ -131,7 +131,7 @@ bool mdf_Template::Read(mdf_Value& root, std::vector<fnd_Finding>& errors, const
             std::ranges::any_of(rules.findings, [&](const fnd_Finding& rule) { return Same(rule, finding); });
         if (!ofRules) findings_.push_back(finding);
     }
-    timeline_ = std::make_unique<kprC_Timeline>(store_->FindModel(odb_Odb::DefaultModelName())->steps);
+    timeline_ = std::make_unique<kprC_Timeline>(store_->DeckModel()->steps);
     return true;
 }
 
@@ -150,7 +150,7 @@ std::unique_ptr<mdf_Template> mdf_Template::Twin() const {
     twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_, given_);
     if (twin->store_ == nullptr) throw std::logic_error("a template that was read can't be read again");
     twin->timeline_ =
-        std::make_unique<kprC_Timeline>(twin->store_->FindModel(odb_Odb::DefaultModelName())->steps);
+        std::make_unique<kprC_Timeline>(twin->store_->DeckModel()->steps);
     return twin;
 }
 
@@ -180,7 +180,7 @@ const mdf_Template::Target& mdf_Template::TargetOf(const std::string& pointer) {
     known->model = tokens[1];
     // The class of an object decides what may refer to it.
     constexpr std::size_t ofObject = 4;
-    if (known->model != odb_Odb::DefaultModelName() || tokens.size() <= ofObject ||
+    if (known->model != store_->DeckModelName().View() || tokens.size() <= ofObject ||
         tokens[ofObject] == "class")
         return *known;
     for (const odiK_Repository& repository : odiK_Repositories()) {
@@ -231,12 +231,13 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfObjects(std::span<const mdf_Chan
         if (!ofChanged) diagnostics.Take(finding);
     }
     auto store = std::make_unique<odb_Odb>();
-    const cow_String name(odb_Odb::DefaultModelName());
+    const cow_String& name = store_->DeckModelName();
     odiK_Model& model = store->AddModel(name);
-    model.Share(*store_->FindModel(name));
+    store->SetDeckModelName(name);
+    model.Share(*store_->DeckModel());
     const fnd_Path top;
     const fnd_Path models(top, "models");
-    const fnd_Path ofModel(models, odb_Odb::DefaultModelName());
+    const fnd_Path ofModel(models, name.View());
     for (const auto& [pointer, object] : objects) {
         const Target& target = *object.first;
         const fnd_Path container(ofModel, std::string_view(target.repository->member));
@@ -254,7 +255,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfModels(std::span<const mdf_Chang
     mdf_Diagnostics diagnostics(report);
     std::vector<std::string> pointers;
     std::map<std::string, mdf_Value> models;
-    models.emplace(odb_Odb::DefaultModelName(), mdf_Value());
+    models.emplace(std::string(store_->DeckModelName().View()), mdf_Value());
     for (std::size_t i = 0; i < changes.size(); ++i) {
         pointers.push_back(changes[i].pointer);
         models.emplace(targets[i]->model, mdf_Value());
@@ -273,6 +274,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfModels(std::span<const mdf_Chang
         if (!readAnew) diagnostics.Take(finding);
     }
     auto store = std::make_unique<odb_Odb>();
+    store->SetDeckModelName(store_->DeckModelName());
     mdf_MeshShelf shelf(shelf_, pointers);
     const fnd_Path top;
     const fnd_Path path(top, "models");

@@ -245,7 +245,7 @@ void pyx_AddClasses(py::module_& module) {
     };
     py::class_<pyx_Field>(module, "Field")
         .def_property_readonly("name", [](const pyx_Field& f) { return f.field->name; })
-        .def_property_readonly("doc", [](const pyx_Field& f) { return f.field->doc; })
+        .def_property_readonly("doc", [](const pyx_Field& f) { return f.field->Documentation(); })
         .def_property_readonly("type", &pyx_Field::Type)
         .def_property_readonly("required", [](const pyx_Field& f) { return f.field->required; })
         .def_property_readonly("model_data", [](const pyx_Field& f) { return !f.field->notModelData; })

@@ -256,7 +256,7 @@ pyx_Mesh pyx_Mesh::OfFile(py::handle request) {
     for (fnd_Finding& finding : report.findings) finding.place.clear();
     if (report.unreadable) pyx_RaiseUnreadable(report.findings);
     if (store == nullptr) throw pyx_Wrong{report.findings};
-    const auto& part = store->FindModel(odb_Odb::DefaultModelName())->Parts().begin()->second;
+    const auto& part = store->DeckModel()->Parts().begin()->second;
     return pyx_Mesh(part->mesh, report.meshOrigins.front());
 }
 

@@ -83,7 +83,7 @@ std::unique_ptr<odb_Odb> Read(const pyx_Document& document, mdf_Report& report) 
 }
 
 void AddDeckChecks(const odb_Odb& odb, fnd_List& list) {
-    const char* const name = odb_Odb::DefaultModelName();
+    const cow_String& name = odb.DeckModelName();
     dck_CheckDeck(odb, name, list);
     dck_CheckMeshes(odb, name, list);
     dck_Rehearse(odb, std::vector<fnd_Finding>(list.findings), list);
@@ -111,7 +111,7 @@ std::unique_ptr<pyx_Store> pyx_Store::Of(py::handle value) {
 std::unique_ptr<pyx_Store> pyx_Store::Load(const std::string& path) {
     auto store = std::make_unique<pyx_Store>();
     mdf_Report& report = store->report_;
-    pyx_Released([&] { store->odb_ = mdf_ReadModelFile(path, report); });
+    pyx_Released([&] { store->odb_ = mdf_ReadModelFile(path, report, {{}, false}); });
     if (report.unreadable) pyx_RaiseUnreadable(report.findings);
     if (store->odb_ == nullptr) throw pyx_Wrong{report.findings};
     return store;
@@ -128,7 +128,7 @@ py::list pyx_Store::Check(py::handle value) {
 }
 
 const odiK_Model& pyx_Store::Model() const {
-    return *odb_->FindModel(odb_Odb::DefaultModelName());
+    return *odb_->DeckModel();
 }
 
 py::dict pyx_Store::Trees() const {
@@ -192,7 +192,7 @@ void pyx_Store::SetParameters(const py::list& parameters) {
 
 std::string pyx_Store::History() const {
     std::string text;
-    pyx_Released([&] { text = DescribeHistory(*odb_, odb_Odb::DefaultModelName()).dump(); });
+    pyx_Released([&] { text = DescribeHistory(*odb_, odb_->DeckModelName()).dump(); });
     return text;
 }
 

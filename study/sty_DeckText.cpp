@@ -53,7 +53,7 @@ void sty_DeckText::Begin(const odb_Odb& store) {
 }
 
 void sty_DeckText::Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) {
-    const odiK_Model* model = store_->FindModel(odb_Odb::DefaultModelName());
+    const odiK_Model* model = store_->DeckModel();
     for (const auto& [name, instance] : model->Instances()) {
         const cow_CountedHld<odiK_Mesh> held = instance->Mesh();
         if (held.Referent() == &mesh) return meshes_.Keep(held, block, text);

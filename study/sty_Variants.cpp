@@ -180,12 +180,12 @@ void sty_Variants::LeaveOut(const std::vector<fnd_Finding>& findings) {
 }
 
 void sty_Variants::CheckMeshes(const odb_Odb& store, fnd_Sink& sink) {
-    const odiK_Model& model = *store.FindModel(odb_Odb::DefaultModelName());
+    const odiK_Model& model = *store.DeckModel();
     const auto check = [&](const cow_CountedHld<odiK_Mesh>& mesh, std::string_view member,
                            const cow_String& name) {
         if (mesh.IsNull()) return;
         std::string place("/models");
-        fnd_AppendPointer(place, odb_Odb::DefaultModelName());
+        fnd_AppendPointer(place, store.DeckModelName().View());
         place += member;
         fnd_AppendPointer(place, name.View());
         place += "/mesh";
@@ -204,7 +204,7 @@ void sty_Variants::CheckMeshes(const odb_Odb& store, fnd_Sink& sink) {
 
 std::vector<fnd_Finding> sty_Variants::CheckDeck(const odb_Odb& store) {
     fnd_List list;
-    dck_CheckDeck(store, odb_Odb::DefaultModelName(), list);
+    dck_CheckDeck(store, store.DeckModelName(), list);
     CheckMeshes(store, list);
     return std::move(list.findings);
 }

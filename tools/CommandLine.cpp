@@ -227,10 +227,18 @@ ExitCode CommandLine::RunWriteEach(RunReport& report) const {
                    report);
 }
 
+void CommandLine::AddModelName(CLI::App* command, std::string& name) {
+    command
+        ->add_option("--model", name,
+                     "Which model of the file (default: the only one, or of several \"Default Model\")")
+        ->type_name("NAME");
+}
+
 void CommandLine::AddWrite() {
     Verb& verb = AddVerb("write", "Write the deck of a model",
                          [this](RunReport& report) { return RunWriteEach(report); });
     AddInputs(verb.command, "Model files, JSON; \"-\" is the standard input", kModels);
+    AddModelName(verb.command, write_.modelName);
     CLI::Option* job =
         verb.command
             ->add_option("--job", write_.job,
@@ -267,12 +275,13 @@ void CommandLine::AddCheck() {
         [this](RunReport& report) {
             return RunEach(
                 [this](const std::string& input, RunReport& one) {
-                    return IsDeck(input) ? RunCheckDeck(input, deck_, one) : RunCheck(input, one);
+                    return IsDeck(input) ? RunCheckDeck(input, deck_, one) : RunCheck(input, modelName_, one);
                 },
                 report);
         });
     AddInputs(verb.command, "Model files, JSON, or decks, .inp; \"-\" is a model on the standard input",
               kModelsAndDecks);
+    AddModelName(verb.command, modelName_);
     verb.command->add_flag("--no-includes", deck_.keepIncludesShut,
                            "Of a deck: don't read the files that it includes");
     AddStrictness(verb.command);
@@ -441,6 +450,7 @@ void CommandLine::AddView() {
     std::vector<std::string> extensions = kModelsAndDecks;
     extensions.insert(extensions.end(), kMeshes.begin(), kMeshes.end());
     AddInput(verb.command, view_.model, "Model file, JSON; a mesher's file; or a deck, .inp", extensions);
+    AddModelName(verb.command, view_.modelName);
     AddOutput(verb.command, view_.output,
               "The page (default: the model file's name with .html, in the current folder)");
     Take(verb.command
@@ -463,10 +473,27 @@ void CommandLine::AddTables() {
     AddJson(variables.command);
     variables.examples = {{"qrxdeck variables --step-type StaticStep", ""}};
 
-    Verb& schema = AddVerb("schema", "Print the JSON Schema of model files, for editors and generators",
-                           [this](RunReport& report) { return RunSchema(schemaOutput_, report); });
-    AddOutput(schema.command, schemaOutput_, "File to write (default: the standard output)");
-    schema.examples = {{"qrxdeck schema -o model.schema.json", ""}};
+    Verb& classes = AddVerb("classes", "List the classes of objects that model files know",
+                            [this](RunReport& report) { return RunClasses(classFamily_, report); });
+    Take(classes.command->add_option("FAMILY", classFamily_,
+                                     "One family alone, such as steps, loads, sections, materials"),
+         Values::WORDS, ClassFamilies());
+    AddJson(classes.command);
+    classes.examples = {{"qrxdeck classes loads", ""}};
+
+    Verb& schema = AddVerb("schema", "Print the JSON Schema of model files, or one class as a table",
+                           [this](RunReport& report) {
+                               return schemaClass_.empty() ? RunSchema(schemaOutput_, report)
+                                                           : RunSchemaOf(schemaClass_, report);
+                           });
+    CLI::Option* named = Take(schema.command->add_option("CLASS", schemaClass_,
+                                                         "A class, or a part of a model such as instance, to "
+                                                         "be read as a table"),
+                              Values::WORDS, ClassNames());
+    AddOutput(schema.command, schemaOutput_, "File to write (default: the standard output)")->excludes(named);
+    AddJson(schema.command);
+    schema.examples = {{"qrxdeck schema -o model.schema.json", "for editors and generators"},
+                       {"qrxdeck schema StaticStep", "members, units, defaults, an example"}};
 }
 
 void CommandLine::AddAboutItself() {

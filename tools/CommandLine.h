@@ -65,6 +65,7 @@ private:
                   const std::vector<std::string>& extensions);
     void AddInputs(CLI::App* command, const char* about, const std::vector<std::string>& extensions);
     CLI::Option* AddOutput(CLI::App* command, std::string& file, const char* about);
+    static void AddModelName(CLI::App* command, std::string& name);
     void AddThreads(CLI::App* command);
     void AddJson(CLI::App* command);
     void AddStrictness(CLI::App* command);
@@ -94,7 +95,10 @@ private:
     std::vector<std::string> ignored_;
     std::string word_;
     std::string colour_ = "auto";
+    std::string modelName_;
     std::string schemaOutput_;
+    std::string schemaClass_;
+    std::string classFamily_;
     std::string stepType_;
     std::string manuals_;
     bool textOfDeck_ = false;

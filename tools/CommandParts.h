@@ -16,10 +16,12 @@ std::string InputName(const std::string& path);
 /// Reads the text of a file or of the standard input; false, with an error in the system's words.
 bool ReadInput(const std::string& path, std::string& text, fnd_Finding& error);
 /// Reads a model file, or a model from the standard input, with all that is to be said of it.
-std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& found);
+std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& found,
+                                        const mdf_ModelChoice& choice = {});
 /// The store of a model file that is right; else null, with the code.
 std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
-                                   std::list<mdf_MeshOrigin>* origins = nullptr);
+                                   std::list<mdf_MeshOrigin>* origins = nullptr,
+                                   const mdf_ModelChoice& choice = {});
 /// Replaces the file as a whole; false, with the reason, when the file system refuses. `tell` prints what
 /// there is to say of it, for which everything that can fail is done before the file stands. What `write`
 /// raises beyond that comes through.

@@ -156,8 +156,8 @@ public:
 /// Everything that is to be said of a model before its deck is written; false when it is not to be written.
 bool IsFitToWrite(const odb_Odb& odb, const std::string& modelFile, fnd_List& list, RunReport& report) {
     report.Watched().Begin("checking", modelFile);
-    dck_CheckDeck(odb, odb_Odb::DefaultModelName(), list);
-    dck_CheckMeshes(odb, odb_Odb::DefaultModelName(), list);
+    dck_CheckDeck(odb, odb.DeckModelName(), list);
+    dck_CheckMeshes(odb, odb.DeckModelName(), list);
     // Takes a look into the file again, which is to count.
     report.Locate(modelFile, list.findings);
     report.Times().End("checking");
@@ -228,8 +228,9 @@ bool ReadInput(const std::string& path, std::string& text, fnd_Finding& error) {
     return number == 0;
 }
 
-std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& found) {
-    if (path != kStandardStream) return mdf_ReadModelFile(path, found);
+std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& found,
+                                        const mdf_ModelChoice& choice) {
+    if (path != kStandardStream) return mdf_ReadModelFile(path, found, choice);
     found.fileName = InputName(path);
     std::string text;
     fnd_Finding error;
@@ -238,7 +239,7 @@ std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& fou
         found.findings.push_back(std::move(error));
         return nullptr;
     }
-    std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, found.fileName, found);
+    std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, found.fileName, found, {}, choice);
     const auto kept = std::make_shared<mdf_FileText>("");
     kept->Keep(std::move(text));
     found.text = kept;
@@ -246,12 +247,12 @@ std::unique_ptr<odb_Odb> ReadModelInput(const std::string& path, mdf_Report& fou
 }
 
 std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, ExitCode& code,
-                                   std::list<mdf_MeshOrigin>* origins) {
+                                   std::list<mdf_MeshOrigin>* origins, const mdf_ModelChoice& choice) {
     mdf_Report found;
     report.Watched().Begin("reading", InputName(path));
     found.progress = &report.Watched().Work();
     if (report.ShowsAll()) found.most = std::numeric_limits<int>::max();
-    std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found);
+    std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found, choice);
     if (odb != nullptr) {
         for (const auto& [name, model] : odb->Models()) report.Ignore(*model);
     }
@@ -308,7 +309,7 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(request.model, report, code, nullptr, {request.modelName});
     if (odb == nullptr) return code;
     if (target == kStandardStream) return WriteDeckToOutput(*odb, InputName(request.model), report);
     code = WriteDeck(*odb, InputName(request.model), target, report);
@@ -317,10 +318,10 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report) {
 
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
                    RunReport& report) {
-    const odiK_Model* model = odb.FindModel(odb_Odb::DefaultModelName());
+    const odiK_Model* model = odb.DeckModel();
     if (model == nullptr) {
-        report.Error(modelFile, std::string("there is no model named \"") + odb_Odb::DefaultModelName() +
-                                    "\" to write a deck from");
+        report.Error(modelFile, "there is no model named " + fnd_Quoted(odb.DeckModelName().View()) +
+                                    " to write a deck from");
         return ExitCode::MODEL_IS_WRONG;
     }
     const std::vector<dck_KindCount> counts = dck_CountsOfDeck(*model);
@@ -349,15 +350,15 @@ ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::
     }
 }
 
-ExitCode RunCheck(const std::string& model, RunReport& report) {
+ExitCode RunCheck(const std::string& model, const std::string& modelName, RunReport& report) {
     ExitCode code;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, nullptr, {modelName});
     if (odb == nullptr) return code;
     const std::string file = InputName(model);
     report.Watched().Begin("checking", file);
     fnd_List list;
-    dck_CheckDeck(*odb, odb_Odb::DefaultModelName(), list);
-    dck_CheckMeshes(*odb, odb_Odb::DefaultModelName(), list);
+    dck_CheckDeck(*odb, odb->DeckModelName(), list);
+    dck_CheckMeshes(*odb, odb->DeckModelName(), list);
     report.AddAll(file, list.findings);
     report.Watched().Begin("rehearsing the deck of", file);
     fnd_List raised;
@@ -367,8 +368,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
         code = ExitCode::MODEL_IS_WRONG;
     else
         report.Print(fnd_Visible(file) + ": no errors\n");
-    const std::vector<dck_LeftOut> leftOut =
-        dck_LeftOutOf(*odb, *odb->FindModel(odb_Odb::DefaultModelName()));
+    const std::vector<dck_LeftOut> leftOut = dck_LeftOutOf(*odb, *odb->DeckModel());
     if (report.AsJson()) report.Member("leftOut") = JsonOf(leftOut);
     PrintLeftOut(leftOut, WidthOf(leftOut), report);
     return code;
@@ -377,7 +377,7 @@ ExitCode RunCheck(const std::string& model, RunReport& report) {
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
     ExitCode code;
     std::list<mdf_MeshOrigin> origins;
-    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins);
+    const std::unique_ptr<odb_Odb> odb = ReadModel(model, report, code, &origins, {{}, false});
     if (odb == nullptr) return code;
     ordered_json& models = report.Member("models") = ordered_json::object();
     for (const auto& [name, entry] : odb->Models()) {
@@ -404,14 +404,14 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
         return ExitCode::FILE_SYSTEM_REFUSED;
     }
     mdf_Report found;
-    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, file, found);
+    const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, file, found, {}, {{}, false});
     report.AddAll(found);
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
     std::ostringstream formatted;
     const bool toOutput = request.output.empty() || request.output == kStandardStream;
     const std::string place = toOutput ? file : request.output;
     mdf_WriteModelFile(*odb, formatted, found.meshOrigins, plt_Path(place).parent_path().string(),
-                       found.parameters);
+                       found.parameters, found.schema);
     const bool isCanonical = formatted.view() == text;
     report.Member("formatted") = {{"file", file}, {"wasCanonical", isCanonical}};
     if (request.check) {
@@ -456,6 +456,7 @@ ExitCode RunSchema(const std::string& output, RunReport& report) {
     std::ostringstream schema;
     mdf_WriteSchema(schema);
     if (output.empty() || output == kStandardStream) {
+        if (report.AsJson()) report.Member("schema") = ordered_json::parse(schema.str());
         report.Print(schema.str());
         return ExitCode::DONE;
     }

@@ -9,6 +9,8 @@
 /// What the user asked for on the command line.
 struct WriteRequest {
     std::string model;
+    /// The one to write of a file with several models; may be empty.
+    std::string modelName;
     /// Empty: the model file's name without extension. May hold a folder, relative to the output folder; with
     /// ".inp" or without. "-": the standard output.
     std::string job;
@@ -50,7 +52,7 @@ ExitCode RunWrite(const WriteRequest& request, RunReport& report);
 /// The part of it behind the reading: writes the deck of a store that came from the file `modelFile`.
 ExitCode WriteDeck(const odb_Odb& odb, const std::string& modelFile, const std::string& target,
                    RunReport& report);
-ExitCode RunCheck(const std::string& model, RunReport& report);
+ExitCode RunCheck(const std::string& model, const std::string& modelName, RunReport& report);
 /// `history`: also what every object is in each step.
 ExitCode RunInfo(const std::string& model, bool history, RunReport& report);
 /// Writes the model file anew in its canonical form.
@@ -63,5 +65,12 @@ ExitCode RunMesh(const MeshRequest& request, RunReport& report);
 ExitCode RunNew(const NewRequest& request, RunReport& report);
 /// Writes the schema to the file, or to the standard output when the name is empty.
 ExitCode RunSchema(const std::string& output, RunReport& report);
+/// One class of the schema, or one part of a model's frame, as a table.
+ExitCode RunSchemaOf(const std::string& className, RunReport& report);
+/// The classes that model files know, or those of one family.
+ExitCode RunClasses(const std::string& family, RunReport& report);
+/// What the two take.
+std::vector<std::string> ClassFamilies();
+std::vector<std::string> ClassNames();
 
 #endif

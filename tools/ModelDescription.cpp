@@ -60,7 +60,7 @@ ordered_json DescribeSteps(const kprC_StepContainer& steps) {
         const kprC_Step& step = steps.StepAt(i);
         const auto* analysis = dynamic_cast<const kprC_AnalysisStep*>(&step);
         ordered_json entry = {{"name", Text(steps.NameAt(i))},
-                              {"class", Text(cls_Classes().NameOf(step.DynTypeId()))},
+                              {"class", Text(cls_Classes().ShortNameOf(step.DynTypeId()))},
                               {"procedure", kprC_ProcedureWords(step)},
                               {"perturbation", step.Perturbation()},
                               {"explicit", step.Explicit()},
@@ -187,7 +187,7 @@ ordered_json DescribeModel(const odiK_Model& model) {
     for (const odiK_Repository& repository : odiK_Repositories()) {
         if (repository.IsInOrder()) continue;
         for (const auto& [name, record] : repository.In(model))
-            named[repository.member][Text(name)] = Text(cls_Classes().NameOf(record.DynTypeId()));
+            named[repository.member][Text(name)] = Text(cls_Classes().ShortNameOf(record.DynTypeId()));
     }
     return root;
 }

@@ -49,7 +49,7 @@ ordered_json HistoryOf(const mdl_Repository& objects, const kprC_StepContainer& 
             }
             states.push_back(std::move(state));
         }
-        all[Text(name)] = {{"class", Text(cls_Classes().NameOf(object.DynTypeId()))},
+        all[Text(name)] = {{"class", Text(cls_Classes().ShortNameOf(object.DynTypeId()))},
                            {"suppressed", object.suppressed},
                            {"steps", std::move(states)}};
     }

@@ -82,19 +82,19 @@ public:
                "\": { \"elastic\": { \"table\": [[210000, 0.3]] }, \"density\": { \"table\": [[7.85e-09]] } "
                "}\n"
                "    },\n"
-               "    \"steps\": [ { \"name\": \"Initial\", \"class\": \"kprC_InitialStep\" },\n"
-               "               { \"name\": \"Step-1\", \"class\": \"kprC_StaticStep\" } ],\n"
+               "    \"steps\": [ { \"name\": \"Initial\", \"class\": \"InitialStep\" },\n"
+               "               { \"name\": \"Step-1\", \"class\": \"StaticStep\" } ],\n"
                "    // Supports and loads go here, such as\n"
-               "    // \"boundaryConditions\": { \"Held\": { \"class\": \"kbcC_DisplacementBC\", \"region\": "
+               "    // \"boundaryConditions\": { \"Held\": { \"class\": \"DisplacementBC\", \"region\": "
                "\"" +
                part_ +
                "-1.A NODE SET\",\n"
                "    //   \"states\": { \"Initial\": { \"u1\": 0, \"u2\": 0, \"u3\": 0 } } } },\n"
-               "    // \"loads\": { \"Pressure\": { \"class\": \"kloC_Pressure\", \"region\": \"" +
+               "    // \"loads\": { \"Pressure\": { \"class\": \"Pressure\", \"region\": \"" +
                part_ +
                "-1.A SURFACE\",\n"
                "    //   \"states\": { \"Step-1\": { \"magnitude\": 1.0 } } } },\n"
-               "    \"fieldOutputRequests\": { \"Usual\": { \"class\": \"korC_FieldOutput\", \"states\": { "
+               "    \"fieldOutputRequests\": { \"Usual\": { \"class\": \"FieldOutput\", \"states\": { "
                "\"Step-1\": {} } } }\n"
                "  } } }\n";
     }
@@ -150,9 +150,9 @@ private:
         const auto& subsets = mesh.Sets()[static_cast<std::size_t>(place)]->subsets;
         const auto& elements = mesh.Classes()[static_cast<std::size_t>(subsets.front().classIndex)];
         const ddb_ElementFamily* family = ddb_FamilyOf(elements.type.View());
-        std::string section = R"({ "class": "kseC_HomogenousSolidSection")";
+        std::string section = R"({ "class": "HomogenousSolidSection")";
         if (family != nullptr && family->section == ddb_SectionNeedEnm::SHELL)
-            section = R"({ "class": "kseC_HomogenousShellSection", "thickness": 1.0)";
+            section = R"({ "class": "HomogenousShellSection", "thickness": 1.0)";
         return section + ", \"materialName\": \"" + kMaterial + "\" }";
     }
 

@@ -1,6 +1,7 @@
 #include "tools/VariableList.h"
 
 #include "deck_checks/dck_Text.h"
+#include "model_file/mdf_ClassChoice.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/output/korC_OdbRequestTable.h"
 #include "store_interface/records/steps/kprC_Step.h"
@@ -17,14 +18,12 @@ namespace {
 
 using Spec = korC_OdbRequestSpec;
 
-constexpr std::string_view kPrefix = "kprC_";
-constexpr std::string_view kSuffix = "Step";
-
-/// "Static" of "kprC_StaticStep".
-std::string ShortName(std::string_view className) {
-    if (className.starts_with(kPrefix)) className.remove_prefix(kPrefix.size());
-    if (className.ends_with(kSuffix)) className.remove_suffix(kSuffix.size());
-    return std::string(className);
+/// "Static" of "StaticStep".
+std::string ProcedureName(const cls_ClassEntry& step) {
+    constexpr std::string_view kSuffix = "Step";
+    std::string_view name = step.info.Word();
+    if (name.ends_with(kSuffix)) name.remove_suffix(kSuffix.size());
+    return std::string(name);
 }
 
 std::string InSmallLetters(std::string text) {
@@ -63,7 +62,7 @@ ordered_json ProceduresIn(unsigned bits) {
     ordered_json list = ordered_json::array();
     for (const cls_ClassEntry* procedure : Procedures()) {
         if ((bits & korC_OdbRequestTable::Bit(procedure->info.Id())) != 0) {
-            list.push_back(ShortName(procedure->info.name));
+            list.push_back(ProcedureName(*procedure));
         }
     }
     return list;
@@ -97,21 +96,15 @@ std::string ProcedureText(const ordered_json& procedures) {
 } // namespace
 
 std::optional<unsigned> FindStepType(const std::string& name) {
-    const std::string wanted = InSmallLetters(name);
-    for (const cls_ClassEntry* procedure : Procedures()) {
-        const std::string whole = InSmallLetters(procedure->info.name);
-        const std::string core = InSmallLetters(ShortName(procedure->info.name));
-        if (wanted == whole || wanted == core || wanted == core + InSmallLetters(std::string(kSuffix))) {
-            return procedure->info.Id();
-        }
-    }
-    return std::nullopt;
+    const mdf_ClassChoice& choice = mdf_ClassChoice::Of(kprC_AnalysisStep::TypeId());
+    const cls_ClassEntry* step = choice.Find(name);
+    return step == nullptr ? std::nullopt : std::optional(step->info.Id());
 }
 
 std::string StepTypeNames() {
     std::string names;
     for (const cls_ClassEntry* procedure : Procedures()) {
-        names += (names.empty() ? "" : ", ") + ShortName(procedure->info.name);
+        names += (names.empty() ? "" : ", ") + ProcedureName(*procedure);
     }
     return names;
 }

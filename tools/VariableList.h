@@ -6,7 +6,7 @@
 #include <optional>
 #include <string>
 
-/// The number of a procedure by the class of its step, "kprC_StaticStep", "StaticStep" or "Static" in any
+/// The number of a procedure by any name of the class of its step, such as "StaticStep" or "Static", in any
 /// capitals; none if there is no such procedure.
 std::optional<unsigned> FindStepType(const std::string& name);
 /// The names of all procedures, as FindStepType takes them.

@@ -6,7 +6,7 @@
 #include <cstdio>
 
 ExitCode VerifyDeck(const odb_Odb& odb, const std::string& target, RunReport& report) {
-    const odiK_Model* model = odb.FindModel(odb_Odb::DefaultModelName());
+    const odiK_Model* model = odb.DeckModel();
     drd_Findings findings;
     DeckRequest request;
     // What a model's own text includes is none of the store's.

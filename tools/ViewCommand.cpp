@@ -128,14 +128,15 @@ ExitCode RunView(const ViewRequest& request, RunReport& report) {
         deck = std::make_unique<ShownDeck>(request.model);
         odb = deck->Store(report, code);
     } else {
-        odb = IsModelFile(request.model) ? ReadModel(request.model, report, code)
-                                         : ReadMesh(request.model, report, code);
+        odb = IsModelFile(request.model)
+                  ? ReadModel(request.model, report, code, nullptr, {request.modelName})
+                  : ReadMesh(request.model, report, code);
     }
     report.Watched().End();
     if (odb == nullptr) return code;
-    if (odb->FindModel(odb_Odb::DefaultModelName()) == nullptr) {
+    if (odb->DeckModel() == nullptr) {
         report.Error(request.model,
-                     std::string("there is no model named \"") + odb_Odb::DefaultModelName() + "\" to show");
+                     "there is no model named " + fnd_Quoted(odb->DeckModelName().View()) + " to show");
         return ExitCode::MODEL_IS_WRONG;
     }
     try {

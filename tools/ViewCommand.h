@@ -8,6 +8,8 @@
 /// What the user asked `qrxdeck view` for.
 struct ViewRequest {
     std::string model;
+    /// The one to show of a file with several models; may be empty.
+    std::string modelName;
     /// Empty: the model file's name with ".html" for its extension, in the current folder.
     std::string output;
     /// Empty: no mesh file.

@@ -32,7 +32,7 @@ std::string WithoutTags(std::string json) {
 } // namespace
 
 vpg_PageData vpg_DataOf(const odb_Odb& odb, const std::string& title) {
-    const cow_String name = odb_Odb::DefaultModelName();
+    const cow_String& name = odb.DeckModelName();
     // Completes the model, and raises when that can't be.
     const ddb_Model view = odb.ddb().model(name);
     vpg_Arrays arrays;

@@ -362,7 +362,7 @@ ordered_json vpg_Layout::SectionsText() const {
     ordered_json sections = ordered_json::array();
     for (const auto& [name, section] : model_.sections) {
         ordered_json text = {{"name", vpg_Text(name)},
-                             {"class", vpg_Text(cls_Classes().NameOf(section.DynTypeId()))},
+                             {"class", vpg_Text(cls_Classes().ShortNameOf(section.DynTypeId()))},
                              {"doc", cls_Classes().Find(section.DynTypeId())->info.doc},
                              {"material", vpg_Text(section.MaterialName())}};
         vpg_Outline outline;

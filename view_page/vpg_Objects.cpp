@@ -69,11 +69,8 @@ std::string LabelOf(unsigned typeId) {
     if (const oif_LoadRow* load = oif_FindLoadRow(typeId)) return load->label;
     if (const oif_BCRow* bc = oif_FindBCRow(typeId)) return bc->label;
     if (const oif_FieldRow* field = oif_FindFieldRow(typeId)) return field->label;
-    std::string name(cls_Classes().Find(typeId)->info.name);
-    const std::size_t prefix = name.find('_');
-    if (prefix != std::string::npos) name.erase(0, prefix + 1);
     std::string words;
-    for (const char c : name) {
+    for (const char c : cls_Classes().Find(typeId)->info.Word()) {
         const bool isCapital = c >= 'A' && c <= 'Z';
         if (isCapital && !words.empty()) words += ' ';
         words += isCapital && !words.empty() ? static_cast<char>(c - 'A' + 'a') : c;
@@ -93,7 +90,7 @@ public:
         const unsigned typeId = object_.DynTypeId();
         text_ = {{"kind", repository_.member},
                  {"name", vpg_Text(name_)},
-                 {"class", vpg_Text(cls_Classes().NameOf(typeId))},
+                 {"class", vpg_Text(cls_Classes().ShortNameOf(typeId))},
                  {"label", LabelOf(typeId)},
                  {"doc", cls_Classes().Find(typeId)->info.doc},
                  {"mark", vpg_MarkOf(typeId)}};

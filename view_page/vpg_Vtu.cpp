@@ -30,7 +30,7 @@ struct Array {
 
 class Grid {
 public:
-    explicit Grid(const odb_Odb& odb) : layout_(odb, odb_Odb::DefaultModelName()) {
+    explicit Grid(const odb_Odb& odb) : layout_(odb, odb.DeckModelName()) {
         for (const vpg_Layout::Shown& shown : layout_.All()) {
             firstPoint_.push_back(points_);
             firstCell_.push_back(cells_);
@@ -290,6 +290,6 @@ private:
 
 void vpg_WriteVtu(const odb_Odb& odb, const std::function<void(std::string_view)>& out) {
     // Completes the model, and raises when that can't be.
-    const ddb_Model view = odb.ddb().model(odb_Odb::DefaultModelName());
+    const ddb_Model view = odb.ddb().model(odb.DeckModelName());
     Grid(odb).Write(out);
 }

@@ -582,7 +582,7 @@ class Model:
     """All that one deck is written from.
 
     heading : the text below ``*Heading``, with which the deck opens
-    name : decks are written from the model named "Default Model"
+    name : by which a model file knows it; no deck tells of it
 
     All else is a field of the model: description, top_level_solver_input, solver_input, ...
     """
@@ -894,9 +894,11 @@ def save(models, target):
         _qrx.replace_file(_records.file_path(target), "model file", text)
 
 
-def load(path, name=DEFAULT_NAME):
-    """Reads a model file."""
+def load(path, name=None):
+    """Reads a model file. Of a file with several models the one of the name, or "Default Model"."""
     models = load_all(path)
+    if name is None:
+        name = next(iter(models)) if len(models) == 1 else DEFAULT_NAME
     if name not in models:
         raise _no_such("models", name, models)
     return models[name]

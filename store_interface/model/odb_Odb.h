@@ -19,7 +19,7 @@ private:
 /// through ddb(). Must outlive every view on it.
 class odb_Odb {
 public:
-    /// The model that decks are written from.
+    /// The name of the model that decks are written from, unless another is chosen.
     static const char* DefaultModelName() { return "Default Model"; }
 
     odb_Odb() = default;
@@ -33,8 +33,15 @@ public:
     const std::map<cow_String, cow_CountedHld<odiK_Model>>& Models() const { return models_; }
     ddb_Ddb ddb() const { return ddb_Ddb(models_); }
 
+    /// The model that decks are written from; its name reaches no deck.
+    const cow_String& DeckModelName() const { return deckModelName_; }
+    void SetDeckModelName(const cow_String& name) { deckModelName_ = name; }
+    /// Null when it isn't there.
+    odiK_Model* DeckModel() const { return FindModel(deckModelName_); }
+
 private:
     std::map<cow_String, cow_CountedHld<odiK_Model>> models_;
+    cow_String deckModelName_ = DefaultModelName();
 };
 
 #endif

@@ -68,8 +68,10 @@ const cls_FieldTable& odiK_ModelData::Fields() {
             .Field<&R::solverInput>("solverInput", "text that closes the model section")
             .Verbatim()
             .Field<&R::absoluteZero>("absoluteZero", "absolute zero on the temperature scale in use")
+            .Unit("temperature")
             .NotInDeck(kNoConstants)
-            .Field<&R::stefanBoltzmann>("stefanBoltzmann", "Stefan-Boltzmann constant in the units in use")
+            .Field<&R::stefanBoltzmann>("stefanBoltzmann", "Stefan-Boltzmann constant")
+            .Unit("power/(area*temperature^4)")
             .NotInDeck(kNoConstants)
             .Field<&R::waveFormulation>("waveFormulation", "how acoustic waves from outside are formulated")
             .Words(kWaveFormulations)
@@ -91,7 +93,9 @@ const cls_FieldTable& odiK_ModelData::Fields() {
             .Field<&R::ignore>("ignore", "warnings and notes that are known and not to be told, with reasons")
             .Tree<cls_TreeEnm::Datums>("datums", "coordinate systems, points, axes and planes")
             .Tree<cls_TreeEnm::Parts>("parts", "parts by name")
-            .Tree<cls_TreeEnm::Assembly>("assembly", "the instances, and what spans them");
+            .Tree<cls_TreeEnm::Assembly>("assembly", "the instances, and what spans them")
+            .Example(
+                R"({"description": "A plate under pressure", "materials": {"Steel": {"elastic": {"table": [[210000, 0.3]]}}}})");
     return fields;
 }
 
@@ -105,7 +109,8 @@ const cls_FieldTable& odiK_IgnoredFinding::Fields() {
             .FreeText()
             .Required()
             .Field<&R::place>("place", "JSON pointer, as the finding is told with: only there and below it; "
-                                       "without it wherever it is found");
+                                       "without it wherever it is found")
+            .Example(R"({"code": "unused-nodes", "reason": "reference points of the customer's drawing"})");
     return fields;
 }
 
@@ -132,7 +137,8 @@ const cls_FieldTable& odiK_Datum::Fields() {
             .Field<&R::yAxis>("yAxis", "second axis; any length")
             .Field<&R::zAxis>("zAxis",
                               "third axis, of a coordinate system the cross product of the other two "
-                              "when left out, or the normal of a plane; any length");
+                              "when left out, or the normal of a plane; any length")
+            .Example(R"({"name": "Cylinder", "type": "csys", "system": "cylindrical", "origin": [0, 0, 0]})");
     return fields;
 }
 
@@ -141,7 +147,9 @@ const cls_FieldTable& odiK_Part::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .With(DescribeOwner<R, &R::solverInput, &R::mesh, SectionsOf, MaterialOrientationsOf,
-                                BeamOrientationsOf, cls_TreeEnm::Attributes>);
+                                BeamOrientationsOf, cls_TreeEnm::Attributes>)
+            .Example(
+                R"({"mesh": {"file": "plate.msh"}, "sectionAssignments": [{"region": "ALL", "sectionName": "Plate"}]})");
     return fields;
 }
 
@@ -152,13 +160,15 @@ const cls_FieldTable& odiK_Instance::Fields() {
             .Field<&R::partName>("part", "the part that it shows")
             .NameOf("part")
             .Field<&R::isPartInstance>("partInstance", "false for an entry that is no part instance")
-            .Field<&R::translation>("translation", "length, single precision")
+            .Field<&R::translation>("translation", "how it is moved; single precision")
+            .Unit("length")
             .Field<&R::rotation>("rotation",
                                  "rotation vector through the origin: its direction is the axis, its length "
                                  "the angle in radians; applied before the translation")
             .With(DescribeOwner<R, &R::solverInput, &R::ownMesh, &R::ownSectionAssignments,
                                 &R::ownMaterialOrientations, &R::ownBeamOrientations,
-                                cls_TreeEnm::OwnAttributes>);
+                                cls_TreeEnm::OwnAttributes>)
+            .Example(R"({"part": "PART", "translation": [100, 0, 0]})");
     return fields;
 }
 
@@ -179,6 +189,7 @@ const cls_FieldTable& odiK_Assembly::Fields() {
             .Of<ptoC_SectionAssignment>()
             .Tree<&R::connectorOrientations, cls_TreeEnm::AssemblyAttributes>(
                 "connectorOrientations", "orientations of connector elements")
-            .Of<ptoC_ConnectorOrientation>();
+            .Of<ptoC_ConnectorOrientation>()
+            .Example(R"({"instances": {"PART-1": {"part": "PART"}}})");
     return fields;
 }

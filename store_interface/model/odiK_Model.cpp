@@ -3,7 +3,9 @@
 #include "foundation/nex_Exception.h"
 #include "store_interface/model/odiK_Repositories.h"
 
+#include <algorithm>
 #include <cmath>
+#include <set>
 
 namespace {
 
@@ -50,6 +52,21 @@ void Propagate(mdl_Repository& repository, const kprC_Timeline& timeline) {
 
 std::string PathOfSet(const cow_String& owner, int id) {
     return std::string(owner.View()) + ".setData[" + std::to_string(id) + "]";
+}
+
+rgnC_SubsetData& SubsetOf(std::vector<rgnC_SubsetData>& subsets, int meshIndex) {
+    for (rgnC_SubsetData& subset : subsets) {
+        if (subset.meshIndex == meshIndex) return subset;
+    }
+    return subsets.emplace_back(rgnC_SubsetData{meshIndex, -1, {}, {}});
+}
+
+bool SameNodes(const odiK_Set& a, const odiK_Set& b) {
+    return a.type == b.type &&
+           std::ranges::equal(a.subsets, b.subsets,
+                              [](const rgnC_SubsetData& one, const rgnC_SubsetData& other) {
+                                  return one.meshIndex == other.meshIndex && one.subset == other.subset;
+                              });
 }
 
 } // namespace
@@ -242,6 +259,40 @@ rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String&
                                       : " in instance " + Quoted(instanceName)));
     }
     return region;
+}
+
+rgnC_Region odiK_Model::JoinNodeSets(const cow_List<rgnC_Region>& regions) {
+    constexpr std::size_t kLongestStem = 70;
+    std::string stem;
+    cow_CountedHld<odiK_Set> set(new odiK_Set());
+    std::set<std::pair<int, int>> known;
+    for (const rgnC_Region& region : regions) {
+        stem.append("_").append(region.SetName().View());
+        const rgnC_SetData& data = region.ConstSet().Data();
+        for (int i = 0; i < data.NumSubSets(); ++i) {
+            const rgnC_SubsetData from = data.SubSet(i);
+            rgnC_SubsetData& to = SubsetOf(set->subsets, from.meshIndex);
+            for (const int node : from.subset) {
+                if (known.emplace(from.meshIndex, node).second) to.subset.Append(node);
+            }
+        }
+    }
+    stem.resize(std::min(stem.size(), kLongestStem));
+    for (int number = 1;; ++number) {
+        const cow_String name(number == 1 ? stem : stem + "-" + std::to_string(number));
+        const int place = FindAssemblySet(name);
+        if (place >= 0) {
+            if (!SameNodes(*assemblySets_[static_cast<std::size_t>(place)], *set)) continue;
+        } else if (IsComplete()) {
+            return {};
+        } else {
+            set->name = name;
+            set->internal = true;
+            assemblySets_.push_back(set);
+            assemblySetIndex_.emplace(set->name.View(), static_cast<int>(assemblySets_.size()) - 1);
+        }
+        return FindRegion({}, name);
+    }
 }
 
 void odiK_Model::CompleteTree(fnd_Sink& problems) {

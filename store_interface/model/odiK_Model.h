@@ -210,6 +210,10 @@ public:
     /// The same; a set that is not there raises.
     rgnC_Region Region(const cow_String& instanceName, const cow_String& setName);
 
+    /// The region of an internal node set of the assembly with the nodes of all these, each node once.
+    /// Without a value where a complete model has no such set.
+    rgnC_Region JoinNodeSets(const cow_List<rgnC_Region>& regions);
+
     /// Works out what follows: attributes of the instances on their own sets, statuses and states in all
     /// steps. Raises when something can't be. Must be called again after a change of a model that has been
     /// read.

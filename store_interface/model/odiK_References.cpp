@@ -88,6 +88,6 @@ void odiK_References::CheckClass(const cls_Field& field, const std::string& name
         return;
     }
     sink.Add("wrong-class", place,
-             "found " + fnd_Quoted(name) + ", a " + Text(cls_Classes().NameOf(record->DynTypeId())),
-             std::string("the name of a ") + field.refersToClass->name);
+             "found " + fnd_Quoted(name) + ", a " + Text(cls_Classes().ShortNameOf(record->DynTypeId())),
+             "the name of a " + std::string(field.refersToClass->Word()));
 }

@@ -1,6 +1,7 @@
 #include "store_interface/records/cls_ClassRegistrar.h"
 
 #include <cstdio>
+#include <memory>
 #include <string>
 
 void cls_ClassRegistrar::AddEntry(const cls_ClassEntry& entry) {
@@ -49,6 +50,17 @@ cow_String cls_ClassRegistrar::NameOf(unsigned id) const {
     char text[32];
     std::snprintf(text, sizeof text, "class 0x%X", id);
     return text;
+}
+
+cow_String cls_ClassRegistrar::ShortNameOf(unsigned id) const {
+    const cls_ClassEntry* entry = Find(id);
+    if (entry == nullptr) return NameOf(id);
+    const cls_ClassEntry* base = Find(entry->baseId);
+    if (base == nullptr || base->create == nullptr || base->info.Word() != entry->info.Word())
+        return entry->info.Word();
+    // Records of the base may answer with the derived class.
+    const std::unique_ptr<cls_Record> record(base->create());
+    return record->DynTypeId() == id ? cow_String(entry->info.Word()) : NameOf(id);
 }
 
 void nex_CheckCast(unsigned found, unsigned expected, nex_Position position) {

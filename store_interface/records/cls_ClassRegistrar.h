@@ -44,8 +44,11 @@ public:
     const cls_ClassEntry* FindByName(std::string_view name) const;
     /// The classes that records of class `base` can be made of, in the order in which they were entered.
     std::vector<const cls_ClassEntry*> ConcreteClasses(unsigned base) const;
-    /// The name for messages; the number in hexadecimal for an unknown class.
+    /// The whole name; the number in hexadecimal for an unknown class.
     cow_String NameOf(unsigned id) const;
+    /// The name that people read and write: without the prefix of its family, but whole where that word means
+    /// the base of the class, which is another class.
+    cow_String ShortNameOf(unsigned id) const;
 
 private:
     void AddEntry(const cls_ClassEntry& entry);

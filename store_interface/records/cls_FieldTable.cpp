@@ -16,6 +16,12 @@ const cls_Field* cls_FieldTable::Find(std::string_view name) const {
     return nullptr;
 }
 
+std::string cls_Field::Documentation() const {
+    std::string text(doc);
+    if (unit != nullptr) text.append(" (").append(unit).append(")");
+    return text;
+}
+
 bool cls_RecordsEqual(const cls_Record& a, const cls_Record& b) {
     if (&a == &b) return true;
     if (a.DynTypeId() != b.DynTypeId()) return false;

@@ -10,6 +10,7 @@
 
 #include <limits>
 #include <span>
+#include <string>
 #include <vector>
 
 /// The markers of fields without a value.
@@ -220,13 +221,20 @@ struct cls_Field {
     bool verbatim = false;
     /// For a text that may run over several lines: no keyword line is made of it.
     bool freeText = false;
+    /// For a region of nodes: a model file may give several, which are taken together.
+    bool mayBeSeveral = false;
     /// Absent or empty is an error of a model file.
     bool required = false;
     /// Filled by the store or a program, never by a model file.
     bool notModelData = false;
+    /// For numbers: what they are measured in ("force/length"), "no unit" for bare ones; else null.
+    const char* unit = nullptr;
     /// Why no deck ever tells of the field, with what to do instead; null for fields that decks tell of.
     const char* notInDeck = nullptr;
     cls_BaseStateRule baseState = cls_BaseStateRule::Carried;
+
+    /// What it is for, with the unit: "thickness of the layer (length)".
+    std::string Documentation() const;
 
     /// Null for a part of the tree that is no member of the record.
     const void* In(const cls_Record& record) const { return access(const_cast<cls_Record&>(record)); }
@@ -238,9 +246,12 @@ class cls_FieldTable {
 public:
     const std::vector<cls_Field>& All() const { return fields_; }
     const cls_Field* Find(std::string_view name) const;
+    /// A JSON object; empty for a class that has said nothing.
+    const char* Example() const { return example_; }
 
 protected:
     std::vector<cls_Field> fields_;
+    const char* example_ = "{}";
 };
 
 /// Makes the field table of the record class C:
@@ -339,6 +350,22 @@ public:
     }
     cls_Describe& Length(int length) {
         fields_.back().length = length;
+        return *this;
+    }
+    cls_Describe& Unit(const char* unit) {
+        fields_.back().unit = unit;
+        return *this;
+    }
+    /// What a model file may say of a record of the class, as a JSON object; for all fields at once.
+    cls_Describe& Example(const char* json) {
+        example_ = json;
+        return *this;
+    }
+    /// Of a region of nodes: a model file may give several, which are taken together.
+    cls_Describe& InheritedMayBeSeveral(std::string_view name) {
+        for (cls_Field& field : fields_) {
+            if (name == field.name) field.mayBeSeveral = true;
+        }
         return *this;
     }
     cls_Describe& NotInDeck(const char* why) {

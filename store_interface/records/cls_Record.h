@@ -15,6 +15,14 @@ struct cls_ClassInfo {
     const char* name;
     const char* doc;
     unsigned number = 0;
+    /// Other words that model files take for it beside its short name, with spaces between.
+    const char* aliases = "";
+
+    /// The name without its family's prefix, "BeamSection" of "kseC_BeamSection".
+    constexpr std::string_view Word() const {
+        const std::string_view whole(name);
+        return whole.substr(whole.find('_') + 1);
+    }
 
     constexpr unsigned Id() const { return number != 0 ? number : HashOfName(); }
 

@@ -21,7 +21,8 @@ const cls_FieldTable& odiK_SetHead::Fields() {
             .Field<&R::type>("kind", "what its members are")
             .WordsOnly()
             .Required()
-            .Field<&R::internal>("internal", "a set that the deck marks as made by a program");
+            .Field<&R::internal>("internal", "a set that the deck marks as made by a program")
+            .Example(R"({"name": "FIXED", "kind": "node"})");
     return fields;
 }
 

@@ -92,9 +92,9 @@ TEST(Check, InitialStepInAnotherPlaceThanTheFirst_IsAnError) {
     store.model.steps.Append("Pull", kprC_StaticStep());
     store.model.steps.Append("Initial", kprC_InitialStep());
     EXPECT_EQ(Found(store.odb),
-              (Texts{"initial-step /steps/0/class: found 'kprC_StaticStep', expected kprC_InitialStep as the "
+              (Texts{"initial-step /steps/0/class: found 'StaticStep', expected InitialStep as the "
                      "first step",
-                     "initial-step /steps/1/class: found a second kprC_InitialStep, expected it in the first "
+                     "initial-step /steps/1/class: found a second InitialStep, expected it in the first "
                      "place alone"}));
 }
 

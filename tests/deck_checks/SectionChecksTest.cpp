@@ -14,7 +14,7 @@ std::string Part(const std::string& type, const std::string& attributes) {
 
 const std::string kSteel = R"("materials": {"Steel": {}},)";
 const std::string kSolid =
-    R"("sections": {"S": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)";
+    R"("sections": {"S": {"class": "HomogenousSolidSection", "materialName": "Steel"}},)";
 const std::string kOnAll = R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "S"}])";
 
 } // namespace
@@ -40,16 +40,16 @@ TEST(ModelChecks, RigidSurfaceAndConnectorElements_NeedNoSection) {
 TEST(ModelChecks, ElementTypeThatCannotTakeTheSection_IsNamed) {
     EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("S4R", kOnAll)),
               Texts{"/parts/P: 4 elements of type 'S4R' can't take the section 'S' "
-                    "(kseC_HomogenousSolidSection)"});
+                    "(HomogenousSolidSection)"});
     EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("b31", kOnAll)),
               Texts{"/parts/P: 4 elements of type 'b31' can't take the section 'S' "
-                    "(kseC_HomogenousSolidSection)"});
+                    "(HomogenousSolidSection)"});
 }
 
 TEST(ModelChecks, TrussElements_TakeSolidAndTrussSections) {
     EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("T3D2", kOnAll)), Texts{});
     EXPECT_EQ(FindingsOf<dck_CheckSections>(
-                  kSteel + R"("sections": {"S": {"class": "kseC_TrussSection", "materialName": "Steel"}},)" +
+                  kSteel + R"("sections": {"S": {"class": "TrussSection", "materialName": "Steel"}},)" +
                   Part("T3D2", kOnAll)),
               Texts{});
 }
@@ -61,12 +61,12 @@ TEST(ModelChecks, UnknownElementType_TakesAnySection) {
 TEST(ModelChecks, LaterAssignment_DecidesWhichSectionAnElementHas) {
     EXPECT_EQ(FindingsOf<dck_CheckSections>(
                   kSteel + R"("sections": {
-                 "Shell": {"class": "kseC_HomogenousShellSection", "materialName": "Steel"},
-                 "Solid": {"class": "kseC_HomogenousSolidSection", "materialName": "Steel"}},)" +
+                 "Shell": {"class": "HomogenousShellSection", "materialName": "Steel"},
+                 "Solid": {"class": "HomogenousSolidSection", "materialName": "Steel"}},)" +
                   Part("S4", R"(, "sectionAssignments": [{"region": "ALL", "sectionName": "Solid"},
                                                               {"region": "SOME", "sectionName": "Shell"}])")),
               Texts{"/parts/P: 1 element of type 'S4' can't take the section 'Solid' "
-                    "(kseC_HomogenousSolidSection)"});
+                    "(HomogenousSolidSection)"});
 }
 
 TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
@@ -78,7 +78,7 @@ TEST(ModelChecks, InstanceWithAssignmentsOfItsOwn_IsLookedAtByItself) {
           "B": {"part": "P", "sectionAssignments": [{"region": "ALL", "sectionName": "S"}]}}})"),
               (Texts{"/parts/P: 1 element has no section",
                      "/assembly/instances/B: 1 element of type 'MASS' can't take the section 'S' "
-                     "(kseC_HomogenousSolidSection)"}));
+                     "(HomogenousSolidSection)"}));
 }
 
 namespace {
@@ -92,8 +92,8 @@ Texts ConditionFindings(const std::string& conditions, const std::string& loadCa
                  {"name": "S", "kind": "surface", "facets": [[1, "END1"]]}]}}},
         "assembly": {"instances": {"A": {"part": "P"}}})";
     return FindingsOf<dck_CheckConditions>(mesh +
-                                           R"(, "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
-        {"name": "Linear", "class": "kprC_StaticLinearPerturbationStep", "loadCases": {)" +
+                                           R"(, "steps": [{"name": "Initial", "class": "InitialStep"},
+        {"name": "Linear", "class": "StaticLinearPerturbationStep", "loadCases": {)" +
                                            loadCases + R"(}}], "boundaryConditions": {)" + conditions + "}");
 }
 
@@ -104,11 +104,11 @@ const std::string kPlace = "/boundaryConditions/";
 TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
     EXPECT_EQ(
         ConditionFindings(R"(
-        "element": {"class": "kbcC_DisplacementBC", "region": "A.E", "states": {"Initial": {"u1": 0}}},
-        "none": {"class": "kbcC_TypeBC", "states": {"Initial": {"typeName": 0}}},
-        "right": {"class": "kbcC_PorePressureBC", "region": "A.N", "states": {"Initial": {"magnitude": 0}}},
-        "suppressed": {"class": "kbcC_TypeBC", "region": "A.E", "suppressed": true},
-        "surface": {"class": "kbcC_SubmodelBC", "region": "A.S", "states": {"Initial": {"dofs": [1]}}})"),
+        "element": {"class": "DisplacementBC", "region": "A.E", "states": {"Initial": {"u1": 0}}},
+        "none": {"class": "TypeBC", "states": {"Initial": {"typeName": 0}}},
+        "right": {"class": "PorePressureBC", "region": "A.N", "states": {"Initial": {"magnitude": 0}}},
+        "suppressed": {"class": "TypeBC", "region": "A.E", "suppressed": true},
+        "surface": {"class": "SubmodelBC", "region": "A.S", "states": {"Initial": {"dofs": [1]}}})"),
         (Texts{kPlace + "element/region: found 'E', which is an element set; the condition acts on nodes",
                kPlace + "none: the condition has no region, so its lines name no set",
                kPlace + "surface/region: found 'S', which is a surface; the condition acts on nodes"}));
@@ -117,10 +117,10 @@ TEST(ModelChecks, ConditionOnNodes_NeedsANodeSet) {
 TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
     EXPECT_EQ(
         ConditionFindings(R"(
-        "nodes": {"class": "kbcC_ConnVelocityBC", "region": "A.N", "connectors": ["A.E", "A.N"],
+        "nodes": {"class": "ConnVelocityBC", "region": "A.N", "connectors": ["A.E", "A.N"],
                   "states": {"Initial": {"v1": 0}}},
-        "nothing": {"class": "kbcC_ConnVelocityBC", "region": "A.E", "states": {"Initial": {"v1": 0}}},
-        "right": {"class": "kbcC_ConnDisplacementBC", "region": "A.E", "connectors": ["A.E"],
+        "nothing": {"class": "ConnVelocityBC", "region": "A.E", "states": {"Initial": {"v1": 0}}},
+        "right": {"class": "ConnDisplacementBC", "region": "A.E", "connectors": ["A.E"],
                   "states": {"Initial": {"u1": 0}}})"),
         (Texts{kPlace +
                    "nodes/region: found 'N', which is a node set; the condition acts on connector elements",
@@ -131,9 +131,9 @@ TEST(ModelChecks, ConditionOnConnectors_NeedsElementSets) {
 
 TEST(ModelChecks, ConditionThatNoStepWrites_IsTold) {
     EXPECT_EQ(ConditionFindings(R"(
-        "left out": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
-        "taken": {"class": "kbcC_TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
-        "without states": {"class": "kbcC_TypeBC", "region": "A.N"})",
+        "left out": {"class": "TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "taken": {"class": "TypeBC", "region": "A.N", "states": {"Linear": {"typeName": 0}}},
+        "without states": {"class": "TypeBC", "region": "A.N"})",
                                 R"("case": {"bcs": {"taken": 1}})"),
               (Texts{kPlace + "left out: no step writes the condition",
                      kPlace + "without states: no step writes the condition"}));
@@ -149,7 +149,7 @@ TEST(MaterialChecks, GasketOptionsWithoutAGasketSection_AreNamed) {
 TEST(MaterialChecks, OtherOptionsOfAGasket_AreNamed) {
     const Texts found = FindingsOf<dck_CheckSections>(
         R"("materials": {"M": {"membraneElastic": {}, "density": {}, "creep": {}, "regularization": {}}},
-           "sections": {"S": {"class": "kseC_GasketSection", "materialName": "M"}})");
+           "sections": {"S": {"class": "GasketSection", "materialName": "M"}})");
     const std::string left =
         ": the material is a gasket behaviour, which has no such option, so this will not stand "
         "in the deck";

@@ -34,8 +34,8 @@ const odiK_Mesh& MeshOfP(const std::unique_ptr<odb_Odb>& odb) {
 }
 
 int AssembledType(const std::string& value) {
-    const auto odb = Store(
-        Model(R"("sections": {"S": {"class": "kseC_ConnectorSection", "assembledType": )" + value + "}}"));
+    const auto odb =
+        Store(Model(R"("sections": {"S": {"class": "ConnectorSection", "assembledType": )" + value + "}}"));
     const auto& section = static_cast<const kseC_ConnectorSection&>(TheModel(odb).sections.ConstGet("S"));
     return static_cast<int>(section.assembledType);
 }
@@ -78,7 +78,7 @@ TEST(AcceptedForms, Range_ToTheLargestLabel_DoesNotOverflow) {
 TEST(AcceptedForms, Texts_AsLines_AreEndedEach) {
     const auto odb = Store(Model(R"("solverInput": ["*A", "", "b"], "topLevelSolverInput": "as it stands",
                                     "assembly": {"solverInput": []},
-                                    "steps": [{"name": "S", "class": "kprC_InitialStep", "solverInput": ["x"]}])"));
+                                    "steps": [{"name": "S", "class": "InitialStep", "solverInput": ["x"]}])"));
     EXPECT_EQ(TheModel(odb).solverInput, "*A\n\nb\n");
     EXPECT_EQ(TheModel(odb).topLevelSolverInput, "as it stands");
     EXPECT_EQ(TheModel(odb).AssemblyObject().solverInput, "");
@@ -238,7 +238,7 @@ TEST(AcceptedForms, Datums_OfEveryType_AreNormalised) {
 
 TEST(AcceptedForms, State_WithAStatusByNameTextOrNumber_IsTaken) {
     for (const char* status : {R"("CREATED")", R"("created")", "1"}) {
-        EXPECT_EQ(Findings(Model(R"("steps": [{"name": "Initial", "class": "kprC_InitialStep"}],
+        EXPECT_EQ(Findings(Model(R"("steps": [{"name": "Initial", "class": "InitialStep"}],
                                     "adaptiveMeshConstraints": {"C": {"states": {"Initial": {"status": )" +
                                  std::string(status) + "}}}}")),
                   Lines{})

@@ -5,12 +5,12 @@ namespace {
 class ConnectorFindings : public testing::TestWithParam<FindingCase> {};
 
 std::string Section(const std::string& members) {
-    return Whole({}, R"("sections": {"C": {"class": "kseC_ConnectorSection", )" + members + "}}");
+    return Whole({}, R"("sections": {"C": {"class": "ConnectorSection", )" + members + "}}");
 }
 
 /// A section with one option; what is found of it stands under kOption.
 std::string Option(const std::string& className, const std::string& members) {
-    return Section(R"("options": [{"class": "kbeC_Connector)" + className + "\", " + members + "}]");
+    return Section(R"("options": [{"class": "Connector)" + className + "\", " + members + "}]");
 }
 const std::string kOption = "@/sections/C/options/0/";
 
@@ -45,8 +45,8 @@ const FindingCase connectorCases[] = {
       kOption + "components: found 7, expected components from 1 to 6",
       kOption + "components: found 3 twice, expected each component once"}},
     {"ComponentsOfLockAndFailure",
-     Section(R"("options": [{"class": "kbeC_ConnectorLock", "components": [-1]},
-                            {"class": "kbeC_ConnectorFailure", "components": [9]}])"),
+     Section(R"("options": [{"class": "ConnectorLock", "components": [-1]},
+                            {"class": "ConnectorFailure", "components": [9]}])"),
      {"@/sections/C/options/0/components: found -1, expected components from 1 to 6",
       "@/sections/C/options/1/components: found 9, expected components from 1 to 6"}},
     {"IndependentComponents",
@@ -94,9 +94,9 @@ const FindingCase connectorCases[] = {
                 "component, contact area"}},
     {"UserDefinedFriction_WithoutAKindTakesIndependentComponentsOrNot",
      Section(R"("options": [
-        {"class": "kbeC_ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1]]},
-        {"class": "kbeC_ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1, 2]]},
-        {"class": "kbeC_ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1, 2, 3]]}])"),
+        {"class": "ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1]]},
+        {"class": "ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1, 2]]},
+        {"class": "ConnectorFriction", "formulation": 1, "independentComponents": [1], "table": [[1, 2, 3]]}])"),
      {"@/sections/C/options/2/table: found rows of 3, expected rows of 1 to 2: internal contact force"}},
     {"PredefinedFriction_TakesAnyTable", Option("Friction", R"("table": [[1, 2, 3, 4]])"), {}},
     {"CoefficientTable",

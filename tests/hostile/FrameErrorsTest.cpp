@@ -23,18 +23,24 @@ const FindingCase frameCases[] = {
      {"/format: found 1, expected 'qrx-model/1'"}},
     {"UnknownRootMember",
      R"({"format": "qrx-model/1", "model": {}, "models": {"Default Model": {}}})",
-     {"/model: found an unknown member 'model', expected one of format, parameters, models; did you mean "
-      "'models'?"}},
+     {"/model: found an unknown member 'model', expected one of $schema, format, parameters, models; did "
+      "you mean 'models'?"}},
     {"ModelsAsArray",
      R"({"format": "qrx-model/1", "models": [{}]})",
      {"/models: found an array of 1 item, expected an object of models"}},
     {"NoModel",
      R"({"format": "qrx-model/1", "models": {}})",
-     {"/models: found no model named 'Default Model', expected one, since decks are written from it"}},
+     {"/models: found no model, expected one, since decks are written from it"}},
     {"DefaultModelMisspelt",
-     R"({"format": "qrx-model/1", "models": {"Default model ": {}}})",
-     {"/models: found no model named 'Default Model', expected one, since decks are written from it; did you "
-      "mean 'Default model '?"}},
+     R"({"format": "qrx-model/1", "models": {"Other": {}, "Default model ": {}}})",
+     {"/models: found 2 models, none of them 'Default Model', expected one to write the deck from, by that "
+      "name "
+      "or chosen by its own; did you mean 'Default model '? there are 'Other', 'Default model '"}},
+    {"SeveralModelsOfOtherNames",
+     R"({"format": "qrx-model/1", "models": {"A": {}, "B": {}, "C": {}}})",
+     {"/models: found 3 models, none of them 'Default Model', expected one to write the deck from, by that "
+      "name "
+      "or chosen by its own; there are 'A', 'B', 'C'"}},
     {"EmptyModelName",
      R"({"format": "qrx-model/1", "models": {"": {}, "Default Model": {}}})",
      {"/models/: found an empty name, expected a name that can stand in a deck"}},

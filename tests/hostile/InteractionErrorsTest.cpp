@@ -5,11 +5,11 @@ namespace {
 class InteractionErrors : public testing::TestWithParam<FindingCase> {};
 
 const std::string kNames =
-    R"("steps": [{"name": "Initial", "class": "kprC_InitialStep"}],
-       "contactControls": {"Std": {"class": "kinC_StdContactControls"}, "Exp": {"class": "kinC_ExpContactControls"}},
-       "interactionProperties": {"Contact": {"class": "kinC_ContactProperty"},
-                                 "Film": {"class": "kinC_FilmConditionProp"},
-                                 "Wave": {"class": "kinC_IncidentWaveProperty"}}, )";
+    R"("steps": [{"name": "Initial", "class": "InitialStep"}],
+       "contactControls": {"Std": {"class": "StdContactControls"}, "Exp": {"class": "ExpContactControls"}},
+       "interactionProperties": {"Contact": {"class": "ContactProperty"},
+                                 "Film": {"class": "FilmConditionProp"},
+                                 "Wave": {"class": "IncidentWaveProperty"}}, )";
 
 /// The interaction A of the class, with this state in the initial step.
 std::string State(const std::string& className, const std::string& state, const std::string& members = "") {
@@ -18,7 +18,7 @@ std::string State(const std::string& className, const std::string& state, const 
 }
 
 std::string Pair(const std::string& members) {
-    return Model(R"("interactions": {"A": {"class": "kinC_SurfaceToSurfaceContactStd", )" + members + "}}");
+    return Model(R"("interactions": {"A": {"class": "SurfaceToSurfaceContactStd", )" + members + "}}");
 }
 
 std::string Property(const std::string& className, const std::string& members) {
@@ -50,53 +50,53 @@ const FindingCase interactionCases[] = {
     {"BoltClearanceWithoutValue", Pair(R"("clearanceType": "BOLT")"), {}},
     {"PropertyOfAnotherClass",
      State("SurfaceToSurfaceContactStd", R"("InteractionProperty": "Film")"),
-     {"@/interactions/A/states/Initial/InteractionProperty: found 'Film', a kinC_FilmConditionProp, expected "
+     {"@/interactions/A/states/Initial/InteractionProperty: found 'Film', a FilmConditionProp, expected "
       "the "
-      "name of a kinC_ContactProperty"}},
+      "name of a ContactProperty"}},
     {"PropertyThatIsNotThere",
      State("SelfContactXpl", R"("InteractionProperty": "Contacts")"),
      {"@/interactions/A/states/Initial/InteractionProperty: found 'Contacts', expected the name of an "
       "interactionProperty; did you mean 'Contact'?"}},
     {"FilmPropertyOfAnotherClass",
      State("ConcFilmCondition", R"("filmProperty": "Contact")"),
-     {"@/interactions/A/states/Initial/filmProperty: found 'Contact', a kinC_ContactProperty, expected the "
+     {"@/interactions/A/states/Initial/filmProperty: found 'Contact', a ContactProperty, expected the "
       "name of "
-      "a kinC_FilmConditionProp"}},
+      "a FilmConditionProp"}},
     {"ImpedancePropertyOfAnotherClass",
      State("AcousticImpedance", R"("property": "Wave")"),
-     {"@/interactions/A/states/Initial/property: found 'Wave', a kinC_IncidentWaveProperty, expected the "
+     {"@/interactions/A/states/Initial/property: found 'Wave', a IncidentWaveProperty, expected the "
       "name of a "
-      "kinC_AcousticImpedanceProp"}},
+      "AcousticImpedanceProp"}},
     {"WavePropertyOfAnotherClass",
      State("IncidentWave", "", R"("property": "Film", )"),
-     {"@/interactions/A/property: found 'Film', a kinC_FilmConditionProp, expected the name of a "
-      "kinC_IncidentWaveProperty"}},
+     {"@/interactions/A/property: found 'Film', a FilmConditionProp, expected the name of a "
+      "IncidentWaveProperty"}},
     {"PropertyOfAGeneralContactOfAnotherClass",
      State("ContactExp", R"("propertyAssignments": ["Contact", "Film"])",
            R"("propertyAssignmentPairs": [{}, {}], )"),
-     {"@/interactions/A/states/Initial/propertyAssignments/1: found 'Film', a kinC_FilmConditionProp, "
+     {"@/interactions/A/states/Initial/propertyAssignments/1: found 'Film', a FilmConditionProp, "
       "expected the "
-      "name of a kinC_ContactProperty"}},
+      "name of a ContactProperty"}},
     {"ControlsOfTheExplicitSolverForAStandardPair",
      State("SurfaceToSurfaceContactStd", R"("ContactControls": "Exp")"),
-     {"@/interactions/A/states/Initial/ContactControls: found 'Exp', a kinC_ExpContactControls, expected the "
+     {"@/interactions/A/states/Initial/ContactControls: found 'Exp', a ExpContactControls, expected the "
       "name "
-      "of a kinC_StdContactControls"}},
+      "of a StdContactControls"}},
     {"ControlsOfTheExplicitSolverForStandardSelfContact",
      State("SelfContactStd", R"("ContactControls": "Exp")"),
-     {"@/interactions/A/states/Initial/ContactControls: found 'Exp', a kinC_ExpContactControls, expected the "
+     {"@/interactions/A/states/Initial/ContactControls: found 'Exp', a ExpContactControls, expected the "
       "name "
-      "of a kinC_StdContactControls"}},
+      "of a StdContactControls"}},
     {"ControlsOfTheImplicitSolverForAnExplicitPair",
      State("SurfaceToSurfaceContactXpl", R"("ContactControls": {"value": "Std", "state": 2})"),
-     {"@/interactions/A/states/Initial/ContactControls/value: found 'Std', a kinC_StdContactControls, "
+     {"@/interactions/A/states/Initial/ContactControls/value: found 'Std', a StdContactControls, "
       "expected the "
-      "name of a kinC_ExpContactControls"}},
+      "name of a ExpContactControls"}},
     {"ControlsOfTheImplicitSolverForExplicitSelfContact",
      State("SelfContactXpl", R"("ContactControls": "Std")"),
-     {"@/interactions/A/states/Initial/ContactControls: found 'Std', a kinC_StdContactControls, expected the "
+     {"@/interactions/A/states/Initial/ContactControls: found 'Std', a StdContactControls, expected the "
       "name "
-      "of a kinC_ExpContactControls"}},
+      "of a ExpContactControls"}},
     {"ControlsOfTheirClass", State("SelfContactStd", R"("ContactControls": "Std")"), {}},
     {"GeneralContactListsBeyondTheirPairs",
      State("ContactExp",
@@ -176,12 +176,12 @@ const FindingCase interactionCases[] = {
      Property("AcousticImpedanceProp", R"("table": [[1, 2, 3, 4]])"),
      {"warning @/interactionProperties/A/table: found rows of 4, where the flags stand for 2 or 3"}},
     {"ContactPairIsNoClassOfAModelFile",
-     Model(R"("interactions": {"A": {"class": "kinC_SurfaceToSurfaceContactExp"}})"),
-     {"@/interactions/A/class: found 'kinC_SurfaceToSurfaceContactExp'; did you mean "
-      "'kinC_SurfaceToSurfaceContactXpl'? Expected one of kinC_SurfaceToSurfaceContactStd, "
-      "kinC_SurfaceToSurfaceContactXpl, kinC_SelfContactStd, kinC_SelfContactXpl, kinC_ContactExp, "
-      "kinC_RadiationToAmbient, kinC_ConcRadiationToAmbient, kinC_AcousticImpedance, "
-      "kinC_ElasticFoundation, kinC_ActuatorSensor, ... (5 more)"}},
+     Model(R"("interactions": {"A": {"class": "SurfaceToSurfaceContactExp"}})"),
+     {"@/interactions/A/class: found 'SurfaceToSurfaceContactExp'; did you mean "
+      "'SurfaceToSurfaceContactXpl'? Expected one of SurfaceToSurfaceContactStd, "
+      "SurfaceToSurfaceContactXpl, SelfContactStd, SelfContactXpl, ContactExp, "
+      "RadiationToAmbient, ConcRadiationToAmbient, AcousticImpedance, "
+      "ElasticFoundation, ActuatorSensor, ... (5 more)"}},
 };
 
 } // namespace

@@ -5,7 +5,7 @@ namespace {
 class LoadErrors : public testing::TestWithParam<FindingCase> {};
 
 const char kSteps[] =
-    R"("steps": [{"name": "I", "class": "kprC_InitialStep"}, {"name": "S", "class": "kprC_StaticStep"}], )";
+    R"("steps": [{"name": "I", "class": "InitialStep"}, {"name": "S", "class": "StaticStep"}], )";
 
 std::string Load(const std::string& className, const std::string& members) {
     return Model(kSteps + (R"("loads": {"L": {"class": "kloC_)" + className + "\", " + members + "}}"));

@@ -5,7 +5,7 @@ namespace {
 class RecordErrors : public testing::TestWithParam<FindingCase> {};
 
 std::string Section(const std::string& members) {
-    return Model(R"("sections": {"S": {"class": "kseC_ConnectorSection")" + members + "}}");
+    return Model(R"("sections": {"S": {"class": "ConnectorSection")" + members + "}}");
 }
 
 std::string Cyclic(const std::string& members) {
@@ -18,7 +18,7 @@ std::string TimePoints(const std::string& members) {
 
 /// A mesh constraint in a model that has the step Initial.
 std::string States(const std::string& states) {
-    return Model(R"("steps": [{"name": "Initial", "class": "kprC_InitialStep"}],
+    return Model(R"("steps": [{"name": "Initial", "class": "InitialStep"}],
                     "adaptiveMeshConstraints": {"C": {"states": )" +
                  states + "}}");
 }
@@ -49,8 +49,8 @@ const FindingCase recordCases[] = {
      Model(R"("timePoints": {"": {}})"),
      {"@/timePoints/: found an empty name, expected a name that can stand in a deck"}},
     {"ClassOfAnotherFamily",
-     Model(R"("timePoints": {"T": {"class": "kmaC_Material"}})"),
-     {"@/timePoints/T/class: found 'kmaC_Material', expected kprC_TimePoint"}},
+     Model(R"("timePoints": {"T": {"class": "Material"}})"),
+     {"@/timePoints/T/class: found 'Material', expected TimePoint"}},
     {"ClassAsNumber",
      Model(R"("timePoints": {"T": {"class": 1}})"),
      {"@/timePoints/T/class: found 1, expected the name of a class"}},
@@ -65,28 +65,28 @@ const FindingCase recordCases[] = {
      {"@/sections/S/states: found an unknown member 'states', expected one of " + connectorMembers}},
 
     {"AmplitudeTableOfThreeColumns",
-     Amplitude(R"("class": "kamC_Tabular", "table": [[0, 1, 2]])"),
+     Amplitude(R"("class": "Tabular", "table": [[0, 1, 2]])"),
      {"@/amplitudes/A/table: found rows of 3, expected rows of 2: time, value"}},
     {"SmoothStepTableOfOneColumn",
-     Amplitude(R"("class": "kamC_SmoothStep", "table": [[0], [1]])"),
+     Amplitude(R"("class": "SmoothStep", "table": [[0], [1]])"),
      {"@/amplitudes/A/table: found rows of 1, expected rows of 2: time, value"}},
     {"PeriodicTableOfThreeColumns",
-     Amplitude(R"("class": "kamC_Periodic", "table": [[0, 1, 2]])"),
+     Amplitude(R"("class": "Periodic", "table": [[0, 1, 2]])"),
      {"@/amplitudes/A/table: found rows of 3, expected rows of 2: cosine term, sine term"}},
     {"PsdTableOfTwoColumns",
-     Amplitude(R"("class": "kamC_PsdDefinition", "table": [[0, 1]])"),
+     Amplitude(R"("class": "PsdDefinition", "table": [[0, 1]])"),
      {"@/amplitudes/A/table: found rows of 2, expected rows of 3: real part, imaginary part, frequency"}},
     {"SpectrumTableOfTwoColumns",
-     Amplitude(R"("class": "kamC_Spectrum", "table": [[0, 1]])"),
+     Amplitude(R"("class": "Spectrum", "table": [[0, 1]])"),
      {"@/amplitudes/A/table: found rows of 2, expected rows of 3: magnitude, frequency, fraction of critical "
       "damping"}},
     {"AmplitudeWithoutClass",
      Amplitude(""),
-     {"@/amplitudes/A/class: found nothing, expected one of kamC_Tabular, kamC_EquallySpaced, kamC_Periodic, "
-      "kamC_Modulated, kamC_Decay, kamC_SolutionDependent, kamC_SmoothStep, kamC_PsdDefinition, "
-      "kamC_Spectrum"}},
+     {"@/amplitudes/A/class: found nothing, expected one of Tabular, EquallySpaced, Periodic, "
+      "Modulated, Decay, SolutionDependent, SmoothStep, PsdDefinition, "
+      "Spectrum"}},
     {"NumberInTheListOfAnAmplitudeAsNull",
-     Amplitude(R"("class": "kamC_EquallySpaced", "values": [1, null])"),
+     Amplitude(R"("class": "EquallySpaced", "values": [1, null])"),
      {"@/amplitudes/A/values/1: found null, expected a number"}},
 
     {"EnumUnknownName",
@@ -197,22 +197,22 @@ const FindingCase recordCases[] = {
      Steps(R"({"name": "Initial"})"),
      {"@/steps/0/class: found nothing, expected the class of the step"}},
     {"StepWithoutName",
-     Steps(R"({"class": "kprC_InitialStep"})"),
+     Steps(R"({"class": "InitialStep"})"),
      {"@/steps/0/name: found nothing, expected the name of the step"}},
     {"StepNameEmpty",
-     Steps(R"({"class": "kprC_InitialStep", "name": ""})"),
+     Steps(R"({"class": "InitialStep", "name": ""})"),
      {"@/steps/0/name: found an empty name, expected a name that can stand in a deck"}},
     {"StepNameTwice",
-     Steps(R"({"class": "kprC_InitialStep", "name": "S"}, {"class": "kprC_InitialStep", "name": "S"})"),
+     Steps(R"({"class": "InitialStep", "name": "S"}, {"class": "InitialStep", "name": "S"})"),
      {"@/steps/1/name: found a second step named 'S', expected names that are unique"}},
     {"SecondInitialStep",
-     Steps(R"({"class": "kprC_InitialStep", "name": "S"}, {"class": "kprC_InitialStep", "name": "T"})"),
-     {"@/steps/1/class: found a second kprC_InitialStep, expected it in the first place alone"}},
+     Steps(R"({"class": "InitialStep", "name": "S"}, {"class": "InitialStep", "name": "T"})"),
+     {"@/steps/1/class: found a second InitialStep, expected it in the first place alone"}},
     {"StepDescriptionAsLines",
-     Steps(R"({"class": "kprC_InitialStep", "name": "S", "description": ["a"]})"),
+     Steps(R"({"class": "InitialStep", "name": "S", "description": ["a"]})"),
      {"@/steps/0/description: found an array of 1 item, expected a string"}},
     {"StepInputAsNumber",
-     Steps(R"({"class": "kprC_InitialStep", "name": "S", "solverInput": 1})"),
+     Steps(R"({"class": "InitialStep", "name": "S", "solverInput": 1})"),
      {"@/steps/0/solverInput: found 1, expected a string or an array of strings"}},
 };
 
@@ -226,10 +226,10 @@ INSTANTIATE_TEST_SUITE_P(Cases, RecordErrors, testing::ValuesIn(recordCases), Fi
 
 TEST(RecordErrors, Step_OfUnknownClass_IsToldOnceAndNotByItsStates) {
     const std::vector<std::string> findings =
-        Findings(Model(R"("steps": [{"name": "Initial", "class": "kprC_InitalStep"}],
+        Findings(Model(R"("steps": [{"name": "Initial", "class": "InitalStep"}],
                           "adaptiveMeshConstraints": {"C": {"states": {"Initial": {}}}})"));
     ASSERT_EQ(findings.size(), 1u);
-    EXPECT_TRUE(findings[0].starts_with("@/steps/0/class: found 'kprC_InitalStep'; did you mean "
-                                        "'kprC_InitialStep'? Expected one of "))
+    EXPECT_TRUE(findings[0].starts_with("@/steps/0/class: found 'InitalStep'; did you mean "
+                                        "'InitialStep'? Expected one of "))
         << findings[0];
 }

@@ -4,8 +4,7 @@ namespace {
 
 class ReferenceErrors : public testing::TestWithParam<FindingCase> {};
 
-const std::string section =
-    R"("sections": {"WELD": {"class": "kseC_ConnectorSection", "assembledType": "WELD"}})";
+const std::string section = R"("sections": {"WELD": {"class": "ConnectorSection", "assembledType": "WELD"}})";
 
 /// A section assignment of the assembly on this region.
 std::string Region(const std::string& region) {
@@ -34,7 +33,7 @@ std::string EquationTerm(const std::string& set) {
         R"("sets": [{"name": "WIRES", "kind": "element", "members": [{"instance": "I", "labels": [4]}]},
                              {"name": "POINTS", "kind": "node", "members": [{"instance": "I", "labels": [1]}]}])",
         R"("datums": [{"name": "LOCAL"}],
-           "constraints": {"Q": {"class": "kcoC_Equation", "terms": [{"setName": ")" +
+           "constraints": {"Q": {"class": "Equation", "terms": [{"setName": ")" +
             set + R"(", "dof": 1, "csys": "LOCAL"}]}})");
 }
 

@@ -7,7 +7,7 @@ class SectionErrors : public testing::TestWithParam<FindingCase> {};
 /// A model with a material M, a profile P and a section S of these.
 std::string Section(const std::string& className, const std::string& members) {
     return Model(
-        R"("materials": {"M": {"damping": {}}}, "beamProfiles": {"P": {"class": "kbpC_CircularProfile", "r": 1}},
+        R"("materials": {"M": {"damping": {}}}, "beamProfiles": {"P": {"class": "CircularProfile", "r": 1}},
                     "sections": {"S": {"class": "kseC_)" +
         className + "\", " + members + "}}");
 }
@@ -26,11 +26,11 @@ std::string Composite(const std::string& kind, const std::string& members) {
 }
 
 std::string ArbitraryProfile(const std::string& members) {
-    return Model(R"("beamProfiles": {"A": {"class": "kbpC_ArbitraryProfile")" + members + "}}");
+    return Model(R"("beamProfiles": {"A": {"class": "ArbitraryProfile")" + members + "}}");
 }
 
 std::string Sensor(const std::string& members) {
-    return Model(R"("interactions": {"A": {"class": "kinC_ActuatorSensor", )" + members + "}}");
+    return Model(R"("interactions": {"A": {"class": "ActuatorSensor", )" + members + "}}");
 }
 
 const std::string noDeck = "found a shell of which no deck can be written: where elements have it, writing "
@@ -114,7 +114,7 @@ const FindingCase sectionCases[] = {
      Section("UserShellSection", R"("symmetric": false)"),
      {"warning @/sections/S/class: " + noDeck}},
     {"GeneralShell",
-     Model(R"("sections": {"S": {"class": "kseC_GeneralShellSection"}})"),
+     Model(R"("sections": {"S": {"class": "GeneralShellSection"}})"),
      {"warning @/sections/S/class: " + noDeck}},
 
     {"SensorCountsNegative",
@@ -125,18 +125,18 @@ const FindingCase sectionCases[] = {
     // What decks can carry, however odd, is nobody's business here.
     {"OddValues_AreWarnedOfAndPass",
      Model(R"("materials": {"M": {"damping": {}}}, "beamProfiles": {
-                "P": {"class": "kbpC_ArbitraryProfile", "table": [[0, 0, 0], [0, 0, 0]]},
-                "I": {"class": "kbpC_IbeamProfile"}, "G": {"class": "kbpC_GeneralizedProfile"}},
+                "P": {"class": "ArbitraryProfile", "table": [[0, 0, 0], [0, 0, 0]]},
+                "I": {"class": "IbeamProfile"}, "G": {"class": "GeneralizedProfile"}},
               "sections": {
-                "Beam": {"class": "kseC_BeamSection", "profileName": "G", "materialName": "M",
+                "Beam": {"class": "BeamSection", "profileName": "G", "materialName": "M",
                          "materialTable": [[1]], "centroid": [1], "shearCenter": [1, 2, 3]},
-                "General": {"class": "kseC_BeamSection", "integration": "BEFORE_ANALYSIS", "profileName": "P",
+                "General": {"class": "BeamSection", "integration": "BEFORE_ANALYSIS", "profileName": "P",
                             "temperatureDependency": true},
-                "Solid": {"class": "kseC_CompositeSolidSection", "symmetric": true},
-                "Shell": {"class": "kseC_HomogenousShellSection", "thickness": -1, "materialName": "M",
+                "Solid": {"class": "CompositeSolidSection", "symmetric": true},
+                "Shell": {"class": "HomogenousShellSection", "thickness": -1, "materialName": "M",
                           "integrationPoints": 0, "thicknessModulus": -1, "rebars": {}},
-                "Truss": {"class": "kseC_TrussSection", "area": 0, "materialName": "M"},
-                "Point": {"class": "kseC_PointSection", "mass": -1}})"),
+                "Truss": {"class": "TrussSection", "area": 0, "materialName": "M"},
+                "Point": {"class": "PointSection", "mass": -1}})"),
      {"warning @/sections/General/materialTable: found no row, expected Young's modulus, torsional shear "
       "modulus, the cell of temperatureDependency: a section integrated before the analysis takes no others",
       "warning @/sections/Shell/thickness: found -1.0, expected more than 0",

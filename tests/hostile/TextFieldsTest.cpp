@@ -118,8 +118,8 @@ TEST(TextFields, ControlCharacters_AreRefusedInAllButDeckTextAndDescriptions) {
 namespace {
 
 std::string StepsWith(const std::string& description) {
-    return Model(R"("steps": [{"name": "Initial", "class": "kprC_InitialStep"},
-        {"name": "S", "class": "kprC_StaticStep", "description": ")" +
+    return Model(R"("steps": [{"name": "Initial", "class": "InitialStep"},
+        {"name": "S", "class": "StaticStep", "description": ")" +
                  description + "\"}]");
 }
 
@@ -127,7 +127,7 @@ std::string SetsOf(const std::string& names) {
     return Model(R"("parts": {"P": {"mesh": {"nodes": {"labels": [1], "coordinates": [[0, 0, 0]]},
                                              "sets": [{"name": "N", "kind": "node", "labels": [1]}]}}},
         "assembly": {"instances": {"A.B": {"part": "P"}}},
-        "steps": [{"name": "Initial", "class": "kprC_InitialStep"},
+        "steps": [{"name": "Initial", "class": "InitialStep"},
                   {"name": "S", "class": "FREQUENCYSTEP", "residualModeSets": [)" +
                  names + "]}]");
 }

@@ -63,7 +63,7 @@ class MeshTest(unittest.TestCase):
         self.assertEqual((run.returncode, run.stderr), (3, "plate.json: error: the file is there already; --force overwrites it\n"))
         self.assertEqual((self.folder / "plate.json").read_text(), "mine")
         self.assertEqual(self.run_program("new", "plate.msh", "--force").returncode, 0)
-        self.assertIn("kseC_HomogenousShellSection", (self.folder / "plate.json").read_text())
+        self.assertIn("HomogenousShellSection", (self.folder / "plate.json").read_text())
 
     def test_new_elsewhere_names_the_file_from_there_and_gives_each_solid_group_a_section(self):
         (self.folder / "deep").mkdir()

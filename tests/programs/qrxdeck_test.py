@@ -305,13 +305,50 @@ class Refusals(ProgramTest):
         self.assertEqual(message["line"], 2)
         self.assertGreater(message["column"], 0)
 
-    def test_NoDefaultModel_IsCodeOne(self):
+    def named(self, *names):
+        """A model file with copies of the model under these names."""
         model = json.loads(json.dumps(MODEL))
-        model["models"]["Study"] = model["models"].pop("Default Model")
+        content = model["models"].pop("Default Model")
+        model["models"] = {name: content for name in names}
+        return model
+
+    def test_TheOnlyModel_IsWrittenWhateverItsName(self):
+        self.put("model.json", MODEL)
+        self.assertEqual(self.run_program("write", "model.json", "--job", "expected").returncode, 0)
+        expected = (self.folder / "expected.inp").read_bytes()
+        for name in ["Study", "a/b~c", "default model"]:
+            with self.subTest(name=name):
+                self.put("model.json", self.named(name))
+                for verb in [["write", "--job", "deck"], ["check"], ["info"], ["format", "-o", "again.json"]]:
+                    self.assertEqual(self.run_program(verb[0], "model.json", *verb[1:]).returncode, 0)
+                self.assertEqual((self.folder / "deck.inp").read_bytes(), expected)
+                self.assertEqual(list(json.loads((self.folder / "again.json").read_text())["models"]), [name])
+
+    def test_OneOfSeveralModels_IsChosenByItsName(self):
+        model = self.named("A", "B")
+        model["models"]["B"] = {"steps": [{"name": "Start", "class": "InitialStep"}]}
         self.put("model.json", model)
+        for name, has in [("A", True), ("B", False)]:
+            run = self.run_program("write", "model.json", "--model", name, "--job", name)
+            self.assertEqual(run.returncode, 0, run.errors)
+            self.assertEqual(b"*Element" in (self.folder / f"{name}.inp").read_bytes(), has)
+            self.assertEqual(self.run_program("check", "model.json", "--model", name).returncode, 0)
+        self.assertEqual(self.run_program("info", "model.json").returncode, 0)
+        self.assertEqual(self.run_program("format", "model.json").returncode, 0)
+
+    def test_SeveralModels_NoneNamedAndNoneTheDefault_IsCodeOneAndListsThem(self):
+        self.put("model.json", self.named("Sketch", "Defalt Model"))
         run = self.run_program("write", "model.json")
         self.assert_refused(run, 1)
-        self.assertIn("'Default Model'", run.errors)
+        self.assertIn("did you mean 'Defalt Model'? there are 'Sketch', 'Defalt Model'", run.errors)
+        run = self.run_program("write", "model.json", "--model", "Sketsh")
+        self.assert_refused(run, 1)
+        self.assertIn("found no model named 'Sketsh'", run.errors)
+        self.assertIn("did you mean 'Sketch'?", run.errors)
+
+    def test_SchemaMember_IsAccepted(self):
+        self.put("model.json", {"$schema": "./model.schema.json", **MODEL})
+        self.assertEqual(self.run_program("check", "model.json").returncode, 0)
 
     def test_WrongUsage_IsCodeTwo(self):
         for arguments in [[], ["write"], ["frobnicate"], ["write", "model.json", "--frob"],
@@ -736,14 +773,14 @@ class OtherCommands(ProgramTest):
             "    4  Snap     static riks                 off     1       1        1e-05  1e+36  -\n"), run.output)
         model = json.loads(self.run_program("info", "model.json", "--json").output)["models"]["Default Model"]
         self.assertEqual(model["steps"][0], {
-            "name": "Initial", "class": "kprC_InitialStep", "procedure": "initial", "perturbation": False,
+            "name": "Initial", "class": "InitialStep", "procedure": "initial", "perturbation": False,
             "explicit": False, "suppressed": False})
         self.assertEqual(model["steps"][2], {
-            "name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
+            "name": "Cases", "class": "StaticLinearPerturbationStep",
             "procedure": "static linear perturbation", "perturbation": True, "explicit": False,
             "suppressed": False, "nlgeom": False, "increments": {}, "loadCases": ["down", "up"]})
         self.assertEqual(model["steps"][3], {
-            "name": "Hit", "class": "kprC_ExplicitDynamicsStep", "procedure": "explicit dynamics",
+            "name": "Hit", "class": "ExplicitDynamicsStep", "procedure": "explicit dynamics",
             "perturbation": False, "explicit": True, "suppressed": True, "nlgeom": True, "period": 0.001,
             "increments": {"initial": 0.0}, "loadCases": []})
 
@@ -753,13 +790,13 @@ class OtherCommands(ProgramTest):
                                    {"name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
                                     "loadCases": {"up": {"bcs": {"Tip": 2}}}},
                                    {"name": "Release", "class": "kprC_StaticStep"}])
-            support = {"class": "kbcC_TypeBC", "region": "ROD-1.TIP"}
+            support = {"class": "TypeBC", "region": "ROD-1.TIP"}
             model["boundaryConditions"] = {
                 "Hold": dict(support, states={"Initial": {"typeName": "PINNED"}, "Release": {"deactivated": True}}),
                 "Off": dict(support, suppressed=True, states={"Initial": {"typeName": "PINNED"}}),
                 "Tip": dict(support, states={"Press": {"typeName": "XSYMM"}})}
             model["loads"] = {
-                "Bolt": {"class": "kloC_BoltLoad", "region": "ROD-1.TIP",
+                "Bolt": {"class": "BoltLoad", "region": "ROD-1.TIP",
                          "states": {"Press": {"magnitude": 5}, "Release": {"boltMethod": "FIX_LENGTH"}}}}
         self.put("model.json", changed(conditions))
         run = self.run_program("info", "model.json", "--history")
@@ -779,7 +816,7 @@ class OtherCommands(ProgramTest):
         self.assertNotIn("history", plain.output)
         model = json.loads(self.run_program("info", "model.json", "--history", "--json").output)["models"]["Default Model"]
         self.assertEqual(model["history"]["boundaryConditions"]["Hold"], {
-            "class": "kbcC_TypeBC", "suppressed": False, "steps": [
+            "class": "TypeBC", "suppressed": False, "steps": [
                 {"step": "Initial", "status": "CREATED", "written": True, "opNew": False},
                 {"step": "Press", "status": "PROPAGATED", "written": False, "opNew": False},
                 {"step": "Cases", "status": "PROPAGATED_FROM_BASE_STATE", "written": True, "opNew": True},
@@ -795,7 +832,7 @@ class OtherCommands(ProgramTest):
             model["steps"].append({"name": "Cases", "class": "kprC_StaticLinearPerturbationStep",
                                    "loadCases": {"up": {"bcs": {"Tipp": 2}, "loads": {"Bolts": 1}}}})
             model["boundaryConditions"] = {
-                "Tip": {"class": "kbcC_TypeBC", "region": "ROD-1.TIPP",
+                "Tip": {"class": "TypeBC", "region": "ROD-1.TIPP",
                         "states": {"Casez": {"typeName": "PINNED"}, "Initial": {"typeName": "FREE"}}},
                 "Wire": {"class": "kbcC_ConnVelocityBC", "connectors": ["ROD-1.WIRE"], "datum": "System",
                          "states": {"Initial": {"v1": 0, "amplitude": "Ramp"}, "Cases": {"u1": 0}}}}
@@ -845,7 +882,7 @@ class OtherCommands(ProgramTest):
         self.assertEqual(model["parts"]["ROD"]["mesh"], {"nodes": 2, "elements": 1, "elementTypes": {"R2D2": 1}})
         self.assertEqual(model["parts"]["ROD"]["sets"], {"node": {"TIP": 1}, "element": {}, "surface": {}})
         self.assertEqual(model["instances"]["ROD-1"]["translation"], [0, 1, 0])
-        self.assertEqual([step["class"] for step in model["steps"]], ["kprC_InitialStep"])
+        self.assertEqual([step["class"] for step in model["steps"]], ["InitialStep"])
 
     def test_Schema_IsJsonAndTheSameInAFile(self):
         run = self.run_program("schema")

@@ -265,11 +265,13 @@ def test_OtherModels_StayInTheFile(tmp_path):
         qrx.load(tmp_path / "both.json", "Third")
 
 
-def test_ModelOfAnotherName_HasNoDeck():
+def test_NameOfAModel_IsNothingToItsDeck(tmp_path):
     model = rod.model()
+    expected = model.deck()
     model.name = "Mine"
-    with pytest.raises(qrx.ModelError, match="Default Model"):
-        model.deck()
+    assert model.deck() == expected
+    model.save(tmp_path / "mine.json")
+    assert qrx.load(tmp_path / "mine.json").name == "Mine"
 
 
 def test_Datums_AreFoundByName(tmp_path):

@@ -33,7 +33,7 @@ const Kind* FindKind(std::string_view repository) {
 class oif_DeckLines::Run {
 public:
     explicit Run(const odb_Odb& odb)
-        : info_(odb.ddb().model(odb_Odb::DefaultModelName())), builder_(info_), log_(builder_.BuildLogged()) {
+        : info_(odb.ddb().model(odb.DeckModelName())), builder_(info_), log_(builder_.BuildLogged()) {
         const cow_String initial = info_.Model().InitialStepName();
         // A deck has the model's section ahead of the initial step's.
         for (const bool ofModel : {true, false}) {

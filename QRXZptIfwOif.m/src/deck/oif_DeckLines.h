@@ -16,7 +16,7 @@ struct oif_ObjectLines {
     std::string text;
 };
 
-/// What single objects of the model named "Default Model" become in a deck, step by step: the very lines that
+/// What single objects of a store's model become in a deck, step by step: the very lines that
 /// oif_Writer would write, made by the same builders. Banners, which stand ahead of all objects of a kind,
 /// are no object's own, nor are sets and coordinate systems that objects use.
 class oif_DeckLines {

@@ -5,20 +5,20 @@
 #include "store_interface/model/odb_Odb.h"
 
 void oif_Writer::WriteInputFile(const char* jobName) {
-    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_.DeckModelName()));
     const cow_String fileName = cow_String(jobName) + ".inp";
     oif_Builder builder(modelInfo, threads_);
     builder.WriteInputFile(fileName);
 }
 
 void oif_Writer::WriteInput(qio_ostream& device) {
-    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_.DeckModelName()));
     oif_Builder builder(modelInfo, threads_);
     builder.WriteInput(device);
 }
 
 void oif_Writer::WriteInput(oif_MeshTexts& device) {
-    oif_ModelInfo modelInfo(odb_.ddb().model(odb_Odb::DefaultModelName()));
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_.DeckModelName()));
     oif_Builder builder(modelInfo);
     builder.KeepTexts(device);
     builder.WriteInput(device);

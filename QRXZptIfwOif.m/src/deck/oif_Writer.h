@@ -5,7 +5,7 @@ class oif_MeshTexts;
 class odb_Odb;
 class qio_ostream;
 
-/// The way in: writes the model named "Default Model" of an open store as a deck. Several threads may write
+/// The way in: writes the model of an open store that decks are written from as a deck. Several threads may write
 /// at once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
 class oif_Writer {
 public:

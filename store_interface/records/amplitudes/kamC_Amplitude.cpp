@@ -12,10 +12,10 @@ const cls_FieldTable& kamC_Amplitude::Fields() {
     using R = kamC_Amplitude;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::timeSpan>("timeSpan", "what the time values of a curve count from; 0 is not written")
-            .Field<&R::stamp>("stamp",
-                              "edition of the model in which the amplitude came to be: 0 the base of a "
-                              "restart, above 0 after it; not in the deck");
+            .Field<&R::timeSpan>("timeSpan",
+                                 "what the time values of a curve count from; STEP is not written")
+            .Field<&R::stamp>("stamp", "edition of the model in which the amplitude came to be: zero for the "
+                                       "base of a restart, more after it; not in the deck");
     return fields;
 }
 
@@ -23,8 +23,10 @@ const cls_FieldTable& kamC_BaselineCorrection::Fields() {
     using R = kamC_BaselineCorrection;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::intervals>("intervals", "ends of the correction time intervals (time), ascending; "
-                                               "empty: one correction over the whole record");
+            .Field<&R::intervals>("intervals", "ends of the correction time intervals, ascending; empty: one "
+                                               "correction over the whole record")
+            .Unit("time")
+            .Example(R"({"intervals": [5]})");
     return fields;
 }
 
@@ -32,12 +34,14 @@ const cls_FieldTable& kamC_Tabular::Fields() {
     using R = kamC_Tabular;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::smooth>(
-                "smooth", "fraction of the time interval that is smoothed, 0 to 0.5; unset: no 'smooth='")
+            .Field<&R::smooth>("smooth",
+                               "part of the time interval that is smoothed, 0 to 0.5; unset: no 'smooth='")
+            .Unit("no unit")
             .Field<&R::table>("table", "columns: time (time), value (factor); every row has two cells")
             .Field<&R::baselineCorrection>(
                 "baselineCorrection",
-                "baseline correction of an acceleration record; a keyword of its own behind the amplitude");
+                "baseline correction of an acceleration record; a keyword of its own behind the amplitude")
+            .Example(R"({"table": [[0, 0], [1, 1], [2, 0.5]]})");
     return fields;
 }
 
@@ -45,14 +49,19 @@ const cls_FieldTable& kamC_EquallySpaced::Fields() {
     using R = kamC_EquallySpaced;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::fixedInterval>("fixedInterval", "interval between the values (time); always written")
+            .Field<&R::fixedInterval>("fixedInterval", "interval between the values; always written")
+            .Unit("time")
             .Field<&R::begin>("begin", "time of the first value; written when not 0.0")
-            .Field<&R::smooth>(
-                "smooth", "fraction of the time interval that is smoothed, 0 to 0.5; unset: no 'smooth='")
-            .Field<&R::values>("values", "the values (factors), first to last")
+            .Unit("time")
+            .Field<&R::smooth>("smooth",
+                               "part of the time interval that is smoothed, 0 to 0.5; unset: no 'smooth='")
+            .Unit("no unit")
+            .Field<&R::values>("values", "the values, first to last")
+            .Unit("no unit")
             .Field<&R::baselineCorrection>(
                 "baselineCorrection",
-                "baseline correction of an acceleration record; a keyword of its own behind the amplitude");
+                "baseline correction of an acceleration record; a keyword of its own behind the amplitude")
+            .Example(R"({"fixedInterval": 0.01, "values": [0, 0.4, 1, 0.4, 0]})");
     return fields;
 }
 
@@ -60,13 +69,16 @@ const cls_FieldTable& kamC_Periodic::Fields() {
     using R = kamC_Periodic;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::frequency>("frequency",
-                                  "circular frequency (radians/time); second number of the first data line")
-            .Field<&R::start>("start", "starting time; third number")
-            .Field<&R::a0>("a0", "constant term (factor); fourth number")
+            .Field<&R::frequency>("frequency", "circular frequency")
+            .Unit("radians/time")
+            .Field<&R::start>("start", "starting time")
+            .Unit("time")
+            .Field<&R::a0>("a0", "constant term")
+            .Unit("no unit")
             .Field<&R::table>("table",
                               "columns: A (cosine term), B (sine term), one row per term; every row has two "
-                              "cells. The number of rows is the first number of the first data line");
+                              "cells. The number of rows is the first number of the first data line")
+            .Example(R"({"frequency": 62.8, "table": [[0, 1]]})");
     return fields;
 }
 
@@ -74,11 +86,17 @@ const cls_FieldTable& kamC_Modulated::Fields() {
     using R = kamC_Modulated;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::initial>("initial", "constant term A0 (factor)")
-            .Field<&R::magnitude>("magnitude", "magnitude A (factor)")
+            .Field<&R::initial>("initial", "constant term A0")
+            .Unit("no unit")
+            .Field<&R::magnitude>("magnitude", "magnitude A")
+            .Unit("no unit")
             .Field<&R::start>("start", "starting time")
-            .Field<&R::frequency1>("frequency1", "circular frequency 1 (radians/time)")
-            .Field<&R::frequency2>("frequency2", "circular frequency 2 (radians/time)");
+            .Unit("time")
+            .Field<&R::frequency1>("frequency1", "circular frequency 1")
+            .Unit("radians/time")
+            .Field<&R::frequency2>("frequency2", "circular frequency 2")
+            .Unit("radians/time")
+            .Example(R"({"magnitude": 1, "frequency1": 10, "frequency2": 100})");
     return fields;
 }
 
@@ -86,19 +104,28 @@ const cls_FieldTable& kamC_Decay::Fields() {
     using R = kamC_Decay;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::initial>("initial", "constant term A0 (factor)")
-            .Field<&R::maximum>("maximum", "coefficient A of the exponential (factor)")
+            .Field<&R::initial>("initial", "constant term A0")
+            .Unit("no unit")
+            .Field<&R::maximum>("maximum", "coefficient A of the exponential")
+            .Unit("no unit")
             .Field<&R::start>("start", "starting time")
-            .Field<&R::decayTime>("decayTime", "decay time (time)");
+            .Unit("time")
+            .Field<&R::decayTime>("decayTime", "decay time")
+            .Unit("time")
+            .Example(R"({"maximum": 1, "decayTime": 0.2})");
     return fields;
 }
 
 const cls_FieldTable& kamC_SolutionDependent::Fields() {
     using R = kamC_SolutionDependent;
     static const cls_FieldTable fields = cls_Describe<R>(kamC_Amplitude::Fields())
-                                             .Field<&R::initial>("initial", "initial value (factor)")
-                                             .Field<&R::minimum>("minimum", "smallest value (factor)")
-                                             .Field<&R::maximum>("maximum", "largest value (factor)");
+                                             .Field<&R::initial>("initial", "initial value")
+                                             .Unit("no unit")
+                                             .Field<&R::minimum>("minimum", "smallest value")
+                                             .Unit("no unit")
+                                             .Field<&R::maximum>("maximum", "largest value")
+                                             .Unit("no unit")
+                                             .Example(R"({"initial": 1, "minimum": 0.1, "maximum": 1000})");
     return fields;
 }
 
@@ -106,7 +133,8 @@ const cls_FieldTable& kamC_SmoothStep::Fields() {
     using R = kamC_SmoothStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::table>("table", "columns: time (time), value (factor); every row has two cells");
+            .Field<&R::table>("table", "columns: time (time), value (factor); every row has two cells")
+            .Example(R"({"table": [[0, 0], [1, 1]]})");
     return fields;
 }
 
@@ -120,13 +148,17 @@ const cls_FieldTable& kamC_PsdDefinition::Fields() {
     using R = kamC_PsdDefinition;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::dbReference>("dbReference", "reference value of the decibel scale (units of the "
-                                                   "excitation); written as 'db Reference=' when not 0.0")
-            .Field<&R::g>("g", "acceleration of gravity (length/time squared); written when not 1.0")
-            .Field<&R::psdType>("psdType", "units of the density; written when not 1")
+            .Field<&R::dbReference>(
+                "dbReference",
+                "reference value of the decibel scale; written as 'db Reference=' when not 0.0")
+            .Unit("unit of the excitation")
+            .Field<&R::g>("g", "acceleration of gravity; written when not 1.0")
+            .Unit("length/time^2")
+            .Field<&R::psdType>("psdType", "units of the density; FORCE is not written")
             .Field<&R::user>("user", "true: the function comes from a user subroutine, ', user' is written")
             .Field<&R::table>("table", "columns: real part, imaginary part (units squared/frequency), "
-                                       "frequency (cycles/time); every row has three cells");
+                                       "frequency (cycles/time); every row has three cells")
+            .Example(R"({"table": [[1, 0, 10], [1, 0, 1000]]})");
     return fields;
 }
 
@@ -143,11 +175,13 @@ const cls_FieldTable& kamC_Spectrum::Fields() {
     using R = kamC_Spectrum;
     static const cls_FieldTable fields =
         cls_Describe<R>(kamC_Amplitude::Fields())
-            .Field<&R::g>("g", "acceleration of gravity (length/time squared), for spectra in multiples of "
-                               "it; written when not 0.0")
-            .Field<&R::type>("type", "quantity of the spectrum; written when not 2")
+            .Field<&R::g>("g",
+                          "acceleration of gravity, for spectra in multiples of it; written when not 0.0")
+            .Unit("length/time^2")
+            .Field<&R::type>("type", "quantity of the spectrum; ACCELERATION is not written")
             .Field<&R::table>("table", "columns: magnitude (units of the quantity), frequency (cycles/time), "
-                                       "fraction of critical damping; every row has three cells");
+                                       "fraction of critical damping; every row has three cells")
+            .Example(R"({"table": [[0.2, 1, 0.05], [0.5, 10, 0.05]]})");
     return fields;
 }
 

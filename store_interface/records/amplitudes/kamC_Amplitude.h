@@ -32,8 +32,8 @@ public:
 
 class kamC_Tabular final : public cls_RecordOf<kamC_Tabular, kamC_Amplitude> {
 public:
-    static constexpr cls_ClassInfo Class{"kamC_Tabular",
-                                         "Amplitude by a table of points; the solver's default definition."};
+    static constexpr cls_ClassInfo Class{
+        "kamC_Tabular", "Amplitude by a table of points; the solver's default definition.", 0, "Table"};
 
     static constexpr double smoothDef() { return cls_UnsetDouble; }
     double smooth = smoothDef();
@@ -112,7 +112,8 @@ public:
 
 class kamC_SmoothStep final : public cls_RecordOf<kamC_SmoothStep, kamC_Amplitude> {
 public:
-    static constexpr cls_ClassInfo Class{"kamC_SmoothStep", "Amplitude by smooth steps between points."};
+    static constexpr cls_ClassInfo Class{"kamC_SmoothStep", "Amplitude by smooth steps between points.", 0,
+                                         "Smooth"};
 
     cow_2DArray<double> table;
 
@@ -122,7 +123,7 @@ public:
 class kamC_PsdDefinition final : public cls_RecordOf<kamC_PsdDefinition, kamC_Amplitude> {
 public:
     static constexpr cls_ClassInfo Class{"kamC_PsdDefinition",
-                                         "Power spectral density of a random excitation."};
+                                         "Power spectral density of a random excitation.", 0, "Psd"};
 
     enum class PsdTypeEnm : int { BASE = 0, FORCE = 1, DB = 2 };
 

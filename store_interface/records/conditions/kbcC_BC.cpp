@@ -56,7 +56,8 @@ const cls_FieldTable& kbcC_BCState::Fields() {
         cls_Describe<kbcC_BCState>(cls_Record::Fields())
             .Field<&kbcC_BCState::amplitude>("amplitude", "amplitude in this step")
             .RefersTo("amplitude")
-            .InBaseState(cls_BaseStateRule::Dropped);
+            .InBaseState(cls_BaseStateRule::Dropped)
+            .Example(R"({"amplitude": "Ramp"})");
     return fields;
 }
 
@@ -66,7 +67,8 @@ const cls_FieldTable& kbcC_BC::Fields() {
             .Field<&kbcC_BC::region>("region", "the node set (or other set) that it acts on")
             .Field<&kbcC_BC::datum>("datum", "coordinate system of the components; none for the global one")
             .Field<&kbcC_BC::distributionType>("distributionType",
-                                               "uniform, by a user subroutine, or from a field");
+                                               "uniform, by a user subroutine, or from a field")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
@@ -81,7 +83,8 @@ const cls_FieldTable& kloC_LoadState::Fields() {
 const cls_FieldTable& kloC_Load::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kloC_Load>(kprC_PropagatingObject::Fields())
-            .Field<&kloC_Load::region>("region", "the set or surface that it acts on");
+            .Field<&kloC_Load::region>("region", "the set or surface that it acts on")
+            .Example(R"({"region": "PART-1.TOP"})");
     return fields;
 }
 
@@ -89,7 +92,8 @@ const cls_FieldTable& kpfC_Field::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kpfC_Field>(kprC_PropagatingObject::Fields())
             .Field<&kpfC_Field::region>("region", "the node or element set that it acts on")
-            .Field<&kpfC_Field::distributionType>("distributionType", "where the values come from");
+            .Field<&kpfC_Field::distributionType>("distributionType", "where the values come from")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 

@@ -208,7 +208,8 @@ class kbcC_DisplacementBC final
     : public kbcC_DisplacementQueries<kbcC_MotionOf<kbcC_DisplacementBC, kbcC_BC, kbcC_DisplacementBCState>> {
 public:
     static constexpr cls_ClassInfo Class{"kbcC_DisplacementBC",
-                                         "prescribed displacements and rotations of a node set", 0x2980005};
+                                         "prescribed displacements and rotations of a node set", 0x2980005,
+                                         "Displacement"};
 
     bool fixed = false;
 
@@ -218,15 +219,17 @@ public:
 class kbcC_VelocityBC final
     : public kbcC_VelocityQueries<kbcC_MotionOf<kbcC_VelocityBC, kbcC_BC, kbcC_VelocityBCState>> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_VelocityBC", "prescribed velocities and angular velocities of a node set", 0x2980007};
+    static constexpr cls_ClassInfo Class{"kbcC_VelocityBC",
+                                         "prescribed velocities and angular velocities of a node set",
+                                         0x2980007, "Velocity"};
 };
 
 class kbcC_AccelerationBC final
     : public kbcC_AccelerationQueries<kbcC_MotionOf<kbcC_AccelerationBC, kbcC_BC, kbcC_AccelerationBCState>> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_AccelerationBC", "prescribed accelerations and angular accelerations of a node set", 0x2980009};
+    static constexpr cls_ClassInfo Class{"kbcC_AccelerationBC",
+                                         "prescribed accelerations and angular accelerations of a node set",
+                                         0x2980009, "Acceleration"};
 };
 
 class kbcC_ConnDisplacementBC final
@@ -235,7 +238,7 @@ class kbcC_ConnDisplacementBC final
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_ConnDisplacementBC", "prescribed relative displacement of connectors in their local directions",
-        0x2980024};
+        0x2980024, "ConnectorDisplacement"};
 };
 
 class kbcC_ConnVelocityBC final
@@ -244,7 +247,7 @@ class kbcC_ConnVelocityBC final
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_ConnVelocityBC", "prescribed relative velocity of connectors in their local directions",
-        0x2980026};
+        0x2980026, "ConnectorVelocity"};
 };
 
 class kbcC_ConnAccelerationBC final
@@ -253,7 +256,7 @@ class kbcC_ConnAccelerationBC final
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_ConnAccelerationBC", "prescribed relative acceleration of connectors in their local directions",
-        0x2980028};
+        0x2980028, "ConnectorAcceleration"};
 };
 
 void cls_RegisterMotionConditionRecords(cls_ClassRegistrar& registrar);

@@ -17,10 +17,12 @@ const cls_FieldTable& kbcC_TemperatureBCState::Fields() {
     using R = kbcC_TemperatureBCState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbcC_BCState::Fields())
-            .Field<&R::magnitude>("magnitude", "temperature")
+            .Field<&R::magnitude>("magnitude", "the temperature")
+            .Unit("temperature")
             .InBaseState(cls_BaseStateRule::ZeroValue)
             .Field<&R::dofs>(
-                "dofs", "degrees of freedom 11, 12, ... in the order of the data lines; read if dofsGiven");
+                "dofs", "degrees of freedom 11, 12, ... in the order of the data lines; read if dofsGiven")
+            .Example(R"({"magnitude": 80})");
     return fields;
 }
 
@@ -28,16 +30,18 @@ const cls_FieldTable& kbcC_TemperatureBC::Fields() {
     using R = kbcC_TemperatureBC;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbcC_BC::Fields())
-            .Field<&R::dofsGiven>("dofsGiven", "the states list the degrees of freedom; otherwise it is 11");
+            .Field<&R::dofsGiven>("dofsGiven", "the states list the degrees of freedom; otherwise it is 11")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kbcC_DistributedBCState::Fields() {
     using R = kbcC_DistributedBCState;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kbcC_BCState::Fields())
-            .Field<&R::magnitude>("magnitude", "the value; unit of the quantity")
-            .InBaseState(cls_BaseStateRule::ZeroValue);
+    static const cls_FieldTable fields = cls_Describe<R>(kbcC_BCState::Fields())
+                                             .Field<&R::magnitude>("magnitude", "the value")
+                                             .Unit("unit of the quantity")
+                                             .InBaseState(cls_BaseStateRule::ZeroValue)
+                                             .Example(R"({"magnitude": 0.1})");
     return fields;
 }
 
@@ -48,7 +52,9 @@ const cls_FieldTable& kbcC_ComplexDistributedBCState::Fields() {
             .Field<&R::imaginaryMagnitude>(
                 "imaginaryMagnitude",
                 "imaginary part of magnitude, in harmonic steps of the direct kind; set and cleared with it")
-            .InBaseState(cls_BaseStateRule::ZeroValue);
+            .Unit("unit of the quantity")
+            .InBaseState(cls_BaseStateRule::ZeroValue)
+            .Example(R"({"magnitude": 0.1, "imaginaryMagnitude": 0.02})");
     return fields;
 }
 
@@ -56,7 +62,8 @@ const cls_FieldTable& kbcC_DistributedBC::Fields() {
     using R = kbcC_DistributedBC;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbcC_BC::Fields())
-            .Field<&R::fixed>("fixed", "the flag of that name is written, and the value all the same");
+            .Field<&R::fixed>("fixed", "the flag of that name is written, and the value all the same")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 

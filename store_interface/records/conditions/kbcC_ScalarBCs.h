@@ -34,7 +34,7 @@ public:
     static constexpr cls_ClassInfo Class{"kbcC_TemperatureBC",
                                          "prescribed temperature of a node set, on degree of freedom 11 or, "
                                          "through the thickness of shells, on those listed",
-                                         0x2980010};
+                                         0x2980010, "Temperature"};
 
     bool dofsGiven = false;
 
@@ -99,36 +99,41 @@ public:
 
 class kbcC_PorePressureBC final : public kbcC_ScalarOf<kbcC_PorePressureBC, kbcC_DistributedBCState> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_PorePressureBC", "prescribed pore fluid pressure, degree of freedom 8; stress", 0x2980014};
+    static constexpr cls_ClassInfo Class{"kbcC_PorePressureBC",
+                                         "prescribed pore fluid pressure, degree of freedom 8; stress",
+                                         0x2980014, "PorePressure"};
 };
 
 class kbcC_AcousticPressureBC final
     : public kbcC_ScalarOf<kbcC_AcousticPressureBC, kbcC_ComplexDistributedBCState> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_AcousticPressureBC", "prescribed acoustic pressure, degree of freedom 8; stress", 0x2980016};
+    static constexpr cls_ClassInfo Class{"kbcC_AcousticPressureBC",
+                                         "prescribed acoustic pressure, degree of freedom 8; stress",
+                                         0x2980016, "AcousticPressure"};
 };
 
 class kbcC_FluidPressureBC final : public kbcC_ScalarOf<kbcC_FluidPressureBC, kbcC_DistributedBCState> {
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_FluidPressureBC",
-        "prescribed hydrostatic fluid pressure at a reference node, degree of freedom 8; stress", 0x2980018};
+        "prescribed hydrostatic fluid pressure at a reference node, degree of freedom 8; stress", 0x2980018,
+        "FluidPressure"};
 };
 
 class kbcC_ElectricPotentialBC final
     : public kbcC_ScalarOf<kbcC_ElectricPotentialBC, kbcC_ComplexDistributedBCState> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_ElectricPotentialBC", "prescribed electric potential, degree of freedom 9; voltage", 0x298001A};
+    static constexpr cls_ClassInfo Class{"kbcC_ElectricPotentialBC",
+                                         "prescribed electric potential, degree of freedom 9; voltage",
+                                         0x298001A, "ElectricPotential"};
 };
 
 class kbcC_ConcentrationBC final : public kbcC_ScalarOf<kbcC_ConcentrationBC, kbcC_DistributedBCState> {
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_ConcentrationBC",
-        "prescribed normalised concentration of a diffusing material, degree of freedom 11", 0x298001C};
+        "prescribed normalised concentration of a diffusing material, degree of freedom 11", 0x298001C,
+        "Concentration"};
 };
 
 class kbcC_FluidCavityPressureBC final
@@ -136,8 +141,8 @@ class kbcC_FluidCavityPressureBC final
 public:
     static constexpr cls_ClassInfo Class{
         "kbcC_FluidCavityPressureBC",
-        "prescribed pressure of a fluid cavity at its reference node, degree of freedom 8; stress",
-        0x2980031};
+        "prescribed pressure of a fluid cavity at its reference node, degree of freedom 8; stress", 0x2980031,
+        "FluidCavityPressure"};
 };
 
 void cls_RegisterScalarConditionRecords(cls_ClassRegistrar& registrar);

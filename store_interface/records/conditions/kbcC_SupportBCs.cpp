@@ -31,10 +31,9 @@ const cls_FieldTable& kbcC_TypeBCState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kbcC_BCState::Fields())
             .Field<&R::typeName>("typeName", "the kind of support")
-            .Field<&R::buckleCase>(
-                "buckleCase",
-                "load cases of a buckling step that the condition enters; any other number: none")
-            .Meanings(kbcC_BuckleCaseMeanings());
+            .Field<&R::buckleCase>("buckleCase", "load cases of a buckling step that the condition enters")
+            .Meanings(kbcC_BuckleCaseMeanings())
+            .Example(R"({"typeName": "ENCASTRE"})");
     return fields;
 }
 
@@ -46,11 +45,13 @@ const cls_FieldTable& kbcC_SubmodelBCState::Fields() {
             .Field<&R::dofs>("dofs", "degrees of freedom that are driven, in the order of the data lines")
             .Field<&R::shellThicknessValue>("shellThicknessValue",
                                             "size of the centre zone of a boundary between shell and solid; "
-                                            "length, 0 or less: a tenth of shellThickness")
+                                            "zero or less: a tenth of shellThickness")
+            .Unit("length")
             .Field<&R::stepName>("stepName", "the step of the global analysis, as the deck shall hold it (a "
                                              "number); not a step of this model")
-            .Field<&R::increment>("increment", "increment of that step; 0 for none")
-            .Field<&R::timeScale>("timeScale", "the time of the global step is scaled to that of this step");
+            .Field<&R::increment>("increment", "increment of that step; zero for none")
+            .Field<&R::timeScale>("timeScale", "the time of the global step is scaled to that of this step")
+            .Example(R"({"dofs": [1, 2, 3], "stepName": "1"})");
     return fields;
 }
 
@@ -62,12 +63,17 @@ const cls_FieldTable& kbcC_SubmodelBC::Fields() {
                                                    "boundary, empty for all of it; not a set of this model")
             .Field<&R::shellThickness>(
                 "shellThickness",
-                "shell thickness of the global model, for boundaries between shell and solid; length")
+                "shell thickness of the global model, for boundaries between shell and solid")
+            .Unit("length")
             .Field<&R::absoluteExteriorTolerance>(
                 "absoluteExteriorTolerance",
-                "how far a driven node may lie outside the elements of the global model; length")
-            .Field<&R::exteriorTolerance>("exteriorTolerance",
-                                          "the same as a fraction of the elements' average size");
+                "how far a driven node may lie outside the elements of the global model")
+            .Unit("length")
+            .Field<&R::exteriorTolerance>(
+                "exteriorTolerance",
+                "how far a driven node may lie outside, as a fraction of the elements' average size")
+            .Unit("no unit")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 

@@ -11,7 +11,7 @@ public:
         "kbcC_TypeBC",
         "a node set held by a named support: symmetry, antisymmetry, pinned, "
         "clamped, or the restraint of a pipe section",
-        0x298000C};
+        0x298000C, "Support"};
 
     /// The texts are the words of the deck.
     enum class TypeNameEnm : int {
@@ -74,8 +74,9 @@ public:
 
 class kbcC_SubmodelBC final : public cls_RecordOf<kbcC_SubmodelBC, kbcC_BC> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kbcC_SubmodelBC", "boundary of a submodel, driven by the results of a global model", 0x2980022};
+    static constexpr cls_ClassInfo Class{"kbcC_SubmodelBC",
+                                         "boundary of a submodel, driven by the results of a global model",
+                                         0x2980022, "Submodel"};
 
     cow_String globalElset;
     double shellThickness = 0.0;

@@ -31,8 +31,11 @@ const cls_FieldTable& kloC_BoltLoadState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_LoadState::Fields())
             .Field<&R::boltMethod>("boltMethod", "how the bolt is tightened from this step on")
-            .Field<&R::magnitude>("magnitude", "bolt force, read by APPLY_FORCE; force")
-            .Field<&R::adjustment>("adjustment", "change of length, read by ADJUST_LENGTH; length");
+            .Field<&R::magnitude>("magnitude", "bolt force, read by APPLY_FORCE")
+            .Unit("force")
+            .Field<&R::adjustment>("adjustment", "change of length, read by ADJUST_LENGTH")
+            .Unit("length")
+            .Example(R"({"boltMethod": "APPLY_FORCE", "magnitude": 20000})");
     return fields;
 }
 

@@ -12,7 +12,7 @@ public:
     static constexpr cls_ClassInfo Class{"kloC_BoltLoad",
                                          "tightening of a bolt across its pre-tension section, by a force or "
                                          "by a length change, or locking of the bolt at its current length",
-                                         0x2880024};
+                                         0x2880024, "BoltPretension"};
 
     enum class MethodEnm : int { APPLY_FORCE = 0, ADJUST_LENGTH = 1, FIX_LENGTH = 2 };
 

@@ -12,23 +12,29 @@ template <class R>
 void ComplexComponents(cls_Describe<R>& describe) {
     describe.template Field<&R::complex>("complex", kComplexDoc)
         .template Field<&R::complexComponent1>("complexComponent1", "component 1 of a complex load")
+        .Unit("unit of the load")
         .template Field<&R::complexComponent2>("complexComponent2", "component 2 of a complex load")
-        .template Field<&R::complexComponent3>("complexComponent3", "component 3 of a complex load");
+        .Unit("unit of the load")
+        .template Field<&R::complexComponent3>("complexComponent3", "component 3 of a complex load")
+        .Unit("unit of the load");
 }
 
 template <class R>
 void ComplexMagnitude(cls_Describe<R>& describe) {
     describe.template Field<&R::complex>("complex", kComplexDoc)
-        .template Field<&R::complexMagnitude>("complexMagnitude", "magnitude of a complex load");
+        .template Field<&R::complexMagnitude>("complexMagnitude", "magnitude of a complex load")
+        .Unit("unit of the load");
 }
 
 template <class R>
 void Heights(cls_Describe<R>& describe) {
     describe
         .template Field<&R::zeroPressureHeight>("zeroPressureHeight",
-                                                "height where a hydrostatic pressure is zero: length")
-        .template Field<&R::referencePressureHeight>(
-            "referencePressureHeight", "height where a hydrostatic pressure has its magnitude: length");
+                                                "height where a hydrostatic pressure is zero")
+        .Unit("length")
+        .template Field<&R::referencePressureHeight>("referencePressureHeight",
+                                                     "height where a hydrostatic pressure has its magnitude")
+        .Unit("length");
 }
 
 } // namespace
@@ -67,39 +73,46 @@ bool kloC_DistributedLoad::UsesField(cow_String& name) const {
 
 const cls_FieldTable& kloC_ScalarState::Fields() {
     using R = kloC_ScalarState;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kloC_LoadState::Fields())
-            .Field<&R::magnitude>("magnitude", "magnitude, in the unit of the load");
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_LoadState::Fields())
+                                             .Field<&R::magnitude>("magnitude", "magnitude of the load")
+                                             .Unit("unit of the load")
+                                             .Example(R"({"magnitude": 10})");
     return fields;
 }
 
 const cls_FieldTable& kloC_DistributedState::Fields() {
     using R = kloC_DistributedState;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kloC_LoadState::Fields())
-            .Field<&R::magnitude>("magnitude", "magnitude, in the unit of the load");
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_LoadState::Fields())
+                                             .Field<&R::magnitude>("magnitude", "magnitude of the load")
+                                             .Unit("unit of the load")
+                                             .Example(R"({"magnitude": 0.5})");
     return fields;
 }
 
 const cls_FieldTable& kloC_VectorState::Fields() {
     using R = kloC_VectorState;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kloC_LoadState::Fields())
-            .Field<&R::component1>("component1", "component 1, in the unit of the load")
-            .Field<&R::component2>("component2", "component 2, in the unit of the load")
-            .Field<&R::component3>("component3", "component 3, in the unit of the load");
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_LoadState::Fields())
+                                             .Field<&R::component1>("component1", "component 1 of the load")
+                                             .Unit("unit of the load")
+                                             .Field<&R::component2>("component2", "component 2 of the load")
+                                             .Unit("unit of the load")
+                                             .Field<&R::component3>("component3", "component 3 of the load")
+                                             .Unit("unit of the load")
+                                             .Example(R"({"component3": -1000})");
     return fields;
 }
 
 const cls_FieldTable& kloC_PressureState::Fields() {
     using R = kloC_PressureState;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_DistributedState::Fields()).With(Heights<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_DistributedState::Fields()).With(Heights<R>).Example(R"({"magnitude": 0.5})");
     return fields;
 }
 
 const cls_FieldTable& kloC_PipePressureState::Fields() {
     using R = kloC_PipePressureState;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_DistributedState::Fields()).With(Heights<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_DistributedState::Fields()).With(Heights<R>).Example(R"({"magnitude": 6.3})");
     return fields;
 }
 
@@ -107,9 +120,11 @@ const cls_FieldTable& kloC_RotationalBodyForceState::Fields() {
     using R = kloC_RotationalBodyForceState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_LoadState::Fields())
-            .Field<&R::magnitude>("magnitude",
-                                  "square of the angular velocity (radians^2/time^2) of a centrifugal load, "
-                                  "else the angular acceleration (radians/time^2)");
+            .Field<&R::magnitude>(
+                "magnitude",
+                "square of the angular velocity of a centrifugal load, else the angular acceleration")
+            .Unit("radians^2/time^2 or radians/time^2")
+            .Example(R"({"magnitude": 98696})");
     return fields;
 }
 
@@ -118,7 +133,9 @@ const cls_FieldTable& kloC_SubmodelStressBasedState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_LoadState::Fields())
             .Field<&R::stepName>("stepName", "step of the global analysis")
-            .Field<&R::scaleParameter>("scaleParameter", "factor on the global stresses");
+            .Field<&R::scaleParameter>("scaleParameter", "factor on the global stresses")
+            .Unit("no unit")
+            .Example(R"({"stepName": "1"})");
     return fields;
 }
 
@@ -130,7 +147,8 @@ const cls_FieldTable& kloC_DistributedLoad::Fields() {
                 "distributionType",
                 "how the magnitude is spread; HYDROSTATIC is for pressures and pipe pressures only")
             .Field<&R::fieldName>("fieldName", "name of the field that a distribution FIELD takes; the field "
-                                               "itself is not part of the model");
+                                               "itself is not part of the model")
+            .Example(R"({"region": "PART-1.TOP"})");
     return fields;
 }
 
@@ -138,9 +156,11 @@ const cls_FieldTable& kloC_ConcentratedForce::Fields() {
     using R = kloC_ConcentratedForce;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
+            .InheritedMayBeSeveral("region")
             .Field<&R::datum>("datum", "coordinate system of the components, none for the global one")
             .Field<&R::follower>("follower", "the direction follows the rotation of the node")
-            .With(ComplexComponents<R>);
+            .With(ComplexComponents<R>)
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
@@ -148,15 +168,19 @@ const cls_FieldTable& kloC_Moment::Fields() {
     using R = kloC_Moment;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
+            .InheritedMayBeSeveral("region")
             .Field<&R::datum>("datum", "coordinate system of the components, none for the global one")
             .Field<&R::follower>("follower", "the axis follows the rotation of the node")
-            .With(ComplexComponents<R>);
+            .With(ComplexComponents<R>)
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_PEGLoad::Fields() {
     using R = kloC_PEGLoad;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexComponents<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .With(ComplexComponents<R>)
+                                             .Example(R"({"region": "PART-1.CENTRE"})");
     return fields;
 }
 
@@ -164,25 +188,34 @@ const cls_FieldTable& kloC_ConcentratedPoreFluid::Fields() {
     using R = kloC_ConcentratedPoreFluid;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
-            .Field<&R::complex>("complex", "must stay false: there is no complex flow, and writing it fails");
+            .InheritedMayBeSeveral("region")
+            .Field<&R::complex>("complex", "must stay false: there is no complex flow, and writing it fails")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_InwardVolAccel::Fields() {
     using R = kloC_InwardVolAccel;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .InheritedMayBeSeveral("region")
+                                             .With(ComplexMagnitude<R>)
+                                             .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_ConnectorForce::Fields() {
     using R = kloC_ConnectorForce;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexComponents<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .With(ComplexComponents<R>)
+                                             .Example(R"({"region": "CONNECTORS"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_ConnectorMoment::Fields() {
     using R = kloC_ConnectorMoment;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexComponents<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .With(ComplexComponents<R>)
+                                             .Example(R"({"region": "CONNECTORS"})");
     return fields;
 }
 
@@ -194,7 +227,9 @@ const cls_FieldTable& kloC_RotationalBodyForce::Fields() {
             .Field<&R::rotaryAcceleration>("rotaryAcceleration",
                                            "the load of an angular acceleration, label ROTA")
             .Field<&R::point1>("point1", "first point of the axis: length")
-            .Field<&R::point2>("point2", "second point of the axis: length");
+            .Field<&R::point2>("point2", "second point of the axis: length")
+            .Example(
+                R"({"region": "PART-1.ALL", "centrifugal": true, "point1": [0, 0, 0], "point2": [0, 0, 1]})");
     return fields;
 }
 
@@ -205,7 +240,8 @@ const cls_FieldTable& kloC_LineLoad::Fields() {
             .Field<&R::system>("system",
                                "GLOBAL: components along the axes of the model (PX, PY, PZ); LOCAL: "
                                "components 1 and 2 along the axes of the beam section (P1, P2)")
-            .With(ComplexComponents<R>);
+            .With(ComplexComponents<R>)
+            .Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
@@ -215,21 +251,26 @@ const cls_FieldTable& kloC_PipePressure::Fields() {
         cls_Describe<R>(kloC_DistributedLoad::Fields())
             .Field<&R::external>("external", "pressure from outside; else from inside")
             .Field<&R::effectiveDiameter>("effectiveDiameter",
-                                          "effective outer or inner diameter of the pipe: length")
-            .With(ComplexMagnitude<R>);
+                                          "effective outer or inner diameter of the pipe")
+            .Unit("length")
+            .With(ComplexMagnitude<R>)
+            .Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_BodyForce::Fields() {
     using R = kloC_BodyForce;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kloC_DistributedLoad::Fields()).With(ComplexComponents<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_DistributedLoad::Fields())
+                                             .With(ComplexComponents<R>)
+                                             .Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_Gravity::Fields() {
     using R = kloC_Gravity;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexComponents<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .With(ComplexComponents<R>)
+                                             .Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
@@ -238,7 +279,8 @@ const cls_FieldTable& kloC_Pressure::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_DistributedLoad::Fields())
             .Field<&R::distributionRegion>("distributionRegion", "node set of a reference node, or none")
-            .With(ComplexMagnitude<R>);
+            .With(ComplexMagnitude<R>)
+            .Example(R"({"region": "PART-1.TOP"})");
     return fields;
 }
 
@@ -260,9 +302,11 @@ const cls_FieldTable& kloC_Traction::Fields() {
                 "orientation",
                 "name of an orientation that the deck gets elsewhere, as it stands there; goes before datum")
             .Field<&R::datum>("datum", "coordinate system of the direction, none for the global one")
-            .Field<&R::angle>("angle", "additional rotation of the system: degrees")
+            .Field<&R::angle>("angle", "additional rotation of the system")
+            .Unit("degrees")
             .Field<&R::axis>("axis", "axis of the additional rotation")
-            .With(ComplexMagnitude<R>);
+            .With(ComplexMagnitude<R>)
+            .Example(R"({"region": "PART-1.TOP", "vectorGiven": true, "direction": [[0, 0, 0], [1, 0, 0]]})");
     return fields;
 }
 
@@ -270,8 +314,10 @@ const cls_FieldTable& kloC_ConcentratedHeatFlux::Fields() {
     using R = kloC_ConcentratedHeatFlux;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
+            .InheritedMayBeSeveral("region")
             .Field<&R::dof>("dof",
-                            "degree of freedom of the temperature: 11, or 12 and up at points of a shell");
+                            "degree of freedom of the temperature: 11, or 12 and up at points of a shell")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
@@ -279,43 +325,55 @@ const cls_FieldTable& kloC_ConcentratedConcentrationFlux::Fields() {
     using R = kloC_ConcentratedConcentrationFlux;
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
-            .Field<&R::dof>("dof", "degree of freedom of the concentration: 11");
+            .InheritedMayBeSeveral("region")
+            .Field<&R::dof>("dof", "degree of freedom of the concentration: 11")
+            .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_ConcentratedCharge::Fields() {
     using R = kloC_ConcentratedCharge;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .InheritedMayBeSeveral("region")
+                                             .With(ComplexMagnitude<R>)
+                                             .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_ConcentratedCurrent::Fields() {
     using R = kloC_ConcentratedCurrent;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields())
+                                             .InheritedMayBeSeveral("region")
+                                             .With(ComplexMagnitude<R>)
+                                             .Example(R"({"region": "PART-1.SET"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_SurfaceCharge::Fields() {
     using R = kloC_SurfaceCharge;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>).Example(R"({"region": "PART-1.TOP"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_SurfaceCurrent::Fields() {
     using R = kloC_SurfaceCurrent;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>).Example(R"({"region": "PART-1.TOP"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_BodyCharge::Fields() {
     using R = kloC_BodyCharge;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>).Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
 const cls_FieldTable& kloC_BodyCurrent::Fields() {
     using R = kloC_BodyCurrent;
-    static const cls_FieldTable fields = cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>);
+    static const cls_FieldTable fields =
+        cls_Describe<R>(kloC_Load::Fields()).With(ComplexMagnitude<R>).Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 
@@ -324,7 +382,8 @@ const cls_FieldTable& kloC_InertiaRelief::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kloC_Load::Fields())
             .Field<&R::datum>("datum",
-                              "coordinate system of the rigid body directions, none for the global one");
+                              "coordinate system of the rigid body directions, none for the global one")
+            .Example(R"({"region": "PART-1.ALL"})");
     return fields;
 }
 

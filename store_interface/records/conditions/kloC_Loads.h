@@ -165,7 +165,8 @@ class kloC_ConcentratedForce final : public kloC_LoadOf<kloC_ConcentratedForce, 
                                      public kloC_ComplexComponents {
 public:
     static constexpr cls_ClassInfo Class{"kloC_ConcentratedForce",
-                                         "a force at each node of a node set: force", 0x2880047};
+                                         "a force at each node of a node set: force", 0x2880047,
+                                         "PointForce PointLoad"};
 
     dtmC_DatumRef datum;
     bool follower = false;
@@ -176,7 +177,7 @@ public:
 class kloC_Moment final : public kloC_LoadOf<kloC_Moment, kloC_MomentState>, public kloC_ComplexComponents {
 public:
     static constexpr cls_ClassInfo Class{"kloC_Moment", "a moment at each node of a node set: force*length",
-                                         0x2880018};
+                                         0x2880018, "ConcentratedMoment PointMoment"};
 
     dtmC_DatumRef datum;
     bool follower = false;
@@ -190,7 +191,7 @@ public:
     static constexpr cls_ClassInfo Class{"kloC_PEGLoad",
                                          "a load at the reference node of generalized plane strain elements: "
                                          "axial force, moments about axes 1 and 2",
-                                         0x2880022};
+                                         0x2880022, "GeneralizedPlaneStrainLoad"};
 
     static const cls_FieldTable& Fields();
 };
@@ -210,7 +211,7 @@ class kloC_InwardVolAccel final : public kloC_LoadOf<kloC_InwardVolAccel, kloC_S
 public:
     static constexpr cls_ClassInfo Class{
         "kloC_InwardVolAccel", "inward volume acceleration at nodes of an acoustic medium: volume/time^2",
-        0x2880042};
+        0x2880042, "InwardVolumeAcceleration"};
 
     static const cls_FieldTable& Fields();
 };
@@ -238,7 +239,8 @@ class kloC_RotationalBodyForce final
     : public kloC_LoadOf<kloC_RotationalBodyForce, kloC_RotationalBodyForceState> {
 public:
     static constexpr cls_ClassInfo Class{"kloC_RotationalBodyForce",
-                                         "body force of a body that turns about an axis", 0x2880014};
+                                         "body force of a body that turns about an axis", 0x2880014,
+                                         "RotationalBody"};
 
     bool centrifugal = true;
     bool rotaryAcceleration = false;
@@ -328,15 +330,16 @@ const omu_EnumTable& omu_EnumTableOf(kloC_Traction::KindEnm);
 class kloC_SurfaceTraction final
     : public kloC_LoadOf<kloC_SurfaceTraction, kloC_DistributedState, kloC_Traction> {
 public:
-    static constexpr cls_ClassInfo Class{"kloC_SurfaceTraction",
-                                         "a general or shear traction on a surface: stress", 0x2880055};
+    static constexpr cls_ClassInfo Class{
+        "kloC_SurfaceTraction", "a general or shear traction on a surface: stress", 0x2880055, "Traction"};
 };
 
 class kloC_ShellEdgeLoad final
     : public kloC_LoadOf<kloC_ShellEdgeLoad, kloC_DistributedState, kloC_Traction> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kloC_ShellEdgeLoad", "a load along a shell edge: force/length, or moment/length", 0x2880057};
+    static constexpr cls_ClassInfo Class{"kloC_ShellEdgeLoad",
+                                         "a load along a shell edge: force/length, or moment/length",
+                                         0x2880057, "EdgeLoad"};
 };
 
 class kloC_SubmodelStressBased final
@@ -344,13 +347,14 @@ class kloC_SubmodelStressBased final
 public:
     static constexpr cls_ClassInfo Class{
         "kloC_SubmodelStressBased",
-        "surface traction of a submodel from the stresses of a global model; no deck can carry it",
-        0x288005C};
+        "surface traction of a submodel from the stresses of a global model; no deck can carry it", 0x288005C,
+        "SubmodelStress"};
 };
 
 class kloC_ConcentratedHeatFlux final : public kloC_LoadOf<kloC_ConcentratedHeatFlux, kloC_ScalarState> {
 public:
-    static constexpr cls_ClassInfo Class{"kloC_ConcentratedHeatFlux", "heat flux at nodes: power", 0x2880026};
+    static constexpr cls_ClassInfo Class{"kloC_ConcentratedHeatFlux", "heat flux at nodes: power", 0x2880026,
+                                         "PointHeatFlux"};
 
     int dof = 11;
 
@@ -405,8 +409,9 @@ public:
 
 class kloC_HydroFluidFlow final : public kloC_LoadOf<kloC_HydroFluidFlow, kloC_ScalarState> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kloC_HydroFluidFlow", "flow into a fluid cavity at its reference node: mass/time", 0x288002E};
+    static constexpr cls_ClassInfo Class{"kloC_HydroFluidFlow",
+                                         "flow into a fluid cavity at its reference node: mass/time",
+                                         0x288002E, "FluidFlow"};
 };
 
 class kloC_ConcentratedCharge final : public kloC_LoadOf<kloC_ConcentratedCharge, kloC_ScalarState>,

@@ -113,7 +113,7 @@ public:
     static constexpr cls_ClassInfo Class{
         "kpfC_GeneralField",
         "a numbered field variable at a node set: constant, by section points, or from a results file",
-        0x2EC0015};
+        0x2EC0015, "FieldVariable"};
 
 protected:
     /// A number of values counts only for the values that it was given with.
@@ -123,8 +123,9 @@ protected:
 
 class kpfC_Velocity final : public kpfC_FieldOf<kpfC_Velocity> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kpfC_Velocity", "initial velocity of a node set, or its rotation about an axis", 0x2EC0016};
+    static constexpr cls_ClassInfo Class{"kpfC_Velocity",
+                                         "initial velocity of a node set, or its rotation about an axis",
+                                         0x2EC0016, "InitialVelocity"};
 
     double velocity1 = 0.0;
     double velocity2 = 0.0;
@@ -142,7 +143,7 @@ class kpfC_Stress final : public kpfC_FieldOf<kpfC_Stress> {
 public:
     static constexpr cls_ClassInfo Class{
         "kpfC_Stress", "initial stress of an element set: uniform, from a results file, or geostatic",
-        0x2EC001A};
+        0x2EC001A, "InitialStress"};
 
     static constexpr double sigma11Def() { return cls_UnsetDouble; }
     static constexpr double sigma12Def() { return cls_UnsetDouble; }
@@ -172,8 +173,9 @@ public:
 
 class kpfC_Hardening final : public kpfC_FieldOf<kpfC_Hardening> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kpfC_Hardening", "initial plastic strain and backstress of an element set", 0x2EC001F};
+    static constexpr cls_ClassInfo Class{"kpfC_Hardening",
+                                         "initial plastic strain and backstress of an element set", 0x2EC001F,
+                                         "InitialHardening"};
 
     double equivPlasticStrain = 0.0;
     cow_List<double> backstress;

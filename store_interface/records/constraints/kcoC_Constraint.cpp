@@ -18,7 +18,8 @@ const cls_FieldTable& ddb_ModelSectorDefinition::Fields() {
             .Field<&R::startPoint>("startPoint", "first point of the axis (length, single precision)")
             .SinglePrecision()
             .Field<&R::endPoint>("endPoint", "second point of the axis (length, single precision)")
-            .SinglePrecision();
+            .SinglePrecision()
+            .Example(R"({"symmetryType": "CYCLIC", "numberOfSectors": 12, "endPoint": [0, 0, 1]})");
     return fields;
 }
 

@@ -33,21 +33,24 @@ const cls_FieldTable& kcoC_Tie::Fields() {
             .Field<&R::master>("master", "master surface")
             .Field<&R::slave>("slave", "slave surface; may be a node set")
             .Field<&R::adjust>("adjust", "slave nodes are moved onto the master surface")
-            .Field<&R::positionTolerance>("positionTolerance",
-                                          "distance within which slave nodes are tied (length)")
+            .Field<&R::positionTolerance>("positionTolerance", "distance within which slave nodes are tied")
+            .Unit("length")
             .Field<&R::tieRotations>("tieRotations", "rotations are tied too; false writes 'no rotation'")
-            .Field<&R::positionToleranceMethod>("positionToleranceMethod",
-                                                "1 means that positionTolerance is written")
+            .Field<&R::positionToleranceMethod>(
+                "positionToleranceMethod",
+                "whether the solver works out the tolerance or positionTolerance gives it")
             .Meanings(positionToleranceMethodMeanings)
             .Field<&R::constraintRatioMethod>("constraintRatioMethod",
-                                              "1 means that constraintRatio is written")
+                                              "whether the solver's ratio holds or constraintRatio")
             .Meanings(constraintRatioMethodMeanings)
-            .Field<&R::constraintRatio>(
-                "constraintRatio", "where the constraint acts between the two surfaces (fraction, no unit)")
+            .Field<&R::constraintRatio>("constraintRatio",
+                                        "where the constraint acts between the two surfaces, as a fraction")
+            .Unit("no unit")
             .Field<&R::type>("type", "discretization")
             .Meanings(typeMeanings)
             .Field<&R::thickness>("thickness", "shell thickness counts; false writes 'no thickness'")
-            .Field<&R::cyclicSymmetry>("cyclicSymmetry", "this tie joins the two sides of the cyclic sector");
+            .Field<&R::cyclicSymmetry>("cyclicSymmetry", "this tie joins the two sides of the cyclic sector")
+            .Example(R"({"master": "PART-1.TOP", "slave": "PART-2.BOTTOM"})");
     return fields;
 }
 
@@ -59,9 +62,10 @@ const cls_FieldTable& kcoC_Coupling::Fields() {
         cls_Describe<R>(kcoC_Constraint::Fields())
             .Field<&R::surface>("surface", "the coupled surface; may be a node set")
             .Field<&R::refNode>("refNode", "set of the reference node")
-            .Field<&R::influenceRadius>("influenceRadius",
-                                        "distance from the reference node within which nodes are coupled "
-                                        "(length); unset: the whole surface")
+            .Field<&R::influenceRadius>(
+                "influenceRadius",
+                "distance from the reference node within which nodes are coupled; unset: the whole surface")
+            .Unit("length")
             .Field<&R::distributing>("distributing", "true: distributing coupling; false: kinematic coupling")
             .Field<&R::orientation>("orientation", "local system of the degrees of freedom; null: global")
             .Field<&R::u1>("u1", "translation 1 is coupled")
@@ -72,7 +76,8 @@ const cls_FieldTable& kcoC_Coupling::Fields() {
             .Field<&R::ur3>("ur3", "rotation 3 is coupled")
             .Field<&R::weightingMethod>("weightingMethod",
                                         "distributing coupling: how weights fall with distance")
-            .Meanings(weightingMethodMeanings);
+            .Meanings(weightingMethodMeanings)
+            .Example(R"({"surface": "PART-1.TOP", "refNode": "PART-1.CENTRE"})");
     return fields;
 }
 
@@ -88,7 +93,8 @@ const cls_FieldTable& kcoC_RigidBody::Fields() {
             .Field<&R::surface>("surface", "analytical surface; not set: no parameter")
             .Field<&R::refPointAtCenterOfMass>("refPointAtCenterOfMass",
                                                "the reference node is moved to the centre of mass")
-            .Field<&R::isothermal>("isothermal", "the body has one temperature");
+            .Field<&R::isothermal>("isothermal", "the body has one temperature")
+            .Example(R"({"refNode": "PART-1.CENTRE", "elements": "PART-1.ALL"})");
     return fields;
 }
 
@@ -100,10 +106,14 @@ const cls_FieldTable& kcoC_EmbeddedRegion::Fields() {
             .Field<&R::embedded>("embedded", "embedded element set")
             .Field<&R::fractionalTolerance>(
                 "fractionalTolerance",
-                "how far outside the host nodes may lie, as a fraction of the element size (no unit)")
-            .Field<&R::absoluteTolerance>("absoluteTolerance", "the same as a length")
+                "how far outside the host nodes may lie, as a fraction of the element size")
+            .Unit("no unit")
+            .Field<&R::absoluteTolerance>("absoluteTolerance", "how far outside the host nodes may lie")
+            .Unit("length")
             .Field<&R::weightFactorTolerance>("weightFactorTolerance",
-                                              "weight factors below this are set to zero (no unit)");
+                                              "weight factors below this are set to zero")
+            .Unit("no unit")
+            .Example(R"({"host": "CONCRETE-1.ALL", "embedded": "BARS-1.ALL"})");
     return fields;
 }
 
@@ -112,12 +122,14 @@ const cls_FieldTable& kcoC_EquationTerm::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::coefficient>("coefficient", "factor of the degree of freedom")
+            .Unit("no unit")
             .Field<&R::setName>("setName", "name of a node set of the assembly")
             .RefersTo("set")
             .Field<&R::dof>("dof", "degree of freedom, from 1")
             .Field<&R::csys>("csys",
                              "coordinate system in which dof is counted, none for the global one; with it, "
-                             "setName is a node set of the assembly");
+                             "setName is a node set of the assembly")
+            .Example(R"({"coefficient": 1, "setName": "LEFT", "dof": 1})");
     return fields;
 }
 
@@ -125,7 +137,9 @@ const cls_FieldTable& kcoC_Equation::Fields() {
     using R = kcoC_Equation;
     static const cls_FieldTable fields =
         cls_Describe<R>(kcoC_Constraint::Fields())
-            .Field<&R::terms>("terms", "the terms in their order; their number is written ahead of them");
+            .Field<&R::terms>("terms", "the terms in their order; their number is written ahead of them")
+            .Example(
+                R"({"terms": [{"coefficient": 1, "setName": "LEFT", "dof": 1}, {"coefficient": -1, "setName": "RIGHT", "dof": 1}]})");
     return fields;
 }
 
@@ -137,16 +151,20 @@ const cls_FieldTable& kcoC_ShellSolidCoupling::Fields() {
         cls_Describe<R>(kcoC_Constraint::Fields())
             .Field<&R::shellEdge>("shellEdge", "edge surface of the shell")
             .Field<&R::solidFace>("solidFace", "face surface of the solid")
-            .Field<&R::positionToleranceMethod>("positionToleranceMethod",
-                                                "1 means that positionTolerance is written")
+            .Field<&R::positionToleranceMethod>(
+                "positionToleranceMethod",
+                "whether the solver works out the tolerance or positionTolerance gives it")
             .Meanings(positionToleranceMethodMeanings)
-            .Field<&R::positionTolerance>("positionTolerance",
-                                          "distance within which nodes are joined (length)")
-            .Field<&R::influenceDistanceMethod>("influenceDistanceMethod",
-                                                "1 means that influenceDistance is written")
+            .Field<&R::positionTolerance>("positionTolerance", "distance within which nodes are joined")
+            .Unit("length")
+            .Field<&R::influenceDistanceMethod>(
+                "influenceDistanceMethod",
+                "whether the solver works out the distance or influenceDistance gives it")
             .Meanings(influenceDistanceMethodMeanings)
             .Field<&R::influenceDistance>("influenceDistance",
-                                          "distance from the edge within which nodes are joined (length)");
+                                          "distance from the edge within which nodes are joined")
+            .Unit("length")
+            .Example(R"({"shellEdge": "SHELL-1.EDGE", "solidFace": "SOLID-1.FACE"})");
     return fields;
 }
 

@@ -7,7 +7,8 @@ class cls_ClassRegistrar;
 
 class kcoC_Tie : public cls_RecordOf<kcoC_Tie, kcoC_Constraint> {
 public:
-    static constexpr cls_ClassInfo Class{"kcoC_Tie", "two surfaces tied together", 0x2B00002};
+    static constexpr cls_ClassInfo Class{"kcoC_Tie", "two surfaces tied together", 0x2B00002,
+                                         "TieConstraint"};
 
     rgnC_Region master;
     rgnC_Region slave;
@@ -32,13 +33,14 @@ public:
 /// A tie under the class that it answers with.
 class odiK_Tie final : public cls_RecordOf<odiK_Tie, kcoC_Tie> {
 public:
-    static constexpr cls_ClassInfo Class{"odiK_Tie", "the class that every tie answers with", 0x2B00003};
+    static constexpr cls_ClassInfo Class{
+        "odiK_Tie", "a tie by the class that every tie answers with; take Tie", 0x2B00003};
 };
 
 class kcoC_Coupling : public cls_RecordOf<kcoC_Coupling, kcoC_Constraint> {
 public:
     static constexpr cls_ClassInfo Class{"kcoC_Coupling", "the nodes of a surface follow a reference node",
-                                         0x2B00004};
+                                         0x2B00004, "CouplingConstraint"};
 
     static constexpr double influenceRadiusDef() { return cls_UnsetDouble; }
 
@@ -62,13 +64,17 @@ public:
 
 class odiK_Coupling final : public cls_RecordOf<odiK_Coupling, kcoC_Coupling> {
 public:
-    static constexpr cls_ClassInfo Class{"odiK_Coupling", "a coupling under its other class", 0x2B00005};
+    static constexpr cls_ClassInfo Class{
+        "odiK_Coupling",
+        "a coupling by the other class that stores hold, with the same lines in a deck; take Coupling",
+        0x2B00005};
 };
 
 class kcoC_RigidBody final : public cls_RecordOf<kcoC_RigidBody, kcoC_Constraint> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kcoC_RigidBody", "elements, nodes or an analytical surface that move as one rigid body", 0x2B00006};
+        "kcoC_RigidBody", "elements, nodes or an analytical surface that move as one rigid body", 0x2B00006,
+        "Rigid"};
 
     rgnC_Region refNode;
     rgnC_Region elements;
@@ -86,7 +92,7 @@ public:
 class kcoC_EmbeddedRegion final : public cls_RecordOf<kcoC_EmbeddedRegion, kcoC_Constraint> {
 public:
     static constexpr cls_ClassInfo Class{"kcoC_EmbeddedRegion", "elements embedded in host elements",
-                                         0x2B00007};
+                                         0x2B00007, "Embedded"};
 
     static constexpr double fractionalToleranceDef() { return 0.05; }
     static constexpr double weightFactorToleranceDef() { return 1e-06; }
@@ -115,7 +121,8 @@ public:
 class kcoC_Equation final : public cls_RecordOf<kcoC_Equation, kcoC_Constraint> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kcoC_Equation", "linear equation among degrees of freedom: the sum of its terms is zero", 0x2B00008};
+        "kcoC_Equation", "linear equation among degrees of freedom: the sum of its terms is zero", 0x2B00008,
+        "LinearEquation"};
 
     cow_List<kcoC_EquationTerm> terms;
 
@@ -125,7 +132,7 @@ public:
 class kcoC_ShellSolidCoupling final : public cls_RecordOf<kcoC_ShellSolidCoupling, kcoC_Constraint> {
 public:
     static constexpr cls_ClassInfo Class{"kcoC_ShellSolidCoupling", "a shell edge joined to a solid face",
-                                         0x2B00009};
+                                         0x2B00009, "ShellToSolidCoupling"};
 
     rgnC_Region shellEdge;
     rgnC_Region solidFace;

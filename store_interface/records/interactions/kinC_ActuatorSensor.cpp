@@ -6,7 +6,7 @@ const cls_FieldTable& kinC_ActuatorSensor::Fields() {
     using R = kinC_ActuatorSensor;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_Interaction::Fields())
-            .Field<&R::coordinates>("coordinates", "number of coordinates; 0: no ', coordinates='")
+            .Field<&R::coordinates>("coordinates", "number of coordinates; zero writes none")
             .Field<&R::unsymm>("unsymm", "true: ', unsymm'")
             .Field<&R::variables>("variables", "number of solution-dependent variables; always written")
             .Field<&R::elementType>("elementType",
@@ -15,7 +15,9 @@ const cls_FieldTable& kinC_ActuatorSensor::Fields() {
                 "nodeSetText",
                 "the node-set text: the whole data line of '*User Element', written as it stands")
             .Field<&R::initialValues>("initialValues",
-                                      "values of the actuator form of '*Initial Conditions, type=SOLUTION'");
+                                      "values of the actuator form of '*Initial Conditions, type=SOLUTION'")
+            .Unit("as the user's code says")
+            .Example(R"({"elementType": "U1", "nodeSetText": "1, 2", "variables": 1})");
     return fields;
 }
 
@@ -24,7 +26,9 @@ const cls_FieldTable& kinC_ActuatorSensorProp::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionProperty::Fields())
             .Field<&R::realProperties>("realProperties", "real properties, in order")
-            .Field<&R::intProperties>("intProperties", "integer properties, in order");
+            .Unit("as the user's code says")
+            .Field<&R::intProperties>("intProperties", "integer properties, in order")
+            .Example(R"({"realProperties": [1.5]})");
     return fields;
 }
 

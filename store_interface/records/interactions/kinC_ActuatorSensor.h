@@ -29,7 +29,8 @@ public:
 class kinC_ActuatorSensorProp final : public cls_RecordOf<kinC_ActuatorSensorProp, kinC_InteractionProperty> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_ActuatorSensorProp",
-                                         "properties of the control element's user code"};
+                                         "properties of the control element's user code", 0,
+                                         "ActuatorSensorProperty"};
 
     cow_List<double> realProperties;
     cow_List<int> intProperties;

@@ -9,7 +9,8 @@ namespace {
 template <class State, class Controls>
 cls_FieldTable WithControls() {
     return cls_Describe<State>(kinC_ContactPairState::Fields())
-        .template InheritedRefersTo<Controls>("ContactControls");
+        .template InheritedRefersTo<Controls>("ContactControls")
+        .Example(R"({"InteractionProperty": "Friction"})");
 }
 
 } // namespace
@@ -52,11 +53,11 @@ const cls_FieldTable& kinC_ContactPairState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionState::Fields())
             .Field<&R::opDelete>("opDelete", "this state only removes the pair (explicit solver: op=DELETE)")
-            .Field<&R::InteractionProperty>("InteractionProperty",
-                                            "name of the kinC_ContactProperty in force")
+            .Field<&R::InteractionProperty>("InteractionProperty", "the contact property in force")
             .RefersTo<kinC_ContactProperty>("interactionProperty")
             .Field<&R::ContactControls>("ContactControls", "name of contact controls; empty: none")
-            .RefersTo("contactControls");
+            .RefersTo("contactControls")
+            .Example(R"({"InteractionProperty": "Friction"})");
     return fields;
 }
 
@@ -71,16 +72,16 @@ const cls_FieldTable& kinC_SurfaceToSurfaceContact::Fields() {
             .Field<&R::sliding>("sliding", "tracking approach")
             .Meanings(slidingMeanings)
             .Field<&R::initialClearance>("initialClearance",
-                                         "initial clearance (length); the smallest positive normal double "
-                                         "(2.2250738585072014e-308) means "
-                                         "unset too")
-            .Field<&R::halfThreadAngle>(
-                "halfThreadAngle", "bolt clearance, first data value: half thread angle (angle, degrees)")
-            .Field<&R::pitch>("pitch", "bolt clearance, second data value: thread pitch (length)")
-            .Field<&R::majorBoltDiameter>("majorBoltDiameter",
-                                          "bolt clearance: major diameter of the thread (length)")
-            .Field<&R::meanBoltDiameter>("meanBoltDiameter",
-                                         "bolt clearance: mean diameter of the thread (length)")
+                                         "initial clearance; 2.2250738585072014e-308 means unset too")
+            .Unit("length")
+            .Field<&R::halfThreadAngle>("halfThreadAngle", "bolt clearance: half thread angle")
+            .Unit("degrees")
+            .Field<&R::pitch>("pitch", "bolt clearance: thread pitch")
+            .Unit("length")
+            .Field<&R::majorBoltDiameter>("majorBoltDiameter", "bolt clearance: major diameter of the thread")
+            .Unit("length")
+            .Field<&R::meanBoltDiameter>("meanBoltDiameter", "bolt clearance: mean diameter of the thread")
+            .Unit("length")
             .Field<&R::clearanceRegion>(
                 "clearanceRegion",
                 "nodes to which the clearance applies; not set: the set name in the deck is empty")
@@ -95,14 +96,17 @@ const cls_FieldTable& kinC_SurfaceToSurfaceContactStdState::Fields() {
         cls_Describe<R>(kinC_SurfaceToSurfaceContactState::Fields())
             .Field<&R::interferenceType>("interferenceType",
                                          "kind of interference fit, also one that was cleared or never set")
-            .Field<&R::interferenceValue>("interferenceValue",
-                                          "interference (length), for kinds other than 1")
-            .Field<&R::directionType>("directionType", "1: direction holds the shift vector")
-            .Field<&R::direction>("direction", "direction of the relative shift (no unit)")
+            .Field<&R::interferenceValue>("interferenceValue", "interference, of any kind but SHRINK_FIT")
+            .Unit("length")
+            .Field<&R::directionType>("directionType",
+                                      "whether the solver works out the shift or direction gives it")
+            .Field<&R::direction>("direction", "direction of the relative shift")
+            .Unit("no unit")
             .Length(3)
-            .Field<&R::amplitude>("amplitude", "amplitude of the interference, for kind 2; empty: none")
+            .Field<&R::amplitude>("amplitude", "amplitude of the interference, of UNIFORM_FIT; empty: none")
             .RefersTo("amplitude")
-            .InheritedRefersTo<kinC_StdContactControls>("ContactControls");
+            .InheritedRefersTo<kinC_StdContactControls>("ContactControls")
+            .Example(R"({"InteractionProperty": "Friction"})");
     return fields;
 }
 
@@ -114,25 +118,29 @@ const cls_FieldTable& kinC_SurfaceToSurfaceContactStd::Fields() {
         cls_Describe<R>(kinC_SurfaceToSurfaceContact::Fields())
             .Field<&R::adjust>("adjust",
                                "whether and how slave nodes are moved onto the master surface at the start")
-            .Field<&R::adjustTolerance>("adjustTolerance", "adjustment zone (length), used by adjust 2")
-            .Field<&R::adjustRegion>("adjustRegion", "node set to adjust, used by adjust 3")
+            .Field<&R::adjustTolerance>("adjustTolerance", "adjustment zone, of adjust TOLERANCE")
+            .Unit("length")
+            .Field<&R::adjustRegion>("adjustRegion", "node set to adjust, of adjust SET")
             .Field<&R::formulation>("formulation", "contact discretization")
             .Meanings(formulationMeanings)
             .Field<&R::thickness>("thickness",
                                   "shell and membrane thickness counts; false writes 'no thickness'")
-            .Field<&R::smooth>("smooth", "degree of smoothing of the master surface (fraction, no unit)")
+            .Field<&R::smooth>("smooth", "degree of smoothing of the master surface")
+            .Unit("no unit")
             .Field<&R::tied>("tied", "the surfaces are tied for the whole analysis")
             .Field<&R::autoHcrit>("autoHcrit",
                                   "true: the solver chooses the overclosure limit; false writes 'hcrit='")
-            .Field<&R::hcrit>("hcrit",
-                              "allowed penetration of a slave node (length), used when not autoHcrit")
+            .Field<&R::hcrit>("hcrit", "allowed penetration of a slave node, used when not autoHcrit")
+            .Unit("length")
             .Field<&R::limitSlideDistance>("limitSlideDistance", "write 'slide distance=' for finite sliding")
-            .Field<&R::slideDistance>("slideDistance", "largest expected sliding (length)")
+            .Field<&R::slideDistance>("slideDistance", "largest expected sliding")
+            .Unit("length")
             .Field<&R::extensionZone>(
-                "extensionZone",
-                "fraction of the end facet's size by which the master surface is extended (no unit)")
+                "extensionZone", "fraction of the end facet's size by which the master surface is extended")
+            .Unit("no unit")
             .Field<&R::geometricCorrection>("geometricCorrection",
-                                            "name of the geometric surface correction; empty: none");
+                                            "name of the geometric surface correction; empty: none")
+            .Example(R"({"master": "PART-1.TOP", "slave": "PART-2.BOTTOM"})");
     return fields;
 }
 
@@ -143,14 +151,14 @@ const cls_FieldTable& kinC_SurfaceToSurfaceContactXpl::Fields() {
                                                                  {1, "weight is written"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_SurfaceToSurfaceContact::Fields())
-            .Field<&R::mechanicalConstraint>("mechanicalConstraint",
-                                             "how the contact constraint is enforced; any other value prints "
-                                             "nothing behind 'mechanical constraint='")
+            .Field<&R::mechanicalConstraint>("mechanicalConstraint", "how the contact constraint is enforced")
             .Meanings(mechanicalConstraintMeanings)
             .Field<&R::weightingChoice>("weightingChoice", "who sets the balance between the two surfaces")
             .Meanings(weightingChoiceMeanings)
-            .Field<&R::weight>("weight",
-                               "weighting factor between 0 and 1 (no unit), used by weightingChoice 1");
+            .Field<&R::weight>(
+                "weight", "weighting factor between 0 and 1, where weightingChoice says that it is written")
+            .Unit("no unit")
+            .Example(R"({"master": "PART-1.TOP", "slave": "PART-2.BOTTOM"})");
     return fields;
 }
 
@@ -169,10 +177,11 @@ const cls_FieldTable& kinC_SelfContactStd::Fields() {
         cls_Describe<R>(kinC_SelfContact::Fields())
             .Field<&R::formulation>("formulation", "contact discretization")
             .Meanings(formulationMeanings)
-            .Field<&R::thickness>(
-                "thickness",
-                "shell and membrane thickness counts; false writes 'no thickness' (formulation 1 only)")
-            .Field<&R::smooth>("smooth", "degree of smoothing of the surface (fraction, no unit)");
+            .Field<&R::thickness>("thickness", "shell and membrane thickness counts; false writes 'no "
+                                               "thickness', of surface to surface only")
+            .Field<&R::smooth>("smooth", "degree of smoothing of the surface")
+            .Unit("no unit")
+            .Example(R"({"surface": "PART-1.SKIN"})");
     return fields;
 }
 
@@ -181,10 +190,9 @@ const cls_FieldTable& kinC_SelfContactXpl::Fields() {
     static constexpr cls_IntMeaning mechanicalConstraintMeanings[] = {{0, "KINEMATIC"}, {1, "PENALTY"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_SelfContact::Fields())
-            .Field<&R::mechanicalConstraint>("mechanicalConstraint",
-                                             "how the contact constraint is enforced; any other value prints "
-                                             "nothing behind 'mechanical constraint='")
-            .Meanings(mechanicalConstraintMeanings);
+            .Field<&R::mechanicalConstraint>("mechanicalConstraint", "how the contact constraint is enforced")
+            .Meanings(mechanicalConstraintMeanings)
+            .Example(R"({"surface": "PART-1.SKIN"})");
     return fields;
 }
 

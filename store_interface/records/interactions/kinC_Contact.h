@@ -113,7 +113,8 @@ class kinC_SurfaceToSurfaceContactStd final
                                 kinC_SurfaceToSurfaceContact> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_SurfaceToSurfaceContactStd",
-                                         "contact between two surfaces in the implicit solver", 0x2A00014};
+                                         "contact between two surfaces in the implicit solver", 0x2A00014,
+                                         "SurfaceToSurfaceContactStandard StandardContact"};
 
     static constexpr kinC_StdAdjustEnm adjustDef() { return kinC_StdAdjustEnm::NONE; }
     static constexpr double smoothDef() { return 0.2; }
@@ -150,7 +151,8 @@ class kinC_SurfaceToSurfaceContactXpl final
                                 kinC_SurfaceToSurfaceContact> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_SurfaceToSurfaceContactXpl",
-                                         "contact between two surfaces in the explicit solver", 0x2A00016};
+                                         "contact between two surfaces in the explicit solver", 0x2A00016,
+                                         "SurfaceToSurfaceContactExplicit ExplicitContact"};
 
     int mechanicalConstraint = 0;
     int weightingChoice = 0;
@@ -193,8 +195,9 @@ public:
 class kinC_SelfContactStd final
     : public kinC_InteractionOf<kinC_SelfContactStd, kinC_SelfContactStdState, kinC_SelfContact> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kinC_SelfContactStd", "contact of a surface with itself in the implicit solver", 0x2A0001A};
+    static constexpr cls_ClassInfo Class{"kinC_SelfContactStd",
+                                         "contact of a surface with itself in the implicit solver", 0x2A0001A,
+                                         "SelfContactStandard"};
 
     static constexpr double smoothDef() { return 0.2; }
     int formulation = 0;
@@ -215,8 +218,9 @@ public:
 class kinC_SelfContactXpl final
     : public kinC_InteractionOf<kinC_SelfContactXpl, kinC_SelfContactXplState, kinC_SelfContact> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kinC_SelfContactXpl", "contact of a surface with itself in the explicit solver", 0x2A0001C};
+    static constexpr cls_ClassInfo Class{"kinC_SelfContactXpl",
+                                         "contact of a surface with itself in the explicit solver", 0x2A0001C,
+                                         "SelfContactExplicit"};
 
     int mechanicalConstraint = 0;
 

@@ -8,7 +8,7 @@ class cls_ClassRegistrar;
 class kinC_StdContactControls final : public cls_RecordOf<kinC_StdContactControls, kinC_ContactControls> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_StdContactControls", "contact controls of the implicit solver",
-                                         0x2A00051};
+                                         0x2A00051, "StandardContactControls"};
 
     static constexpr double relativePenetrationToleranceDef() { return 0.001; }
     static constexpr int maxchpDef() { return 0; }
@@ -43,7 +43,7 @@ public:
 class kinC_ExpContactControls final : public cls_RecordOf<kinC_ExpContactControls, kinC_ContactControls> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_ExpContactControls", "contact controls of the explicit solver",
-                                         0x2A00052};
+                                         0x2A00052, "ExplicitContactControls"};
 
     static constexpr bool fastLocalTrkDef() { return true; }
     static constexpr double scalePenaltyDef() { return 1.0; }

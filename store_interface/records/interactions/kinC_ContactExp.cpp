@@ -22,7 +22,8 @@ const cls_FieldTable& kinC_SurfacePair::Fields() {
             .Field<&R::first>("first", "first surface; not set: printed as an empty name (all exterior)")
             .Field<&R::second>(
                 "second",
-                "second surface; not set: printed as an empty name; unused by surface property assignments");
+                "second surface; not set: printed as an empty name; unused by surface property assignments")
+            .Example(R"({"first": "PART-1.TOP", "second": "PART-2.BOTTOM"})");
     return fields;
 }
 
@@ -35,8 +36,11 @@ const cls_FieldTable& kinC_SurfThick::Fields() {
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::type>("type", "which thickness")
             .Meanings(typeMeanings)
-            .Field<&R::value>("value", "thickness (length), used when type is neither 0 nor 3")
-            .Field<&R::scale>("scale", "scale factor on the thickness (no unit)");
+            .Field<&R::value>("value", "thickness, where type says that it is a number")
+            .Unit("length")
+            .Field<&R::scale>("scale", "scale factor on the thickness")
+            .Unit("no unit")
+            .Example(R"({"type": "ORIG", "scale": 0.9})");
     return fields;
 }
 
@@ -51,7 +55,8 @@ const cls_FieldTable& kinC_MasterSlave::Fields() {
     using R = kinC_MasterSlave;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::masterSlave>("masterSlave", "the role; reaches the deck as its text");
+            .Field<&R::masterSlave>("masterSlave", "the role; reaches the deck as its text")
+            .Example(R"({"masterSlave": "SLAVE"})");
     return fields;
 }
 
@@ -61,18 +66,21 @@ const cls_FieldTable& kinC_ContactExpState::Fields() {
         cls_Describe<R>(kinC_InteractionState::Fields())
             .Field<&R::wholeModelContact>("wholeModelContact",
                                           "true: the whole exterior of the model is included")
-            .Field<&R::inclusions>("inclusions", "per inclusion pair: true writes the pair")
-            .Field<&R::exclusions>("exclusions", "per exclusion pair: true writes the pair")
+            .Field<&R::inclusions>("inclusions",
+                                   "per inclusion pair: true writes the pair; or the pairs themselves")
+            .Field<&R::exclusions>("exclusions",
+                                   "per exclusion pair: true writes the pair; or the pairs themselves")
             .Field<&R::propertyAssignments>("propertyAssignments",
-                                            "per property assignment: the contact property; an attribute "
-                                            "state other than 0 writes the entry")
+                                            "per property assignment: the contact property; an entry that "
+                                            "was never set is not written; or the pairs with it, in one")
             .RefersTo<kinC_ContactProperty>("interactionProperty")
-            .Field<&R::surfacePropertyAssignments>("surfacePropertyAssignments",
-                                                   "per surface property assignment: the thickness; an "
-                                                   "attribute state other than 0 writes the entry")
-            .Field<&R::formulationAssignments>(
-                "formulationAssignments",
-                "per formulation assignment: the role; an attribute state other than 0 writes the entry");
+            .Field<&R::surfacePropertyAssignments>(
+                "surfacePropertyAssignments", "per surface property assignment: the thickness; an entry that "
+                                              "was never set is not written; or the pairs with it, in one")
+            .Field<&R::formulationAssignments>("formulationAssignments",
+                                               "per formulation assignment: the role; an entry that was "
+                                               "never set is not written; or the pairs with it, in one")
+            .Example(R"({"wholeModelContact": true, "propertyAssignments": [{"property": "Friction"}]})");
     return fields;
 }
 

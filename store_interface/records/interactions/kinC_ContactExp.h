@@ -64,7 +64,7 @@ public:
     static constexpr cls_ClassInfo Class{"kinC_ContactExp",
                                          "general contact: contact among many surfaces at once, by lists of "
                                          "included and excluded pairs and assignments",
-                                         0x2A00033};
+                                         0x2A00033, "GeneralContact"};
 
     cow_List<kinC_SurfacePair> inclusionPairs;
     cow_List<kinC_SurfacePair> exclusionPairs;

@@ -17,7 +17,8 @@ const cls_FieldTable& kinC_TangentialBehavior::Fields() {
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::formulation>("formulation", "friction law")
             .Meanings(formulationMeanings)
-            .Field<&R::directionality>("directionality", "2 means two coefficients per row")
+            .Field<&R::directionality>("directionality",
+                                       "whether a row has one coefficient or, anisotropic, two")
             .Meanings(directionalityMeanings)
             .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column")
             .Field<&R::pressureDependency>("pressureDependency", "the table has a contact pressure column")
@@ -28,23 +29,27 @@ const cls_FieldTable& kinC_TangentialBehavior::Fields() {
             .Meanings(exponentialDecayDefinitionMeanings)
             .Field<&R::table>(
                 "table",
-                "formulation 1 and 4: friction coefficient (two of them for directionality 2), then "
+                "columns: penalty and Lagrange: friction coefficient (two of them where anisotropic), then "
                 "temperature, contact pressure, slip rate as far as flagged, in this order, then field "
-                "variables. Formulation 2, read row by row: static coefficient, kinetic coefficient, decay "
-                "coefficient (time per length); or, for test data, static coefficient, second coefficient, "
-                "its slip rate, kinetic coefficient. Formulation 5: one property per row, first column")
-            .Field<&R::shearStressLimit>("shearStressLimit", "limit of the shear stress (stress)")
+                "variables; exponential decay, read row by row: static coefficient, kinetic coefficient, "
+                "decay coefficient (time/length), or, for test data, static coefficient, second coefficient, "
+                "its slip rate, kinetic coefficient; user: one property per row, first column")
+            .Field<&R::shearStressLimit>("shearStressLimit", "limit of the shear stress")
+            .Unit("stress")
             .Field<&R::maximumElasticSlip>("maximumElasticSlip", "how the allowed elastic slip is given")
             .Meanings(maximumElasticSlipMeanings)
             .Field<&R::slipTolerance>("slipTolerance",
-                                      "elastic slip as a fraction of the contact surface's size (no unit)")
-            .Field<&R::elasticSlip>("elasticSlip", "elastic slip (length)")
-            .Field<&R::elasticSlipStiffness>(
-                "elasticSlipStiffness",
-                "slope of shear traction against elastic slip (stress per length), explicit solver")
+                                      "elastic slip as a fraction of the contact surface's size")
+            .Unit("no unit")
+            .Field<&R::elasticSlip>("elasticSlip", "elastic slip")
+            .Unit("length")
+            .Field<&R::elasticSlipStiffness>("elasticSlipStiffness",
+                                             "slope of shear traction against elastic slip, explicit solver")
+            .Unit("stress/length")
             .Field<&R::nStateDependentVars>("nStateDependentVars",
                                             "number of solution-dependent variables of a user friction")
-            .Field<&R::useProperties>("useProperties", "a user friction has properties, in the table");
+            .Field<&R::useProperties>("useProperties", "a user friction has properties, in the table")
+            .Example(R"({"formulation": "penalty", "table": [[0.2]]})");
     return fields;
 }
 
@@ -62,12 +67,12 @@ const cls_FieldTable& kinC_NormalBehavior::Fields() {
             .Meanings(pressureOverclosureMeanings)
             .Field<&R::allowSeparation>("allowSeparation", "whether surfaces may part again")
             .Meanings(allowSeparationMeanings)
-            .Field<&R::maxStiffness>(
-                "maxStiffness",
-                "limit of the stiffness of exponential contact (stress per length), explicit solver")
-            .Field<&R::contactStiffness>(
-                "contactStiffness",
-                "stiffness (stress per length): penalty or linear contact; 0 means the solver's")
+            .Field<&R::maxStiffness>("maxStiffness",
+                                     "limit of the stiffness of exponential contact, explicit solver")
+            .Unit("stress/length")
+            .Field<&R::contactStiffness>("contactStiffness",
+                                         "stiffness of penalty or linear contact; zero means the solver's")
+            .Unit("stress/length")
             .Field<&R::table>("table",
                               "columns contact pressure (stress), overclosure or clearance (length). "
                               "Exponential: two rows, the first (pressure at zero clearance, 0), the second "
@@ -75,17 +80,23 @@ const cls_FieldTable& kinC_NormalBehavior::Fields() {
             .Field<&R::constraintEnforcementMethod>("constraintEnforcementMethod",
                                                     "how hard contact is enforced")
             .Meanings(constraintEnforcementMethodMeanings)
-            .Field<&R::overclosureFactor>("overclosureFactor",
-                                          "scale factor contact: overclosure as a fraction of the element "
-                                          "size (no unit); written if above 0")
+            .Field<&R::overclosureFactor>(
+                "overclosureFactor",
+                "scale factor contact: overclosure as a fraction of the element size; written if above 0")
+            .Unit("no unit")
             .Field<&R::overclosureMeasure>("overclosureMeasure",
-                                           "scale factor contact: overclosure (length); written if above 0")
+                                           "scale factor contact: overclosure; written if above 0")
+            .Unit("length")
             .Field<&R::contactStiffnessScaleFactor>("contactStiffnessScaleFactor",
-                                                    "factor on the contact stiffness (no unit)")
+                                                    "factor on the contact stiffness")
+            .Unit("no unit")
             .Field<&R::initialStiffnessScaleFactor>("initialStiffnessScaleFactor",
-                                                    "factor on the initial contact stiffness (no unit)")
-            .Field<&R::clearanceAtZeroContactPressure>(
-                "clearanceAtZeroContactPressure", "clearance at which the contact pressure is zero (length)");
+                                                    "factor on the initial contact stiffness")
+            .Unit("no unit")
+            .Field<&R::clearanceAtZeroContactPressure>("clearanceAtZeroContactPressure",
+                                                       "clearance at which the contact pressure is zero")
+            .Unit("length")
+            .Example(R"({"pressureOverclosure": "HARD"})");
     return fields;
 }
 
@@ -95,17 +106,18 @@ const cls_FieldTable& kinC_Damping::Fields() {
         {0, "step: row 1"}, {1, "linear: rows 1 and 2"}, {2, "bilinear: rows 1 to 3"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::definition>("definition",
-                                   "shape of damping against clearance; how many rows of the table count")
+            .Field<&R::definition>(
+                "definition", "shape of damping against clearance, and so how many rows of the table count")
             .Meanings(definitionMeanings)
-            .Field<&R::tangentFraction>(
-                "tangentFraction",
-                "tangential damping as a fraction of the normal one (no unit), explicit solver")
-            .Field<&R::table>(
-                "table", "two columns: damping coefficient or critical damping fraction; clearance (length). "
-                         "Row 1 first column: the damping at zero clearance; definition 1: row 2 second "
-                         "column is the clearance of zero damping; definition 2: row 2 second column is the "
-                         "clearance where damping starts to fall, row 3 second column that of zero damping");
+            .Field<&R::tangentFraction>("tangentFraction",
+                                        "tangential damping as a fraction of the normal one, explicit solver")
+            .Unit("no unit")
+            .Field<&R::table>("table",
+                              "columns: damping coefficient or critical damping fraction, clearance "
+                              "(length); the first row has the damping at zero clearance; linear: the second "
+                              "the clearance of zero damping; bilinear: the second the clearance where "
+                              "damping starts to fall, the third that of zero damping")
+            .Example(R"({"table": [[0.1, 0]]})");
     return fields;
 }
 
@@ -114,8 +126,7 @@ const cls_FieldTable& kinC_ThermalConductance::Fields() {
     static constexpr cls_IntMeaning definitionMeanings[] = {{0, "tabular"}, {1, "user"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::definition>("definition",
-                                   "where the conductance comes from; any other value writes nothing")
+            .Field<&R::definition>("definition", "where the conductance comes from")
             .Meanings(definitionMeanings)
             .Field<&R::clearanceDependency>("clearanceDependency", "the clearance table is used")
             .Field<&R::pressureDependency>("pressureDependency", "the pressure table is used")
@@ -135,7 +146,8 @@ const cls_FieldTable& kinC_ThermalConductance::Fields() {
                                                   "pressure table: number of field variable columns")
             .Field<&R::pressureTable>(
                 "pressureTable", "conductance (power per area and temperature), contact pressure (stress), "
-                                 "temperature if flagged, mass flow rate if flagged, then field variables");
+                                 "temperature if flagged, mass flow rate if flagged, then field variables")
+            .Example(R"({"clearanceDependency": true, "clearanceTable": [[10, 0], [0, 0.1]]})");
     return fields;
 }
 
@@ -143,10 +155,12 @@ const cls_FieldTable& kinC_HeatGeneration::Fields() {
     using R = kinC_HeatGeneration;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::heatFraction>("heatFraction",
-                                     "fraction of the dissipated work that becomes heat (no unit)")
+            .Field<&R::heatFraction>("heatFraction", "fraction of the dissipated work that becomes heat")
+            .Unit("no unit")
             .Field<&R::distributionFraction>("distributionFraction",
-                                             "fraction of the heat that goes to the slave surface (no unit)");
+                                             "fraction of the heat that goes to the slave surface")
+            .Unit("no unit")
+            .Example(R"({"heatFraction": 1, "distributionFraction": 0.5})");
     return fields;
 }
 
@@ -154,11 +168,12 @@ const cls_FieldTable& kinC_Radiation::Fields() {
     using R = kinC_Radiation;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::firstEmissivity>("firstEmissivity",
-                                        "emissivity of the master surface (no unit); written second")
-            .Field<&R::secondEmissivity>("secondEmissivity",
-                                         "emissivity of the slave surface (no unit); written first")
-            .Field<&R::table>("table", "effective view factor (no unit), gap (length)");
+            .Field<&R::firstEmissivity>("firstEmissivity", "emissivity of the master surface; written second")
+            .Unit("no unit")
+            .Field<&R::secondEmissivity>("secondEmissivity", "emissivity of the slave surface; written first")
+            .Unit("no unit")
+            .Field<&R::table>("table", "effective view factor (no unit), gap (length)")
+            .Example(R"({"firstEmissivity": 0.8, "secondEmissivity": 0.8, "table": [[1, 0], [0, 10]]})");
     return fields;
 }
 
@@ -167,10 +182,12 @@ const cls_FieldTable& kinC_GeometricProperties::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::contactArea>(
-                "contactArea",
-                "contact area of a node or out-of-plane thickness (area or length), implicit solver")
+                "contactArea", "contact area of a node or out-of-plane thickness, of the implicit solver")
+            .Unit("length^2 or length")
             .Field<&R::padThickness>("padThickness",
-                                     "thickness of a layer between the surfaces (length), explicit solver");
+                                     "thickness of a layer between the surfaces, explicit solver")
+            .Unit("length")
+            .Example(R"({"contactArea": 1})");
     return fields;
 }
 
@@ -184,7 +201,8 @@ const cls_FieldTable& kinC_ContactProperty::Fields() {
             .Field<&R::thermalConductance>("thermalConductance", "heat conduction across the gap")
             .Field<&R::heatGeneration>("heatGeneration", "share of dissipated work that becomes heat")
             .Field<&R::radiation>("radiation", "radiation across the gap")
-            .Field<&R::geometricProperties>("geometricProperties", "contact area and pad thickness");
+            .Field<&R::geometricProperties>("geometricProperties", "contact area and pad thickness")
+            .Example(R"({"tangentialBehavior": {"formulation": "penalty", "table": [[0.2]]}})");
     return fields;
 }
 

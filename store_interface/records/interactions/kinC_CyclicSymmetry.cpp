@@ -7,7 +7,8 @@ const cls_FieldTable& kinC_CyclicSymmetryState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionState::Fields())
             .Field<&R::cyclicMode>("cyclicMode", "cyclic mode (nodal diameter) that the loads of the step "
-                                                 "excite");
+                                                 "excite")
+            .Example(R"({"cyclicMode": 2})");
     return fields;
 }
 

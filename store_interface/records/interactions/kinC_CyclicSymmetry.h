@@ -27,7 +27,8 @@ class kinC_ElasticFoundation final
     : public kinC_InteractionOf<kinC_ElasticFoundation, kinC_InteractionState> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_ElasticFoundation",
-                                         "elastic support of a surface; no deck carries it", 0x2A00026};
+                                         "elastic support of a surface; no deck carries it", 0x2A00026,
+                                         "Foundation"};
 };
 
 void cls_RegisterCyclicSymmetryRecords(cls_ClassRegistrar& registrar);

@@ -12,14 +12,18 @@ const cls_FieldTable& kinC_FilmConditionState::Fields() {
     using R = kinC_FilmConditionState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionState::Fields())
-            .Field<&R::filmProperty>("filmProperty", "name of a kinC_FilmConditionProp, for definition 1")
+            .Field<&R::filmProperty>("filmProperty",
+                                     "the film condition property, where the definition refers to one")
             .RefersTo<kinC_FilmConditionProp>("interactionProperty")
-            .Field<&R::sinkTemperature>("sinkTemperature", "temperature of the surroundings (temperature)")
+            .Field<&R::sinkTemperature>("sinkTemperature", "temperature of the surroundings")
+            .Unit("temperature")
             .Field<&R::amplitude>("amplitude", "amplitude of the sink temperature; empty: none")
             .RefersTo("amplitude")
-            .Field<&R::filmCoeff>("filmCoeff", "film coefficient (power per area and temperature)")
+            .Field<&R::filmCoeff>("filmCoeff", "film coefficient")
+            .Unit("power/(area*temperature)")
             .Field<&R::filmAmplitude>("filmAmplitude", "amplitude of the film coefficient; empty: none")
-            .RefersTo("amplitude");
+            .RefersTo("amplitude")
+            .Example(R"({"filmCoeff": 0.01, "sinkTemperature": 20})");
     return fields;
 }
 
@@ -30,9 +34,10 @@ const cls_FieldTable& kinC_FilmCondition::Fields() {
                                                             {2, "user subroutine"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_Interaction::Fields())
-            .Field<&R::surface>("surface", "the surface; for kinC_ConcFilmCondition the node region")
+            .Field<&R::surface>("surface", "the surface, or the nodes of a concentrated film condition")
             .Field<&R::definition>("definition", "where the film coefficient comes from")
-            .Meanings(definitionMeanings);
+            .Meanings(definitionMeanings)
+            .Example(R"({"surface": "PART-1.TOP"})");
     return fields;
 }
 
@@ -40,7 +45,9 @@ const cls_FieldTable& kinC_ConcFilmConditionState::Fields() {
     using R = kinC_ConcFilmConditionState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_FilmConditionState::Fields())
-            .Field<&R::nodalArea>("nodalArea", "area that belongs to each node (area)");
+            .Field<&R::nodalArea>("nodalArea", "area that belongs to each node")
+            .Unit("length^2")
+            .Example(R"({"filmCoeff": 0.01, "sinkTemperature": 20, "nodalArea": 25})");
     return fields;
 }
 
@@ -51,7 +58,8 @@ const cls_FieldTable& kinC_ConcFilmCondition::Fields() {
         cls_Describe<R>(kinC_FilmCondition::Fields())
             .Field<&R::regionType>("regionType",
                                    "explicit procedures: whether the nodes move with the material")
-            .Meanings(regionTypeMeanings);
+            .Meanings(regionTypeMeanings)
+            .Example(R"({"surface": "PART-1.SET"})");
     return fields;
 }
 
@@ -59,11 +67,13 @@ const cls_FieldTable& kinC_RadiationToAmbientState::Fields() {
     using R = kinC_RadiationToAmbientState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionState::Fields())
-            .Field<&R::ambientTemperature>("ambientTemperature",
-                                           "temperature of the surroundings (temperature)")
+            .Field<&R::ambientTemperature>("ambientTemperature", "temperature of the surroundings")
+            .Unit("temperature")
             .Field<&R::amplitude>("amplitude", "amplitude of the ambient temperature; empty: none")
             .RefersTo("amplitude")
-            .Field<&R::emissivity>("emissivity", "emissivity (no unit)");
+            .Field<&R::emissivity>("emissivity", "emissivity")
+            .Unit("no unit")
+            .Example(R"({"emissivity": 0.8, "ambientTemperature": 20})");
     return fields;
 }
 
@@ -71,7 +81,8 @@ const cls_FieldTable& kinC_RadiationToAmbient::Fields() {
     using R = kinC_RadiationToAmbient;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_Interaction::Fields())
-            .Field<&R::surface>("surface", "the surface; for kinC_ConcRadiationToAmbient the node region");
+            .Field<&R::surface>("surface", "the surface, or the nodes of a concentrated radiation")
+            .Example(R"({"surface": "PART-1.TOP"})");
     return fields;
 }
 
@@ -79,7 +90,9 @@ const cls_FieldTable& kinC_ConcRadiationToAmbientState::Fields() {
     using R = kinC_ConcRadiationToAmbientState;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_RadiationToAmbientState::Fields())
-            .Field<&R::nodalArea>("nodalArea", "area that belongs to each node (area)");
+            .Field<&R::nodalArea>("nodalArea", "area that belongs to each node")
+            .Unit("length^2")
+            .Example(R"({"emissivity": 0.8, "ambientTemperature": 20, "nodalArea": 25})");
     return fields;
 }
 
@@ -90,7 +103,8 @@ const cls_FieldTable& kinC_ConcRadiationToAmbient::Fields() {
         cls_Describe<R>(kinC_RadiationToAmbient::Fields())
             .Field<&R::regionType>("regionType",
                                    "explicit procedures: whether the nodes move with the material")
-            .Meanings(regionTypeMeanings);
+            .Meanings(regionTypeMeanings)
+            .Example(R"({"surface": "PART-1.SET"})");
     return fields;
 }
 
@@ -99,12 +113,14 @@ const cls_FieldTable& kinC_CavityRadiationState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionState::Fields())
             .Field<&R::blocking>("blocking", "which surfaces can stand between others")
-            .Field<&R::blockingSurfaces>("blockingSurfaces", "the blocking surfaces, for blocking 2")
-            .Field<&R::range>("range",
-                              "largest distance of surfaces that see each other (length); the default, the "
-                              "largest single-precision float, means unset (exact comparison)")
+            .Field<&R::blockingSurfaces>("blockingSurfaces", "the blocking surfaces, with PARTIAL")
+            .Field<&R::range>("range", "largest distance of surfaces that see each other; the default, the "
+                                       "largest number of single precision, means unset")
+            .Unit("length")
             .Field<&R::reflection>("reflection", "reflection counts: YES or NO")
-            .Field<&R::vtol>("vtol", "tolerance of the view factors (no unit); always written");
+            .Field<&R::vtol>("vtol", "tolerance of the view factors; always written")
+            .Unit("no unit")
+            .Example(R"({"vtol": 0.05})");
     return fields;
 }
 
@@ -112,10 +128,11 @@ const cls_FieldTable& kinC_CavityRadiation::Fields() {
     using R = kinC_CavityRadiation;
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_Interaction::Fields())
-            .Field<&R::ambientTemp>(
-                "ambientTemp",
-                "temperature of the surroundings of an open cavity (temperature); unset: closed")
-            .Field<&R::surfaces>("surfaces", "the cavity's surfaces; one line each");
+            .Field<&R::ambientTemp>("ambientTemp",
+                                    "temperature of the surroundings of an open cavity; unset: closed")
+            .Unit("temperature")
+            .Field<&R::surfaces>("surfaces", "the cavity's surfaces; one line each")
+            .Example(R"({"surfaces": ["PART-1.INSIDE"]})");
     return fields;
 }
 
@@ -127,7 +144,8 @@ const cls_FieldTable& kinC_FilmConditionProp::Fields() {
                                               "the table has a temperature column behind the coefficient")
             .Field<&R::dependencies>("dependencies", "number of field variable columns")
             .Field<&R::table>("table", "film coefficient (power per area and temperature), temperature if "
-                                       "temperatureDependency, then one column per field variable");
+                                       "temperatureDependency, then one column per field variable")
+            .Example(R"({"table": [[0.01]]})");
     return fields;
 }
 

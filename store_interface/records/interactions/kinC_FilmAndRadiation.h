@@ -25,8 +25,8 @@ public:
 
 class kinC_FilmCondition : public kinC_InteractionOf<kinC_FilmCondition, kinC_FilmConditionState> {
 public:
-    static constexpr cls_ClassInfo Class{"kinC_FilmCondition",
-                                         "convection between a surface and a surrounding fluid", 0x2A0001F};
+    static constexpr cls_ClassInfo Class{
+        "kinC_FilmCondition", "convection between a surface and a surrounding fluid", 0x2A0001F, "Film"};
 
     rgnC_Region surface;
     int definition = 0;
@@ -48,7 +48,8 @@ public:
 class kinC_ConcFilmCondition final
     : public kinC_InteractionOf<kinC_ConcFilmCondition, kinC_ConcFilmConditionState, kinC_FilmCondition> {
 public:
-    static constexpr cls_ClassInfo Class{"kinC_ConcFilmCondition", "convection at single nodes", 0x2A0006E};
+    static constexpr cls_ClassInfo Class{"kinC_ConcFilmCondition", "convection at single nodes", 0x2A0006E,
+                                         "ConcentratedFilm ConcFilm"};
 
     int regionType = 1;
 
@@ -71,8 +72,8 @@ public:
 class kinC_RadiationToAmbient
     : public kinC_InteractionOf<kinC_RadiationToAmbient, kinC_RadiationToAmbientState> {
 public:
-    static constexpr cls_ClassInfo Class{"kinC_RadiationToAmbient",
-                                         "radiation from a surface to its surroundings", 0x2A00023};
+    static constexpr cls_ClassInfo Class{
+        "kinC_RadiationToAmbient", "radiation from a surface to its surroundings", 0x2A00023, "Radiation"};
 
     rgnC_Region surface;
 
@@ -96,7 +97,8 @@ class kinC_ConcRadiationToAmbient final
                                 kinC_RadiationToAmbient> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_ConcRadiationToAmbient",
-                                         "radiation from single nodes to their surroundings", 0x2A00070};
+                                         "radiation from single nodes to their surroundings", 0x2A00070,
+                                         "ConcentratedRadiation ConcRadiation"};
 
     int regionType = 1;
 
@@ -134,7 +136,8 @@ public:
 
 class kinC_FilmConditionProp final : public cls_RecordOf<kinC_FilmConditionProp, kinC_InteractionProperty> {
 public:
-    static constexpr cls_ClassInfo Class{"kinC_FilmConditionProp", "film coefficient as a table", 0x2A00042};
+    static constexpr cls_ClassInfo Class{"kinC_FilmConditionProp", "film coefficient as a table", 0x2A00042,
+                                         "FilmConditionProperty FilmProperty"};
 
     bool temperatureDependency = false;
     int dependencies = 0;

@@ -4,10 +4,10 @@
 
 const cls_FieldTable& kinC_AcousticImpedanceState::Fields() {
     using R = kinC_AcousticImpedanceState;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kinC_InteractionState::Fields())
-            .Field<&R::property>("property", "name of a kinC_AcousticImpedanceProp")
-            .RefersTo<kinC_AcousticImpedanceProp>("interactionProperty");
+    static const cls_FieldTable fields = cls_Describe<R>(kinC_InteractionState::Fields())
+                                             .Field<&R::property>("property", "the impedance property")
+                                             .RefersTo<kinC_AcousticImpedanceProp>("interactionProperty")
+                                             .Example(R"({"property": "Absorber"})");
     return fields;
 }
 
@@ -23,18 +23,19 @@ const cls_FieldTable& kinC_AcousticImpedance::Fields() {
             .Field<&R::surface>("surface", "the surface")
             .Field<&R::nonreflecting>("nonreflecting", "what the boundary is")
             .Meanings(nonreflectingMeanings)
-            .Field<&R::boundaryType>("boundaryType",
-                                     "shape of the nonreflecting boundary; from 6 on the name is absent")
+            .Field<&R::boundaryType>("boundaryType", "shape of the nonreflecting boundary")
             .Meanings(boundaryTypeMeanings)
-            .Field<&R::radius>("radius", "radius (length), boundaryType 2 and 3")
-            .Field<&R::semiAxisA>(
-                "semiAxisA",
-                "first figure of the ellipse or spheroid: semimajor axis (length), boundaryType 4 and 5")
-            .Field<&R::semiAxisB>("semiAxisB",
-                                  "second figure of the ellipse or spheroid, as stored (a length "
-                                  "or a ratio), boundaryType 4 and 5")
-            .Field<&R::center>("center", "centre (length), boundaryType 4 and 5")
-            .Field<&R::axis>("axis", "the major axis, boundaryType 4 and 5; its length counts");
+            .Field<&R::radius>("radius", "radius of a circular or spherical boundary")
+            .Unit("length")
+            .Field<&R::semiAxisA>("semiAxisA", "first figure of an ellipse or spheroid: semimajor axis")
+            .Unit("length")
+            .Field<&R::semiAxisB>("semiAxisB", "second figure of an ellipse or spheroid, as stored")
+            .Unit("length or no unit")
+            .Field<&R::center>("center", "centre of an elliptical or spheroidal boundary")
+            .Unit("length")
+            .Field<&R::axis>("axis",
+                             "the major axis of an elliptical or spheroidal boundary; its length counts")
+            .Example(R"({"surface": "PART-1.WALL"})");
     return fields;
 }
 
@@ -49,11 +50,14 @@ const cls_FieldTable& kinC_IncidentWave::Fields() {
             .Field<&R::surface>("surface", "the surface that the wave meets")
             .Field<&R::waveType>("waveType", "what the amplitude gives")
             .Meanings(waveTypeMeanings)
-            .Field<&R::property>("property", "name of a kinC_IncidentWaveProperty")
+            .Field<&R::property>("property", "the property of the wave")
             .RefersTo<kinC_IncidentWaveProperty>("interactionProperty")
-            .Field<&R::amplitude>("amplitude", "amplitude of the wave, for waveType 0 and 1")
+            .Field<&R::amplitude>("amplitude", "amplitude of the wave, of pressure or acceleration")
             .RefersTo("amplitude")
-            .Field<&R::magnitude>("magnitude", "reference magnitude (pressure or acceleration)");
+            .Field<&R::magnitude>("magnitude", "reference magnitude")
+            .Unit("stress or length/time^2")
+            .Example(
+                R"({"surface": "PART-1.HULL", "source": "PART-1.SOURCE", "standoff": "PART-1.STANDOFF", "property": "Wave", "amplitude": "Pulse"})");
     return fields;
 }
 
@@ -66,7 +70,8 @@ const cls_FieldTable& kinC_AcousticImpedanceProp::Fields() {
             .Field<&R::dependencies>("dependencies",
                                      "number of field variable columns; the deck doesn't tell it")
             .Field<&R::table>("table", "real part, imaginary part, frequency (cycles per time) if given, "
-                                       "then field variables; printed as it stands");
+                                       "then field variables; printed as it stands")
+            .Example(R"({"table": [[1, 0, 100]]})");
     return fields;
 }
 
@@ -77,60 +82,68 @@ const cls_FieldTable& kinC_IncidentWaveProperty::Fields() {
         {0, "nothing"}, {1, "the charge block"}, {2, "the three decay constants"}};
     static const cls_FieldTable fields =
         cls_Describe<R>(kinC_InteractionProperty::Fields())
-            .Field<&R::speed>("speed", "speed of sound in the fluid (length per time)")
-            .Field<&R::density>("density", "density of the fluid (mass per volume)")
+            .Field<&R::speed>("speed", "speed of sound in the fluid")
+            .Unit("length/time")
+            .Field<&R::density>("density", "density of the fluid")
+            .Unit("mass/volume")
             .Field<&R::shape>("shape", "shape of the wave front")
             .Meanings(shapeMeanings)
             .Field<&R::bubbleModel>("bubbleModel", "what follows the two fluid figures")
             .Meanings(bubbleModelMeanings)
-            .Field<&R::decayA>("decayA",
-                               "first of the three further numbers (bubbleModel 2): decay constant (no unit)")
-            .Field<&R::decayB>("decayB", "second of the three further numbers: decay constant (no unit)")
-            .Field<&R::decayC>("decayC", "third of the three further numbers: decay constant (no unit)")
+            .Field<&R::decayA>("decayA", "first of the three decay constants")
+            .Unit("no unit")
+            .Field<&R::decayB>("decayB", "second of the three decay constants")
+            .Unit("no unit")
+            .Field<&R::decayC>("decayC", "third of the three decay constants")
+            .Unit("no unit")
             .Field<&R::pressureConstant>("pressureConstant",
-                                         "charge number 1, line 1: similitude constant of the peak pressure")
-            .Field<&R::timeConstant>("timeConstant",
-                                     "charge number 2, line 1: similitude constant of the decay time")
-            .Field<&R::pressureExponent>(
-                "pressureExponent",
-                "charge number 3, line 1: similitude exponent of the peak pressure (no unit)")
-            .Field<&R::timeExponent>(
-                "timeExponent", "charge number 4, line 1: similitude exponent of the decay time (no unit)")
-            .Field<&R::adiabaticConstant>(
-                "adiabaticConstant", "charge number 5, line 1: adiabatic constant of the charge (pressure)")
-            .Field<&R::specificHeatRatio>(
-                "specificHeatRatio",
-                "charge number 6, line 1: ratio of specific heats of the explosion gas (no unit)")
-            .Field<&R::chargeDensity>("chargeDensity",
-                                      "charge number 7, line 1: density of the charge (mass per volume)")
-            .Field<&R::chargeMass>("chargeMass", "charge number 8, line 1: mass of the charge (mass)")
-            .Field<&R::fluidDensity>("fluidDensity",
-                                     "charge number 9, line 2: density of the fluid (mass per volume)")
-            .Field<&R::fluidSoundSpeed>(
-                "fluidSoundSpeed", "charge number 10, line 2: speed of sound in the fluid (length per time)")
-            .Field<&R::gravity>("gravity",
-                                "charge number 11, line 2: acceleration of gravity (length per time squared)")
-            .Field<&R::atmosphericPressure>("atmosphericPressure",
-                                            "charge number 12, line 2: atmospheric pressure (stress)")
-            .Field<&R::waveEffects>("waveEffects", "charge number 13, line 2, fifth field: the flag; waves "
-                                                   "in fluid and gas count; '1.0, ' or '0.0, '")
-            .Field<&R::dragCoefficient>("dragCoefficient",
-                                        "charge number 14, line 2: flow drag coefficient (no unit)")
-            .Field<&R::dragExponent>("dragExponent", "charge number 15, line 2: flow drag exponent (no unit)")
-            .Field<&R::maximumTime>("maximumTime",
-                                    "charge number 16, line 3: largest time of the bubble simulation (time)")
-            .Field<&R::maximumSteps>(
-                "maximumSteps",
-                "charge number 17, line 3, second field: the integer; largest number of its steps")
-            .Field<&R::relativeStepControl>("relativeStepControl",
-                                            "charge number 18, line 3: relative error tolerance (no unit)")
-            .Field<&R::absoluteStepControl>("absoluteStepControl",
-                                            "charge number 19, line 3: absolute error tolerance")
-            .Field<&R::stepControlExponent>("stepControlExponent",
-                                            "charge number 20, line 3: error control exponent (no unit)")
-            .Field<&R::initialDepth>("initialDepth",
-                                     "charge number 21, line 4: depth of the charge (length); the keyword's "
-                                     "setDepthNormal replaces it");
+                                         "of the charge: similitude constant of the peak pressure")
+            .Unit("stress*(length/mass^(1/3))^(1+A)")
+            .Field<&R::timeConstant>("timeConstant", "of the charge: similitude constant of the decay time")
+            .Unit("time/mass^(1/3)")
+            .Field<&R::pressureExponent>("pressureExponent",
+                                         "of the charge: similitude exponent of the peak pressure")
+            .Unit("no unit")
+            .Field<&R::timeExponent>("timeExponent", "of the charge: similitude exponent of the decay time")
+            .Unit("no unit")
+            .Field<&R::adiabaticConstant>("adiabaticConstant",
+                                          "of the charge: adiabatic constant of the charge")
+            .Unit("stress")
+            .Field<&R::specificHeatRatio>("specificHeatRatio",
+                                          "of the charge: ratio of specific heats of the explosion gas")
+            .Unit("no unit")
+            .Field<&R::chargeDensity>("chargeDensity", "of the charge: density of the charge")
+            .Unit("mass/volume")
+            .Field<&R::chargeMass>("chargeMass", "of the charge: mass of the charge")
+            .Unit("mass")
+            .Field<&R::fluidDensity>("fluidDensity", "of the charge: density of the fluid")
+            .Unit("mass/volume")
+            .Field<&R::fluidSoundSpeed>("fluidSoundSpeed", "of the charge: speed of sound in the fluid")
+            .Unit("length/time")
+            .Field<&R::gravity>("gravity", "of the charge: acceleration of gravity")
+            .Unit("length/time^2")
+            .Field<&R::atmosphericPressure>("atmosphericPressure", "of the charge: atmospheric pressure")
+            .Unit("stress")
+            .Field<&R::waveEffects>("waveEffects", "of the charge: waves in fluid and gas count")
+            .Field<&R::dragCoefficient>("dragCoefficient", "of the charge: flow drag coefficient")
+            .Unit("no unit")
+            .Field<&R::dragExponent>("dragExponent", "of the charge: flow drag exponent")
+            .Unit("no unit")
+            .Field<&R::maximumTime>("maximumTime", "of the charge: largest time of the bubble simulation")
+            .Unit("time")
+            .Field<&R::maximumSteps>("maximumSteps",
+                                     "of the charge: largest number of steps of the bubble simulation")
+            .Field<&R::relativeStepControl>("relativeStepControl", "of the charge: relative error tolerance")
+            .Unit("no unit")
+            .Field<&R::absoluteStepControl>("absoluteStepControl", "of the charge: absolute error tolerance")
+            .Unit("unit of the solution")
+            .Field<&R::stepControlExponent>("stepControlExponent", "of the charge: error control exponent")
+            .Unit("no unit")
+            .Field<&R::initialDepth>(
+                "initialDepth",
+                "of the charge: depth of the charge; the keyword's setDepthNormal replaces it")
+            .Unit("length")
+            .Example(R"({"speed": 1.5e6, "density": 1e-9})");
     return fields;
 }
 

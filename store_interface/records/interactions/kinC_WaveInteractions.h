@@ -19,8 +19,9 @@ public:
 class kinC_AcousticImpedance final
     : public kinC_InteractionOf<kinC_AcousticImpedance, kinC_AcousticImpedanceState> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kinC_AcousticImpedance", "impedance or nonreflecting boundary on an acoustic surface", 0x2A0002A};
+    static constexpr cls_ClassInfo Class{"kinC_AcousticImpedance",
+                                         "impedance or nonreflecting boundary on an acoustic surface",
+                                         0x2A0002A, "Impedance"};
 
     rgnC_Region surface;
     int nonreflecting = 0;
@@ -54,7 +55,8 @@ class kinC_AcousticImpedanceProp final
     : public cls_RecordOf<kinC_AcousticImpedanceProp, kinC_InteractionProperty> {
 public:
     static constexpr cls_ClassInfo Class{"kinC_AcousticImpedanceProp",
-                                         "acoustic impedance or admittance as a table", 0x2A00043};
+                                         "acoustic impedance or admittance as a table", 0x2A00043,
+                                         "AcousticImpedanceProperty"};
 
     bool admittance = false;
     int dependencies = 0;
@@ -69,7 +71,7 @@ public:
     static constexpr cls_ClassInfo Class{
         "kinC_IncidentWaveProperty",
         "how an incident wave travels, with the charge data of an underwater explosion; no deck carries it",
-        0x2A00044};
+        0x2A00044, "IncidentWaveProp"};
 
     double speed = 0.0;
     double density = 0.0;

@@ -16,7 +16,8 @@ const cls_FieldTable& kmaC_FailureRatios::Fields() {
             .With(kmaC_DependentTable(
                 "columns: ratio of biaxial to uniaxial compressive strength, ratio of uniaxial tensile to "
                 "compressive strength, ratio of plastic strains at biaxial and uniaxial ultimate stress, "
-                "ratio of tensile cracking stresses in plane stress"));
+                "ratio of tensile cracking stresses in plane stress"))
+            .Example(R"({"table": [[1.16, 0.09, 1.28, 0.33]]})");
     return fields;
 }
 
@@ -25,7 +26,8 @@ const cls_FieldTable& kmaC_ShearRetention::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: factor for closed cracks, strain at which open cracks have no shear stiffness"));
+                "columns: factor for closed cracks, strain at which open cracks have no shear stiffness"))
+            .Example(R"({"table": [[0.5, 0.001]]})");
     return fields;
 }
 
@@ -39,10 +41,11 @@ const cls_FieldTable& kmaC_TensionStiffening::Fields() {
     using R = kmaC_TensionStiffening;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "how the post-cracking behaviour is given; written when not 1")
+            .Field<&R::type>("type", "how the post-cracking behaviour is given; STRAIN is not written")
             .With(kmaC_DependentTable(
-                "columns: type 1: fraction of the cracking stress that remains, strain beyond cracking; type "
-                "0: displacement at which no stress remains (length)"));
+                "columns: STRAIN: fraction of the cracking stress that remains, strain beyond cracking; "
+                "DISPLACEMENT: displacement at which no stress remains (length)"))
+            .Example(R"({"table": [[1, 0], [0, 0.001]]})");
     return fields;
 }
 
@@ -54,7 +57,9 @@ const cls_FieldTable& kmaC_Concrete::Fields() {
                 "columns: compressive stress (stress, absolute value), plastic strain (absolute value)"))
             .Field<&R::failureRatios>("failureRatios", "shape of the failure surface")
             .Field<&R::shearRetention>("shearRetention", "shear of cracked concrete")
-            .Field<&R::tensionStiffening>("tensionStiffening", "post-cracking behaviour");
+            .Field<&R::tensionStiffening>("tensionStiffening", "post-cracking behaviour")
+            .Example(
+                R"({"table": [[20, 0], [35, 0.0015]], "tensionStiffening": {"table": [[1, 0], [0, 0.001]]}})");
     return fields;
 }
 
@@ -66,7 +71,8 @@ const cls_FieldTable& kmaC_ConcreteCompressionHardening::Fields() {
                 "rateGiven", "true: the table has a strain rate column (1/time) behind its two data columns. "
                              "False with temperatureDependency: the deck gets a blank rate column")
             .With(kmaC_DependentTable(
-                "columns: yield stress (stress), inelastic strain, inelastic strain rate if rateGiven"));
+                "columns: yield stress (stress), inelastic strain, inelastic strain rate if rateGiven"))
+            .Example(R"({"table": [[20, 0], [38, 0.001], [5, 0.01]]})");
     return fields;
 }
 
@@ -79,13 +85,15 @@ const cls_FieldTable& kmaC_ConcreteTensionStiffening::Fields() {
     using R = kmaC_ConcreteTensionStiffening;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "how the post-cracking behaviour is given; written when not 0")
+            .Field<&R::type>("type", "how the post-cracking behaviour is given; STRAIN is not written")
             .Field<&R::rateGiven>(
                 "rateGiven", "true: the table has a strain rate column (1/time) behind its two data columns. "
                              "False with temperatureDependency: the deck gets a blank rate column")
-            .With(kmaC_DependentTable("columns: type 0: remaining stress (stress), cracking strain; type 1: "
-                                      "remaining stress, cracking displacement (length); type 2: failure "
-                                      "stress, fracture energy (energy/area); then the rate if rateGiven"));
+            .With(kmaC_DependentTable(
+                "columns: STRAIN: remaining stress (stress), cracking strain; DISPLACEMENT: remaining "
+                "stress, cracking displacement (length); GFI: failure stress, fracture energy (energy/area); "
+                "then the rate if rateGiven"))
+            .Example(R"({"table": [[3, 0], [0.1, 0.002]]})");
     return fields;
 }
 
@@ -93,10 +101,12 @@ const cls_FieldTable& kmaC_ConcreteCompressionDamage::Fields() {
     using R = kmaC_ConcreteCompressionDamage;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::tensionRecovery>(
-                "tensionRecovery",
-                "stiffness recovered when the load turns to tension, factor 0 to 1; written when not 0.0")
-            .With(kmaC_DependentTable("columns: damage variable (0 to 1), inelastic strain"));
+            .Field<&R::tensionRecovery>("tensionRecovery",
+                                        "part of the stiffness that is recovered when the load turns to "
+                                        "tension, from 0 to 1; written when not 0.0")
+            .Unit("no unit")
+            .With(kmaC_DependentTable("columns: damage variable (0 to 1), inelastic strain"))
+            .Example(R"({"table": [[0, 0], [0.8, 0.01]]})");
     return fields;
 }
 
@@ -110,12 +120,14 @@ const cls_FieldTable& kmaC_ConcreteTensionDamage::Fields() {
     using R = kmaC_ConcreteTensionDamage;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "what the second column is; written when not 0")
-            .Field<&R::compressionRecovery>(
-                "compressionRecovery",
-                "stiffness recovered when the load turns to compression, factor 0 to 1; written when not 1.0")
-            .With(kmaC_DependentTable("columns: damage variable (0 to 1), cracking strain (type 0) or "
-                                      "cracking displacement (type 1, length)"));
+            .Field<&R::type>("type", "what the second column is; STRAIN is not written")
+            .Field<&R::compressionRecovery>("compressionRecovery",
+                                            "part of the stiffness that is recovered when the load turns to "
+                                            "compression, from 0 to 1; written when not 1.0")
+            .Unit("no unit")
+            .With(kmaC_DependentTable("columns: damage variable (0 to 1), cracking strain (STRAIN) or "
+                                      "cracking displacement (DISPLACEMENT, length)"))
+            .Example(R"({"table": [[0, 0], [0.9, 0.002]]})");
     return fields;
 }
 
@@ -131,7 +143,9 @@ const cls_FieldTable& kmaC_ConcreteDamagedPlasticity::Fields() {
             .Field<&R::concreteTensionStiffening>("concreteTensionStiffening",
                                                   "post-cracking behaviour in tension")
             .Field<&R::concreteCompressionDamage>("concreteCompressionDamage", "damage in compression")
-            .Field<&R::concreteTensionDamage>("concreteTensionDamage", "damage in tension");
+            .Field<&R::concreteTensionDamage>("concreteTensionDamage", "damage in tension")
+            .Example(
+                R"({"table": [[36, 0.1, 1.16, 0.667, 0]], "concreteCompressionHardening": {"table": [[20, 0], [38, 0.001]]}, "concreteTensionStiffening": {"table": [[3, 0], [0.1, 0.002]]}})");
     return fields;
 }
 
@@ -146,10 +160,11 @@ const cls_FieldTable& kmaC_BrittleShear::Fields() {
     using R = kmaC_BrittleShear;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "form of the post-cracking shear: 0 nothing is written, 1 "
-                                     "'type=POWERLAW'; any other number writes the separator ', ' alone")
-            .With(kmaC_DependentTable("columns: type 0: shear retention factor, crack opening strain; type "
-                                      "1: crack opening strain at which shear stiffness is lost, exponent"));
+            .Field<&R::type>("type", "form of the post-cracking shear; RETENTION_FACTOR is not written")
+            .With(kmaC_DependentTable(
+                "columns: RETENTION_FACTOR: shear retention factor, crack opening strain; POWER_LAW: crack "
+                "opening strain at which shear stiffness is lost, exponent"))
+            .Example(R"({"table": [[1, 0], [0, 0.01]]})");
     return fields;
 }
 
@@ -162,11 +177,12 @@ const cls_FieldTable& kmaC_BrittleCracking::Fields() {
     using R = kmaC_BrittleCracking;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "how the post-cracking behaviour is given; written when not 0")
-            .With(kmaC_DependentTable("columns: type 0: stress after cracking (stress), cracking strain; "
-                                      "type 1: stress after cracking, cracking displacement (length); type "
-                                      "2: failure stress, fracture energy (energy/area)"))
-            .Field<&R::brittleShear>("brittleShear", "shear of cracked material");
+            .Field<&R::type>("type", "how the post-cracking behaviour is given; STRAIN is not written")
+            .With(kmaC_DependentTable("columns: STRAIN: stress after cracking (stress), cracking strain; "
+                                      "DISPLACEMENT: stress after cracking, cracking displacement (length); "
+                                      "GFI: failure stress, fracture energy (energy/area)"))
+            .Field<&R::brittleShear>("brittleShear", "shear of cracked material")
+            .Example(R"({"table": [[3, 0], [0, 0.001]], "brittleShear": {"table": [[1, 0], [0, 0.01]]}})");
     return fields;
 }
 

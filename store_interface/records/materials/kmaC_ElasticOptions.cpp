@@ -7,7 +7,8 @@ const cls_FieldTable& kmaC_FailStrain::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable("columns: tensile and compressive strain limit in direction 1, the "
-                                      "same in direction 2, shear strain limit"));
+                                      "same in direction 2, shear strain limit"))
+            .Example(R"({"table": [[0.01, 0.008, 0.006, 0.01, 0.02]]})");
     return fields;
 }
 
@@ -17,7 +18,8 @@ const cls_FieldTable& kmaC_FailStress::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
                 "columns: tensile and compressive stress limit in direction 1, the same in direction 2, "
-                "shear strength (stress), cross product term, biaxial stress limit (stress)"));
+                "shear strength (stress), cross product term, biaxial stress limit (stress)"))
+            .Example(R"({"table": [[1500, 1200, 50, 200, 70, 0, 0]]})");
     return fields;
 }
 
@@ -38,7 +40,7 @@ const cls_FieldTable& kmaC_Elastic::Fields() {
     using R = kmaC_Elastic;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "form of the constants; written when not 0")
+            .Field<&R::type>("type", "form of the constants; ISOTROPIC is not written")
             .Field<&R::noCompression>("noCompression",
                                       "true: no compressive stress, '*No Compression' follows")
             .Field<&R::noTension>("noTension", "true: no tensile stress, '*No Tension' follows")
@@ -48,14 +50,15 @@ const cls_FieldTable& kmaC_Elastic::Fields() {
                                        "TERM'), false: instantaneous; ignored without viscoelastic")
             .Field<&R::table>(
                 "table",
-                "columns: type 0: Young's modulus (stress), Poisson's ratio; type 1: D1111, D1122, D2222, "
-                "D1133, D2233, D3333, D1212, D1313, D2323 (stress); type 2: the 21 stiffnesses D1111, D1122, "
-                "D2222, D1133, D2233, D3333, D1112, D2212, D3312, D1212, D1113, D2213, D3313, D1213, D1313, "
-                "D1123, D2223, D3323, D1223, D1323, D2323; type 3: E1, E2, E3, nu12, nu13, nu23, G12, G13, "
-                "G23; type 4: E1, E2, nu12, G12, G13, G23; type 5: normal and two shear stiffnesses; type 6: "
-                "Knn, Kss, Ktt, Kns, Knt, Kst; type 7: shear modulus")
+                "columns: ISOTROPIC: Young's modulus (stress), Poisson's ratio; ORTHOTROPIC: D1111, D1122, "
+                "D2222, D1133, D2233, D3333, D1212, D1313, D2323 (stress); ANISOTROPIC: the 21 stiffnesses "
+                "D1111, D1122, D2222, D1133, D2233, D3333, D1112, D2212, D3312, D1212, D1113, D2213, D3313, "
+                "D1213, D1313, D1123, D2223, D3323, D1223, D1323, D2323; ENGINEERING_CONSTANTS: E1, E2, E3, "
+                "nu12, nu13, nu23, G12, G13, G23; LAMINA: E1, E2, nu12, G12, G13, G23; TRACTION: normal and "
+                "two shear stiffnesses; COUPLED_TRACTION: Knn, Kss, Ktt, Kns, Knt, Kst; SHEAR: shear modulus")
             .Field<&R::failStrain>("failStrain", "strain limits")
-            .Field<&R::failStress>("failStress", "stress limits");
+            .Field<&R::failStress>("failStress", "stress limits")
+            .Example(R"({"table": [[210000, 0.3]]})");
     return fields;
 }
 
@@ -65,7 +68,8 @@ const cls_FieldTable& kmaC_Hypoelastic::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::user>("user", "true: moduli come from a user subroutine, the word 'user' is written")
             .Field<&R::table>("table", "columns: Young's modulus (stress), Poisson's ratio, then the three "
-                                       "strain invariants; empty with user");
+                                       "strain invariants; empty with user")
+            .Example(R"({"table": [[200, 0.4, 0, 0, 0]]})");
     return fields;
 }
 
@@ -79,9 +83,10 @@ const cls_FieldTable& kmaC_PorousElastic::Fields() {
     using R = kmaC_PorousElastic;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::shear>("shear", "what gives the shear behaviour; written when not 1")
+            .Field<&R::shear>("shear", "what gives the shear behaviour; POISSON is not written")
             .With(kmaC_DependentTable("columns: logarithmic bulk modulus, shear modulus (shear 0, stress) or "
-                                      "Poisson's ratio (shear 1), elastic tensile limit (stress)"));
+                                      "Poisson's ratio (shear 1), elastic tensile limit (stress)"))
+            .Example(R"({"table": [[0.05, 0.3, 0.01]]})");
     return fields;
 }
 

@@ -16,15 +16,16 @@ const cls_FieldTable& kmaC_AcousticMedium::Fields() {
                 "volumetricDragDependencies",
                 "number of field variables of volumetricDragTable; written when positive")
             .Field<&R::volumetricDragTable>(
-                "volumetricDragTable",
-                "columns: volumetric drag (mass/volume/time), frequency (cycles/time)");
+                "volumetricDragTable", "columns: volumetric drag (mass/volume/time), frequency (cycles/time)")
+            .Example(R"({"table": [[2140]]})");
     return fields;
 }
 
 const cls_FieldTable& kmaC_AcousticBulkModulus::Fields() {
     using R = kmaC_AcousticBulkModulus;
     static const cls_FieldTable fields = cls_Describe<R>(kmaC_MaterialOption::Fields())
-                                             .With(kmaC_DependentTable("columns: bulk modulus (stress)"));
+                                             .With(kmaC_DependentTable("columns: bulk modulus (stress)"))
+                                             .Example(R"({"table": [[2140]]})");
     return fields;
 }
 
@@ -32,8 +33,8 @@ const cls_FieldTable& kmaC_AcousticVolumetricDrag::Fields() {
     using R = kmaC_AcousticVolumetricDrag;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(
-                kmaC_DependentTable("columns: volumetric drag (mass/volume/time), frequency (cycles/time)"));
+            .With(kmaC_DependentTable("columns: volumetric drag (mass/volume/time), frequency (cycles/time)"))
+            .Example(R"({"table": [[1e-9, 0]]})");
     return fields;
 }
 
@@ -42,14 +43,18 @@ const cls_FieldTable& kmaC_FluidDensity::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::temperature>("temperature", "reference temperature; written when not 0.0")
-            .Field<&R::pressure>("pressure", "reference pressure (stress); written when not 0.0");
+            .Unit("temperature")
+            .Field<&R::pressure>("pressure", "reference pressure; written when not 0.0")
+            .Unit("stress")
+            .Example(R"({"temperature": 20})");
     return fields;
 }
 
 const cls_FieldTable& kmaC_FluidBulkModulus::Fields() {
     using R = kmaC_FluidBulkModulus;
     static const cls_FieldTable fields = cls_Describe<R>(kmaC_MaterialOption::Fields())
-                                             .With(kmaC_DependentTable("columns: bulk modulus (stress)"));
+                                             .With(kmaC_DependentTable("columns: bulk modulus (stress)"))
+                                             .Example(R"({"table": [[2000]]})");
     return fields;
 }
 
@@ -58,7 +63,9 @@ const cls_FieldTable& kmaC_FluidExpansion::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::zero>("zero", "reference temperature; written when not 0.0")
-            .With(kmaC_DependentTable("columns: expansion coefficient (1/temperature)"));
+            .Unit("temperature")
+            .With(kmaC_DependentTable("columns: expansion coefficient (1/temperature)"))
+            .Example(R"({"table": [[2e-4]]})");
     return fields;
 }
 
@@ -66,7 +73,8 @@ const cls_FieldTable& kmaC_DetonationPoint::Fields() {
     using R = kmaC_DetonationPoint;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::table>("table", "columns: x, y, z (length), delay time (time)");
+            .Field<&R::table>("table", "columns: x, y, z (length), delay time (time)")
+            .Example(R"({"table": [[0, 0, 0, 0]]})");
     return fields;
 }
 
@@ -84,11 +92,12 @@ const cls_FieldTable& kmaC_Eos::Fields() {
             .Field<&R::type>("type", "kind of the equation; always written")
             .Field<&R::table>(
                 "table",
-                "columns: type 0: reference sound speed, slope of the shock line, material constant gamma; "
-                "type 1: detonation wave speed, A, B (stress), omega, R1, R2, and last the pre-detonation "
-                "bulk modulus (stress), ahead of which the deck gets a blank column; type 2: gas constant, "
-                "ambient pressure (stress); type 3: f1 (stress), f2, logarithmic volumetric strain")
-            .Field<&R::detonationPoint>("detonationPoint", "start of the detonation");
+                "columns: USUP: reference sound speed, slope of the shock line, material constant gamma; "
+                "JWL: detonation wave speed, A, B (stress), omega, R1, R2, and last the pre-detonation bulk "
+                "modulus (stress), ahead of which the deck gets a blank column; IDEAL_GAS: gas constant, "
+                "ambient pressure (stress); TABULAR: f1 (stress), f2, logarithmic volumetric strain")
+            .Field<&R::detonationPoint>("detonationPoint", "start of the detonation")
+            .Example(R"({"type": "USUP", "table": [[3.94e6, 1.49, 1.96]]})");
     return fields;
 }
 

@@ -16,7 +16,8 @@ const cls_FieldTable& kmaC_ContactArea::Fields() {
                 "dependencies", "number of field variables: the last columns of the table; written as "
                                 "'dependencies=' when not 0, in a line of its own behind the keyword line")
             .Field<&R::table>("table", "columns: contact area (area) or width (length), closure (length); "
-                                       "then the temperature if given, and the field variables");
+                                       "then the temperature if given, and the field variables")
+            .Example(R"({"table": [[1, 0], [1.5, 0.1]]})");
     return fields;
 }
 
@@ -48,26 +49,28 @@ const cls_FieldTable& kmaC_ThicknessBehavior::Fields() {
             .Field<&R::tensileStiffnessFactor>("tensileStiffnessFactor",
                                                "tensile stiffness as a fraction of the initial compressive "
                                                "stiffness; written when not 0.001")
-            .Field<&R::type>("type", "0 nothing is written, any other number 'type=DAMAGE'")
+            .Unit("no unit")
+            .Field<&R::type>("type", "form of the loading and unloading curves, elastic-plastic or with "
+                                     "damage, which writes 'type=DAMAGE'")
             .Field<&R::unloadingDependencies>("unloadingDependencies",
                                               "number of field variables of unloadingTable; written as "
                                               "'dependencies=' of the unloading block when not 0")
             .Field<&R::variableUnits>(
-                "variableUnits", "whether the loading data are a pressure or a force; written when not 0")
+                "variableUnits", "whether the loading data are a pressure or a force; STRESS is not written")
             .Field<&R::yieldOnset>(
-                "yieldOnset",
-                "where yielding starts: a closure (length) if yieldOnsetMethod isn't 0, then always written "
-                "as 'yield onset='; else a relative drop of the slope, written as 'slope drop=' when not 0.1")
+                "yieldOnset", "where yielding starts: a relative drop of the slope, written as 'slope drop=' "
+                              "when not 0.1; with CLOSURE_VALUE a closure, always written as 'yield onset='")
+            .Unit("no unit, or length")
             .Field<&R::yieldOnsetMethod>("yieldOnsetMethod", "which of the two yieldOnset is")
             .Field<&R::table>("table", "columns: loading curve: pressure (stress) or force, closure "
                                        "(length); then the temperature if given, and the field variables")
-            .Field<&R::unloadingTable>(
-                "unloadingTable",
-                "columns: unloading curves; type 1: pressure or force, closure, largest closure before "
-                "unloading; type 0: pressure or force, closure, plastic closure; then the temperature if "
-                "given, and the field variables; empty: no unloading block")
+            .Field<&R::unloadingTable>("unloadingTable",
+                                       "columns: pressure or force, closure, then the largest closure before "
+                                       "unloading (damage) or the plastic closure; then the temperature if "
+                                       "given, and the field variables; empty: no unloading block")
             .Field<&R::contactArea>(
-                "contactArea", "contact area or width against closure; written only with variableUnits 1");
+                "contactArea", "contact area or width against closure; written only with variableUnits FORCE")
+            .Example(R"({"table": [[0, 0], [20, 0.1], [60, 0.2]]})");
     return fields;
 }
 
@@ -78,7 +81,8 @@ const cls_FieldTable& kmaC_MembraneElastic::Fields() {
             .Field<&R::dependencies>("dependencies", "number of field variables: the last columns of the "
                                                      "table; written as 'dependencies=' when not 0")
             .Field<&R::table>("table", "columns: Young's modulus (stress), Poisson's ratio; then the "
-                                       "temperature if given, and the field variables");
+                                       "temperature if given, and the field variables")
+            .Example(R"({"table": [[100, 0.3]]})");
     return fields;
 }
 
@@ -91,12 +95,15 @@ const cls_FieldTable& kmaC_TransShearElastic::Fields() {
     using R = kmaC_TransShearElastic;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::variableUnits>("variableUnits", "1: 'variable=FORCE'; any other number nothing")
+            .Field<&R::variableUnits>(
+                "variableUnits",
+                "whether the stiffness is of a stress or of a force; FORCE writes 'variable=FORCE'")
             .Field<&R::dependencies>("dependencies", "number of field variables: the last columns of the "
                                                      "table; written as 'dependencies=' when not 0")
             .Field<&R::table>("table",
                               "columns: shear stiffness (stress/length, or force/length with variableUnits "
-                              "1); then the temperature if given, and the field variables");
+                              "FORCE); then the temperature if given, and the field variables")
+            .Example(R"({"table": [[40]]})");
     return fields;
 }
 

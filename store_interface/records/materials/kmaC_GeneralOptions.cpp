@@ -4,9 +4,9 @@
 
 const cls_FieldTable& kmaC_Density::Fields() {
     using R = kmaC_Density;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: mass density (mass/volume)"));
+    static const cls_FieldTable fields = cls_Describe<R>(kmaC_MaterialOption::Fields())
+                                             .With(kmaC_DependentTable("columns: mass density (mass/volume)"))
+                                             .Example(R"({"table": [[7.85e-9]]})");
     return fields;
 }
 
@@ -14,11 +14,14 @@ const cls_FieldTable& kmaC_Damping::Fields() {
     using R = kmaC_Damping;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::alpha>("alpha", "mass-proportional factor (1/time); written when not 0.0")
-            .Field<&R::beta>("beta", "stiffness-proportional factor (time); written when not 0.0")
+            .Field<&R::alpha>("alpha", "mass-proportional factor; written when not 0.0")
+            .Unit("1/time")
+            .Field<&R::beta>("beta", "stiffness-proportional factor; written when not 0.0")
+            .Unit("time")
             .Field<&R::composite>(
-                "composite",
-                "fraction of critical damping for composite modal damping; written when not 0.0");
+                "composite", "fraction of critical damping for composite modal damping; written when not 0.0")
+            .Unit("no unit")
+            .Example(R"({"alpha": 0.1, "beta": 1e-5})");
     return fields;
 }
 
@@ -28,7 +31,8 @@ const cls_FieldTable& kmaC_Depvar::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::deleteVar>("deleteVar", "number of the variable that controls the deletion of "
                                                "elements; written as 'delete=' when not 0")
-            .Field<&R::numVariables>("numVariables", "count of state variables; the data line");
+            .Field<&R::numVariables>("numVariables", "count of state variables; the data line")
+            .Example(R"({"numVariables": 3})");
     return fields;
 }
 
@@ -44,14 +48,17 @@ const cls_FieldTable& kmaC_UserMaterial::Fields() {
     using R = kmaC_UserMaterial;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "0 mechanical, 1 thermal, 2 both")
+            .Field<&R::type>("type", "which models the subroutine has: MECHANICAL, THERMAL, or both")
             .Field<&R::unsymm>(
                 "unsymm",
                 "true: the mechanical or thermal Jacobian isn't symmetric; the word 'unsymm' in each block")
             .Field<&R::mechanicalConstants>("mechanicalConstants",
                                             "constants of the mechanical model, in the subroutine's order")
+            .Unit("as the subroutine says")
             .Field<&R::thermalConstants>("thermalConstants",
-                                         "constants of the thermal model, in the subroutine's order");
+                                         "constants of the thermal model, in the subroutine's order")
+            .Unit("as the subroutine says")
+            .Example(R"({"mechanicalConstants": [210000, 0.3]})");
     return fields;
 }
 
@@ -59,7 +66,8 @@ const cls_FieldTable& kmaC_UserOutputVariables::Fields() {
     using R = kmaC_UserOutputVariables;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::numVariables>("numVariables", "count of variables; the data line");
+            .Field<&R::numVariables>("numVariables", "count of variables; the data line")
+            .Example(R"({"numVariables": 2})");
     return fields;
 }
 
@@ -73,9 +81,13 @@ const cls_FieldTable& kmaC_Regularization::Fields() {
     using R = kmaC_Regularization;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::rtol>("rtol", "tolerance, fraction; written as 'rtol=' when it differs from 0.03")
-            .Field<&R::strainRateRegularization>("strainRateRegularization",
-                                                 "spacing of the strain rate intervals; written when not 0");
+            .Field<&R::rtol>("rtol",
+                             "tolerance of regularized tables; written as 'rtol=' when it differs from 0.03")
+            .Unit("no unit")
+            .Field<&R::strainRateRegularization>(
+                "strainRateRegularization",
+                "spacing of the strain rate intervals; LOGARITHMIC is not written")
+            .Example(R"({"rtol": 0.01})");
     return fields;
 }
 

@@ -6,14 +6,14 @@ const cls_FieldTable& kmaC_BiaxialTestData::Fields() {
     using R = kmaC_BiaxialTestData;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::smoothing>(
-                "smoothing",
-                "order of the smoothing polynomial of the test data; unset (2147483647): no 'smooth='")
+            .Field<&R::smoothing>("smoothing",
+                                  "order of the smoothing polynomial of the test data; unset: no 'smooth='")
             .Field<&R::lateralStrainGiven>("lateralStrainGiven",
                                            "true: the third column is the lateral strain. False with a "
                                            "temperature or field column: the deck gets a blank third column")
             .With(kmaC_DependentTable("columns: nominal stress (stress), nominal strain, nominal lateral "
-                                      "strain if lateralStrainGiven"));
+                                      "strain if lateralStrainGiven"))
+            .Example(R"({"table": [[0.1, 0.02], [0.5, 0.15], [1.2, 0.6]]})");
     return fields;
 }
 
@@ -21,14 +21,14 @@ const cls_FieldTable& kmaC_PlanarTestData::Fields() {
     using R = kmaC_PlanarTestData;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::smoothing>(
-                "smoothing",
-                "order of the smoothing polynomial of the test data; unset (2147483647): no 'smooth='")
+            .Field<&R::smoothing>("smoothing",
+                                  "order of the smoothing polynomial of the test data; unset: no 'smooth='")
             .Field<&R::lateralStrainGiven>("lateralStrainGiven",
                                            "true: the third column is the lateral strain. False with a "
                                            "temperature or field column: the deck gets a blank third column")
             .With(kmaC_DependentTable("columns: nominal stress (stress), nominal strain, nominal lateral "
-                                      "strain if lateralStrainGiven"));
+                                      "strain if lateralStrainGiven"))
+            .Example(R"({"table": [[0.1, 0.05], [0.4, 0.3], [0.9, 1.2]]})");
     return fields;
 }
 
@@ -37,7 +37,8 @@ const cls_FieldTable& kmaC_SimpleShearTestData::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::table>("table", "columns: nominal shear stress (stress), nominal shear strain, "
-                                       "nominal transverse stress (stress, may be left out)");
+                                       "nominal transverse stress (stress, may be left out)")
+            .Example(R"({"table": [[0.1, 0.08, 0], [0.5, 0.4, 0.05]]})");
     return fields;
 }
 
@@ -45,14 +46,14 @@ const cls_FieldTable& kmaC_UniaxialTestData::Fields() {
     using R = kmaC_UniaxialTestData;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::smoothing>(
-                "smoothing",
-                "order of the smoothing polynomial of the test data; unset (2147483647): no 'smooth='")
+            .Field<&R::smoothing>("smoothing",
+                                  "order of the smoothing polynomial of the test data; unset: no 'smooth='")
             .Field<&R::lateralStrainGiven>("lateralStrainGiven",
                                            "true: the third column is the lateral strain. False with a "
                                            "temperature or field column: the deck gets a blank third column")
             .With(kmaC_DependentTable("columns: nominal stress (stress), nominal strain, nominal lateral "
-                                      "strain if lateralStrainGiven"));
+                                      "strain if lateralStrainGiven"))
+            .Example(R"({"table": [[0.1, 0.06], [0.5, 0.5], [1, 1.6]]})");
     return fields;
 }
 
@@ -62,11 +63,12 @@ const cls_FieldTable& kmaC_VolumetricTestData::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::volinf>("volinf",
                                "long-term normalized volumetric modulus or compliance; unset: no 'volinf='")
-            .Field<&R::smoothing>(
-                "smoothing",
-                "order of the smoothing polynomial of the test data; unset (2147483647): no 'smooth='")
+            .Unit("no unit")
+            .Field<&R::smoothing>("smoothing",
+                                  "order of the smoothing polynomial of the test data; unset: no 'smooth='")
             .With(kmaC_DependentTable("columns: hyperelastic and hyperfoam: pressure (stress), volume ratio; "
-                                      "viscoelastic: normalized volumetric modulus or compliance, time"));
+                                      "viscoelastic: normalized volumetric modulus or compliance, time"))
+            .Example(R"({"table": [[50, 0.98], [120, 0.95]]})");
     return fields;
 }
 
@@ -77,7 +79,8 @@ const cls_FieldTable& kmaC_Hysteresis::Fields() {
             .Field<&R::table>("table",
                               "columns: stress scaling factor, creep parameter, effective stress exponent, "
                               "creep strain exponent; further columns (temperature, field variables) may "
-                              "follow and go out as they stand, the keyword has no parameter for them");
+                              "follow and go out as they stand, the keyword has no parameter for them")
+            .Example(R"({"table": [[1.6, 0.56, 4, -1]]})");
     return fields;
 }
 
@@ -124,40 +127,45 @@ const cls_FieldTable& kmaC_Hyperelastic::Fields() {
     using R = kmaC_Hyperelastic;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "strain energy potential; 5 gets no word in the deck")
+            .Field<&R::type>("type", "strain energy potential; POLYNOMIAL gets no word in the deck")
             .Field<&R::moduliTimeScale>("moduliTimeScale",
-                                        "With viscoelastic or hysteresis: 1 the constants are long-term "
-                                        "('moduli=LONG TERM'), any other number instantaneous")
-            .Field<&R::n>("n", "order of the potential; for type 4, 5, 6, written when not 1")
+                                        "with viscoelastic or hysteresis: whether the constants are "
+                                        "long-term ('moduli=LONG TERM') or instantaneous")
+            .Field<&R::n>(
+                "n",
+                "order of the potential, of OGDEN, POLYNOMIAL and REDUCED_POLYNOMIAL; written when not 1")
             .Field<&R::beta>("beta",
-                             "invariant mixture parameter of type 8 with test data; unset: no 'beta='")
-            .Field<&R::testData>("testData", "true: the constants come from the test data below and the "
-                                             "table isn't written; a type 1 material needs it")
+                             "invariant mixture parameter of VAN_DER_WAALS with test data; unset: no 'beta='")
+            .Unit("no unit")
+            .Field<&R::testData>(
+                "testData",
+                "true: the constants come from the test data and the table isn't written; MARLOW needs it")
             .Field<&R::compressible>(
                 "compressible",
-                "type 7: whether the user subroutine's material is compressible; always written for type 7")
+                "with USER: whether the subroutine's material is compressible; then always written")
             .Field<&R::properties>("properties",
-                                   "type 7: number of properties of the user subroutine; written when not 0")
-            .Field<&R::marlowDeviatoricData>(
-                "marlowDeviatoricData",
-                "Type 1: which test gives the deviatoric behaviour: 0 uniaxial, 1 biaxial, 2 planar")
-            .Field<&R::volumetricResponse>(
-                "volumetricResponse",
-                "With test data: 1 volumetric test data (type 1 writes them only then), 2 Poisson's ratio")
-            .Field<&R::poisson>(
-                "poisson",
-                "Poisson's ratio; written with testData and volumetricResponse 2, whatever its value")
+                                   "with USER: number of properties of the subroutine; written when not 0")
+            .Field<&R::marlowDeviatoricData>("marlowDeviatoricData",
+                                             "with MARLOW: which test gives the deviatoric behaviour")
+            .Field<&R::volumetricResponse>("volumetricResponse",
+                                           "with test data: what gives the volumetric behaviour; MARLOW "
+                                           "writes volumetric test data only with VOLUMETRIC_DATA")
+            .Field<&R::poisson>("poisson", "Poisson's ratio; written with testData and the volumetric "
+                                           "response POISSON_RATIO, whatever its value")
+            .Unit("no unit")
             .Field<&R::table>(
-                "table", "columns: type 0: mu (stress), locking stretch, D (1/stress); type 2: C10, C01, D1; "
-                         "type 3: C10, D1; type 4: mu1, alpha1, ... mun, alphan, D1 ... Dn; type 5: the Cij "
-                         "in rising order of i + j, i first, then D1 ... Dn; type 6: C10 ... Cn0, D1 ... Dn; "
-                         "type 7: the properties in one row; type 8: mu, locking stretch, a, beta, D; type "
-                         "9: C10, C20, C30, D1, D2, D3; a temperature column may follow")
+                "table",
+                "columns, with a temperature column behind them if wanted: ARRUDA_BOYCE: mu (stress), "
+                "locking stretch, D (1/stress); MOONEY_RIVLIN: C10, C01, D1; NEO_HOOKE: C10, D1; OGDEN: mu1, "
+                "alpha1, ... mun, alphan, D1 ... Dn; POLYNOMIAL: the Cij in rising order of i + j, i first, "
+                "then D1 ... Dn; REDUCED_POLYNOMIAL: C10 ... Cn0, D1 ... Dn; USER: the properties in one "
+                "row; VAN_DER_WAALS: mu, locking stretch, a, beta, D; YEOH: C10, C20, C30, D1, D2, D3")
             .Field<&R::biaxialTestData>("biaxialTestData", "equibiaxial test")
             .Field<&R::planarTestData>("planarTestData", "planar test")
             .Field<&R::uniaxialTestData>("uniaxialTestData", "uniaxial test")
             .Field<&R::volumetricTestData>("volumetricTestData", "volumetric test")
-            .Field<&R::hysteresis>("hysteresis", "hysteresis");
+            .Field<&R::hysteresis>("hysteresis", "hysteresis")
+            .Example(R"({"type": "MOONEY_RIVLIN", "table": [[0.4, 0.1, 0.05]]})");
     return fields;
 }
 
@@ -165,10 +173,11 @@ const cls_FieldTable& kmaC_Hyperfoam::Fields() {
     using R = kmaC_Hyperfoam;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::testData>(
-                "testData", "true: the constants come from the test data below and the table isn't written")
+            .Field<&R::testData>("testData",
+                                 "true: the constants come from the test data and the table isn't written")
             .Field<&R::poisson>("poisson",
                                 "one effective Poisson's ratio for all terms; unset: no 'poisson='")
+            .Unit("no unit")
             .Field<&R::n>("n", "order of the potential; written when not 1")
             .Field<&R::longTermModuli>("longTermModuli",
                                        "with viscoelastic: true: the constants are long-term ('moduli=LONG "
@@ -179,7 +188,8 @@ const cls_FieldTable& kmaC_Hyperfoam::Fields() {
             .Field<&R::planarTestData>("planarTestData", "planar test")
             .Field<&R::simpleShearTestData>("simpleShearTestData", "simple shear test")
             .Field<&R::uniaxialTestData>("uniaxialTestData", "uniaxial test")
-            .Field<&R::volumetricTestData>("volumetricTestData", "volumetric test");
+            .Field<&R::volumetricTestData>("volumetricTestData", "volumetric test")
+            .Example(R"({"n": 1, "table": [[0.2, 4.5, 0]]})");
     return fields;
 }
 
@@ -189,10 +199,13 @@ const cls_FieldTable& kmaC_CombinedTestData::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::shrinf>("shrinf",
                                "long-term normalized shear modulus or compliance; unset: no 'shrinf='")
+            .Unit("no unit")
             .Field<&R::volinf>("volinf",
                                "long-term normalized volumetric modulus or compliance; unset: no 'volinf='")
+            .Unit("no unit")
             .Field<&R::table>("table", "columns: normalized shear modulus or compliance, normalized "
-                                       "volumetric modulus or compliance, time");
+                                       "volumetric modulus or compliance, time")
+            .Example(R"({"table": [[0.9, 0.95, 1], [0.6, 0.8, 100]]})");
     return fields;
 }
 
@@ -202,7 +215,9 @@ const cls_FieldTable& kmaC_ShearTestData::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::shrinf>("shrinf",
                                "long-term normalized shear modulus or compliance; unset: no 'shrinf='")
-            .Field<&R::table>("table", "columns: normalized shear modulus or compliance, time");
+            .Unit("no unit")
+            .Field<&R::table>("table", "columns: normalized shear modulus or compliance, time")
+            .Example(R"({"table": [[0.9, 1], [0.6, 100]]})");
     return fields;
 }
 
@@ -217,10 +232,10 @@ const cls_FieldTable& kmaC_Trs::Fields() {
     using R = kmaC_Trs;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::definition>("definition", "form of the shift function; written when not 0")
-            .Field<&R::table>("table",
-                              "columns: definition 0: reference temperature, C1, C2 (temperature); "
-                              "definition 1: activation energy, reference temperature; definition 2: none");
+            .Field<&R::definition>("definition", "form of the shift function; WLF is not written")
+            .Field<&R::table>("table", "columns: WLF: reference temperature, C1, C2 (temperature); "
+                                       "ARRHENIUS: activation energy, reference temperature; USER: none")
+            .Example(R"({"table": [[20, 17.4, 51.6]]})");
     return fields;
 }
 
@@ -251,21 +266,21 @@ const cls_FieldTable& kmaC_Viscoelastic::Fields() {
                 "timeDomain", "true: time domain, time counts; false: frequency domain, frequency counts")
             .Field<&R::frequency>("frequency", "how the frequency domain behaviour is given")
             .Field<&R::time>("time", "how the time domain behaviour is given")
-            .Field<&R::errtol>(
-                "errtol",
-                "allowed error of the fit, fraction; where a fit is asked for, written when not 0.01")
+            .Field<&R::errtol>("errtol",
+                               "allowed error of the fit; where a fit is asked for, written when not 0.01")
+            .Unit("no unit")
             .Field<&R::nmax>(
                 "nmax", "largest number of terms of the fit; where a fit is asked for, written when not 13")
             .Field<&R::table>(
-                "table",
-                "columns: time 0 and frequency 2: g (fraction), k (fraction), relaxation time (time); "
-                "frequency 0: real g, imaginary g, exponent a, real k, imaginary k, exponent b; frequency 1 "
-                "and time 3: omega times real g, omega times imaginary g, omega times real k, omega times "
-                "imaginary k, frequency (cycles/time); empty for the test data forms")
+                "table", "columns: PRONY: g (fraction), k (fraction), relaxation time (time); FORMULA: real "
+                         "g, imaginary g, exponent a, real k, imaginary k, exponent b; TABULAR and "
+                         "FREQUENCY_DATA: omega times real g, omega times imaginary g, omega times real k, "
+                         "omega times imaginary k, frequency (cycles/time); empty for the test data forms")
             .Field<&R::combinedTestData>("combinedTestData", "combined test")
             .Field<&R::shearTestData>("shearTestData", "shear test")
             .Field<&R::trs>("trs", "temperature-time shift")
-            .Field<&R::volumetricTestData>("volumetricTestData", "volumetric test");
+            .Field<&R::volumetricTestData>("volumetricTestData", "volumetric test")
+            .Example(R"({"time": "PRONY", "table": [[0.3, 0, 0.5], [0.2, 0, 10]]})");
     return fields;
 }
 

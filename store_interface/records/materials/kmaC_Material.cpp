@@ -69,7 +69,8 @@ const cls_FieldTable& kmaC_Material::Fields() {
             .Field<&R::viscoelastic>(
                 "viscoelastic",
                 "linear viscoelasticity; adds 'moduli=' to elastic, hyperelastic and hyperfoam")
-            .Field<&R::viscous>("viscous", "viscous part of a two-layer model");
+            .Field<&R::viscous>("viscous", "viscous part of a two-layer model")
+            .Example(R"({"density": {"table": [[7.85e-9]]}, "elastic": {"table": [[210000, 0.3]]}})");
     return fields;
 }
 

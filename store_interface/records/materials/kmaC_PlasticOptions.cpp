@@ -14,11 +14,11 @@ const cls_FieldTable& kmaC_RateDependent::Fields() {
     using R = kmaC_RateDependent;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "form of the law: 0 nothing is written, 1 'type=YIELD RATIO', 2 "
-                                     "'type=JOHNSON COOK'; any other number nothing")
+            .Field<&R::type>("type", "form of the law; POWER_LAW is not written")
             .With(kmaC_DependentTable(
-                "columns: type 0: multiplier (1/time), exponent; type 1: yield stress ratio, equivalent "
-                "plastic strain rate (1/time); type 2: C, reference strain rate (1/time)"));
+                "columns: POWER_LAW: multiplier (1/time), exponent; YIELD_RATIO: yield stress ratio, "
+                "equivalent plastic strain rate (1/time); JOHNSON_COOK: C, reference strain rate (1/time)"))
+            .Example(R"({"table": [[40, 5]]})");
     return fields;
 }
 
@@ -26,7 +26,8 @@ const cls_FieldTable& kmaC_Potential::Fields() {
     using R = kmaC_Potential;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: stress ratios R11, R22, R33, R12, R13, R23"));
+            .With(kmaC_DependentTable("columns: stress ratios R11, R22, R33, R12, R13, R23"))
+            .Example(R"({"table": [[1, 1, 1.1, 1, 1, 1]]})");
     return fields;
 }
 
@@ -36,8 +37,11 @@ const cls_FieldTable& kmaC_Ornl::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::a>("a",
                           "saturation rate of the kinematic shift with creep strain; written when not 0.3")
-            .Field<&R::h>("h", "rate of the kinematic shift with creep strain (stress); unset: no 'h='")
-            .Field<&R::reset>("reset", "true: the optional reset procedure, the word 'reset'");
+            .Unit("no unit")
+            .Field<&R::h>("h", "rate of the kinematic shift with creep strain; unset: no 'h='")
+            .Unit("stress")
+            .Field<&R::reset>("reset", "true: the optional reset procedure, the word 'reset'")
+            .Example(R"({"a": 0.3})");
     return fields;
 }
 
@@ -49,7 +53,8 @@ const cls_FieldTable& kmaC_CyclicHardening::Fields() {
                 "parameters", "true: the row holds material parameters and the word 'parameters' is written")
             .With(kmaC_DependentTable(
                 "columns: parameters false: yield surface size (stress), equivalent plastic strain; "
-                "parameters true: size at zero plastic strain (stress), largest change Q (stress), rate b"));
+                "parameters true: size at zero plastic strain (stress), largest change Q (stress), rate b"))
+            .Example(R"({"table": [[300, 0], [350, 0.1]]})");
     return fields;
 }
 
@@ -60,7 +65,8 @@ const cls_FieldTable& kmaC_CycledPlastic::Fields() {
             .Field<&R::table>(
                 "table",
                 "columns: yield stress (stress), plastic strain; further columns (temperature, field "
-                "variables) may follow and go out as they stand, the keyword has no parameter for them");
+                "variables) may follow and go out as they stand, the keyword has no parameter for them")
+            .Example(R"({"table": [[350, 0], [450, 0.2]]})");
     return fields;
 }
 
@@ -70,7 +76,8 @@ const cls_FieldTable& kmaC_AnnealTemperature::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::dependencies>("dependencies",
                                      "number of field variables: the last columns of the table.")
-            .Field<&R::table>("table", "columns: annealing temperature");
+            .Field<&R::table>("table", "columns: annealing temperature")
+            .Example(R"({"table": [[700]]})");
     return fields;
 }
 
@@ -97,32 +104,34 @@ const cls_FieldTable& kmaC_Plastic::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::hardening>("hardening",
-                                  "hardening law; written when not 0, not with rateDependentTable")
+                                  "hardening law; ISOTROPIC is not written, and none with rateDependentTable")
             .Field<&R::rateDependentTable>(
                 "rateDependentTable", "true: the third column of the table is the plastic strain rate, and "
                                       "the deck gets one block per rate, in ascending order; nothing of "
                                       "hardening, dataType and numBackstresses is written then")
-            .Field<&R::dataType>("dataType", "form of the data of combined hardening; written when not 0, "
-                                             "whatever hardening is, not with rateDependentTable")
+            .Field<&R::dataType>("dataType", "form of the data of combined hardening; HALF_CYCLE is not "
+                                             "written, and none with rateDependentTable")
             .Field<&R::strainRangeDependency>(
                 "strainRangeDependency",
                 "combined hardening with stabilized data: true: the third column of the table is the strain "
                 "range. False with a temperature or field column: the deck gets a blank third column")
             .Field<&R::numBackstresses>("numBackstresses",
-                                        "number of backstresses, 1 or more; written when dataType is 1")
+                                        "number of backstresses, from 1; written when dataType is PARAMETERS")
             .With(kmaC_DependentTable(
-                "columns: hardening 0 to 2: yield stress (stress), plastic strain, plastic strain rate "
-                "(1/time) if rateDependentTable; hardening 3, dataType 0: yield stress, plastic strain; "
-                "dataType 1: stress at zero plastic strain, then C (stress) and gamma of each backstress; "
-                "dataType 2: yield stress, plastic strain, strain range if strainRangeDependency; hardening "
-                "4: A, B (stress), n, m, melting temperature, transition temperature; hardening 5: one "
-                "property per row, only the first column is read"))
+                "columns: ISOTROPIC and both KINEMATIC: yield stress (stress), plastic strain, plastic "
+                "strain rate (1/time) if rateDependentTable; COMBINED by HALF_CYCLE: yield stress, plastic "
+                "strain; by PARAMETERS: stress at zero plastic strain, then C (stress) and gamma of each "
+                "backstress; by STABILIZED: yield stress, plastic strain, strain range if "
+                "strainRangeDependency; JOHNSON_COOK: A, B (stress), n, m, melting temperature, transition "
+                "temperature; USER: one property per row, only the first column is read"))
             .Field<&R::rateDependent>("rateDependent", "strain rate dependence of the yield stress")
             .Field<&R::potential>("potential", "anisotropic yield")
-            .Field<&R::cyclicHardening>("cyclicHardening", "growth of the yield surface; with hardening 3")
+            .Field<&R::cyclicHardening>("cyclicHardening",
+                                        "growth of the yield surface; with hardening COMBINED")
             .Field<&R::ornl>("ornl", "constitutive model for cyclic loading and creep of stainless steel")
             .Field<&R::cycledPlastic>("cycledPlastic", "yield surface after cycling")
-            .Field<&R::annealTemperature>("annealTemperature", "annealing temperature");
+            .Field<&R::annealTemperature>("annealTemperature", "annealing temperature")
+            .Example(R"({"table": [[235, 0], [360, 0.2]]})");
     return fields;
 }
 
@@ -133,7 +142,8 @@ const cls_FieldTable& kmaC_DeformationPlasticity::Fields() {
             .Field<&R::table>("table",
                               "columns: Young's modulus (stress), Poisson's ratio, yield stress (stress), "
                               "exponent, yield offset; further columns (temperature, field variables) may "
-                              "follow and go out as they stand, the keyword has no parameter for them");
+                              "follow and go out as they stand, the keyword has no parameter for them")
+            .Example(R"({"table": [[210000, 0.3, 235, 8, 0.4]]})");
     return fields;
 }
 
@@ -150,11 +160,13 @@ const cls_FieldTable& kmaC_Creep::Fields() {
     using R = kmaC_Creep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "creep law; written when not 0")
-            .With(kmaC_DependentTable("columns: law 0 and 1: A, n, m; law 2: A, B, n, activation energy, gas "
-                                      "constant; law 3: none (units by the law: stress and time)"))
+            .Field<&R::law>("law", "creep law; STRAIN is not written")
+            .With(
+                kmaC_DependentTable("columns: STRAIN and TIME: A, n, m; HYPERBOLIC_SINE: A, B, n, activation "
+                                    "energy, gas constant; USER: none (units by the law: stress and time)"))
             .Field<&R::ornl>("ornl", "model for stainless steel")
-            .Field<&R::potential>("potential", "anisotropic creep");
+            .Field<&R::potential>("potential", "anisotropic creep")
+            .Example(R"({"table": [[1e-16, 5, 0]]})");
     return fields;
 }
 
@@ -168,16 +180,18 @@ const cls_FieldTable& kmaC_Viscous::Fields() {
     using R = kmaC_Viscous;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "viscous law: 0 nothing is written, 1 'law=TIME', any other 'law=USER'")
+            .Field<&R::law>("law", "viscous law; STRAIN is not written")
             .With(kmaC_DependentTable("columns: A, n, m (units by the law: stress and time), fraction of the "
-                                      "elastic-viscous network; with law 2 the fraction alone"));
+                                      "elastic-viscous network; with USER the fraction alone"))
+            .Example(R"({"table": [[1e-10, 3, 0, 0.2]]})");
     return fields;
 }
 
 const cls_FieldTable& kmaC_Ratios::Fields() {
     using R = kmaC_Ratios;
     static const cls_FieldTable fields = cls_Describe<R>(kmaC_MaterialOption::Fields())
-                                             .With(kmaC_DependentTable("columns: ratios r11, r22, r33"));
+                                             .With(kmaC_DependentTable("columns: ratios r11, r22, r33"))
+                                             .Example(R"({"table": [[1, 1, 2]]})");
     return fields;
 }
 
@@ -191,9 +205,10 @@ const cls_FieldTable& kmaC_Swelling::Fields() {
     using R = kmaC_Swelling;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "where the rate comes from; written when not 0")
+            .Field<&R::law>("law", "where the rate comes from; INPUT is not written")
             .With(kmaC_DependentTable("columns: volumetric swelling strain rate (1/time)"))
-            .Field<&R::ratios>("ratios", "anisotropy");
+            .Field<&R::ratios>("ratios", "anisotropy")
+            .Example(R"({"table": [[1e-6]]})");
     return fields;
 }
 
@@ -201,7 +216,8 @@ const cls_FieldTable& kmaC_CastIronCompHard::Fields() {
     using R = kmaC_CastIronCompHard;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: yield stress in compression (stress), plastic strain"));
+            .With(kmaC_DependentTable("columns: yield stress in compression (stress), plastic strain"))
+            .Example(R"({"table": [[400, 0], [600, 0.02]]})");
     return fields;
 }
 
@@ -209,7 +225,8 @@ const cls_FieldTable& kmaC_CastIronTensHard::Fields() {
     using R = kmaC_CastIronTensHard;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: yield stress in tension (stress), plastic strain"));
+            .With(kmaC_DependentTable("columns: yield stress in tension (stress), plastic strain"))
+            .Example(R"({"table": [[150, 0], [250, 0.01]]})");
     return fields;
 }
 
@@ -219,7 +236,9 @@ const cls_FieldTable& kmaC_CastIronPlasticity::Fields() {
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable("columns: plastic Poisson's ratio"))
             .Field<&R::castIronCompHard>("castIronCompHard", "hardening in compression")
-            .Field<&R::castIronTensHard>("castIronTensHard", "hardening in tension");
+            .Field<&R::castIronTensHard>("castIronTensHard", "hardening in tension")
+            .Example(
+                R"({"table": [[0.04]], "castIronCompHard": {"table": [[400, 0], [600, 0.02]]}, "castIronTensHard": {"table": [[150, 0], [250, 0.01]]}})");
     return fields;
 }
 
@@ -227,12 +246,14 @@ const cls_FieldTable& kmaC_PorousFailureCriteria::Fields() {
     using R = kmaC_PorousFailureCriteria;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::failureFraction>(
-                "failureFraction",
-                "void volume fraction at total failure; first value of the data line, always written")
-            .Field<&R::criticalFraction>("criticalFraction",
-                                         "void volume fraction at which the stress capacity begins to drop; "
-                                         "second value of the data line, always written");
+            .Field<&R::failureFraction>("failureFraction",
+                                        "void volume fraction at total failure; always written")
+            .Unit("no unit")
+            .Field<&R::criticalFraction>(
+                "criticalFraction",
+                "void volume fraction at which the stress capacity begins to drop; always written")
+            .Unit("no unit")
+            .Example(R"({"failureFraction": 0.25, "criticalFraction": 0.15})");
     return fields;
 }
 
@@ -241,7 +262,8 @@ const cls_FieldTable& kmaC_VoidNucleation::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: mean nucleation strain, standard deviation, volume fraction of nucleating voids"));
+                "columns: mean nucleation strain, standard deviation, volume fraction of nucleating voids"))
+            .Example(R"({"table": [[0.3, 0.1, 0.04]]})");
     return fields;
 }
 
@@ -250,10 +272,12 @@ const cls_FieldTable& kmaC_PorousMetalPlasticity::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::relativeDensity>("relativeDensity",
-                                        "initial relative density (fraction); unset: no 'relative density='")
+                                        "initial relative density; unset: no 'relative density='")
+            .Unit("no unit")
             .With(kmaC_DependentTable("columns: q1, q2, q3 (no units)"))
             .Field<&R::porousFailureCriteria>("porousFailureCriteria", "void fractions at failure")
-            .Field<&R::voidNucleation>("voidNucleation", "nucleation of voids");
+            .Field<&R::voidNucleation>("voidNucleation", "nucleation of voids")
+            .Example(R"({"relativeDensity": 0.95, "table": [[1.5, 1, 2.25]]})");
     return fields;
 }
 

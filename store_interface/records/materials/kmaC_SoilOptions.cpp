@@ -18,9 +18,10 @@ const cls_FieldTable& kmaC_CapCreepCohesion::Fields() {
     using R = kmaC_CapCreepCohesion;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "creep law; written when not 0")
-            .With(kmaC_DependentTable("columns: law 0 and 1: A, n, m; law 2: A, alpha, m, t1; law 3: none "
-                                      "(units by the law: stress and time)"));
+            .Field<&R::law>("law", "creep law; STRAIN is not written")
+            .With(kmaC_DependentTable("columns: STRAIN and TIME: A, n, m; SINGHM: A, alpha, m, t1; USER: "
+                                      "none (units by the law: stress and time)"))
+            .Example(R"({"table": [[1e-10, 2, 0]]})");
     return fields;
 }
 
@@ -33,9 +34,10 @@ const cls_FieldTable& kmaC_CapCreepConsolidation::Fields() {
     using R = kmaC_CapCreepConsolidation;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "creep law; written when not 0")
-            .With(kmaC_DependentTable("columns: law 0 and 1: A, n, m; law 2: A, alpha, m, t1; law 3: none "
-                                      "(units by the law: stress and time)"));
+            .Field<&R::law>("law", "creep law; STRAIN is not written")
+            .With(kmaC_DependentTable("columns: STRAIN and TIME: A, n, m; SINGHM: A, alpha, m, t1; USER: "
+                                      "none (units by the law: stress and time)"))
+            .Example(R"({"table": [[1e-10, 2, 0]]})");
     return fields;
 }
 
@@ -44,7 +46,8 @@ const cls_FieldTable& kmaC_CapHardening::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: hydrostatic compression yield stress (stress), volumetric inelastic strain"));
+                "columns: hydrostatic compression yield stress (stress), volumetric inelastic strain"))
+            .Example(R"({"table": [[0.1, 0], [1, 0.05]]})");
     return fields;
 }
 
@@ -57,7 +60,9 @@ const cls_FieldTable& kmaC_CapPlasticity::Fields() {
                 "inelastic strain, transition surface radius, flow stress ratio"))
             .Field<&R::capCreepCohesion>("capCreepCohesion", "cohesion creep")
             .Field<&R::capCreepConsolidation>("capCreepConsolidation", "consolidation creep")
-            .Field<&R::capHardening>("capHardening", "cap hardening");
+            .Field<&R::capHardening>("capHardening", "cap hardening")
+            .Example(
+                R"({"table": [[0.2, 35, 0.4, 0, 0.05, 1]], "capHardening": {"table": [[0.1, 0], [1, 0.05]]}})");
     return fields;
 }
 
@@ -66,7 +71,8 @@ const cls_FieldTable& kmaC_ClayHardening::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: hydrostatic yield pressure (stress), volumetric plastic strain"));
+                "columns: hydrostatic yield pressure (stress), volumetric plastic strain"))
+            .Example(R"({"table": [[0.1, 0], [1, 0.05]]})");
     return fields;
 }
 
@@ -80,15 +86,17 @@ const cls_FieldTable& kmaC_ClayPlasticity::Fields() {
     using R = kmaC_ClayPlasticity;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::hardening>("hardening", "hardening form; written when not 0")
+            .Field<&R::hardening>("hardening", "hardening form; EXPONENTIAL is not written")
             .Field<&R::intercept>(
                 "intercept",
                 "void ratio at the intercept of the virgin consolidation line; unset: no 'intercept='")
+            .Unit("no unit")
             .With(kmaC_DependentTable(
-                "columns: hardening 0: logarithmic plastic bulk modulus, critical state slope M, initial "
-                "yield surface size (stress), wet yield surface size, flow stress ratio; hardening 1: the "
-                "same without the first, whose place the deck leaves blank in the first row"))
-            .Field<&R::clayHardening>("clayHardening", "hardening curve, with hardening 1");
+                "columns: EXPONENTIAL: logarithmic plastic bulk modulus, critical state slope M, initial "
+                "yield surface size (stress), wet yield surface size, flow stress ratio; TABULAR: the same "
+                "without the first, whose place the deck leaves blank in the first row"))
+            .Field<&R::clayHardening>("clayHardening", "hardening curve, with hardening TABULAR")
+            .Example(R"({"table": [[0.2, 1, 0.1, 1, 1]]})");
     return fields;
 }
 
@@ -101,9 +109,10 @@ const cls_FieldTable& kmaC_DruckerPragerCreep::Fields() {
     using R = kmaC_DruckerPragerCreep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::law>("law", "creep law; written when not 0")
-            .With(kmaC_DependentTable("columns: law 0 and 1: A, n, m; law 2: A, alpha, m, t1; law 3: none "
-                                      "(units by the law: stress and time)"));
+            .Field<&R::law>("law", "creep law; STRAIN is not written")
+            .With(kmaC_DependentTable("columns: STRAIN and TIME: A, n, m; SINGHM: A, alpha, m, t1; USER: "
+                                      "none (units by the law: stress and time)"))
+            .Example(R"({"table": [[1e-10, 2, 0]]})");
     return fields;
 }
 
@@ -118,13 +127,14 @@ const cls_FieldTable& kmaC_DruckerPragerHardening::Fields() {
     using R = kmaC_DruckerPragerHardening;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::type>("type", "stress state of the hardening data; written when not 0, in every block")
+            .Field<&R::type>("type", "stress state of the hardening data; COMPRESSION is not written")
             .Field<&R::rateDependentTable>(
                 "rateDependentTable",
                 "true: the third column of the table is the plastic strain rate, and each run of rows with "
                 "one rate makes a block, in the order of the rows")
             .With(kmaC_DependentTable("columns: yield stress (stress), plastic strain, plastic strain rate "
-                                      "(1/time) if rateDependentTable"));
+                                      "(1/time) if rateDependentTable"))
+            .Example(R"({"table": [[2, 0], [3, 0.02]]})");
     return fields;
 }
 
@@ -133,10 +143,14 @@ const cls_FieldTable& kmaC_TriaxialTestData::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .Field<&R::a>("a", "material constant a, if known; unset: no 'a='")
+            .Unit("stress^(1-b)")
             .Field<&R::b>("b", "material constant b (exponent), if known; unset: no 'b='")
-            .Field<&R::pt>("pt", "material constant pt (stress), if known; unset: no 'pt='")
+            .Unit("no unit")
+            .Field<&R::pt>("pt", "material constant pt, if known; unset: no 'pt='")
+            .Unit("stress")
             .Field<&R::table>("table", "columns: confining stress (stress), stress in the loading direction "
-                                       "(stress), with their signs");
+                                       "(stress), with their signs")
+            .Example(R"({"table": [[-10, -30], [-20, -50]]})");
     return fields;
 }
 
@@ -154,18 +168,20 @@ const cls_FieldTable& kmaC_DruckerPrager::Fields() {
             .Field<&R::shearCriterion>("shearCriterion", "form of the yield surface in the meridional plane")
             .Field<&R::eccentricity>("eccentricity",
                                      "eccentricity of the flow potential; written when not 0.1")
-            .Field<&R::testData>("testData", "true: the constants of shearCriterion 2 come from "
+            .Unit("no unit")
+            .Field<&R::testData>("testData", "true: the constants of the criterion EXPONENTIAL come from "
                                              "triaxialTestData; 'testdata' is written for any criterion")
             .With(kmaC_DependentTable(
-                "columns: shearCriterion 0: friction angle (degrees), flow stress ratio, dilation angle "
-                "(degrees); 1: friction angle (degrees), initial hydrostatic tension strength (stress), "
-                "dilation angle (degrees); 2 without testData: a, b, dilation angle (degrees); 2 with "
-                "testData: dilation angle alone. The deck gets the blank columns that stand before the "
-                "dilation angle"))
+                "columns: LINEAR: friction angle (degrees), flow stress ratio, dilation angle (degrees); "
+                "HYPERBOLIC: friction angle (degrees), initial hydrostatic tension strength (stress), "
+                "dilation angle (degrees); EXPONENTIAL: a, b, dilation angle (degrees), or with testData the "
+                "dilation angle alone, and the deck gets the blank columns that stand before it"))
             .Field<&R::druckerPragerCreep>("druckerPragerCreep", "creep")
             .Field<&R::druckerPragerHardening>("druckerPragerHardening", "hardening")
             .Field<&R::rateDependent>("rateDependent", "strain rate dependence")
-            .Field<&R::triaxialTestData>("triaxialTestData", "triaxial test");
+            .Field<&R::triaxialTestData>("triaxialTestData", "triaxial test")
+            .Example(
+                R"({"table": [[30, 0.8, 20]], "druckerPragerHardening": {"table": [[2, 0], [3, 0.02]]}})");
     return fields;
 }
 
@@ -173,7 +189,8 @@ const cls_FieldTable& kmaC_MohrCoulombHardening::Fields() {
     using R = kmaC_MohrCoulombHardening;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: cohesion (stress), plastic strain"));
+            .With(kmaC_DependentTable("columns: cohesion (stress), plastic strain"))
+            .Example(R"({"table": [[0.05, 0], [0.08, 0.02]]})");
     return fields;
 }
 
@@ -184,11 +201,14 @@ const cls_FieldTable& kmaC_MohrCoulomb::Fields() {
             .Field<&R::deviatoricEccentricity>(
                 "deviatoricEccentricity",
                 "deviatoric eccentricity of the flow potential; unset: no 'deviatoric Eccentricity ='")
+            .Unit("no unit")
             .Field<&R::meridionalEccentricity>(
                 "meridionalEccentricity",
                 "meridional eccentricity of the flow potential; written as 'eccentricity =' when not 0.1")
+            .Unit("no unit")
             .With(kmaC_DependentTable("columns: friction angle (degrees), dilation angle (degrees)"))
-            .Field<&R::mohrCoulombHardening>("mohrCoulombHardening", "cohesion");
+            .Field<&R::mohrCoulombHardening>("mohrCoulombHardening", "cohesion")
+            .Example(R"({"table": [[30, 5]], "mohrCoulombHardening": {"table": [[0.05, 0]]}})");
     return fields;
 }
 
@@ -196,7 +216,8 @@ const cls_FieldTable& kmaC_FoamHardening::Fields() {
     using R = kmaC_FoamHardening;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .With(kmaC_DependentTable("columns: uniaxial compressive yield stress (stress), plastic strain"));
+            .With(kmaC_DependentTable("columns: uniaxial compressive yield stress (stress), plastic strain"))
+            .Example(R"({"table": [[1, 0], [2, 0.5]]})");
     return fields;
 }
 
@@ -210,12 +231,13 @@ const cls_FieldTable& kmaC_Foam::Fields() {
     using R = kmaC_Foam;
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
-            .Field<&R::hardening>("hardening", "hardening model; written when not 0")
+            .Field<&R::hardening>("hardening", "hardening model; VOLUMETRIC is not written")
             .With(kmaC_DependentTable(
-                "columns: hardening 0: yield stress ratio for compression, yield stress ratio for "
-                "hydrostatic tension; hardening 1: yield stress ratio, plastic Poisson's ratio"))
+                "columns: VOLUMETRIC: yield stress ratio for compression, yield stress ratio for hydrostatic "
+                "tension; ISOTROPIC: yield stress ratio, plastic Poisson's ratio"))
             .Field<&R::foamHardening>("foamHardening", "hardening curve")
-            .Field<&R::rateDependent>("rateDependent", "strain rate dependence");
+            .Field<&R::rateDependent>("rateDependent", "strain rate dependence")
+            .Example(R"({"table": [[1.1, 0.1]], "foamHardening": {"table": [[1, 0], [2, 0.5]]}})");
     return fields;
 }
 
@@ -224,7 +246,8 @@ const cls_FieldTable& kmaC_BulkFailure::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"));
+                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"))
+            .Example(R"({"table": [[30, 20, 0.5]]})");
     return fields;
 }
 
@@ -233,7 +256,8 @@ const cls_FieldTable& kmaC_FirstDirection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"));
+                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"))
+            .Example(R"({"table": [[30, 20, 0.5]]})");
     return fields;
 }
 
@@ -242,7 +266,8 @@ const cls_FieldTable& kmaC_SecondDirection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"));
+                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"))
+            .Example(R"({"table": [[30, 20, 0.5]]})");
     return fields;
 }
 
@@ -251,14 +276,16 @@ const cls_FieldTable& kmaC_ThirdDirection::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kmaC_MaterialOption::Fields())
             .With(kmaC_DependentTable(
-                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"));
+                "columns: friction angle (degrees), dilation angle (degrees), cohesion (stress)"))
+            .Example(R"({"table": [[30, 20, 0.5]]})");
     return fields;
 }
 
 const cls_FieldTable& kmaC_JointShearRetention::Fields() {
     using R = kmaC_JointShearRetention;
     static const cls_FieldTable fields = cls_Describe<R>(kmaC_MaterialOption::Fields())
-                                             .With(kmaC_DependentTable("columns: shear retention factor"));
+                                             .With(kmaC_DependentTable("columns: shear retention factor"))
+                                             .Example(R"({"table": [[0.5]]})");
     return fields;
 }
 
@@ -270,7 +297,8 @@ const cls_FieldTable& kmaC_JointedMaterial::Fields() {
             .Field<&R::firstDirection>("firstDirection", "first joint system")
             .Field<&R::secondDirection>("secondDirection", "second joint system")
             .Field<&R::thirdDirection>("thirdDirection", "third joint system")
-            .Field<&R::jointShearRetention>("jointShearRetention", "shear of open joints");
+            .Field<&R::jointShearRetention>("jointShearRetention", "shear of open joints")
+            .Example(R"({"bulkFailure": {"table": [[30, 20, 0.5]]}})");
     return fields;
 }
 

@@ -44,6 +44,7 @@ const cls_FieldTable& karC_RemeshingRule::Fields() {
             .Field<&R::region>("region", "region of the rule; none for the whole model")
             .Field<&R::fieldOutput>("fieldOutput", "whether field output of the indicators is wanted")
             .Field<&R::outputFrequency>("outputFrequency", "in the last increment or in all")
-            .Field<&R::variables>("variables", "the error indicators");
+            .Field<&R::variables>("variables", "the error indicators")
+            .Example(R"({"stepName": "Step-1"})");
     return fields;
 }

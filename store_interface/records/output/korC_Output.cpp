@@ -114,9 +114,10 @@ const cls_FieldTable& korC_OutputState::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::frequency>("frequency",
-                                  "output every so many increments; 0: none, 99999: the last only")
+                                  "output every so many increments; zero for none, 99999 for the last only")
             .Field<&R::numberInterval>("numberInterval", "number of equal intervals of the step's time")
             .Field<&R::timeInterval>("timeInterval", "time between two outputs")
+            .Unit("time")
             .Field<&R::modeList>("modeList", "numbers of modes, from 1; none for all of them")
             .Field<&R::timeMarks>("timeMarks", "whether output falls exactly on the times asked for")
             .Field<&R::timePoints>("timePoints", "name of a set of time points")
@@ -124,7 +125,8 @@ const cls_FieldTable& korC_OutputState::Fields() {
             .Field<&R::frequencyType>("frequencyType", "which of the kinds above counts")
             .Field<&R::variablesType>("variablesType", "which variables, if none are listed")
             .Field<&R::variables>("variables", "names of variables and of single components, in capitals; or "
-                                               "the one word PRESELECT or ALL");
+                                               "the one word PRESELECT or ALL")
+            .Example(R"({"frequency": 1, "variables": ["U", "RF"]})");
     return fields;
 }
 
@@ -184,7 +186,7 @@ const cls_FieldTable& korC_HistoryOutput::Fields() {
             .Field<&R::section>("section", "name of a section of integrated output, written as it stands")
             .Field<&R::springs>("springs",
                                 "names of springs and dashpots; a request for these is passed over")
-            .Field<&R::sensor>("sensor", "1: the request defines a sensor");
+            .Field<&R::sensor>("sensor", "whether the request defines a sensor (any number but zero)");
     return fields;
 }
 
@@ -198,7 +200,8 @@ const cls_FieldTable& korC_IntegratedOutputSection::Fields() {
                                 "a set of the one node about which moments are taken; none for the "
                                 "centre of the surface")
             .Field<&R::description>("description", "free text")
-            .FreeText();
+            .FreeText()
+            .Example(R"({"surface": "PART-1.TOP"})");
     return fields;
 }
 
@@ -213,7 +216,8 @@ const cls_FieldTable& kprC_TimePoint::Fields() {
         cls_Describe<kprC_TimePoint>(cls_Record::Fields())
             .Field<&kprC_TimePoint::generate>("generate", "rows of points are begin, end and increment")
             .Field<&kprC_TimePoint::points>("points",
-                                            "rows of one time, or of begin, end and increment (time)");
+                                            "rows of one time, or of begin, end and increment (time)")
+            .Example(R"({"points": [[0.1], [0.5], [1]]})");
     return fields;
 }
 
@@ -221,7 +225,8 @@ const cls_FieldTable& kadC_AdptMeshCtrl::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<kadC_AdptMeshCtrl>(cls_Record::Fields())
             .Field<&kadC_AdptMeshCtrl::description>("description", "free text")
-            .FreeText();
+            .FreeText()
+            .Example(R"({"description": "the usual"})");
     return fields;
 }
 

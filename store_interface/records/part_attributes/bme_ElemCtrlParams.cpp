@@ -73,6 +73,7 @@ const cls_FieldTable& bme_ElemCtrlParams::Fields() {
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::distortionControl>("distortionControl", "whether elements are kept from inverting")
             .Field<&R::lengthRatio>("lengthRatio", "ratio at which distortion control sets in")
+            .Unit("no unit")
             .Field<&R::kinematicSplit>("kinematicSplit", "kinematic formulation of hexahedra")
             .Field<&R::hourglass>("hourglass", "kind of hourglass control")
             .Field<&R::secondOrderAccuracy>("secondOrderAccuracy",
@@ -80,22 +81,32 @@ const cls_FieldTable& bme_ElemCtrlParams::Fields() {
             .Field<&R::stressRate>("stressRate", "objective stress rate")
             .Field<&R::weightFactor>("weightFactor",
                                      "weight of the stiffness part of combined hourglass control")
+            .Unit("no unit")
             .Field<&R::displacementHourglass>("displacementHourglass",
                                               "scaling factor of the hourglass control of displacements")
+            .Unit("no unit")
             .Field<&R::rotationalHourglass>("rotationalHourglass",
                                             "scaling factor of the hourglass control of rotations")
+            .Unit("no unit")
             .Field<&R::outOfPlaneHourglass>("outOfPlaneHourglass",
                                             "scaling factor of the out-of-plane hourglass control")
+            .Unit("no unit")
             .Field<&R::linearBulkViscosity>("linearBulkViscosity",
                                             "scaling factor of the linear bulk viscosity")
+            .Unit("no unit")
             .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
                                                "scaling factor of the quadratic bulk viscosity")
+            .Unit("no unit")
             .Field<&R::hourglassStiffness>("hourglassStiffness",
-                                           "hourglass stiffness (stress); 0 takes the solver's own")
+                                           "hourglass stiffness; zero takes the solver's own")
+            .Unit("stress")
             .Field<&R::bendingHourglassStiffness>("bendingHourglassStiffness",
-                                                  "hourglass stiffness of the rotations of shells (stress)")
+                                                  "hourglass stiffness of the rotations of shells")
+            .Unit("stress")
             .Field<&R::drillingHourglassScaling>("drillingHourglassScaling",
-                                                 "scaling of the drilling stiffness");
+                                                 "scaling of the drilling stiffness")
+            .Unit("no unit")
+            .Example(R"({"hourglass": "ENHANCED"})");
     return fields;
 }
 

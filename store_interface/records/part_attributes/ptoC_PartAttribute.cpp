@@ -23,9 +23,10 @@ const cls_FieldTable& ptoC_SectionAssignment::Fields() {
             .Field<&R::sectionName>("sectionName", "name of the section")
             .RefersTo("section")
             .Required()
-            .Field<&R::offset>("offset",
-                               "distance of a shell's reference surface from its mid-surface, as a fraction "
-                               "of the thickness: 0.5 is the top, -0.5 the bottom");
+            .Field<&R::offset>("offset", "distance of a shell's reference surface from its mid-surface, as a "
+                                         "fraction of the thickness: 0.5 is the top, -0.5 the bottom")
+            .Unit("no unit")
+            .Example(R"({"region": "ALL", "sectionName": "Plate"})");
     return fields;
 }
 
@@ -36,7 +37,9 @@ const cls_FieldTable& ptoC_MaterialOrientation::Fields() {
             .Field<&R::datum>("datum",
                               "coordinate system; without one the elements keep the default orientation")
             .Field<&R::axis>("axis", "axis of the additional rotation")
-            .Field<&R::angle>("angle", "angle of the additional rotation in degrees");
+            .Field<&R::angle>("angle", "angle of the additional rotation")
+            .Unit("degrees")
+            .Example(R"({"region": "ALL", "datum": "Cylinder"})");
     return fields;
 }
 
@@ -44,7 +47,8 @@ const cls_FieldTable& ptoC_BeamOrientation::Fields() {
     using R = ptoC_BeamOrientation;
     static const cls_FieldTable fields =
         cls_Describe<R>(ptoC_PartAttribute::Fields())
-            .Field<&R::vector>("vector", "direction of the local 1-axis, written as it stands");
+            .Field<&R::vector>("vector", "direction of the local 1-axis, written as it stands")
+            .Example(R"({"region": "ALL", "vector": [0, 0, -1]})");
     return fields;
 }
 
@@ -57,11 +61,14 @@ const cls_FieldTable& ptoC_ConnectorOrientation::Fields() {
                              "the place in the assembly's list, counted from 0")
             .Field<&R::csys1>("csys1", "coordinate system of the first end")
             .Field<&R::axis1>("axis1", "axis of the additional rotation at the first end")
-            .Field<&R::angle1>("angle1", "angle of the additional rotation at the first end in degrees")
+            .Field<&R::angle1>("angle1", "angle of the additional rotation at the first end")
+            .Unit("degrees")
             .Field<&R::orient2sameAs1>("orient2sameAs1", "the second end has the orientation of the first")
             .Field<&R::csys2>("csys2", "coordinate system of the second end")
             .Field<&R::axis2>("axis2", "axis of the additional rotation at the second end")
-            .Field<&R::angle2>("angle2", "angle of the additional rotation at the second end in degrees");
+            .Field<&R::angle2>("angle2", "angle of the additional rotation at the second end")
+            .Unit("degrees")
+            .Example(R"({"region": "CONNECTORS", "csys1": "Cylinder"})");
     return fields;
 }
 

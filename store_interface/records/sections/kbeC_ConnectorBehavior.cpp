@@ -52,13 +52,16 @@ const cls_FieldTable& kbeC_ConnectorOptions::Fields() {
             .Field<&R::useBehaviorRtol>("useBehaviorRtol",
                                         "the usual tolerance 0.03 in place of regularization")
             .Field<&R::regularization>("regularization", "tolerance of regularized tables, as a fraction")
+            .Unit("no unit")
             .Field<&R::useBehaviorRateFactor>("useBehaviorRateFactor",
                                               "the rate filter factor is the usual one")
-            .Field<&R::rateFactor>("rateFactor", "factor that rates are filtered by (no unit)")
+            .Field<&R::rateFactor>("rateFactor", "factor that rates are filtered by")
+            .Unit("no unit")
             .Field<&R::interpolation>("interpolation", "between rates")
             .Field<&R::useBehaviorExtrapolation>("useBehaviorExtrapolation",
                                                  "tables are extrapolated as the behaviour says")
-            .Field<&R::extrapolation>("extrapolation", "beyond a table's ends");
+            .Field<&R::extrapolation>("extrapolation", "beyond a table's ends")
+            .Example(R"({"regularize": true})");
     return fields;
 }
 
@@ -99,7 +102,8 @@ const cls_FieldTable& kbeC_CDCTerm::Fields() {
             .Field<&R::table>("table",
                               "one scale factor per component, then the independent variable's columns if "
                               "given, temperature if temperatureDependency, field variables")
-            .With(kRegularizationField);
+            .With(kRegularizationField)
+            .Example(R"({"components": [1, 2]})");
     return fields;
 }
 
@@ -107,7 +111,8 @@ const cls_FieldTable& kbeC_DerivedComponent::Fields() {
     using R = kbeC_DerivedComponent;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::terms>("terms", "the terms, each a keyword of its own under the one name");
+            .Field<&R::terms>("terms", "the terms, each a keyword of its own under the one name")
+            .Example(R"({"terms": [{"components": [1, 2]}]})");
     return fields;
 }
 
@@ -122,16 +127,21 @@ const cls_FieldTable& kbeC_ConnectorPotential::Fields() {
     using R = kbeC_ConnectorPotential;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::useDerived>("useDerived", "0: the term is a component, otherwise a derived component")
+            .Field<&R::useDerived>("useDerived",
+                                   "whether the term is a component (zero) or a derived component")
             .Field<&R::component>("component", "component, 1 to 6")
-            .Field<&R::negative>("negative", "not 0: the term counts negative")
-            .Field<&R::scaleFactor>("scaleFactor", "scaling factor (no unit)")
-            .Field<&R::radius>(
-                "radius", "effective radius (length, for moments); not asked for with a maximum operator")
-            .Field<&R::exponentFactor>("exponentFactor", "exponent of the term (no unit)")
+            .Field<&R::negative>("negative", "any number but zero: the term counts negative")
+            .Field<&R::scaleFactor>("scaleFactor", "scaling factor")
+            .Unit("no unit")
+            .Field<&R::radius>("radius",
+                               "effective radius, for moments; not asked for with a maximum operator")
+            .Unit("length")
+            .Field<&R::exponentFactor>("exponentFactor", "exponent of the term")
+            .Unit("no unit")
             .Field<&R::sign>("sign", "which part of the component's value counts.")
             .Field<&R::derivedComponent>("derivedComponent",
-                                         "the derived component of the term, with useDerived");
+                                         "the derived component of the term, with useDerived")
+            .Example(R"({"component": 1})");
     return fields;
 }
 
@@ -170,7 +180,8 @@ const cls_FieldTable& kbeC_ConnectorElasticity::Fields() {
             .Field<&R::independentComponents>("independentComponents",
                                               "components on which a coupled nonlinear table depends")
             .With(kComponentsField)
-            .With(kRegularizationField);
+            .With(kRegularizationField)
+            .Example(R"({"components": [1], "table": [[1000]]})");
     return fields;
 }
 
@@ -208,7 +219,8 @@ const cls_FieldTable& kbeC_ConnectorDamping::Fields() {
             .Field<&R::independentComponents>("independentComponents",
                                               "components on which a coupled nonlinear table depends")
             .With(kComponentsField)
-            .With(kRegularizationField);
+            .With(kRegularizationField)
+            .Example(R"({"components": [1], "table": [[5]]})");
     return fields;
 }
 
@@ -216,10 +228,12 @@ const cls_FieldTable& kbeC_ConnectorStop::Fields() {
     using R = kbeC_ConnectorStop;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .Field<&R::minMotion>("minMotion",
-                                  "length, or angle in radians for components 4 to 6; unset: blank")
-            .Field<&R::maxMotion>("maxMotion", "length, or angle in radians; unset: blank")
-            .With(kComponentsField);
+            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
+            .Unit("length or radians")
+            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
+            .Unit("length or radians")
+            .With(kComponentsField)
+            .Example(R"({"components": [1], "minMotion": -5, "maxMotion": 5})");
     return fields;
 }
 
@@ -229,11 +243,16 @@ const cls_FieldTable& kbeC_ConnectorFailure::Fields() {
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::releaseComponent>(
                 "releaseComponent", "component that is released; unset: no ', release=' (all components)")
-            .Field<&R::minMotion>("minMotion", "length or angle in radians; unset: blank")
-            .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
-            .Field<&R::minForce>("minForce", "force or moment; unset: blank")
-            .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
-            .With(kComponentsField);
+            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
+            .Unit("length or radians")
+            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
+            .Unit("length or radians")
+            .Field<&R::minForce>("minForce", "least force or moment; unset: blank")
+            .Unit("force or force*length")
+            .Field<&R::maxForce>("maxForce", "greatest force or moment; unset: blank")
+            .Unit("force or force*length")
+            .With(kComponentsField)
+            .Example(R"({"components": [1], "maxForce": 10000})");
     return fields;
 }
 
@@ -243,11 +262,16 @@ const cls_FieldTable& kbeC_ConnectorLock::Fields() {
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::lockingComponent>("lockingComponent",
                                          "component that is locked; unset: no ', lock=' (all components)")
-            .Field<&R::minMotion>("minMotion", "length or angle in radians; unset: blank")
-            .Field<&R::maxMotion>("maxMotion", "length or angle in radians; unset: blank")
-            .Field<&R::minForce>("minForce", "force or moment; unset: blank")
-            .Field<&R::maxForce>("maxForce", "force or moment; unset: blank")
-            .With(kComponentsField);
+            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
+            .Unit("length or radians")
+            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
+            .Unit("length or radians")
+            .Field<&R::minForce>("minForce", "least force or moment; unset: blank")
+            .Unit("force or force*length")
+            .Field<&R::maxForce>("maxForce", "greatest force or moment; unset: blank")
+            .Unit("force or force*length")
+            .With(kComponentsField)
+            .Example(R"({"components": [1], "maxMotion": 10})");
     return fields;
 }
 
@@ -268,23 +292,30 @@ const cls_FieldTable& kbeC_TangentialBehavior::Fields() {
     using R = kbeC_TangentialBehavior;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::formulation>("formulation", "0 table, 1 exponential decay.")
+            .Field<&R::formulation>("formulation",
+                                    "whether the coefficient is a table or decays exponentially")
             .Field<&R::slipRateDependency>("slipRateDependency", "the table has a slip rate column.")
             .Field<&R::pressureDependency>("pressureDependency", "the table has a contact force column.")
             .Field<&R::temperatureDependency>("temperatureDependency", "the table has a temperature column.")
             .With(kDependenciesField)
-            .Field<&R::testData>("testData", "1: the exponential decay is given by test data")
+            .Field<&R::testData>("testData",
+                                 "any number but zero: the exponential decay is given by test data")
             .Field<&R::shearStressLimit>("shearStressLimit",
                                          "limit of shear stress or force, with a table of coefficients")
+            .Unit("stress or force")
             .Field<&R::slipToleranceType>("slipToleranceType",
                                           "how much slip sticking allows: a fraction or a length")
-            .Field<&R::fraction>("fraction", "allowed elastic slip as a fraction (no unit)")
-            .Field<&R::elasticSlip>("elasticSlip", "allowed elastic slip (length)")
+            .Field<&R::fraction>("fraction", "allowed elastic slip as a fraction")
+            .Unit("no unit")
+            .Field<&R::elasticSlip>("elasticSlip", "allowed elastic slip")
+            .Unit("length")
             .Field<&R::table>(
-                "table", "formulation 0: coefficient, slip rate, contact force, temperature, field "
-                         "variables, as the flags say; formulation 1: one row, read value by value in row "
-                         "order: static coefficient, kinetic coefficient, decay coefficient; with test data: "
-                         "static coefficient, second coefficient, its slip rate, coefficient at infinity");
+                "table",
+                "columns: TABLE: coefficient, slip rate, contact force, temperature, field variables, as the "
+                "flags say; EXPONENTIAL_DECAY: one row, read value by value in row order: static "
+                "coefficient, kinetic coefficient, decay coefficient; with test data: static coefficient, "
+                "second coefficient, its slip rate, coefficient at infinity")
+            .Example(R"({"table": [[0.15]]})");
     return fields;
 }
 
@@ -336,8 +367,8 @@ const cls_FieldTable& kbeC_ConnectorFriction::Fields() {
             .Field<&R::independentKind>("independentKind", "on what the internal contact force depends")
             .Field<&R::independentComponents>(
                 "independentComponents", "user-defined: the components that the contact force depends on")
-            .Field<&R::stickStiffness>("stickStiffness",
-                                       "stiffness of sticking (force per length or moment per angle)")
+            .Field<&R::stickStiffness>("stickStiffness", "stiffness of sticking")
+            .Unit("force/length or force*length")
             .Field<&R::table>(
                 "table", "predefined: the geometric constants and internal contact forces that the "
                          "connection type asks for; user-defined: internal contact force, independent "
@@ -345,9 +376,10 @@ const cls_FieldTable& kbeC_ConnectorFriction::Fields() {
             .Field<&R::tangentialBehavior>("tangentialBehavior", "friction coefficient; none: not given here")
             .Field<&R::potentials>("potentials", "terms of the friction potential")
             .Field<&R::potentialOperator>("potentialOperator", "how the terms of the potential are joined")
-            .Field<&R::forcePotentialExponent>("forcePotentialExponent",
-                                               "exponent of the potential (no unit)")
-            .Field<&R::options>("options", "regularization group; rates play no part here");
+            .Field<&R::forcePotentialExponent>("forcePotentialExponent", "exponent of the potential")
+            .Unit("no unit")
+            .Field<&R::options>("options", "regularization group; rates play no part here")
+            .Example(R"({"tangentialBehavior": {"table": [[0.15]]}})");
     return fields;
 }
 
@@ -400,8 +432,10 @@ const cls_FieldTable& kbeC_ConnectorPlasticity::Fields() {
             .Field<&R::kinematicOptions>("kinematicOptions", "regularization group of the kinematic part")
             .Field<&R::potentials>("potentials", "terms of the yield potential (coupled plasticity)")
             .Field<&R::potentialOperator>("potentialOperator", "how the terms of the potential are joined")
-            .Field<&R::forcePotentialExponent>("forcePotentialExponent",
-                                               "exponent of the potential (no unit)");
+            .Field<&R::forcePotentialExponent>("forcePotentialExponent", "exponent of the potential")
+            .Unit("no unit")
+            .Example(
+                R"({"components": [1], "isotropicHardening": true, "isotropicTable": [[100, 0], [150, 2]]})");
     return fields;
 }
 
@@ -452,16 +486,17 @@ const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
                                                "number of field variables of initiationTable")
             .Field<&R::initiationTemperatureDependency>("initiationTemperatureDependency",
                                                         "initiationTable has a temperature column")
-            .Field<&R::initiationTable>("initiationTable",
-                                        "criterion 0 and 1: lower bound (-1e36 = none), upper bound (1e36 = "
-                                        "none) of force or motion; criterion 2: plastic motion, mode-mix "
-                                        "ratio if modeMixDependency; then temperature, field variables")
+            .Field<&R::initiationTable>(
+                "initiationTable", "columns: FORCE and MOTION: lower bound (-1e36 for none), upper bound "
+                                   "(1e36 for none) of force or motion; PLASTIC_MOTION: plastic motion, "
+                                   "mode-mix ratio if modeMixDependency; then temperature, field variables")
             .Field<&R::initiationOptions>("initiationOptions", "regularization group of the initiation")
             .Field<&R::initiationPotentials>("initiationPotentials", "terms of the initiation potential")
             .Field<&R::initiationPotentialOperator>("initiationPotentialOperator",
                                                     "how the terms of the initiation potential are joined")
             .Field<&R::initiationPotentialExponent>("initiationPotentialExponent",
-                                                    "exponent of the initiation potential (no unit)")
+                                                    "exponent of the initiation potential")
+            .Unit("no unit")
             .Field<&R::evolution>("evolution", "damage evolution exists")
             .Field<&R::evolutionType>("evolutionType", "by motion or by energy")
             .Field<&R::softening>("softening", "how force falls, of an evolution by motion")
@@ -475,16 +510,18 @@ const cls_FieldTable& kbeC_ConnectorDamage::Fields() {
             .Field<&R::evolutionTemperatureDependency>("evolutionTemperatureDependency",
                                                        "evolutionTable has a temperature column")
             .Field<&R::evolutionTable>(
-                "evolutionTable",
-                "motion, linear softening: motion at failure; exponential: motion, law parameter; tabular: "
-                "damage variable, motion; energy: dissipated energy; then the mode-mix ratio if criterion 2 "
-                "and modeMixDependency, temperature, field variables")
+                "evolutionTable", "columns: by motion, linear softening: motion at failure; exponential: "
+                                  "motion, law parameter; tabular: damage variable, motion; by energy: "
+                                  "dissipated energy; then the mode-mix ratio if criterion PLASTIC_MOTION "
+                                  "and modeMixDependency, temperature, field variables")
             .Field<&R::evolutionOptions>("evolutionOptions", "regularization group of the evolution")
             .Field<&R::evolutionPotentials>("evolutionPotentials", "terms of the evolution potential")
             .Field<&R::evolutionPotentialOperator>("evolutionPotentialOperator",
                                                    "how the terms of the evolution potential are joined")
             .Field<&R::evolutionPotentialExponent>("evolutionPotentialExponent",
-                                                   "exponent of the evolution potential (no unit)");
+                                                   "exponent of the evolution potential")
+            .Unit("no unit")
+            .Example(R"({"components": [1], "criterion": "MOTION", "initiationTable": [[-10, 10]]})");
     return fields;
 }
 

@@ -95,7 +95,7 @@ class kbeC_ConnectorElasticity final
     : public cls_RecordOf<kbeC_ConnectorElasticity, kbeC_ConnectorBehaviorOption> {
 public:
     static constexpr cls_ClassInfo Class{"kbeC_ConnectorElasticity",
-                                         "Spring-like or rigid behaviour of components."};
+                                         "Spring-like or rigid behaviour of components.", 0, "Elasticity"};
 
     enum class BehaviorEnm : int { LINEAR = 0, NONLINEAR = 1, RIGID = 2 };
     enum class CouplingEnm : int { UNCOUPLED = 0, COUPLED = 1, COUPLED_POSITION = 2 };
@@ -117,7 +117,8 @@ const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorElasticity::CouplingEnm);
 
 class kbeC_ConnectorDamping final : public cls_RecordOf<kbeC_ConnectorDamping, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorDamping", "Dashpot-like behaviour of components."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorDamping", "Dashpot-like behaviour of components.", 0,
+                                         "Damping"};
 
     enum class BehaviorEnm : int { LINEAR = 0, NONLINEAR = 1 };
     enum class CouplingEnm : int { UNCOUPLED = 0, COUPLED = 1, COUPLED_POSITION = 2 };
@@ -139,7 +140,8 @@ const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorDamping::CouplingEnm);
 
 class kbeC_ConnectorStop final : public cls_RecordOf<kbeC_ConnectorStop, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorStop", "Limits of the motion of components."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorStop", "Limits of the motion of components.", 0,
+                                         "Stop"};
 
     static constexpr double maxMotionDef() { return cls_UnsetDouble; }
     static constexpr double minMotionDef() { return cls_UnsetDouble; }
@@ -153,8 +155,8 @@ public:
 
 class kbeC_ConnectorFailure final : public cls_RecordOf<kbeC_ConnectorFailure, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorFailure",
-                                         "Motion or force at which components fail."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorFailure", "Motion or force at which components fail.",
+                                         0, "Failure"};
 
     static constexpr double maxForceDef() { return cls_UnsetDouble; }
     static constexpr double maxMotionDef() { return cls_UnsetDouble; }
@@ -174,7 +176,8 @@ public:
 
 class kbeC_ConnectorLock final : public cls_RecordOf<kbeC_ConnectorLock, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorLock", "Motion or force at which components lock."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorLock", "Motion or force at which components lock.", 0,
+                                         "Lock"};
 
     static constexpr int lockingComponentDef() { return cls_UnsetInt; }
     static constexpr double maxForceDef() { return cls_UnsetDouble; }
@@ -223,7 +226,7 @@ const omu_EnumTable& omu_EnumTableOf(kbeC_TangentialBehavior::SlipToleranceTypeE
 class kbeC_ConnectorFriction final
     : public cls_RecordOf<kbeC_ConnectorFriction, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorFriction", "Friction of a connector."};
+    static constexpr cls_ClassInfo Class{"kbeC_ConnectorFriction", "Friction of a connector.", 0, "Friction"};
 
     enum class FormulationEnm : int { PREDEFINED = 0, USER_DEFINED = 1 };
     enum class ContactForceTypeEnm : int { COMPONENT_NUMBER = 0, DERIVED_COMPONENT = 1 };
@@ -262,7 +265,7 @@ class kbeC_ConnectorPlasticity final
     : public cls_RecordOf<kbeC_ConnectorPlasticity, kbeC_ConnectorBehaviorOption> {
 public:
     static constexpr cls_ClassInfo Class{"kbeC_ConnectorPlasticity",
-                                         "Plasticity of a connector's components."};
+                                         "Plasticity of a connector's components.", 0, "Plasticity"};
 
     enum class PotentialOperatorEnm : int { SUM = 0, MAXIMUM = 1 };
     enum class IsotropicTypeEnm : int { TABULAR = 0, EXPONENTIAL_LAW = 1 };
@@ -295,8 +298,8 @@ const omu_EnumTable& omu_EnumTableOf(kbeC_ConnectorPlasticity::KinematicTypeEnm)
 
 class kbeC_ConnectorDamage final : public cls_RecordOf<kbeC_ConnectorDamage, kbeC_ConnectorBehaviorOption> {
 public:
-    static constexpr cls_ClassInfo Class{"kbeC_ConnectorDamage",
-                                         "Damage initiation and evolution of a connector's components."};
+    static constexpr cls_ClassInfo Class{
+        "kbeC_ConnectorDamage", "Damage initiation and evolution of a connector's components.", 0, "Damage"};
 
     enum class PotentialOperatorEnm : int { SUM = 0, MAXIMUM = 1 };
     enum class CriterionEnm : int { FORCE = 0, MOTION = 1, PLASTIC_MOTION = 2 };

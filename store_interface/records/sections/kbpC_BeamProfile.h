@@ -15,7 +15,7 @@ class kbpC_GeneralizedProfile final : public cls_RecordOf<kbpC_GeneralizedProfil
 public:
     static constexpr cls_ClassInfo Class{
         "kbpC_GeneralizedProfile",
-        "cross-section given by its properties; only a general section writes them"};
+        "cross-section given by its properties; only a general section writes them", 0, "Generalized"};
 
     double area = 0.0;
     double i11 = 0.0;
@@ -30,7 +30,7 @@ public:
 
 class kbpC_CircularProfile final : public cls_RecordOf<kbpC_CircularProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_CircularProfile", "solid circle"};
+    static constexpr cls_ClassInfo Class{"kbpC_CircularProfile", "solid circle", 0, "Circular Circle"};
 
     double r = 0.0;
 
@@ -39,7 +39,7 @@ public:
 
 class kbpC_HexagonalProfile final : public cls_RecordOf<kbpC_HexagonalProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_HexagonalProfile", "hollow hexagon"};
+    static constexpr cls_ClassInfo Class{"kbpC_HexagonalProfile", "hollow hexagon", 0, "Hexagonal Hexagon"};
 
     double r = 0.0;
     double t = 0.0;
@@ -49,7 +49,7 @@ public:
 
 class kbpC_PipeProfile final : public cls_RecordOf<kbpC_PipeProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_PipeProfile", "pipe"};
+    static constexpr cls_ClassInfo Class{"kbpC_PipeProfile", "pipe", 0, "Pipe"};
 
     double r = 0.0;
     double t = 0.0;
@@ -60,7 +60,7 @@ public:
 
 class kbpC_IbeamProfile final : public cls_RecordOf<kbpC_IbeamProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_IbeamProfile", "I section"};
+    static constexpr cls_ClassInfo Class{"kbpC_IbeamProfile", "I section", 0, "I IProfile IBeam"};
 
     double l = 0.0;
     double h = 0.0;
@@ -75,7 +75,7 @@ public:
 
 class kbpC_BoxProfile final : public cls_RecordOf<kbpC_BoxProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_BoxProfile", "hollow rectangle"};
+    static constexpr cls_ClassInfo Class{"kbpC_BoxProfile", "hollow rectangle", 0, "Box"};
 
     double a = 0.0;
     double b = 0.0;
@@ -90,7 +90,8 @@ public:
 
 class kbpC_ArbitraryProfile final : public cls_RecordOf<kbpC_ArbitraryProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_ArbitraryProfile", "thin-walled profile of straight segments"};
+    static constexpr cls_ClassInfo Class{"kbpC_ArbitraryProfile", "thin-walled profile of straight segments",
+                                         0, "Arbitrary"};
 
     cow_2DArray<double> table;
 
@@ -99,7 +100,8 @@ public:
 
 class kbpC_RectangularProfile final : public cls_RecordOf<kbpC_RectangularProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_RectangularProfile", "solid rectangle"};
+    static constexpr cls_ClassInfo Class{"kbpC_RectangularProfile", "solid rectangle", 0,
+                                         "Rectangular Rectangle"};
 
     double a = 0.0;
     double b = 0.0;
@@ -109,7 +111,7 @@ public:
 
 class kbpC_LbeamProfile final : public cls_RecordOf<kbpC_LbeamProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_LbeamProfile", "L section"};
+    static constexpr cls_ClassInfo Class{"kbpC_LbeamProfile", "L section", 0, "L LProfile LBeam"};
 
     double a = 0.0;
     double b = 0.0;
@@ -122,7 +124,8 @@ public:
 class kbpC_TbeamProfile final : public cls_RecordOf<kbpC_TbeamProfile, kbpC_BeamProfile> {
 public:
     static constexpr cls_ClassInfo Class{"kbpC_TbeamProfile",
-                                         "T section; written as an I section without a bottom flange"};
+                                         "T section; written as an I section without a bottom flange", 0,
+                                         "T TProfile TBeam"};
 
     double b = 0.0;
     double h = 0.0;
@@ -135,7 +138,8 @@ public:
 
 class kbpC_TrapezoidalProfile final : public cls_RecordOf<kbpC_TrapezoidalProfile, kbpC_BeamProfile> {
 public:
-    static constexpr cls_ClassInfo Class{"kbpC_TrapezoidalProfile", "solid trapezoid"};
+    static constexpr cls_ClassInfo Class{"kbpC_TrapezoidalProfile", "solid trapezoid", 0,
+                                         "Trapezoidal Trapezoid"};
 
     double a = 0.0;
     double b = 0.0;

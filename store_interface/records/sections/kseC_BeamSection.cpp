@@ -4,9 +4,13 @@
 
 const cls_FieldTable& kseC_TransverseShearBeam::Fields() {
     using R = kseC_TransverseShearBeam;
-    static const cls_FieldTable fields = cls_Describe<R>(cls_Record::Fields())
-                                             .Field<&R::k11>("k11", "force; 0 takes the value of k22")
-                                             .Field<&R::k22>("k22", "force; 0 then takes the value of k11");
+    static const cls_FieldTable fields =
+        cls_Describe<R>(cls_Record::Fields())
+            .Field<&R::k11>("k11", "stiffness in the 1-direction; at zero that of k22")
+            .Unit("force")
+            .Field<&R::k22>("k22", "stiffness in the 2-direction; at zero that of k11")
+            .Unit("force")
+            .Example(R"({"k11": 50000, "k22": 50000})");
     return fields;
 }
 
@@ -33,8 +37,10 @@ const cls_FieldTable& kseC_BeamSection::Fields() {
     using R = kseC_BeamSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_Section::Fields())
-            .Field<&R::integration>("integration", "1: '*Beam Section'; 0: '*Beam General Section'")
-            .Field<&R::poisson>("poisson", "section Poisson's ratio (no unit); unset or 0.0: not written")
+            .Field<&R::integration>("integration", "whether the section is integrated during the analysis "
+                                                   "('*Beam Section') or before it ('*Beam General Section')")
+            .Field<&R::poisson>("poisson", "section Poisson's ratio; unset or 0.0: not written")
+            .Unit("no unit")
             .Field<&R::temperatureDependency>(
                 "temperatureDependency",
                 "materialTable has the cell of column 2 (0-based); false: a blank column is put there")
@@ -43,32 +49,38 @@ const cls_FieldTable& kseC_BeamSection::Fields() {
                 "materialTable has the cell of column 3 (0-based); false: a blank column is put there")
             .Field<&R::dependencies>("dependencies", "number of field variables of materialTable, its last "
                                                      "columns; written by a general section if positive")
-            .Field<&R::density>("density", "mass per volume, general section only; unset or 0.0: not written")
-            .Field<&R::referenceTemperature>("referenceTemperature",
-                                             "temperature of zero thermal expansion, general section only, "
-                                             "'zero='; unset or 0.0: not written")
+            .Field<&R::density>("density", "density, of a general section only; unset or 0.0: not written")
+            .Unit("mass/volume")
+            .Field<&R::referenceTemperature>(
+                "referenceTemperature",
+                "temperature of zero thermal expansion, of a general section only; unset or 0.0: not written")
+            .Unit("temperature")
             .Field<&R::temperatureVar>("temperatureVar",
                                        "how temperatures are given, integrated section only")
-            .Field<&R::alphaDamping>("alphaDamping",
-                                     "mass-proportional damping (1/time), general section only")
-            .Field<&R::betaDamping>("betaDamping",
-                                    "stiffness-proportional damping (time), general section only")
+            .Field<&R::alphaDamping>("alphaDamping", "mass-proportional damping, general section only")
+            .Unit("1/time")
+            .Field<&R::betaDamping>("betaDamping", "stiffness-proportional damping, general section only")
+            .Unit("time")
             .Field<&R::compositeDamping>("compositeDamping",
-                                         "fraction of critical damping (no unit), general section only")
+                                         "fraction of critical damping, general section only")
+            .Unit("no unit")
             .Field<&R::useFluidInertia>("useFluidInertia", "true: '*Beam Fluid Inertia' is written")
-            .Field<&R::fluidInertiaHalf>("fluidInertiaHalf", "1 writes ', half'")
-            .Field<&R::fluidValue1>("fluidValue1", "mass per volume of the fluid; first item of the line")
-            .Field<&R::fluidValue2>("fluidValue2", "length; radius of the wetted cross-section; fourth item")
-            .Field<&R::fluidValue3>(
-                "fluidValue3", "coefficient of lateral added mass (no unit); fifth item, 1.0 is left out")
-            .Field<&R::fluidValue4>(
-                "fluidValue4", "coefficient of added mass at the ends (no unit); sixth item, 0.0 is left out")
-            .Field<&R::fluidValue5>(
-                "fluidValue5",
-                "length; local 1-coordinate of the cross-section's centre; second item, 0.0 leaves it blank")
-            .Field<&R::fluidValue6>(
-                "fluidValue6",
-                "length; local 2-coordinate of the cross-section's centre; third item, 0.0 leaves it blank")
+            .Field<&R::fluidInertiaHalf>(
+                "fluidInertiaHalf", "whether the beam is immersed in full or half, which writes ', half'")
+            .Field<&R::fluidValue1>("fluidValue1", "density of the fluid")
+            .Unit("mass/volume")
+            .Field<&R::fluidValue2>("fluidValue2", "radius of the wetted cross-section")
+            .Unit("length")
+            .Field<&R::fluidValue3>("fluidValue3", "coefficient of lateral added mass; 1.0 is left out")
+            .Unit("no unit")
+            .Field<&R::fluidValue4>("fluidValue4", "coefficient of added mass at the ends; 0.0 is left out")
+            .Unit("no unit")
+            .Field<&R::fluidValue5>("fluidValue5",
+                                    "local 1-coordinate of the cross-section's centre; 0.0 leaves it blank")
+            .Unit("length")
+            .Field<&R::fluidValue6>("fluidValue6",
+                                    "local 2-coordinate of the cross-section's centre; 0.0 leaves it blank")
+            .Unit("length")
             .Field<&R::profileName>("profileName", "key in the model's profile map")
             .Required()
             .RefersTo("profile")
@@ -82,10 +94,14 @@ const cls_FieldTable& kseC_BeamSection::Fields() {
                 "sectionPoints",
                 "rows (x, y) in the local axes of the profile, lengths; general section only")
             .Field<&R::centroid>(
-                "centroid", "x, y (lengths): centroid; general section only; empty or zeros: nothing written")
+                "centroid", "centroid (x, y), of a general section only; empty or zeros: nothing written")
+            .Unit("length")
             .Field<&R::shearCenter>(
                 "shearCenter",
-                "x, y (lengths): shear centre; general section only; empty or zeros: nothing written");
+                "shear centre (x, y), of a general section only; empty or zeros: nothing written")
+            .Unit("length")
+            .Example(
+                R"({"profileName": "Round", "materialName": "Steel", "integration": "DURING_ANALYSIS"})");
     return fields;
 }
 

@@ -20,7 +20,7 @@ public:
 class kseC_BeamSection final : public cls_RecordOf<kseC_BeamSection, kseC_Section> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kseC_BeamSection", "beam elements: profile, material or material constants, and options"};
+        "kseC_BeamSection", "beam elements: profile, material or material constants, and options", 0, "Beam"};
 
     enum class IntegrationEnm : int { BEFORE_ANALYSIS = 0, DURING_ANALYSIS = 1 };
     enum class TemperatureVarEnm : int { GRADIENTS = 0, VALUES = 1 };

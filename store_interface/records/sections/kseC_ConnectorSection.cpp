@@ -98,19 +98,25 @@ const cls_FieldTable& kseC_ConnectorSection::Fields() {
             .Field<&R::useBehaviorRegularization>("useBehaviorRegularization",
                                                   "the tolerance of the analysis holds, not regularization")
             .Field<&R::regularization>("regularization", "tolerance of regularized tables, as a fraction")
+            .Unit("no unit")
             .Field<&R::extrapolationLinear>("extrapolationLinear", "tables are extrapolated linearly")
             .Field<&R::integrationExplicit>("integrationExplicit", "the behaviour is integrated explicitly")
             .Field<&R::contactAngle>("contactAngle",
                                      "angle of contact around the ring of a slipring, passed unchanged")
+            .Unit("radians")
             .Field<&R::materialFlowFactor>("materialFlowFactor",
-                                           "factor that turns material flow into rotation (no unit)")
+                                           "factor that turns material flow into rotation")
+            .Unit("no unit")
             .Field<&R::massPerLength>("massPerLength", "mass per reference length of the belt of a slipring")
+            .Unit("mass/length")
             .Field<&R::constitutiveReference>(
                 "constitutiveReference", "exactly six: reference lengths of components 1 to 3, reference "
-                                         "angles of components 4 to 6 in degrees; null for one that is unset")
+                                         "angles of components 4 to 6; null for one that is unset")
+            .Unit("length or degrees")
             .Length(6)
             .DefaultItems<UnsetReference>()
-            .Field<&R::options>("options", "options of the behaviour, in the user's order");
+            .Field<&R::options>("options", "options of the behaviour, in the user's order")
+            .Example(R"({"assembledType": "HINGE"})");
     return fields;
 }
 

@@ -9,7 +9,8 @@ class cls_ClassRegistrar;
 class kseC_ConnectorSection final : public cls_RecordOf<kseC_ConnectorSection, kseC_Section> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kseC_ConnectorSection", "Connector elements of the assembly: kind of connection and behaviour."};
+        "kseC_ConnectorSection", "Connector elements of the assembly: kind of connection and behaviour.", 0,
+        "Connector"};
 
     enum class AssembledTypeEnm : int {
         NONE = 0,

@@ -6,21 +6,27 @@ const cls_FieldTable& kseC_RebarLayer::Fields() {
     using R = kseC_RebarLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::area>("area", "area of one bar (length squared)")
+            .Field<&R::area>("area", "area of one bar")
+            .Unit("length^2")
             .Field<&R::orientationName>("orientationName",
                                         "name of the layer's own orientation; non-empty: the layer gets a "
                                         "'*Rebar Layer' of its own and no angle")
             .RefersTo("orientation")
-            .Field<&R::orientationAngle>("orientationAngle", "angle in degrees of the bars")
-            .Field<&R::spacing>("spacing", "length; distance of the bars, written with spacingType 0")
-            .Field<&R::position>("position", "length; distance of the layer from the mid-surface")
-            .Field<&R::angularSpacing>(
-                "angularSpacing", "angle in degrees between the bars, written with any spacingType but 0")
+            .Field<&R::orientationAngle>("orientationAngle", "angle of the bars")
+            .Unit("degrees")
+            .Field<&R::spacing>("spacing", "distance of the bars, of a CONSTANT spacing")
+            .Unit("length")
+            .Field<&R::position>("position", "distance of the layer from the mid-surface")
+            .Unit("length")
+            .Field<&R::angularSpacing>("angularSpacing", "angle between the bars, of an ANGULAR spacing")
+            .Unit("degrees")
             .Field<&R::name>("name", "name of the layer, first item of its data line")
             .Required()
             .Field<&R::materialName>("materialName", "material of the bars")
             .Required()
-            .RefersTo("material");
+            .RefersTo("material")
+            .Example(
+                R"({"name": "BARS", "materialName": "Steel", "area": 50, "spacing": 150, "position": 40})");
     return fields;
 }
 
@@ -34,8 +40,10 @@ const cls_FieldTable& kseC_RebarLayers::Fields() {
     using R = kseC_RebarLayers;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::spacingType>("spacingType", "1: 'angular spacing' is written")
-            .Field<&R::layers>("layers", "the layers; empty: nothing is written");
+            .Field<&R::spacingType>("spacingType", "whether bars have a distance or an angle between them")
+            .Field<&R::layers>("layers", "the layers; empty: nothing is written")
+            .Example(
+                R"({"layers": [{"name": "BARS", "materialName": "Steel", "area": 50, "spacing": 150}]})");
     return fields;
 }
 
@@ -43,9 +51,13 @@ const cls_FieldTable& kseC_TransverseShearShell::Fields() {
     using R = kseC_TransverseShearShell;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::k11>("k11", "force per length; 0 takes the value of k22")
-            .Field<&R::k22>("k22", "force per length; 0 then takes the value of k11")
-            .Field<&R::k12>("k12", "force per length; always written");
+            .Field<&R::k11>("k11", "stiffness in the 1-direction; at zero that of k22")
+            .Unit("force/length")
+            .Field<&R::k22>("k22", "stiffness in the 2-direction; at zero that of k11")
+            .Unit("force/length")
+            .Field<&R::k12>("k12", "coupling stiffness; always written")
+            .Unit("force/length")
+            .Example(R"({"k11": 8000, "k22": 8000})");
     return fields;
 }
 
@@ -115,21 +127,24 @@ const cls_FieldTable& kseC_GeometryShellSection::Fields() {
                 "useGeneralKeyword",
                 "true: '*Shell General Section' (properties computed before the analysis, no integration "
                 "points on the data lines); false: '*Shell Section'")
-            .Field<&R::poissonDefinition>("poissonDefinition",
-                                          "0 the solver's own change of thickness, else `poisson` is written")
-            .Field<&R::poisson>("poisson",
-                                "section Poisson's ratio (no unit), read only if poissonDefinition isn't 0")
+            .Field<&R::poissonDefinition>(
+                "poissonDefinition",
+                "whether the solver's own change of thickness holds or `poisson`, which is then written")
+            .Field<&R::poisson>("poisson", "section Poisson's ratio, read only if poissonDefinition is VALUE")
+            .Unit("no unit")
             .Field<&R::integrationRule>("integrationRule",
-                                        "rule through the thickness; 0 writes no parameter")
+                                        "rule of integration through the thickness; SIMPSON is not written")
             .Field<&R::temperatureMode>("temperatureMode",
-                                        "1: 'temperature=' and temperaturePoints are written")
+                                        "how temperatures are given through the thickness; POINTWISE writes "
+                                        "'temperature=' with temperaturePoints")
             .Field<&R::temperaturePoints>(
                 "temperaturePoints",
-                "number of temperature points through the thickness, read only with temperatureMode 1")
+                "number of temperature points through the thickness, read only with POINTWISE")
             .Field<&R::thicknessModulus>(
                 "thicknessModulus",
-                "stress; effective modulus in thickness direction. Unset: no 'thickness modulus=' and no "
-                "'stack direction='; set but not positive: only 'stack direction=' can be written")
+                "effective modulus in thickness direction; unset: no 'thickness modulus=' and no 'stack "
+                "direction='; set but not positive: only 'stack direction=' can be written")
+            .Unit("stress")
             .Field<&R::rebars>("rebars", "rebar layers of the shell")
             .Field<&R::transverseShear>(
                 "transverseShear",
@@ -141,13 +156,15 @@ const cls_FieldTable& kseC_HomogenousShellSection::Fields() {
     using R = kseC_HomogenousShellSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_GeometryShellSection::Fields())
-            .Field<&R::thickness>("thickness", "length; shell thickness")
+            .Field<&R::thickness>("thickness", "shell thickness")
+            .Unit("length")
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points through the thickness; not written with useGeneralKeyword")
             .Field<&R::materialName>("materialName", "material")
             .Required()
-            .RefersTo("material");
+            .RefersTo("material")
+            .Example(R"({"materialName": "Steel", "thickness": 2})");
     return fields;
 }
 
@@ -155,7 +172,8 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
     using R = kseC_CompositeShellLayer;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::thickness>("thickness", "length; thickness of the layer")
+            .Field<&R::thickness>("thickness", "thickness of the layer")
+            .Unit("length")
             .Field<&R::integrationPoints>(
                 "integrationPoints",
                 "number of integration points of the layer; not written with useGeneralKeyword")
@@ -168,7 +186,9 @@ const cls_FieldTable& kseC_CompositeShellLayer::Fields() {
             .RefersTo("orientation")
             .Field<&R::orientationAngle>(
                 "orientationAngle",
-                "angle in degrees to the section's orientation; written when orientationName is empty");
+                "angle to the section's orientation; written when orientationName is empty")
+            .Unit("degrees")
+            .Example(R"({"materialName": "Ply", "thickness": 0.25, "orientationAngle": 45})");
     return fields;
 }
 
@@ -176,7 +196,9 @@ const cls_FieldTable& kseC_CompositeShellSection::Fields() {
     using R = kseC_CompositeShellSection;
     static const cls_FieldTable fields =
         cls_Describe<R>(kseC_GeometryShellSection::Fields())
-            .Field<&R::layers>("layers", "layers in stacking order, from the bottom side up");
+            .Field<&R::layers>("layers", "layers in stacking order, from the bottom side up")
+            .Example(
+                R"({"layers": [{"materialName": "Ply", "thickness": 0.25}, {"materialName": "Ply", "thickness": 0.25, "orientationAngle": 90}]})");
     return fields;
 }
 

@@ -88,7 +88,8 @@ const omu_EnumTable& omu_EnumTableOf(kseC_GeometryShellSection::TemperatureModeE
 class kseC_HomogenousShellSection final
     : public cls_RecordOf<kseC_HomogenousShellSection, kseC_GeometryShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_HomogenousShellSection", "shell of one material"};
+    static constexpr cls_ClassInfo Class{"kseC_HomogenousShellSection", "shell of one material", 0,
+                                         "ShellSection HomogeneousShellSection"};
 
     double thickness = 0.0;
     int integrationPoints = 5;
@@ -115,7 +116,8 @@ public:
 class kseC_CompositeShellSection final
     : public cls_RecordOf<kseC_CompositeShellSection, kseC_GeometryShellSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_CompositeShellSection", "shell of stacked layers"};
+    static constexpr cls_ClassInfo Class{"kseC_CompositeShellSection", "shell of stacked layers", 0,
+                                         "CompositeShell"};
 
     cow_List<kseC_CompositeShellLayer> layers;
 
@@ -127,13 +129,15 @@ public:
 class kseC_GeneralShellSection final : public cls_RecordOf<kseC_GeneralShellSection, kseC_ShellSection> {
 public:
     static constexpr cls_ClassInfo Class{"kseC_GeneralShellSection",
-                                         "shell of given stiffness; no deck can be written of it"};
+                                         "shell of given stiffness; no deck can be written of it", 0,
+                                         "GeneralShell"};
 };
 
 class kseC_UserShellSection final : public cls_RecordOf<kseC_UserShellSection, kseC_ShellSection> {
 public:
     static constexpr cls_ClassInfo Class{
-        "kseC_UserShellSection", "shell whose behaviour comes from user code; no deck can be written of it"};
+        "kseC_UserShellSection", "shell whose behaviour comes from user code; no deck can be written of it",
+        0, "UserShell"};
 
     bool symmetric = true;
 

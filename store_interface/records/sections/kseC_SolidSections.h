@@ -13,7 +13,8 @@ public:
 class kseC_HomogenousSolidSection final
     : public cls_RecordOf<kseC_HomogenousSolidSection, kseC_SolidSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_HomogenousSolidSection", "continuum elements of one material"};
+    static constexpr cls_ClassInfo Class{"kseC_HomogenousSolidSection", "continuum elements of one material",
+                                         0, "SolidSection HomogeneousSolidSection"};
 
     double thickness = 1.0;
     cow_String materialName;
@@ -38,8 +39,8 @@ public:
 
 class kseC_CompositeSolidSection final : public cls_RecordOf<kseC_CompositeSolidSection, kseC_SolidSection> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_CompositeSolidSection",
-                                         "continuum elements of stacked layers"};
+    static constexpr cls_ClassInfo Class{"kseC_CompositeSolidSection", "continuum elements of stacked layers",
+                                         0, "CompositeSolid"};
 
     bool symmetric = false;
     cow_List<kseC_CompositeSolidLayer> layers;
@@ -49,7 +50,7 @@ public:
 
 class kseC_TrussSection final : public cls_RecordOf<kseC_TrussSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_TrussSection", "truss elements"};
+    static constexpr cls_ClassInfo Class{"kseC_TrussSection", "truss elements", 0, "Truss"};
 
     double area = 1.0;
     cow_String materialName;
@@ -61,7 +62,7 @@ public:
 
 class kseC_MembraneSection final : public cls_RecordOf<kseC_MembraneSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_MembraneSection", "membrane elements"};
+    static constexpr cls_ClassInfo Class{"kseC_MembraneSection", "membrane elements", 0, "Membrane"};
 
     enum class PoissonDefinitionEnm : int { DEFAULT = 0, VALUE = 1 };
 
@@ -80,7 +81,7 @@ const omu_EnumTable& omu_EnumTableOf(kseC_MembraneSection::PoissonDefinitionEnm)
 
 class kseC_GasketSection final : public cls_RecordOf<kseC_GasketSection, kseC_Section> {
 public:
-    static constexpr cls_ClassInfo Class{"kseC_GasketSection", "gasket elements"};
+    static constexpr cls_ClassInfo Class{"kseC_GasketSection", "gasket elements", 0, "Gasket"};
 
     static constexpr double initialThicknessDef() { return cls_UnsetDouble; }
     static constexpr double stabilizationStiffnessDef() { return cls_UnsetDouble; }

@@ -20,6 +20,7 @@ const cls_FieldTable& klcC_LoadCase::Fields() {
                 "boundary conditions of the base state that bcs does not name act in the case too, "
                 "with the factor 1")
             .Field<&klcC_LoadCase::loadsAreStepLoads>("loadsAreStepLoads",
-                                                      "the case takes no loads of its own");
+                                                      "the case takes no loads of its own")
+            .Example(R"({"loads": {"Pressure": 1.35}})");
     return fields;
 }

@@ -71,11 +71,17 @@ const cls_FieldTable& kprC_PrimaryControls::Fields() {
             .Field<&R::useDefault>("useDefault", "true: nothing at all is written, not even the comment")
             .Field<&R::resetOnly>("resetOnly", "true: the controls are reset and nothing else")
             .Field<&R::discontinuous>("discontinuous", "settings for a severely discontinuous response")
-            .Field<&R::timeIncrementation>("timeIncrementation", "27 entries, the first 11 integers")
+            .Field<&R::timeIncrementation>("timeIncrementation",
+                                           "parameters of time incrementation in the solver's order, up to "
+                                           "27, the first 11 whole numbers")
+            .Unit("as the solver's manual says")
             .DefaultItems<DefaultTimeIncrementationItems>()
-            .Field<&R::constraints>("constraints", "9 tolerances")
+            .Field<&R::constraints>("constraints", "tolerances of constraints in the solver's order, up to 9")
+            .Unit("as the solver's manual says")
             .DefaultItems<DefaultConstraintsItems>()
-            .Field<&R::lineSearch>("lineSearch", "5 entries")
+            .Field<&R::lineSearch>("lineSearch",
+                                   "parameters of the line search in the solver's order, up to 5")
+            .Unit("no unit")
             .DefaultItems<DefaultLineSearchItems>()
             .Field<&R::quasiNewtonMaxIterations>(
                 "quasiNewtonMaxIterations",
@@ -88,13 +94,19 @@ const cls_FieldTable& kprC_TypicalControls::Fields() {
     using R = kprC_TypicalControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_PrimaryControls::Fields())
-            .Field<&R::displacement>("displacement", "convergence of the displacement field")
+            .Field<&R::displacement>("displacement",
+                                     "tolerances of the displacement field in the solver's order")
+            .Unit("as the solver's manual says")
             .DefaultItems<DefaultDisplacementItems>()
-            .Field<&R::hydrostaticFluidPressure>("hydrostaticFluidPressure",
-                                                 "convergence of the hydrostatic fluid pressure field")
+            .Field<&R::hydrostaticFluidPressure>(
+                "hydrostaticFluidPressure",
+                "tolerances of the hydrostatic fluid pressure field in the solver's order")
+            .Unit("as the solver's manual says")
             .DefaultItems<DefaultFieldItems>()
-            .Field<&R::rotation>("rotation", "convergence of the rotation field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::rotation>("rotation", "tolerances of the rotation field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -102,8 +114,11 @@ const cls_FieldTable& kprC_HeatTransferControls::Fields() {
     using R = kprC_HeatTransferControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_PrimaryControls::Fields())
-            .Field<&R::temperature>("temperature", "convergence of the temperature field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::temperature>("temperature",
+                                    "tolerances of the temperature field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -111,8 +126,11 @@ const cls_FieldTable& kprC_MassDiffusionControls::Fields() {
     using R = kprC_MassDiffusionControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_PrimaryControls::Fields())
-            .Field<&R::concentration>("concentration", "convergence of the concentration field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::concentration>("concentration",
+                                      "tolerances of the concentration field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -120,8 +138,11 @@ const cls_FieldTable& kprC_CTDControls::Fields() {
     using R = kprC_CTDControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_TypicalControls::Fields())
-            .Field<&R::temperature>("temperature", "convergence of the temperature field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::temperature>("temperature",
+                                    "tolerances of the temperature field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -129,8 +150,11 @@ const cls_FieldTable& kprC_PoreControls::Fields() {
     using R = kprC_PoreControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_TypicalControls::Fields())
-            .Field<&R::poreFluidPressure>("poreFluidPressure", "convergence of the pore fluid pressure field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::poreFluidPressure>("poreFluidPressure",
+                                          "tolerances of the pore fluid pressure field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -138,9 +162,11 @@ const cls_FieldTable& kprC_ElectricalControls::Fields() {
     using R = kprC_ElectricalControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_TypicalControls::Fields())
-            .Field<&R::electricalPotential>("electricalPotential",
-                                            "convergence of the electrical potential field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::electricalPotential>(
+                "electricalPotential", "tolerances of the electrical potential field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -148,9 +174,11 @@ const cls_FieldTable& kprC_CTEControls::Fields() {
     using R = kprC_CTEControls;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_HeatTransferControls::Fields())
-            .Field<&R::electricalPotential>("electricalPotential",
-                                            "convergence of the electrical potential field")
-            .DefaultItems<DefaultFieldItems>();
+            .Field<&R::electricalPotential>(
+                "electricalPotential", "tolerances of the electrical potential field in the solver's order")
+            .Unit("as the solver's manual says")
+            .DefaultItems<DefaultFieldItems>()
+            .Example(R"({"lineSearch": [4]})");
     return fields;
 }
 
@@ -161,8 +189,10 @@ const cls_FieldTable& kprC_LinearCtrl::Fields() {
             .Field<&R::useDefault>("useDefault", "true: nothing at all is written, not even the comment")
             .Field<&R::resetOnly>("resetOnly", "true: only '*Solver Controls, reset'")
             .Field<&R::relativeTolerance>("relativeTolerance",
-                                          "relative convergence tolerance (no unit); 0 is not written")
-            .Field<&R::maxIterations>("maxIterations", "largest number of iterations; 0 is not written");
+                                          "relative convergence tolerance; zero is not written")
+            .Unit("no unit")
+            .Field<&R::maxIterations>("maxIterations", "largest number of iterations; zero is not written")
+            .Example(R"({"relativeTolerance": 1e-4})");
     return fields;
 }
 

@@ -42,7 +42,7 @@ public:
 class kprC_TypicalControls : public cls_RecordOf<kprC_TypicalControls, kprC_PrimaryControls> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_TypicalControls",
-                                         "Controls of stress/displacement procedures."};
+                                         "Controls of stress/displacement procedures.", 0, "StressControls"};
 
     cow_List<double> displacement = fieldDef(true);
     cow_List<double> hydrostaticFluidPressure = fieldDef(false);
@@ -74,7 +74,8 @@ public:
 
 class kprC_CTDControls final : public cls_RecordOf<kprC_CTDControls, kprC_TypicalControls> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_CTDControls", "Controls of coupled temperature-displacement."};
+    static constexpr cls_ClassInfo Class{"kprC_CTDControls", "Controls of coupled temperature-displacement.",
+                                         0, "CoupledTempDisplacementControls"};
 
     cow_List<double> temperature = fieldDef(false);
 
@@ -104,7 +105,8 @@ public:
 class kprC_CTEControls final : public cls_RecordOf<kprC_CTEControls, kprC_HeatTransferControls> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_CTEControls",
-                                         "Controls of coupled thermal-electrical conduction."};
+                                         "Controls of coupled thermal-electrical conduction.", 0,
+                                         "CoupledThermalElectricControls"};
 
     cow_List<double> electricalPotential = fieldDef(false);
 

@@ -46,27 +46,35 @@ const cls_FieldTable& kprC_MassScaling::Fields() {
     using R = kprC_MassScaling;
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
-            .Field<&R::type>(
-                "type",
-                "0 semi-automatic, 1 automatic (rolling), 2 reinitialise mass, 3 disable throughout the step")
+            .Field<&R::type>("type", "how mass is scaled: SEMI_AUTOMATIC, AUTOMATIC for rolling, given back, "
+                                     "or not at all in the step")
             .Field<&R::region>("region", "element set that is scaled")
-            .Field<&R::frequency>("frequency", "increments between two scalings; 0 = by numberInterval")
-            .Field<&R::dt>("dt", "wanted stable time increment (time); 0 is not written")
-            .Field<&R::factor>("factor", "mass factor (no unit), fixed form only; 0 is not written")
+            .Field<&R::frequency>("frequency",
+                                  "increments between two scalings; at zero numberInterval says it")
+            .Field<&R::dt>("dt", "wanted stable time increment; zero is not written")
+            .Unit("time")
+            .Field<&R::factor>("factor", "mass factor, of the fixed form only; zero is not written")
+            .Unit("no unit")
             .Field<&R::numberInterval>("numberInterval", "number of scalings, evenly spread over the step")
-            .Field<&R::frequencyKind>("frequencyKind", "1: the recurrence of type 0 is written (a user gives "
-                                                       "it with throughoutStep); type 1 does not look at it")
-            .Field<&R::feedRate>("feedRate", "rolling: velocity of the rolled piece (length/time)")
+            .Field<&R::frequencyKind>("frequencyKind",
+                                      "NUMBER_INTERVAL: the recurrence of SEMI_AUTOMATIC is written, which "
+                                      "goes with throughoutStep; AUTOMATIC does not look at it")
+            .Field<&R::feedRate>("feedRate", "rolling: velocity of the rolled piece")
+            .Unit("length/time")
             .Field<&R::extrudedLength>("extrudedLength",
-                                       "rolling: element length along the rolling direction (length)")
+                                       "rolling: element length along the rolling direction")
+            .Unit("length")
             .Field<&R::crossSection>(
                 "crossSection",
-                "rolling: number of nodes in the cross-section, written truncated to an integer")
-            .Field<&R::direction>("direction", "rolling direction: 0, 1, 2 = X, Y, Z, 3 none")
+                "rolling: number of nodes in the cross-section, cut to a whole number in the deck")
+            .Unit("no unit")
+            .Field<&R::direction>("direction", "rolling direction")
             .Field<&R::wholeModel>("wholeModel", "true: the whole model, region is not looked at")
-            .Field<&R::dtType>("dtType", "the dt rule: 0 uniform, 1 below min, 2 set equal dt, 3 nonuniform")
-            .Field<&R::throughoutStep>("throughoutStep", "type 0: false = once at the beginning of the step "
-                                                         "(fixed), true = throughout the step (variable)");
+            .Field<&R::dtType>("dtType", "how elements are scaled to the wanted increment")
+            .Field<&R::throughoutStep>(
+                "throughoutStep",
+                "with SEMI_AUTOMATIC: scaling throughout the step, not just at its beginning")
+            .Example(R"({"wholeModel": true, "factor": 4})");
     return fields;
 }
 
@@ -87,15 +95,19 @@ const cls_FieldTable& kprC_ImplicitDynamicsStep::Fields() {
             .With(kprC_TimeIncrementFields)
             .Field<&R::haftol>(
                 "haftol",
-                "half-increment residual tolerance (force); always written by any method but the direct one")
+                "half-increment residual tolerance; always written by any method but the direct one")
+            .Unit("force")
             .Field<&R::nohaf>("nohaf", "direct method only: no half-increment residual")
             .With(kprC_StepAmplitudeField)
-            .Field<&R::extrapolation>("extrapolation",
-                                      "4 is not written; else 1 prints PARABOLIC, any other value NO")
-            .Field<&R::alpha>("alpha", "numerical damping of the integration operator (no unit)")
+            .Field<&R::extrapolation>(
+                "extrapolation", "how the solution is extrapolated from increment to increment; "
+                                 "PROCEDURE_DEFAULT is not written, and any other than PARABOLIC prints NO")
+            .Field<&R::alpha>("alpha", "numerical damping of the integration operator")
+            .Unit("no unit")
             .With(kprC_NoStopField)
             .Field<&R::initialConditions>("initialConditions",
-                                          "2 none: the computation of initial accelerations is bypassed");
+                                          "NONE bypasses the computation of initial accelerations")
+            .Example(R"({"timePeriod": 0.1, "initialInc": 0.001})");
     return fields;
 }
 
@@ -112,20 +124,25 @@ const cls_FieldTable& kprC_ExplicitDynamicsStep::Fields() {
     using R = kprC_ExplicitDynamicsStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::timeIncrementationMethod>(
-                "timeIncrementationMethod",
-                "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
+            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
+                                                 "how the stable time increment is found")
             .With(kprC_AdiabaticField)
             .With(kprC_TimePeriodField)
-            .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
-            .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
+            .Field<&R::initialInc>("initialInc", "time increment of direct user control")
+            .Unit("time")
+            .Field<&R::maxIncrement>("maxIncrement",
+                                     "largest time increment, of AUTOMATIC and ELEMENT_BY_ELEMENT")
+            .Unit("time")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
-            .Field<&R::linearBulkViscosity>("linearBulkViscosity",
-                                            "linear bulk viscosity coefficient (no unit)")
+            .Unit("no unit")
+            .Field<&R::linearBulkViscosity>("linearBulkViscosity", "linear bulk viscosity coefficient")
+            .Unit("no unit")
             .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
-                                               "quadratic bulk viscosity coefficient (no unit)")
+                                               "quadratic bulk viscosity coefficient")
+            .Unit("no unit")
             .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
-            .With(kprC_NlgeomField);
+            .With(kprC_NlgeomField)
+            .Example(R"({"timePeriod": 0.01})");
     return fields;
 }
 
@@ -133,19 +150,24 @@ const cls_FieldTable& kprC_TempDisplacementDynamicsStep::Fields() {
     using R = kprC_TempDisplacementDynamicsStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::timeIncrementationMethod>(
-                "timeIncrementationMethod",
-                "0 automatic, 1 direct user control, 2 element by element, 3 fixed")
+            .Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
+                                                 "how the stable time increment is found")
             .With(kprC_TimePeriodField)
-            .Field<&R::initialInc>("initialInc", "time increment of direct user control (time)")
-            .Field<&R::maxIncrement>("maxIncrement", "largest time increment (time), methods 0 and 2")
+            .Field<&R::initialInc>("initialInc", "time increment of direct user control")
+            .Unit("time")
+            .Field<&R::maxIncrement>("maxIncrement",
+                                     "largest time increment, of AUTOMATIC and ELEMENT_BY_ELEMENT")
+            .Unit("time")
             .Field<&R::scaleFactor>("scaleFactor", "factor on the stable time increment; 1.0 is not written")
-            .Field<&R::linearBulkViscosity>("linearBulkViscosity",
-                                            "linear bulk viscosity coefficient (no unit)")
+            .Unit("no unit")
+            .Field<&R::linearBulkViscosity>("linearBulkViscosity", "linear bulk viscosity coefficient")
+            .Unit("no unit")
             .Field<&R::quadraticBulkViscosity>("quadraticBulkViscosity",
-                                               "quadratic bulk viscosity coefficient (no unit)")
+                                               "quadratic bulk viscosity coefficient")
+            .Unit("no unit")
             .Field<&R::massScaling>("massScaling", "mass scaling definitions, written in list order")
-            .With(kprC_NlgeomField);
+            .With(kprC_NlgeomField)
+            .Example(R"({"timePeriod": 0.01})");
     return fields;
 }
 
@@ -154,11 +176,14 @@ const cls_FieldTable& kprC_SubspaceDynamicsStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .With(kprC_NlgeomField)
-            .Field<&R::vectors>("vectors", "number of modes used; 0 = all, then no *Select Eigenmodes")
+            .Field<&R::vectors>("vectors",
+                                "number of modes used; zero takes all and writes no '*Select Eigenmodes'")
             .With(kprC_TimePeriodField)
-            .Field<&R::initialInc>("initialInc", "fixed time increment (time)")
+            .Field<&R::initialInc>("initialInc", "fixed time increment")
+            .Unit("time")
             .With(kprC_MaxNumIncField)
-            .With(kprC_StepAmplitudeField);
+            .With(kprC_StepAmplitudeField)
+            .Example(R"({"timePeriod": 0.1, "initialInc": 0.001})");
     return fields;
 }
 

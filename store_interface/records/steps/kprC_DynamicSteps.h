@@ -55,7 +55,8 @@ const omu_EnumTable& omu_EnumTableOf(kprC_MassScaling::FrequencyKindEnm);
 class kprC_ImplicitDynamicsStep final : public kprC_ProcedureOf<kprC_ImplicitDynamicsStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_ImplicitDynamicsStep",
-                                         "Dynamics by implicit direct integration.", 0x23C006D};
+                                         "Dynamics by implicit direct integration.", 0x23C006D,
+                                         "ImplicitDynamics DynamicImplicit"};
 
     enum class InitialConditionsEnm : int { DEFAULT = 0, COMPUTE = 1, NONE = 2 };
 
@@ -86,7 +87,8 @@ const omu_EnumTable& omu_EnumTableOf(kprC_ImplicitDynamicsStep::InitialCondition
 
 class kprC_ExplicitDynamicsStep final : public kprC_ProcedureOf<kprC_ExplicitDynamicsStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_ExplicitDynamicsStep", "Explicit dynamics.", 0x23C0069};
+    static constexpr cls_ClassInfo Class{"kprC_ExplicitDynamicsStep", "Explicit dynamics.", 0x23C0069,
+                                         "ExplicitDynamics DynamicExplicit"};
 
     enum class TimeIncrementationEnm : int {
         AUTOMATIC = 0,
@@ -116,7 +118,8 @@ const omu_EnumTable& omu_EnumTableOf(kprC_ExplicitDynamicsStep::TimeIncrementati
 class kprC_TempDisplacementDynamicsStep final : public kprC_ProcedureOf<kprC_TempDisplacementDynamicsStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_TempDisplacementDynamicsStep",
-                                         "Explicit fully coupled thermal-stress analysis.", 0x23C007B};
+                                         "Explicit fully coupled thermal-stress analysis.", 0x23C007B,
+                                         "TempDisplacementDynamics"};
 
     kprC_ExplicitDynamicsStep::TimeIncrementationEnm timeIncrementationMethod =
         kprC_ExplicitDynamicsStep::TimeIncrementationEnm::AUTOMATIC;
@@ -139,7 +142,8 @@ class kprC_SubspaceDynamicsStep final : public kprC_ProcedureOf<kprC_SubspaceDyn
 public:
     static constexpr cls_ClassInfo Class{
         "kprC_SubspaceDynamicsStep",
-        "Explicit integration of the equations projected on the modes of an earlier step.", 0x23C0078};
+        "Explicit integration of the equations projected on the modes of an earlier step.", 0x23C0078,
+        "SubspaceDynamics"};
 
     static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
     static constexpr int maxNumIncDef() { return 100; }

@@ -5,29 +5,33 @@
 
 const cls_FieldTable& kprC_RandomResponseFrequency::Fields() {
     using R = kprC_RandomResponseFrequency;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
+    static const cls_FieldTable fields = cls_Describe<R>(cls_Record::Fields())
+                                             .With(kprC_FrequencyRangeFields)
+                                             .Example(R"({"lower": 1, "upper": 100})");
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateDirectFrequency::Fields() {
     using R = kprC_SteadyStateDirectFrequency;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
+    static const cls_FieldTable fields = cls_Describe<R>(cls_Record::Fields())
+                                             .With(kprC_FrequencyRangeFields)
+                                             .Example(R"({"lower": 1, "upper": 100})");
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateModalFrequency::Fields() {
     using R = kprC_SteadyStateModalFrequency;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
+    static const cls_FieldTable fields = cls_Describe<R>(cls_Record::Fields())
+                                             .With(kprC_FrequencyRangeFields)
+                                             .Example(R"({"lower": 1, "upper": 100})");
     return fields;
 }
 
 const cls_FieldTable& kprC_SteadyStateSubspaceFrequency::Fields() {
     using R = kprC_SteadyStateSubspaceFrequency;
-    static const cls_FieldTable fields =
-        cls_Describe<R>(cls_Record::Fields()).With(kprC_FrequencyRangeFields);
+    static const cls_FieldTable fields = cls_Describe<R>(cls_Record::Fields())
+                                             .With(kprC_FrequencyRangeFields)
+                                             .Example(R"({"lower": 1, "upper": 100})");
     return fields;
 }
 
@@ -38,10 +42,15 @@ const cls_FieldTable& kprC_ResponseSpectrumComponent::Fields() {
             .Field<&R::spectrumName>("spectrumName",
                                      "name of the spectrum, written as it stands, without quotes")
             .RefersTo("amplitude")
-            .Field<&R::x>("x", "direction cosine, global X")
-            .Field<&R::y>("y", "direction cosine, global Y")
-            .Field<&R::z>("z", "direction cosine, global Z")
-            .Field<&R::scale>("scale", "factor on the spectrum");
+            .Field<&R::x>("x", "direction cosine with global axis X")
+            .Unit("no unit")
+            .Field<&R::y>("y", "direction cosine with global axis Y")
+            .Unit("no unit")
+            .Field<&R::z>("z", "direction cosine with global axis Z")
+            .Unit("no unit")
+            .Field<&R::scale>("scale", "factor on the spectrum")
+            .Unit("no unit")
+            .Example(R"({"spectrumName": "QUAKE", "x": 1})");
     return fields;
 }
 
@@ -70,34 +79,44 @@ const cls_FieldTable& kprC_FrequencyStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::numEigen>("numEigen", "number of modes; unset = all in the range")
-            .Field<&R::maxEigen>("maxEigen", "upper frequency bound (cycles per time)")
-            .Field<&R::shift>("shift", "shift point (squared cycles per time)")
+            .Field<&R::maxEigen>("maxEigen", "upper frequency bound")
+            .Unit("cycles/time")
+            .Field<&R::shift>("shift", "shift point")
+            .Unit("(cycles/time)^2")
             .Field<&R::vectors>("vectors", "subspace: number of iteration vectors, always written")
             .Field<&R::maxIterations>("maxIterations",
                                       "subspace: largest number of iterations, always written")
-            .Field<&R::eigensolver>("eigensolver", "0 subspace, 1 Lanczos, 2 AMS")
+            .Field<&R::eigensolver>("eigensolver", "solver of the eigenvalues")
             .Field<&R::dampingProjection>(
                 "dampingProjection",
                 "false: damping is not projected on the modes (AMS, and Lanczos with sim)")
-            .Field<&R::minEigen>("minEigen", "lower frequency bound (cycles per time)")
+            .Field<&R::minEigen>("minEigen", "lower frequency bound")
+            .Unit("cycles/time")
             .Field<&R::blockSize>("blockSize", "Lanczos: block size")
             .Field<&R::maxBlocks>("maxBlocks", "Lanczos: largest number of blocks")
-            .Field<&R::normalization>("normalization", "0 displacement, non-zero mass")
+            .Field<&R::normalization>(
+                "normalization",
+                "what modes are normalised to: the largest DISPLACEMENT or the generalised MASS")
             .Field<&R::propertyEvaluationFrequency>(
-                "propertyEvaluationFrequency",
-                "frequency at which frequency-dependent properties are taken (cycles per time)")
-            .Field<&R::acousticCoupling>("acousticCoupling",
-                                         "0 off, 1 on, 2 projection; not written with the subspace solver")
+                "propertyEvaluationFrequency", "frequency at which frequency-dependent properties are taken")
+            .Unit("cycles/time")
+            .Field<&R::acousticCoupling>(
+                "acousticCoupling",
+                "coupling of structure and acoustic fluid; not written with the subspace solver")
             .Field<&R::residualModes>("residualModes", "compute residual modes (Lanczos, AMS)")
             .Field<&R::sim>("sim", "Lanczos: modes kept in the linear dynamics data base")
             .Field<&R::substructureCutoffMultiplier>("substructureCutoffMultiplier",
                                                      "AMS: first cutoff factor; 5.0 is not written")
+            .Unit("no unit")
             .Field<&R::firstCutoffMultiplier>("firstCutoffMultiplier",
                                               "AMS: second cutoff factor; 1.7 is not written")
+            .Unit("no unit")
             .Field<&R::secondCutoffMultiplier>("secondCutoffMultiplier",
                                                "AMS: third cutoff factor; 1.1 is not written")
+            .Unit("no unit")
             .Field<&R::acousticRangeFactor>("acousticRangeFactor",
                                             "AMS: factor on the acoustic frequency range; 1.0 is not written")
+            .Unit("no unit")
             .Field<&R::residualModeSets>("residualModeSets",
                                          "AMS residual modes: node set names as [instance.]set, one per line")
             .RefersTo("set")
@@ -106,7 +125,8 @@ const cls_FieldTable& kprC_FrequencyStep::Fields() {
                                            "residualModeSets; its length counts the lines")
             .Field<&R::nsetRegion>(
                 "nsetRegion",
-                "AMS: node set to which mode shapes are restricted; null or empty name = all nodes");
+                "AMS: node set to which mode shapes are restricted; null or empty name = all nodes")
+            .Example(R"({"numEigen": 10})");
     return fields;
 }
 
@@ -115,12 +135,15 @@ const cls_FieldTable& kprC_ComplexFrequencyStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::numEigen>("numEigen", "number of complex modes; unset = all")
-            .Field<&R::shift>("shift", "shift point (cycles per time); 0 is not written")
+            .Field<&R::shift>("shift", "shift point; zero is not written")
+            .Unit("cycles/time")
             .Field<&R::frictionDamping>("frictionDamping", "add friction-induced damping")
-            .Field<&R::minEigen>("minEigen", "lower frequency bound (cycles per time)")
-            .Field<&R::maxEigen>(
-                "maxEigen",
-                "upper frequency bound (cycles per time); written when below 1e18 or when minEigen is set");
+            .Field<&R::minEigen>("minEigen", "lower frequency bound")
+            .Unit("cycles/time")
+            .Field<&R::maxEigen>("maxEigen",
+                                 "upper frequency bound; written when below 1e18 or when minEigen is set")
+            .Unit("cycles/time")
+            .Example(R"({"numEigen": 10})");
     return fields;
 }
 
@@ -132,9 +155,11 @@ const cls_FieldTable& kprC_ModalDynamicsStep::Fields() {
                                          "go on from the state of the step before, if that is a linear "
                                          "perturbation static or a modal dynamics step")
             .With(kprC_TimePeriodField)
-            .Field<&R::timeIncrement>("timeIncrement", "fixed time increment (time)")
+            .Field<&R::timeIncrement>("timeIncrement", "fixed time increment")
+            .Unit("time")
             .With(kprC_StepAmplitudeField)
-            .With(kprC_ModalDampingFields);
+            .With(kprC_ModalDampingFields)
+            .Example(R"({"timePeriod": 1, "timeIncrement": 0.001})");
     return fields;
 }
 
@@ -143,7 +168,8 @@ const cls_FieldTable& kprC_RandomResponseStep::Fields() {
     static const cls_FieldTable fields = cls_Describe<R>(kprC_AnalysisStep::Fields())
                                              .With(kprC_FrequenciesField)
                                              .With(kprC_FrequencyScaleField)
-                                             .With(kprC_ModalDampingFields);
+                                             .With(kprC_ModalDampingFields)
+                                             .Example(R"({"frequencies": [{"lower": 1, "upper": 100}]})");
     return fields;
 }
 
@@ -165,10 +191,11 @@ const cls_FieldTable& kprC_ResponseSpectrumStep::Fields() {
     using R = kprC_ResponseSpectrumStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::comp>("comp", "1 algebraic, 2 SRSS, other values write nothing")
-            .Field<&R::sum>("sum", "0 ABS, 1 CQC, 2 NRL, 3 SRSS, 4 TENP")
+            .Field<&R::comp>("comp", "how directions are combined; only ALGEBRAIC and SRSS are written")
+            .Field<&R::sum>("sum", "how the responses of the modes are summed")
             .Field<&R::components>("components", "directions of excitation, one data line each")
-            .With(kprC_ModalDampingFields);
+            .With(kprC_ModalDampingFields)
+            .Example(R"({"components": [{"spectrumName": "QUAKE", "x": 1}]})");
     return fields;
 }
 
@@ -178,7 +205,8 @@ const cls_FieldTable& kprC_SteadyStateDirectStep::Fields() {
                                              .With(kprC_ComplexField)
                                              .With(kprC_FrequenciesField)
                                              .With(kprC_FrequencyScaleField)
-                                             .With(kprC_SubdivideField);
+                                             .With(kprC_SubdivideField)
+                                             .Example(R"({"frequencies": [{"lower": 1, "upper": 100}]})");
     return fields;
 }
 
@@ -188,7 +216,8 @@ const cls_FieldTable& kprC_SteadyStateModalStep::Fields() {
                                              .With(kprC_FrequenciesField)
                                              .With(kprC_FrequencyScaleField)
                                              .With(kprC_SubdivideField)
-                                             .With(kprC_ModalDampingFields);
+                                             .With(kprC_ModalDampingFields)
+                                             .Example(R"({"frequencies": [{"lower": 1, "upper": 100}]})");
     return fields;
 }
 
@@ -211,13 +240,16 @@ const cls_FieldTable& kprC_SteadyStateSubspaceStep::Fields() {
             .With(kprC_FrequencyScaleField)
             .Field<&R::frictionDamping>("frictionDamping", "add friction-induced damping")
             .With(kprC_SubdivideField)
-            .Field<&R::projection>("projection",
-                                   "0 none, 1 constant, 2 eigenfrequency, 3 property change, 4 range")
+            .Field<&R::projection>("projection", "when the modes' subspace is projected anew")
             .Field<&R::dampingChange>(
-                "dampingChange", "projection 3: relative change of damping that asks for a new projection")
+                "dampingChange",
+                "with PROPERTY_CHANGE: relative change of damping that asks for a new projection")
+            .Unit("no unit")
             .Field<&R::stiffnessChange>(
                 "stiffnessChange",
-                "projection 3: relative change of stiffness that asks for a new projection");
+                "with PROPERTY_CHANGE: relative change of stiffness that asks for a new projection")
+            .Unit("no unit")
+            .Example(R"({"frequencies": [{"lower": 1, "upper": 100}]})");
     return fields;
 }
 

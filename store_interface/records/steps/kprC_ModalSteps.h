@@ -87,7 +87,7 @@ public:
 class kprC_FrequencyStep final : public kprC_ProcedureOf<kprC_FrequencyStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_FrequencyStep", "Extraction of natural frequencies and modes.",
-                                         0x23C006A};
+                                         0x23C006A, "Frequency"};
 
     enum class EigensolverEnm : int { SUBSPACE = 0, LANCZOS = 1, AMS = 2 };
     enum class NormalizationEnm : int { DISPLACEMENT = 0, MASS = 1 };
@@ -138,7 +138,8 @@ class kprC_ComplexFrequencyStep final : public kprC_ProcedureOf<kprC_ComplexFreq
 public:
     static constexpr cls_ClassInfo Class{
         "kprC_ComplexFrequencyStep",
-        "Complex eigenvalue extraction. Of a model with such a step no deck can be written.", 0x23C007D};
+        "Complex eigenvalue extraction. Of a model with such a step no deck can be written.", 0x23C007D,
+        "ComplexFrequency"};
 
     static constexpr double maxEigenDef() { return 1e+18; }
     static constexpr double minEigenDef() { return cls_UnsetDouble; }
@@ -156,8 +157,8 @@ public:
 
 class kprC_ModalDynamicsStep final : public kprC_ProcedureOf<kprC_ModalDynamicsStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_ModalDynamicsStep",
-                                         "Transient dynamics by modal superposition.", 0x23C006F};
+    static constexpr cls_ClassInfo Class{
+        "kprC_ModalDynamicsStep", "Transient dynamics by modal superposition.", 0x23C006F, "ModalDynamics"};
 
     static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
 
@@ -178,7 +179,7 @@ class kprC_RandomResponseStep final : public kprC_ProcedureOf<kprC_RandomRespons
 public:
     static constexpr cls_ClassInfo Class{"kprC_RandomResponseStep",
                                          "Response to random excitation on the modes of an earlier step.",
-                                         0x23C0070};
+                                         0x23C0070, "RandomResponse"};
 
     cow_List<kprC_RandomResponseFrequency> frequencies;
     FrequencyScaleEnm frequencyScale = FrequencyScaleEnm::LOGARITHMIC;
@@ -197,7 +198,7 @@ class kprC_ResponseSpectrumStep final : public kprC_ProcedureOf<kprC_ResponseSpe
 public:
     static constexpr cls_ClassInfo Class{"kprC_ResponseSpectrumStep",
                                          "Peak response to a spectrum on the modes of an earlier step.",
-                                         0x23C0071};
+                                         0x23C0071, "ResponseSpectrum"};
 
     enum class CompEnm : int { SINGLE_DIRECTION = 0, ALGEBRAIC = 1, SRSS = 2 };
     enum class SumEnm : int { ABS = 0, CQC = 1, NRL = 2, SRSS = 3, TENP = 4 };
@@ -219,7 +220,8 @@ const omu_EnumTable& omu_EnumTableOf(kprC_ResponseSpectrumStep::SumEnm);
 class kprC_SteadyStateDirectStep final : public kprC_ProcedureOf<kprC_SteadyStateDirectStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateDirectStep",
-                                         "Harmonic response by direct solution.", 0x23C0076};
+                                         "Harmonic response by direct solution.", 0x23C0076,
+                                         "SteadyStateDirect"};
 
     static constexpr bool subdivideUsingEigenfrequenciesDef() { return false; }
 
@@ -234,7 +236,8 @@ public:
 class kprC_SteadyStateModalStep final : public kprC_ProcedureOf<kprC_SteadyStateModalStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateModalStep",
-                                         "Harmonic response on the modes of an earlier step.", 0x23C0077};
+                                         "Harmonic response on the modes of an earlier step.", 0x23C0077,
+                                         "SteadyStateModal"};
 
     static constexpr bool subdivideUsingEigenfrequenciesDef() { return true; }
 
@@ -256,7 +259,7 @@ class kprC_SteadyStateSubspaceStep final : public kprC_ProcedureOf<kprC_SteadySt
 public:
     static constexpr cls_ClassInfo Class{"kprC_SteadyStateSubspaceStep",
                                          "Harmonic response in the subspace of the modes of an earlier step.",
-                                         0x23C007E};
+                                         0x23C007E, "SteadyStateSubspace"};
 
     enum class ProjectionEnm : int {
         NONE = 0,

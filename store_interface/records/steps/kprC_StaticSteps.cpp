@@ -18,12 +18,14 @@ const cls_FieldTable& kprC_StaticStep::Fields() {
             .With(kprC_StabilizationMethodField)
             .With(kprC_StabilizationMagnitudeField)
             .With(kprC_TimeIncrementFields)
-            .Field<&R::amplitude>("amplitude",
-                                  "course of loads without an amplitude: 0 step, 1 ramp; 1 is not written")
+            .Field<&R::amplitude>(
+                "amplitude",
+                "course of loads without an amplitude: at once or along a ramp; RAMP is not written")
             .With(kprC_ExtrapolationField)
             .With(kprC_NoStopField)
             .With(kprC_FullyPlasticField)
-            .With(kprC_UnwrittenTechniqueField);
+            .With(kprC_UnwrittenTechniqueField)
+            .Example(R"({"nlgeom": "ON", "initialInc": 0.1})");
     return fields;
 }
 
@@ -35,21 +37,30 @@ const cls_FieldTable& kprC_StaticRiksStep::Fields() {
             .With(kprC_AdiabaticField)
             .With(kprC_TimeIncrementationField)
             .With(kprC_MaxNumIncField)
-            .Field<&R::initialArcInc>("initialArcInc", "first (or fixed) increment of arc length (no unit)")
-            .Field<&R::totalArc>("totalArc", "arc length scale of the step (no unit)")
-            .Field<&R::minArcInc>("minArcInc", "smallest arc length increment, automatic method only")
-            .Field<&R::maxArcInc>("maxArcInc",
-                                  "largest arc length increment, automatic method only; 1e36 is not written")
-            .Field<&R::maxLPF>("maxLPF", "load proportionality factor that ends the step (no unit)")
+            .Field<&R::initialArcInc>("initialArcInc", "first (or fixed) increment of arc length")
+            .Unit("no unit")
+            .Field<&R::totalArc>("totalArc", "arc length scale of the step")
+            .Unit("no unit")
+            .Field<&R::minArcInc>("minArcInc",
+                                  "smallest increment of arc length, of the automatic method only")
+            .Unit("no unit")
+            .Field<&R::maxArcInc>(
+                "maxArcInc",
+                "largest increment of arc length, of the automatic method only; 1e36 is not written")
+            .Unit("no unit")
+            .Field<&R::maxLPF>("maxLPF", "load proportionality factor that ends the step")
+            .Unit("no unit")
             .With(kprC_ExtrapolationField)
             .With(kprC_NoStopField)
             .With(kprC_FullyPlasticField)
             .Field<&R::nodeMonitored>("nodeMonitored", "whether a displacement of region ends the step")
             .Field<&R::region>("region", "node set that is monitored")
             .Field<&R::dof>("dof", "degree of freedom monitored, 1 to 6")
-            .Field<&R::dofValue>("dofValue", "displacement (length) or rotation (radians) that ends the step")
+            .Field<&R::dofValue>("dofValue", "displacement or rotation that ends the step")
+            .Unit("length or radians")
             .Field<&R::longTerm>("longTerm", "long-term (fully relaxed) response of time-dependent materials")
-            .With(kprC_UnwrittenTechniqueField);
+            .With(kprC_UnwrittenTechniqueField)
+            .Example(R"({"nlgeom": "ON", "initialArcInc": 0.05})");
     return fields;
 }
 
@@ -78,19 +89,22 @@ const cls_FieldTable& kprC_SoilsStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .With(kprC_NlgeomField)
-            .Field<&R::response>("response", "0 transient consolidation, otherwise steady state")
+            .Field<&R::response>("response", "TRANSIENT consolidation or STEADY_STATE")
             .With(kprC_EndField)
             .With(kprC_PseudoTimePeriodField)
             .With(kprC_StabilizationMethodField)
             .With(kprC_StabilizationMagnitudeField)
             .With(kprC_TimeIncrementFields)
             .Field<&R::creep>("creep", "false writes creep=none")
-            .Field<&R::cetol>("cetol", "largest creep strain error per increment (no unit), written above 0")
-            .Field<&R::utol>("utol", "largest pore pressure change per increment (stress); above 0 written, "
-                                     "else the text utol=1.0")
+            .Field<&R::cetol>("cetol", "largest creep strain error per increment, written above 0")
+            .Unit("no unit")
+            .Field<&R::utol>(
+                "utol", "largest pore pressure change per increment; above 0 written, else the text utol=1.0")
+            .Unit("stress")
             .With(kprC_StepAmplitudeField)
             .With(kprC_ExtrapolationField)
-            .With(kprC_UnwrittenTechniqueField);
+            .With(kprC_UnwrittenTechniqueField)
+            .Example(R"({"timePeriod": 1000, "initialInc": 1, "utol": 0.1})");
     return fields;
 }
 
@@ -110,17 +124,19 @@ const cls_FieldTable& kprC_ViscoStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .With(kprC_NlgeomField)
-            .Field<&R::creepIntegration>("creepIntegration", "0 automatic, 1 explicit")
+            .Field<&R::creepIntegration>("creepIntegration",
+                                         "AUTOMATIC choice of the integration, or EXPLICIT alone")
             .Field<&R::cetol>(
-                "cetol",
-                "largest creep strain error per increment (no unit); always written by the automatic method")
+                "cetol", "largest creep strain error per increment; always written by the automatic method")
+            .Unit("no unit")
             .With(kprC_PseudoTimePeriodField)
             .With(kprC_StabilizationMethodField)
             .With(kprC_StabilizationMagnitudeField)
             .With(kprC_TimeIncrementFields)
             .With(kprC_StepAmplitudeField)
             .With(kprC_ExtrapolationField)
-            .With(kprC_UnwrittenTechniqueField);
+            .With(kprC_UnwrittenTechniqueField)
+            .Example(R"({"timePeriod": 1000, "initialInc": 1, "cetol": 0.001})");
     return fields;
 }
 
@@ -128,8 +144,10 @@ const cls_FieldTable& kprC_AnnealStep::Fields() {
     using R = kprC_AnnealStep;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
-            .Field<&R::refTemp>("refTemp", "temperature at which the model is annealed (temperature)")
-            .With(kprC_NlgeomField);
+            .Field<&R::refTemp>("refTemp", "temperature at which the model is annealed")
+            .Unit("temperature")
+            .With(kprC_NlgeomField)
+            .Example(R"({"refTemp": 20})");
     return fields;
 }
 
@@ -144,13 +162,16 @@ const cls_FieldTable& kprC_BuckleStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .Field<&R::numEigen>("numEigen", "number of eigenvalues")
-            .Field<&R::maxEigen>("maxEigen", "upper bound of the eigenvalues (load factor)")
+            .Field<&R::maxEigen>("maxEigen", "upper bound of the eigenvalues")
+            .Unit("no unit")
             .Field<&R::vectors>("vectors", "subspace: number of iteration vectors")
             .Field<&R::maxIterations>("maxIterations", "subspace: largest number of iterations")
-            .Field<&R::eigensolver>("eigensolver", "0 subspace, 1 Lanczos")
-            .Field<&R::minEigen>("minEigen", "Lanczos: lower bound of the eigenvalues (load factor)")
+            .Field<&R::eigensolver>("eigensolver", "solver of the eigenvalues")
+            .Field<&R::minEigen>("minEigen", "Lanczos: lower bound of the eigenvalues")
+            .Unit("no unit")
             .Field<&R::blockSize>("blockSize", "Lanczos: block size")
-            .Field<&R::maxBlocks>("maxBlocks", "Lanczos: largest number of blocks");
+            .Field<&R::maxBlocks>("maxBlocks", "Lanczos: largest number of blocks")
+            .Example(R"({"numEigen": 5, "vectors": 10})");
     return fields;
 }
 

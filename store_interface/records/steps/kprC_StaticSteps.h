@@ -8,7 +8,7 @@ class cls_ClassRegistrar;
 
 class kprC_StaticStep final : public kprC_ProcedureOf<kprC_StaticStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_StaticStep", "General static analysis.", 0x23C0073};
+    static constexpr cls_ClassInfo Class{"kprC_StaticStep", "General static analysis.", 0x23C0073, "Static"};
 
     enum class StabilizationEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
 
@@ -38,8 +38,9 @@ const omu_EnumTable& omu_EnumTableOf(kprC_StaticStep::StabilizationEnm);
 
 class kprC_StaticRiksStep final : public kprC_ProcedureOf<kprC_StaticRiksStep> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kprC_StaticRiksStep", "Static analysis with arc length control, for unstable collapse.", 0x23C0074};
+    static constexpr cls_ClassInfo Class{"kprC_StaticRiksStep",
+                                         "Static analysis with arc length control, for unstable collapse.",
+                                         0x23C0074, "StaticRiks Riks"};
 
     static constexpr ExtrapolationEnm extrapolationDef() { return ExtrapolationEnm::LINEAR; }
     static constexpr double maxArcIncDef() { return 1e+36; }
@@ -71,13 +72,15 @@ public:
 class kprC_StaticLinearPerturbationStep final : public kprC_ProcedureOf<kprC_StaticLinearPerturbationStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_StaticLinearPerturbationStep",
-                                         "Linear static perturbation about the base state.", 0x23C0075};
+                                         "Linear static perturbation about the base state.", 0x23C0075,
+                                         "StaticLinearPerturbation StaticPerturbation"};
 };
 
 class kprC_GeostaticStep final : public kprC_ProcedureOf<kprC_GeostaticStep> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kprC_GeostaticStep", "Geostatic equilibrium under initial stress and self weight.", 0x23C006B};
+    static constexpr cls_ClassInfo Class{"kprC_GeostaticStep",
+                                         "Geostatic equilibrium under initial stress and self weight.",
+                                         0x23C006B, "Geostatic"};
 
     NlgeomEnm nlgeom = NlgeomEnm::OFF;
     SolutionTechniqueEnm solutionTechnique = SolutionTechniqueEnm::FULL_NEWTON;
@@ -87,7 +90,8 @@ public:
 
 class kprC_SoilsStep final : public kprC_ProcedureOf<kprC_SoilsStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_SoilsStep", "Coupled pore fluid flow and stress.", 0x23C0072};
+    static constexpr cls_ClassInfo Class{"kprC_SoilsStep", "Coupled pore fluid flow and stress.", 0x23C0072,
+                                         "Soils"};
 
     enum class ResponseEnm : int { TRANSIENT = 0, STEADY_STATE = 1 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
@@ -122,8 +126,9 @@ const omu_EnumTable& omu_EnumTableOf(kprC_SoilsStep::StabilizationMethodEnm);
 
 class kprC_ViscoStep final : public kprC_ProcedureOf<kprC_ViscoStep> {
 public:
-    static constexpr cls_ClassInfo Class{
-        "kprC_ViscoStep", "Quasi-static response with creep, swelling or viscoelasticity.", 0x23C007A};
+    static constexpr cls_ClassInfo Class{"kprC_ViscoStep",
+                                         "Quasi-static response with creep, swelling or viscoelasticity.",
+                                         0x23C007A, "Visco"};
 
     enum class CreepIntegrationEnm : int { AUTOMATIC = 0, EXPLICIT = 1 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
@@ -157,7 +162,7 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_AnnealStep",
                                          "Annealing between explicit steps: all stresses and plastic strains "
                                          "are reset, at a given temperature.",
-                                         0x23C0065};
+                                         0x23C0065, "Anneal"};
 
     static constexpr double refTempDef() { return cls_UnsetDouble; }
 
@@ -169,7 +174,8 @@ public:
 
 class kprC_BuckleStep final : public kprC_ProcedureOf<kprC_BuckleStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_BuckleStep", "Eigenvalue buckling prediction.", 0x23C0066};
+    static constexpr cls_ClassInfo Class{"kprC_BuckleStep", "Eigenvalue buckling prediction.", 0x23C0066,
+                                         "Buckle Buckling"};
 
     enum class EigensolverEnm : int { SUBSPACE = 0, LANCZOS = 1 };
 

@@ -71,7 +71,7 @@ public:
     static constexpr cls_ClassInfo Class{"kprC_InitialStep",
                                          "the state before the analysis: boundary conditions, initial "
                                          "conditions and interactions can begin here",
-                                         0x23C0064};
+                                         0x23C0064, "Initial"};
 };
 
 /// Base of all steps that have a procedure.

@@ -6,51 +6,56 @@
 // Fields that several step classes have, described once: cls_Describe<R>(...).With(kprC_NlgeomField).
 
 inline constexpr auto kprC_NlgeomField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::nlgeom>("nlgeom", "large-displacement effects: 1 (any non-zero) on, 0 off");
+    fields.template Field<&R::nlgeom>("nlgeom", "ON: large-displacement effects count");
 };
 inline constexpr auto kprC_MaxNumIncField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::maxNumInc>("maxNumInc", "largest number of increments; 100 is not written");
 };
 inline constexpr auto kprC_TimePeriodField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::timePeriod>("timePeriod", "time period of the step (time)");
+    fields.template Field<&R::timePeriod>("timePeriod", "time period of the step").Unit("time");
 };
 inline constexpr auto kprC_PseudoTimePeriodField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::timePeriod>(
-        "timePeriod", "time period of the step (time; a pseudo-time in static procedures)");
+    fields
+        .template Field<&R::timePeriod>("timePeriod",
+                                        "time period of the step; a pseudo-time in static procedures")
+        .Unit("time");
 };
 inline constexpr auto kprC_StepAmplitudeField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::amplitude>(
-        "amplitude", "course of loads without an amplitude: 0 step, 1 ramp; 0 is not written");
+        "amplitude", "course of loads without an amplitude: at once or along a ramp; STEP is not written");
 };
 inline constexpr auto kprC_TimeIncrementationField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::timeIncrementationMethod>("timeIncrementationMethod",
-                                                        "0 automatic, 1 direct (fixed increments)");
+                                                        "AUTOMATIC increments, or DIRECT: all of one size");
 };
 inline constexpr auto kprC_InitialIncField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::initialInc>("initialInc", "first (or fixed) time increment (time)");
+    fields.template Field<&R::initialInc>("initialInc", "first (or fixed) time increment").Unit("time");
 };
 inline constexpr auto kprC_MinIncField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::minInc>("minInc", "smallest time increment (time), automatic method only");
+    fields.template Field<&R::minInc>("minInc", "smallest time increment, automatic method only")
+        .Unit("time");
 };
 inline constexpr auto kprC_MaxIncField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::maxInc>("maxInc", "largest time increment (time), automatic method only");
+    fields.template Field<&R::maxInc>("maxInc", "largest time increment, automatic method only").Unit("time");
 };
 inline constexpr auto kprC_ExtrapolationField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::extrapolation>("extrapolation",
-                                             "0 is not written; else 1 prints PARABOLIC, any other value NO");
+                                             "how the solution is extrapolated from increment to increment; "
+                                             "LINEAR is not written, and any other than PARABOLIC prints NO");
 };
 inline constexpr auto kprC_UnwrittenTechniqueField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::solutionTechnique>(
-        "solutionTechnique", "0 full Newton, 1 separated, 2 quasi-Newton; not written for this procedure");
+        "solutionTechnique", "how the equations are solved; not written for this procedure");
 };
 inline constexpr auto kprC_StabilizationMethodField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::stabilizationMethod>(
-        "stabilizationMethod",
-        "0 none, 1 by dissipated energy fraction, 2 by damping factor; other values write nothing");
+        "stabilizationMethod", "how the step is stabilised, by an energy fraction or by a damping factor");
 };
 inline constexpr auto kprC_StabilizationMagnitudeField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::stabilizationMagnitude>(
-        "stabilizationMagnitude", "dissipated energy fraction (no unit) or damping factor, by the method");
+    fields
+        .template Field<&R::stabilizationMagnitude>(
+            "stabilizationMagnitude", "dissipated energy fraction or damping factor, by the method")
+        .Unit("no unit, or that of the damping factor");
 };
 inline constexpr auto kprC_AdiabaticField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::adiabatic>("adiabatic", "adiabatic heating by inelastic work");
@@ -60,14 +65,16 @@ inline constexpr auto kprC_NoStopField = []<class R>(cls_Describe<R>& fields) {
         "noStop", "direct method only: accept the increment after the last allowed iteration");
 };
 inline constexpr auto kprC_ResponseField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::response>("response", "0 steady state, otherwise transient");
+    fields.template Field<&R::response>("response", "STEADY_STATE or TRANSIENT");
 };
 inline constexpr auto kprC_EndField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::end>("end", "rate of change that ends a transient step when it is reached; "
-                                          "unset = the step ends with its period");
+    fields
+        .template Field<&R::end>("end", "rate of change that ends a transient step when it is reached; "
+                                        "without it the step ends with its period")
+        .Unit("unit of the solution/time");
 };
 inline constexpr auto kprC_FrequencyScaleField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::frequencyScale>("frequencyScale", "0 logarithmic, 1 linear");
+    fields.template Field<&R::frequencyScale>("frequencyScale", "how the points lie between the limits of a range");
 };
 inline constexpr auto kprC_FrequenciesField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::frequencies>("frequencies", "frequency ranges, one data line each");
@@ -95,11 +102,13 @@ inline constexpr auto kprC_TimeIncrementFields = []<class R>(cls_Describe<R>& fi
 };
 
 inline constexpr auto kprC_FrequencyRangeFields = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::upper>("upper", "upper limit (cycles per time), always written")
-        .template Field<&R::lower>("lower", "lower limit or single frequency (cycles per time)")
+    fields.template Field<&R::upper>("upper", "upper limit, always written")
+        .Unit("cycles/time")
+        .template Field<&R::lower>("lower", "lower limit or single frequency")
+        .Unit("cycles/time")
         .template Field<&R::points>("points", "number of points in the range, ends included")
-        .template Field<&R::bias>("bias",
-                                  "bias of the points towards the ends (no unit); written from 4 points on");
+        .template Field<&R::bias>("bias", "bias of the points towards the ends; written from 4 points on")
+        .Unit("no unit");
 };
 
 /// Damping of the modes; structural damping where the procedure has it.

@@ -18,7 +18,8 @@ const cls_FieldTable& kprC_StandardRestart::Fields() {
             .Field<&R::numberInterval>("numberInterval",
                                        "number of intervals of the step; below 1 = by frequency")
             .Field<&R::timeMarks>(
-                "timeMarks", "states at the exact ends of the intervals; written with numberInterval only");
+                "timeMarks", "states at the exact ends of the intervals; written with numberInterval only")
+            .Example(R"({"frequency": 10})");
     return fields;
 }
 
@@ -27,7 +28,8 @@ const cls_FieldTable& kprC_ExplicitRestart::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_Restart::Fields())
             .Field<&R::numberInterval>("numberInterval", "number of intervals of the step")
-            .Field<&R::timeMarks>("timeMarks", "states at the exact ends of the intervals");
+            .Field<&R::timeMarks>("timeMarks", "states at the exact ends of the intervals")
+            .Example(R"({"numberInterval": 5})");
     return fields;
 }
 
@@ -36,7 +38,8 @@ const cls_FieldTable& kprC_Monitor::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(cls_Record::Fields())
             .Field<&R::region>("region", "node set of the watched node; null or empty name = no monitor")
-            .Field<&R::dof>("dof", "degree of freedom");
+            .Field<&R::dof>("dof", "degree of freedom")
+            .Example(R"({"region": "PART-1.CENTRE", "dof": 3})");
     return fields;
 }
 
@@ -44,7 +47,8 @@ const cls_FieldTable& kprC_StandardMonitor::Fields() {
     using R = kprC_StandardMonitor;
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_Monitor::Fields())
-            .Field<&R::frequency>("frequency", "increments between two values, always written");
+            .Field<&R::frequency>("frequency", "increments between two values, always written")
+            .Example(R"({"region": "PART-1.CENTRE", "dof": 3})");
     return fields;
 }
 
@@ -55,7 +59,8 @@ const cls_FieldTable& kprC_ExplicitDiagnosticPrint::Fields() {
             .Field<&R::allke>("allke", "total kinetic energy")
             .Field<&R::criticalElement>("criticalElement", "element with the smallest stable increment")
             .Field<&R::etotal>("etotal", "energy balance")
-            .Field<&R::dmass>("dmass", "change of mass by mass scaling");
+            .Field<&R::dmass>("dmass", "change of mass by mass scaling")
+            .Example(R"({"dmass": true})");
     return fields;
 }
 
@@ -64,7 +69,8 @@ const cls_FieldTable& kprC_PerturbationDiagnosticPrint::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_DiagnosticPrint::Fields())
             .Field<&R::frequency>("frequency", "increments between two prints")
-            .Field<&R::solve>("solve", "data of the equation solver");
+            .Field<&R::solve>("solve", "data of the equation solver")
+            .Example(R"({"solve": true})");
     return fields;
 }
 
@@ -77,7 +83,8 @@ const cls_FieldTable& kprC_StandardDiagnosticPrint::Fields() {
             .Field<&R::modelChange>("modelChange", "removed and reactivated elements")
             .Field<&R::solve>("solve", "never written from this record; takes the value of a perturbation "
                                        "record and is what the next one is compared with")
-            .NotModelData();
+            .NotModelData()
+            .Example(R"({"contact": true})");
     return fields;
 }
 

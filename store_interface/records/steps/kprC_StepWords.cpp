@@ -4,9 +4,9 @@
 #include "store_interface/records/steps/kprC_Step.h"
 
 std::string kprC_ProcedureWords(const kprC_Step& step) {
-    std::string name(cls_Classes().NameOf(step.DynTypeId()).View());
-    if (name.starts_with("kprC_")) name.erase(0, 5);
-    if (name.ends_with("Step")) name.erase(name.size() - 4);
+    const cow_String shortName = cls_Classes().ShortNameOf(step.DynTypeId());
+    std::string_view name = shortName.View();
+    if (name.ends_with("Step")) name.remove_suffix(4);
     std::string words;
     for (const char c : name) {
         const bool isCapital = c >= 'A' && c <= 'Z';

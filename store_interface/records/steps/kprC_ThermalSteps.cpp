@@ -26,13 +26,17 @@ const cls_FieldTable& kprC_CoupledTempDisplacementStep::Fields() {
             .With(kprC_StabilizationMethodField)
             .With(kprC_StabilizationMagnitudeField)
             .With(kprC_TimeIncrementFields)
-            .Field<&R::deltmx>("deltmx",
-                               "largest temperature change per increment (temperature), written above 0")
-            .Field<&R::cetol>("cetol", "largest creep strain error per increment (no unit), written above 0")
-            .Field<&R::creep>("creep", "0 automatic, 1 explicit, 2 none")
+            .Field<&R::deltmx>("deltmx", "largest temperature change per increment, written above 0")
+            .Unit("temperature")
+            .Field<&R::cetol>("cetol", "largest creep strain error per increment, written above 0")
+            .Unit("no unit")
+            .Field<&R::creep>("creep", "how creep is integrated: AUTOMATIC choice, EXPLICIT alone, or none")
             .With(kprC_StepAmplitudeField)
             .With(kprC_ExtrapolationField)
-            .Field<&R::solutionTechnique>("solutionTechnique", "0 full Newton, 1 separated, 2 quasi-Newton");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "how the equations are solved: full Newton, separated fields, or quasi-Newton")
+            .Example(R"({"timePeriod": 100, "initialInc": 1, "deltmx": 20})");
     return fields;
 }
 
@@ -44,12 +48,16 @@ const cls_FieldTable& kprC_CoupledThermalElectricStep::Fields() {
             .With(kprC_EndField)
             .With(kprC_TimePeriodField)
             .With(kprC_TimeIncrementFields)
-            .Field<&R::deltmx>("deltmx", "largest temperature change per increment (temperature)")
-            .Field<&R::mxdem>("mxdem",
-                              "largest emissivity change per increment (no unit); 0.1 is not written")
+            .Field<&R::deltmx>("deltmx", "largest temperature change per increment")
+            .Unit("temperature")
+            .Field<&R::mxdem>("mxdem", "largest emissivity change per increment; 0.1 is not written")
+            .Unit("no unit")
             .With(kprC_StepAmplitudeField)
             .With(kprC_ExtrapolationField)
-            .Field<&R::solutionTechnique>("solutionTechnique", "0 full Newton, 1 separated, 2 quasi-Newton");
+            .Field<&R::solutionTechnique>(
+                "solutionTechnique",
+                "how the equations are solved: full Newton, separated fields, or quasi-Newton")
+            .Example(R"({"timePeriod": 100, "initialInc": 1})");
     return fields;
 }
 
@@ -61,11 +69,14 @@ const cls_FieldTable& kprC_HeatTransferStep::Fields() {
             .With(kprC_EndField)
             .With(kprC_TimePeriodField)
             .With(kprC_TimeIncrementFields)
-            .Field<&R::deltmx>("deltmx", "largest temperature change per increment (temperature)")
-            .Field<&R::mxdem>("mxdem",
-                              "largest emissivity change per increment (no unit); 0.1 is not written")
+            .Field<&R::deltmx>("deltmx", "largest temperature change per increment")
+            .Unit("temperature")
+            .Field<&R::mxdem>("mxdem", "largest emissivity change per increment; 0.1 is not written")
+            .Unit("no unit")
             .With(kprC_StepAmplitudeField)
-            .With(kprC_ExtrapolationField);
+            .With(kprC_ExtrapolationField)
+            .Example(
+                R"({"timePeriod": 3600, "initialInc": 10, "minInc": 0.01, "maxInc": 360, "deltmx": 20})");
     return fields;
 }
 
@@ -74,13 +85,16 @@ const cls_FieldTable& kprC_MassDiffusionStep::Fields() {
     static const cls_FieldTable fields =
         cls_Describe<R>(kprC_AnalysisStep::Fields())
             .With(kprC_ResponseField)
-            .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; 0 = the "
-                                   "step ends with its period")
+            .Field<&R::end>("end", "rate of change that ends a transient step when it is reached; at zero "
+                                   "the step ends with its period")
+            .Unit("unit of the solution/time")
             .With(kprC_TimePeriodField)
             .With(kprC_TimeIncrementFields)
-            .Field<&R::dcmax>("dcmax", "largest normalised concentration change per increment")
+            .Field<&R::dcmax>("dcmax", "largest change of normalised concentration per increment")
+            .Unit("no unit")
             .With(kprC_StepAmplitudeField)
-            .With(kprC_ExtrapolationField);
+            .With(kprC_ExtrapolationField)
+            .Example(R"({"timePeriod": 3600, "initialInc": 10})");
     return fields;
 }
 

@@ -8,7 +8,8 @@ class cls_ClassRegistrar;
 class kprC_CoupledTempDisplacementStep final : public kprC_ProcedureOf<kprC_CoupledTempDisplacementStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_CoupledTempDisplacementStep",
-                                         "Implicit fully coupled thermal-stress analysis.", 0x23C0067};
+                                         "Implicit fully coupled thermal-stress analysis.", 0x23C0067,
+                                         "CoupledTempDisplacement CoupledTemperatureDisplacement"};
 
     enum class CreepEnm : int { AUTOMATIC = 0, EXPLICIT = 1, NONE = 2 };
     enum class StabilizationMethodEnm : int { NONE = 0, DISSIPATED_ENERGY_FRACTION = 1, DAMPING_FACTOR = 2 };
@@ -42,7 +43,8 @@ const omu_EnumTable& omu_EnumTableOf(kprC_CoupledTempDisplacementStep::Stabiliza
 class kprC_CoupledThermalElectricStep final : public kprC_ProcedureOf<kprC_CoupledThermalElectricStep> {
 public:
     static constexpr cls_ClassInfo Class{"kprC_CoupledThermalElectricStep",
-                                         "Coupled thermal-electrical conduction.", 0x23C0068};
+                                         "Coupled thermal-electrical conduction.", 0x23C0068,
+                                         "CoupledThermalElectric"};
 
     static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
     static constexpr double endDef() { return cls_UnsetDouble; }
@@ -69,7 +71,8 @@ public:
 
 class kprC_HeatTransferStep final : public kprC_ProcedureOf<kprC_HeatTransferStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_HeatTransferStep", "Uncoupled heat transfer.", 0x23C006C};
+    static constexpr cls_ClassInfo Class{"kprC_HeatTransferStep", "Uncoupled heat transfer.", 0x23C006C,
+                                         "HeatTransfer"};
 
     static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
     static constexpr double endDef() { return cls_UnsetDouble; }
@@ -95,7 +98,8 @@ public:
 
 class kprC_MassDiffusionStep final : public kprC_ProcedureOf<kprC_MassDiffusionStep> {
 public:
-    static constexpr cls_ClassInfo Class{"kprC_MassDiffusionStep", "Mass diffusion.", 0x23C006E};
+    static constexpr cls_ClassInfo Class{"kprC_MassDiffusionStep", "Mass diffusion.", 0x23C006E,
+                                         "MassDiffusion"};
 
     static constexpr AmplitudeEnm amplitudeDef() { return AmplitudeEnm::STEP; }
     static constexpr double endDef() { return 0.0; }
