@@ -178,10 +178,9 @@ const FindingCase interactionCases[] = {
     {"ContactPairIsNoClassOfAModelFile",
      Model(R"("interactions": {"A": {"class": "SurfaceToSurfaceContactExp"}})"),
      {"@/interactions/A/class: found 'SurfaceToSurfaceContactExp'; did you mean "
-      "'SurfaceToSurfaceContactXpl'? Expected one of SurfaceToSurfaceContactStd, "
-      "SurfaceToSurfaceContactXpl, SelfContactStd, SelfContactXpl, ContactExp, "
-      "RadiationToAmbient, ConcRadiationToAmbient, AcousticImpedance, "
-      "ElasticFoundation, ActuatorSensor, ... (5 more)"}},
+      "'SurfaceToSurfaceContactXpl'? Expected one of SurfaceToSurfaceContactStd, SurfaceToSurfaceContactXpl, "
+      "SelfContactStd, SelfContactXpl, ContactExp, RadiationToAmbient, ConcRadiationToAmbient, "
+      "AcousticImpedance, ElasticFoundation, ActuatorSensor, ... (5 more)"}},
 };
 
 } // namespace
