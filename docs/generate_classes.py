@@ -161,8 +161,11 @@ class Reference:
     def deal(self):
         """Which page tells of which classes: by page all of them, and those that stand in a model themselves."""
         containers, seen, dealt = self.schema.containers(), set(), {}
+        named = {member for _, _, members, _ in PAGES for member in members}
         for file, title, members, _ in PAGES:
             keys, direct = [], []
+            if file == "frame":
+                members = members + [member for member in containers if member not in named]
             for member in members:
                 node = containers.get(member)
                 if node is None:
@@ -225,9 +228,29 @@ class Reference:
             names, count = self.page(file, title, text, *dealt[file])
             total += count
             rows.append((file, title, names))
+        self.variables()
         self.index(rows)
         self.decks.close()
         return total
+
+    def variables(self):
+        """What output requests can ask for."""
+        told = json.loads(subprocess.run([self.decks.program, "variables", "--json"], capture_output=True, text=True,
+                                         check=True).stdout)["variables"]
+        lines = ["# Output variables", "",
+                 "What requests can ask for, as `qrxdeck variables` lists it; with `--step-type` those of one procedure.",
+                 "[Output that you wanted](../recipes/output.md) tells how to ask.", ""]
+        for keyword in dict.fromkeys(each["keyword"] for each in told):
+            lines += [f"## {keyword.lstrip('*')}", "", "```{rst-class} fields", "```", "",
+                      "| name | components | output | meaning |", "|---|---|---|---|"]
+            for each in told:
+                if each["keyword"] != keyword:
+                    continue
+                channels = " and ".join(word for word in ("field", "history") if each[word])
+                parts = " ".join(f"`{part}`" for part in each["components"])
+                lines.append(f"| `{each['name']}` | {parts} | {channels} | {cell(escaped(each['meaning']))} |")
+            lines.append("")
+        (self.folder / "variables.md").write_text("\n".join(lines) + "\n", encoding="utf-8")
 
     def index(self, rows):
         lines = ["# Classes", "",
@@ -241,7 +264,8 @@ class Reference:
         for file, title, names in rows:
             links = ", ".join(f"[{name}]({file}.md#{name.lower()})" for name in names)
             lines.append(f"| [{title}]({file}.md) | {links} |")
-        lines += ["", "```{toctree}", ":hidden:", "", *[file for file, _, _ in rows], "```"]
+        lines.append("| [Output variables](variables.md) | what requests can ask for |")
+        lines += ["", "```{toctree}", ":hidden:", "", *[file for file, _, _ in rows], "variables", "```"]
         (self.folder / "index.md").write_text("\n".join(lines) + "\n", encoding="utf-8")
 
 

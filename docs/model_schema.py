@@ -6,11 +6,14 @@ import re
 # Definitions that are no classes: what the reference calls their values.
 PLAIN = {"NAME": "name", "LINE": "text of one line", "TEXT": "deck text", "INT": "whole number",
          "TRIPLE": "three numbers", "COMPLEX": "number, or real and imaginary part", "TABLE": "rows of numbers",
-         "LABELS": "labels", "FACETS": "facets", "REGION": "region",
-         "REGIONS": "region, or several", "REFERENCE": "name of an object", "POINTER": "JSON pointer",
-         "POINTERS": "JSON pointers", "NODES": "nodes", "ELEMENTS": "elements", "MESH": "mesh", "MEMBERS": "members",
+         "LABELS": "labels", "FACETS": "facets", "REGION": "region", "POINTER": "JSON pointer",
+         "POINTERS": "JSON pointers", "REFERENCE": "name", "REGIONS": "region, or list of regions",
+         "NODES": "nodes", "ELEMENTS": "elements", "MESH": "mesh", "MEMBERS": "members",
          "DATUM": "datum", "SET": "set", "ASSEMBLY_SET": "set of the assembly", "PART": "part", "INSTANCE": "instance",
          "ASSEMBLY": "assembly", "MODEL": "model"}
+PLURALS = {"number": "numbers", "whole number": "whole numbers", "name": "names", "text": "texts",
+           "text of one line": "texts of one line", "datum": "datums", "set": "sets", "elements": "elements of a type",
+           "set of the assembly": "sets of the assembly", "region": "regions"}
 # What is said of every class in the same words.
 SAID_ONCE = {"class"}
 STATE_SAID_ONCE = {"deactivated", "status"}
@@ -43,19 +46,21 @@ class Class:
 class Schema:
     def __init__(self, document):
         self.definitions = document["$defs"]
-        # A definition is a class's when it has a class's name, a prefix of small letters and an underscore, and
-        # members; it is no class that stands by itself when it is what objects are in a step.
-        states = {self.target(node["properties"]["states"].get("additionalProperties"))
-                  for node in self.definitions.values() if "states" in node.get("properties", {})}
-        self.keys = [key for key, node in self.definitions.items()
-                     if re.match(r"^[a-z]+[A-Z]?_[A-Z]", key) and "properties" in node and key not in states]
-        names = {}
-        for key in self.keys:
-            names.setdefault(short(key), []).append(key)
-        self.names = {key: re.sub(r"^[a-z]+[A-Z]?_", "", key) if len(names[short(key)]) == 1 else key
-                      for key in self.keys}
+        # A class's definition is an object's, and is called as the class is: a prefix of small letters, an underscore.
+        self.keys = [key for key, definition in self.definitions.items()
+                     if re.match(r"^[a-z]+[A-Z]?_\w+$", key) and "properties" in definition]
+        self.names = {key: self.name_of(key) for key in self.keys}
         # The page that tells of each class, and its title; whoever writes pages fills it.
         self.pages = {}
+
+    def name_of(self, key):
+        """The name that people use: the first that the class's own member takes."""
+        node = self.definitions[key]["properties"].get("class", {})
+        for each in node.get("anyOf", ()):
+            if "enum" in each:
+                return each["enum"][0]
+        twins = [other for other in self.keys if short(other) == short(key)]
+        return re.sub(r"^[a-z]+[A-Z]?_", "", key) if len(twins) == 1 else key
 
     # -- Places
 
@@ -74,7 +79,7 @@ class Schema:
         if target is not None:
             if target in self.names:
                 yield target, self.definitions[target]
-            elif target in self.definitions:
+            else:
                 yield from self.alternatives(self.definitions[target])
             return
         found = False
@@ -102,7 +107,9 @@ class Schema:
                             continue
                         seen.add(key)
                         yield key
-                    waiting += list(found.get("properties", {}).values())
+                    for name, below in found.get("properties", {}).items():
+                        # What a step says of an object is told with the object.
+                        waiting += self.state_of(below).values() if name == "states" else [below]
                     waiting += [found[word] for word in ("items", "additionalProperties") if word in found]
 
     def occurrences(self, value, node, pointer=""):
@@ -181,7 +188,8 @@ class Schema:
             return self.value_of_union([node[word] for word in ("then", "else") if isinstance(node.get(word), dict)])
         kind = node.get("type")
         if kind == "array":
-            return "list of " + self.value(node.get("items", {}))
+            item = self.value(node.get("items", {}))
+            return "list of " + PLURALS.get(item, item)
         if kind == "object":
             more = node.get("additionalProperties")
             if isinstance(more, dict) and more:
@@ -194,10 +202,11 @@ class Schema:
     def value_of_union(self, parts):
         parts = [part for part in parts if part.get("type") != "null" and "state" not in part.get("properties", {})
                  and not (part.get("type") == "string" and "pattern" in part)]
-        words = any("enum" in part or "const" in part for part in parts)
-        if words:
+        parts = [self.definitions[self.target(part)] if self.is_choice(part) else part for part in parts]
+        if any("enum" in part or "const" in part for part in parts):
             # Any capitals, and the number of a word, are taken too.
-            parts = [part for part in parts if "const" in part or any(isinstance(each, str) for each in part.get("enum", ()))]
+            parts = [part for part in parts if "const" in part or "enum" in part and
+                     any(isinstance(each, str) for each in part["enum"])] or parts
         keys = [key for part in parts for key, _ in self.alternatives(part)]
         pages = {self.pages.get(key) for key in keys}
         if len(keys) > 4 and None not in keys and len(pages) == 1 and None not in pages:
@@ -205,6 +214,12 @@ class Schema:
             return f"one of the [classes of {title.lower()}]({file}.md)"
         texts = list(dict.fromkeys(self.value(part) for part in parts))
         return ", or ".join(texts) if len(texts) < 4 else ", ".join(texts)
+
+    def is_choice(self, node):
+        """Whether it refers to a definition that is words alone."""
+        target = self.target(node)
+        return target is not None and target not in PLAIN and target not in self.names and (
+            "enum" in self.definitions[target])
 
     def link(self, key):
         file, _ = self.pages.get(key, ("index", ""))

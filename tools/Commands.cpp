@@ -158,6 +158,8 @@ bool IsFitToWrite(const odb_Odb& odb, const std::string& modelFile, fnd_List& li
     report.Watched().Begin("checking", modelFile);
     dck_CheckDeck(odb, odb.DeckModelName(), list);
     dck_CheckMeshes(odb, odb.DeckModelName(), list);
+    // Takes a look into the file again, which is to count.
+    report.Locate(modelFile, list.findings);
     report.Times().End("checking");
     if (!report.IsStrict()) return true;
     report.AddAll(modelFile, std::exchange(list.findings, {}));

@@ -28,7 +28,7 @@ void OutOfMemory::MarkWritten(bool written) noexcept {
 void OutOfMemory::End() noexcept {
     // Of several threads that find none at a time, one tells.
     static std::atomic_flag isEnding;
-    while (isEnding.test_and_set()) ::pause();
+    while (isEnding.test_and_set()) isEnding.wait(true);
     whf_SignalCleanUp::Remove();
     ProgressLine::Erase();
     const ExitCode code = isWritten ? ExitCode::REPORT_LOST : ExitCode::FILE_SYSTEM_REFUSED;

@@ -148,8 +148,12 @@ void RunReport::AddAll(const mdf_Report& report) {
     textRead_ = report.text;
 }
 
-void RunReport::AddAll(const std::string& file, std::vector<fnd_Finding> findings) {
+void RunReport::Locate(const std::string& file, std::vector<fnd_Finding>& findings) const {
     if (file == fileRead_ && textRead_ != nullptr) textRead_->Locate(findings);
+}
+
+void RunReport::AddAll(const std::string& file, std::vector<fnd_Finding> findings) {
+    Locate(file, findings);
     for (const fnd_Finding& finding : findings) Add(file, finding);
 }
 

@@ -87,7 +87,9 @@ public:
 
     void AddAll(const mdf_Report& report);
     void Add(const std::string& file, const fnd_Finding& finding);
-    /// What was found in a file; with lines if it is the one whose report was added last.
+    /// Gives findings in a file their lines, if it is the one whose report was added last.
+    void Locate(const std::string& file, std::vector<fnd_Finding>& findings) const;
+    /// What was found in a file, with lines.
     void AddAll(const std::string& file, std::vector<fnd_Finding> findings);
     /// Those of the findings so far that foretell what writing raises.
     const std::vector<fnd_Finding>& Foretold() const { return foretold_; }

@@ -48,9 +48,9 @@ PLACES = {
 }
 
 
-def rows_by_mesh() -> dict[str, list[dict]]:
+def rows_by_mesh() -> dict[str, list[dict[str, object]]]:
     """The rows of the table by the mesh that they take, with numbers where a column has such."""
-    found: dict[str, list[dict]] = {}
+    found: dict[str, list[dict[str, object]]] = {}
     with open(HERE / "plates.csv", newline="", encoding="utf-8") as file:
         for row in csv.DictReader(file):
             values = {"load": float(row["load"]), "thickness": float(row["thickness"]), "title": row["title"]}

@@ -24,7 +24,7 @@ std::string fnd_Path::Text() const {
 
 std::string fnd_Finding::Text() const {
     // A long list is for whom the hint doesn't help.
-    constexpr std::size_t kLong = 40;
+    constexpr std::size_t kLong = 80;
     std::string text = found;
     if (!hint.empty() && expected.size() > kLong && expected.find("one of ") != std::string::npos) {
         text.append("; ").append(hint).append(hint.ends_with('?') ? " Expected " : "; expected ");

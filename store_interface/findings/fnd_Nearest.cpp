@@ -103,7 +103,8 @@ std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>
 std::vector<std::size_t> fnd_PlacesOfNearest(const std::vector<std::string>& words, std::string_view name) {
     std::vector<std::size_t> places(words.size());
     std::iota(places.begin(), places.end(), std::size_t{0});
-    if (words.size() <= fnd_kListed) return places;
+    if (words.size() > fnd_kListed && name.empty()) places.resize(fnd_kListed);
+    if (places.size() <= fnd_kListed) return places;
     // Fast, since a model may have a great many names.
     const std::string lower = fnd_LowerCase(name);
     std::vector<int> unlike;

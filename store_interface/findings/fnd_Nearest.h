@@ -41,7 +41,7 @@ std::string fnd_DidYouMean(fnd_Sink& sink, std::string_view name, const TryAll& 
 /// Longer lists are of no help to anybody.
 inline constexpr std::size_t fnd_kListed = 10;
 /// Which of the words a list shows: all of them up to fnd_kListed, else as many as are most like `name`, in
-/// the order of the words.
+/// the order of the words, or the first ones where there is no name.
 std::vector<std::size_t> fnd_PlacesOfNearest(const std::vector<std::string>& words, std::string_view name);
 
 /// The names that there are, or those most like `name`: "there are 'a', 'b', ...", or "there is none".

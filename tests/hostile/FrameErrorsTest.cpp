@@ -52,14 +52,9 @@ const FindingCase frameCases[] = {
      {"/models/B~1~0/shellToSolid: found 1, expected true or false"}},
     {"UnknownModelMember",
      Model(R"("materail": {})"),
-     {"@/materail: found an unknown member 'materail', expected one of description, topLevelSolverInput, "
-      "solverInput, absoluteZero, stefanBoltzmann, waveFormulation, restartJob, restartStep, "
-      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, cyclicSymmetry, datums, "
-      "parts, assembly, "
-      "materials, sections, beamProfiles, amplitudes, constraints, contactControls, contactInitializations, "
-      "interactionProperties, timePoints, adaptiveMeshControls, steps, boundaryConditions, loads, fields, "
-      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints; "
-      "did you mean 'materials'?"}},
+     {"@/materail: found an unknown member 'materail'; did you mean 'materials'? Expected one of "
+      "solverInput, waveFormulation, ignore, datums, parts, assembly, materials, beamProfiles, amplitudes, "
+      "fields, ... (26 more)"}},
     {"TwiceTheSameMember",
      Model(R"("restartJob": "a", "restartJob": "b")"),
      {"@/restartJob: the member 'restartJob' stands more than once, expected names that differ"}},
@@ -105,13 +100,8 @@ const FindingCase frameCases[] = {
      {"@/absoluteZero: found '" + std::string(59, 'x') + "'..., expected a number"}},
     {"ControlCharactersAreShownAsHex",
      Model(R"("a\u001b[2J": 1)"),
-     {"@/a\\x1B[2J: found an unknown member 'a\\x1B[2J', expected one of description, topLevelSolverInput, "
-      "solverInput, absoluteZero, stefanBoltzmann, waveFormulation, restartJob, restartStep, "
-      "restartIncrement, endRestartStep, globalJob, shellToSolid, analysisProduct, cyclicSymmetry, datums, "
-      "parts, assembly, "
-      "materials, sections, beamProfiles, amplitudes, constraints, contactControls, contactInitializations, "
-      "interactionProperties, timePoints, adaptiveMeshControls, steps, boundaryConditions, loads, fields, "
-      "interactions, fieldOutputRequests, historyOutputRequests, adaptiveMeshConstraints"}},
+     {"@/a\\x1B[2J: found an unknown member 'a\\x1B[2J', expected one of restartJob, globalJob, "
+      "ignore, datums, parts, assembly, materials, steps, loads, fields, ... (26 more)"}},
 
     {"NameEmpty",
      Model(R"("parts": {"": {}})"),
@@ -185,15 +175,15 @@ const FindingCase frameCases[] = {
     {"PartAsNull", Model(R"("parts": {"P": null})"), {"@/parts/P: found null, expected an object"}},
     {"PartUnknownMember",
      Model(R"("parts": {"P": {"meshs": {}}})"),
-     {"@/parts/P/meshs: found an unknown member 'meshs', expected one of solverInput, mesh, "
-      "sectionAssignments, materialOrientations, beamOrientations; did you mean 'mesh'?"}},
+     {"@/parts/P/meshs: found an unknown member 'meshs'; did you mean 'mesh'? Expected one of "
+      "solverInput, mesh, sectionAssignments, materialOrientations, beamOrientations"}},
     {"AssemblyAsArray",
      Model(R"("assembly": [])"),
      {"@/assembly: found an array of 0 items, expected an object"}},
     {"AssemblyUnknownMember",
      Model(R"("assembly": {"instance": {}})"),
-     {"@/assembly/instance: found an unknown member 'instance', expected one of name, solverInput, "
-      "instances, mesh, sets, sectionAssignments, connectorOrientations; did you mean 'instances'?"}},
+     {"@/assembly/instance: found an unknown member 'instance'; did you mean 'instances'? Expected one "
+      "of name, solverInput, instances, mesh, sets, sectionAssignments, connectorOrientations"}},
     {"InstancesAsArray",
      Model(R"("assembly": {"instances": []})"),
      {"@/assembly/instances: found an array of 0 items, expected an object of instances"}},

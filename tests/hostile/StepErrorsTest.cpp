@@ -178,7 +178,8 @@ const FindingCase stepCases[] = {
      Step("FrequencyStep", R"("residualModeSets": ["I.NODE", "NODES"])"),
      {"@/steps/1/residualModeSets/0: found 'I.NODE', expected the name of a set; did you mean 'I.NODES'?",
       "@/steps/1/residualModeSets/1: found 'NODES', expected the name of a set; there are 'E.ALL', "
-      "'E.NODES', 'E.TOP', 'E.A.B', 'I.ALL', 'I.NODES', 'I.TOP', 'I.A.B', 'J.ALL', 'J.NODES', ..."}},
+      "'E.NODES', 'E.TOP', 'E.A.B', 'I.ALL', 'I.NODES', 'I.TOP', 'I.A.B', 'J.NODES', 'J.TOP', ... (2 "
+      "more)"}},
     {"SpectrumOfNothing",
      Step("ResponseSpectrumStep", R"("components": [{"spectrumName": "quake"}])"),
      {"@/steps/1/components/0/spectrumName: found 'quake', expected the name of an amplitude; there is "

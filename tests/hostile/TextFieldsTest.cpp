@@ -111,7 +111,8 @@ TEST(TextFields, ControlCharacters_AreRefusedInAllButDeckTextAndDescriptions) {
         }
     });
     EXPECT_GT(fields, 400);
-    EXPECT_EQ(asTheyStand, (std::set<std::string>{"description", "solverInput", "topLevelSolverInput"}));
+    EXPECT_EQ(asTheyStand,
+              (std::set<std::string>{"description", "reason", "solverInput", "topLevelSolverInput"}));
 }
 
 namespace {

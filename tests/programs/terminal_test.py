@@ -18,6 +18,7 @@ import subprocess
 import sys
 import tempfile
 import termios
+import time
 import unittest
 
 PROGRAM = str(pathlib.Path(sys.argv[1]).resolve())
@@ -531,6 +532,17 @@ class Watching(Program):
         self.put("bridge.json", changed(with_many_nodes(1500000)))
         run = self.run_program("write", "bridge.json", "--threads", "1")
         self.assertEqual((run.returncode, run.errors), (0, ""))
+
+    def test_TimesOfTheSummary_AreThoseOfTheWholeRun(self):
+        self.put("bridge.json", changed(with_many_nodes(1500000)))
+        begin = time.monotonic()
+        run = self.run_program("write", "bridge.json", "--verify", "--json")
+        wall = time.monotonic() - begin
+        written = json.loads(run.output)["written"]
+        self.assertEqual(list(written["times"]), ["reading", "checking", "writing", "syncing", "verifying"])
+        self.assertAlmostEqual(sum(written["times"].values()), written["seconds"])
+        self.assertGreater(written["seconds"], 0.7 * wall)
+        self.assertLess(written["seconds"], wall)
 
     def test_LongNames_AreCutToTheTerminal(self):
         name = "b" * 120

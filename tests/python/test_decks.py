@@ -92,6 +92,9 @@ def _place(model, record, depth=0):
     if isinstance(record, qrx.ModelSectorDefinition):
         model.cyclic_symmetry = record
         return True
+    if isinstance(record, qrx.IgnoredFinding):
+        model.ignore.append(record)
+        return True
     if isinstance(record, qrx.PartAttribute):
         name = {"SectionAssignment": "section_assignments", "ConnectorOrientation": "connector_orientations"}
         if type(record).__name__ in name:
@@ -166,7 +169,7 @@ WITHOUT_DECK = {
     "ActuatorSensor", "ActuatorSensorProp", "ActuatorSensorState", "AdptMeshCons", "AdptMeshConsState", "AdptMeshCtrl",
     "AnnealTemperature", "ComplexFrequencyStep", "ConcFilmCondition", "ConcFilmConditionState",
     "ContactInitialization", "CycledPlastic", "DeformationPlasticity", "DruckerPragerCreep", "FailStrain",
-    "GeneralShellSection", "HeatGeneration", "Hypoelastic", "Ornl", "ResponseSpectrumComponent",
+    "GeneralShellSection", "HeatGeneration", "Hypoelastic", "IgnoredFinding", "Ornl", "ResponseSpectrumComponent",
     "SubmodelStressBased", "SubmodelStressBasedState", "Swelling", "UnwrittenLoad", "UserShellSection", "Viscous",
 }
 

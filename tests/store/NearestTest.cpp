@@ -99,7 +99,8 @@ TEST(Lists, MoreThanTenNames_AreCutToThoseMostLikeTheGivenOneInTheirOrder) {
 }
 
 TEST(FindingText, LongExpectations_StandBehindTheHint) {
-    const std::string list = "one of first, second, third, fourth, fifth, sixth";
+    const std::string list =
+        "one of first, second, third, fourth, fifth, sixth, seventh, eighth, ninth, tenth";
     EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "did you mean 'sixth'?").Text(),
               "found 'x'; did you mean 'sixth'? Expected " + list);
     EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "see above").Text(),
