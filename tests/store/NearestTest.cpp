@@ -95,12 +95,13 @@ TEST(Lists, MoreThanTenNames_AreCutToThoseMostLikeTheGivenOneInTheirOrder) {
     EXPECT_EQ(fnd_OneOf(names, "innermos"),
               "one of aaa, eee, INNERMOST, iii, mmm, nnn, ooo, rrr, sss, inner, ... (18 more)");
     EXPECT_EQ(fnd_ThereAre(names, "innermos").substr(0, 35), "there are 'aaa', 'eee', 'INNERMOST'");
-    EXPECT_EQ(fnd_OneOf(names), "one of aaa, bbb, ccc, ddd, eee, fff, ggg, hhh, iii, jjj, ... (18 more)");
+    EXPECT_EQ(fnd_OneOf(names),
+              "one of aaa, bbb, ccc, ddd, eee, INNERMOST, fff, ggg, hhh, iii, ... (18 more)");
 }
 
 TEST(FindingText, LongExpectations_StandBehindTheHint) {
     const std::string list =
-        "one of first, second, third, fourth, fifth, sixth, seventh, eighth, ninth, tenth";
+        "one of first, second, third, fourth, fifth, sixth, seventh, eighth, ninth, the tenth";
     EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "did you mean 'sixth'?").Text(),
               "found 'x'; did you mean 'sixth'? Expected " + list);
     EXPECT_EQ(fnd_Make("wrong-value", {}, "found 'x'", list, "see above").Text(),
