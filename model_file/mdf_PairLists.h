@@ -6,8 +6,8 @@
 
 class kprC_PropagatingObject;
 
-/// A list of a general contact's states, whose entry i belongs to entry i of a list of pairs. A model file may
-/// give both as one, in the state: {"first": ..., "second": ..., "property": ...}.
+/// A list of a general contact's states, whose entry i belongs to entry i of a list of pairs. A model file
+/// may give both as one, in the state: {"first": ..., "second": ..., "property": ...}.
 struct mdf_PairList {
     const char* list;
     const char* pairs;

@@ -149,8 +149,7 @@ std::unique_ptr<mdf_Template> mdf_Template::Twin() const {
     report.fileName = fileName_;
     twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_, given_);
     if (twin->store_ == nullptr) throw std::logic_error("a template that was read can't be read again");
-    twin->timeline_ =
-        std::make_unique<kprC_Timeline>(twin->store_->DeckModel()->steps);
+    twin->timeline_ = std::make_unique<kprC_Timeline>(twin->store_->DeckModel()->steps);
     return twin;
 }
 

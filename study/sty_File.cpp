@@ -15,8 +15,7 @@ sty_Descriptor::~sty_Descriptor() {
     if (number_ >= 0) plt_Close(number_);
 }
 
-sty_File::sty_File(const std::string& path)
-    : file_(plt_OpenToRead(path.c_str())), buffer_(kPieceBytes) {
+sty_File::sty_File(const std::string& path) : file_(plt_OpenToRead(path.c_str())), buffer_(kPieceBytes) {
     plt_Status found = {};
     if (!file_.IsOpen() || plt_InspectOpen(file_.Number(), &found) != 0) {
         error_ = errno;

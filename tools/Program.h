@@ -5,7 +5,8 @@
 /// of memory are the program's too. Gives its exit code.
 int RunProgram(int argc, char** argv);
 
-/// "qrxdeck 1.0.0 (0123456789ab)": the commit where it is known, with "+" when the sources were changed since.
+/// "qrxdeck 1.0.0 (0123456789ab)": the commit where it is known, with "+" when the sources were changed
+/// since.
 const char* ProgramVersion() noexcept;
 
 #endif

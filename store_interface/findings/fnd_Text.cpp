@@ -60,8 +60,7 @@ std::string fnd_OneOf(const std::vector<std::string>& words, std::string_view gi
         text.append(separator).append(words[i]);
         separator = ", ";
     }
-    if (words.size() > fnd_kListed)
-        text += ", ... (" + std::to_string(words.size() - fnd_kListed) + " more)";
+    if (words.size() > fnd_kListed) text += ", ... (" + std::to_string(words.size() - fnd_kListed) + " more)";
     return text;
 }
 

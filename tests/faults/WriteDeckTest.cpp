@@ -78,7 +78,7 @@ TEST(WriteDeck, StoreWithoutTheDefaultModel_IsCodeOne) {
     const Outcome outcome = Write(odb, folder.Path("job.inp"));
     EXPECT_EQ(outcome.code, ExitCode::MODEL_IS_WRONG);
     EXPECT_EQ(outcome.errors,
-              "model.json: error: there is no model named \"Default Model\" to write a deck from\n");
+              "model.json: error: there is no model named 'Default Model' to write a deck from\n");
     EXPECT_TRUE(folder.Entries().empty());
 }
 

@@ -24,6 +24,15 @@ void* operator new(std::size_t bytes) {
     return Allocate(bytes);
 }
 
+// The library's own would be the sanitizer's, whose memory free() mustn't get.
+void* operator new(std::size_t bytes, const std::nothrow_t&) noexcept {
+    try {
+        return Allocate(bytes);
+    } catch (const std::bad_alloc&) {
+        return nullptr;
+    }
+}
+
 void operator delete(void* memory) noexcept {
     std::free(memory);
 }

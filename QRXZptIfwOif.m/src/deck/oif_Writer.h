@@ -5,8 +5,8 @@ class oif_MeshTexts;
 class odb_Odb;
 class qio_ostream;
 
-/// The way in: writes the model of an open store that decks are written from as a deck. Several threads may write
-/// at once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
+/// The way in: writes the model of an open store that decks are written from as a deck. Several threads may
+/// write at once, each with a writer of its own, also from one store; nobody may change the store meanwhile.
 class oif_Writer {
 public:
     /// The store must outlive the writer. Large meshes and sets are laid out by as many threads; 0 stands for

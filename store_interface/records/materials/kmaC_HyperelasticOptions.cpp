@@ -155,11 +155,13 @@ const cls_FieldTable& kmaC_Hyperelastic::Fields() {
             .Unit("no unit")
             .Field<&R::table>(
                 "table",
-                "columns, with a temperature column behind them if wanted: ARRUDA_BOYCE: mu (stress), "
-                "locking stretch, D (1/stress); MOONEY_RIVLIN: C10, C01, D1; NEO_HOOKE: C10, D1; OGDEN: mu1, "
+                "columns: ARRUDA_BOYCE: mu (stress), locking stretch, D (1/stress); MOONEY_RIVLIN: C10, C01, "
+                "D1; NEO_HOOKE: C10, D1; OGDEN: mu1, "
                 "alpha1, ... mun, alphan, D1 ... Dn; POLYNOMIAL: the Cij in rising order of i + j, i first, "
                 "then D1 ... Dn; REDUCED_POLYNOMIAL: C10 ... Cn0, D1 ... Dn; USER: the properties in one "
-                "row; VAN_DER_WAALS: mu, locking stretch, a, beta, D; YEOH: C10, C20, C30, D1, D2, D3")
+                "row; VAN_DER_WAALS: mu, locking stretch, a, beta, D; YEOH: C10, C20, C30, D1, D2, D3; a "
+                "column of "
+                "temperatures may stand behind them")
             .Field<&R::biaxialTestData>("biaxialTestData", "equibiaxial test")
             .Field<&R::planarTestData>("planarTestData", "planar test")
             .Field<&R::uniaxialTestData>("uniaxialTestData", "uniaxial test")

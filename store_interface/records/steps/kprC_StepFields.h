@@ -74,7 +74,8 @@ inline constexpr auto kprC_EndField = []<class R>(cls_Describe<R>& fields) {
         .Unit("unit of the solution/time");
 };
 inline constexpr auto kprC_FrequencyScaleField = []<class R>(cls_Describe<R>& fields) {
-    fields.template Field<&R::frequencyScale>("frequencyScale", "how the points lie between the limits of a range");
+    fields.template Field<&R::frequencyScale>("frequencyScale",
+                                              "how the points lie between the limits of a range");
 };
 inline constexpr auto kprC_FrequenciesField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::frequencies>("frequencies", "frequency ranges, one data line each");
