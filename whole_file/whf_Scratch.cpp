@@ -73,6 +73,8 @@ bool whf_Scratch::Make(const std::string& folderName) {
     plt_Status found = {};
     plt_Status named = {};
     int error = openError;
+    // Somebody who tidied up had it locked before it was opened here, and has removed it.
+    if (error == ENOENT) return false;
     if (error == 0) error = whf_ErrorOf([&] { return system_.inspectOpen(number, &found); });
     if (error == 0 && !plt_IsPrivateFolder(found)) error = EPERM;
     if (error != 0) {

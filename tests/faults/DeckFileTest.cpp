@@ -426,6 +426,20 @@ TEST_F(DeckFileTest, LinkInThePlaceOfTheFreshFolder_IsNotFollowed) {
     EXPECT_TRUE(std::filesystem::is_empty(trap));
 }
 
+TEST_F(DeckFileTest, FreshFolderThatAnotherRunTidiesAway_IsMadeAnew) {
+    static int tidied;
+    tidied = 0;
+    whf_System files = Real();
+    files.makeFolder = [](int at, const char* name) {
+        const int made = Real().makeFolder(at, name);
+        if (made == 0 && ++tidied <= 2) return Real().removeFolder(at, name);
+        return made;
+    };
+    EXPECT_TRUE(Write(files, realDevice));
+    EXPECT_EQ(tidied, 3);
+    EXPECT_EQ(folder_.Entries(), std::vector<std::string>({"job.inp"}));
+}
+
 TEST_F(DeckFileTest, LinkThatComesLater_DoesNotRedirectTheDeck) {
     folder_.Put("job.inp", kOldDeck);
     std::filesystem::create_directory(folder_.Path("trap"));
