@@ -68,15 +68,10 @@ function(qrx_sanitized list)
 endfunction()
 
 # qrx_library(NAME TYPE SOURCES... [PUBLIC LIBS...] [PRIVATE LIBS...] [PRECOMPILE HEADERS...]): a library of the
-# project and, under QRX_SANITIZED_TESTS, its double NAME_sanitized. Under QRX_UNITY_BUILD the sources of a folder are
-# compiled as one, so names of one folder's sources differ even where they are local.
+# project and, under QRX_SANITIZED_TESTS, its double NAME_sanitized. Under QRX_UNITY_BUILD its sources are compiled as
+# one, so names differ even where they are local.
 function(qrx_library name type)
     cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE;PRECOMPILE" ${ARGN})
-    foreach(source ${ARG_SOURCES})
-        get_filename_component(folder ${source} DIRECTORY)
-        get_filename_component(folder "${folder}" NAME)
-        set_source_files_properties(${source} PROPERTIES UNITY_GROUP "${folder}_")
-    endforeach()
     set(variants ${name})
     if(QRX_SANITIZED_TESTS)
         list(APPEND variants ${name}_sanitized)
@@ -90,7 +85,7 @@ function(qrx_library name type)
             list(APPEND private $<BUILD_INTERFACE:qrx_sanitizers>)
         endif()
         add_library(${variant} ${type} ${ARG_SOURCES})
-        set_target_properties(${variant} PROPERTIES UNITY_BUILD ${QRX_UNITY_BUILD} UNITY_BUILD_MODE GROUP)
+        set_target_properties(${variant} PROPERTIES UNITY_BUILD ${QRX_UNITY_BUILD} UNITY_BUILD_BATCH_SIZE 0)
         target_include_directories(${variant} PUBLIC
             $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>
             $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/QRXZptIfwOif.m/src>)
