@@ -59,19 +59,16 @@ drd_Canonical::drd_Canonical(const drd_Deck& deck, bool ignoreTitles)
                deck.blocks[static_cast<std::size_t>(keyword.block)].begin != static_cast<int>(index) &&
                !(keyword.key.starts_with("end") && keyword.row != nullptr);
     };
-    std::vector<int> items;
+    std::vector<std::pair<int, int>> items; // block and keyword
     for (std::size_t i = 0; i < deck.keywords.size(); ++i) {
         if (!isItem(i)) continue;
-        items.push_back(static_cast<int>(i));
+        items.emplace_back(deck.keywords[i].block, static_cast<int>(i));
         ++endsOfItems_[static_cast<std::size_t>(deck.keywords[i].block) + 1];
     }
     // Each block's end begins as its first place and moves on with every item.
     std::partial_sum(endsOfItems_.begin(), endsOfItems_.end(), endsOfItems_.begin());
     items_.resize(items.size());
-    for (const int item : items) {
-        const int block = deck.keywords[static_cast<std::size_t>(item)].block;
-        items_[endsOfItems_[static_cast<std::size_t>(block)]++] = item;
-    }
+    for (const auto& [block, item] : items) items_[endsOfItems_[static_cast<std::size_t>(block)]++] = item;
 }
 
 void drd_Canonical::Sign(const Renames& renames) {

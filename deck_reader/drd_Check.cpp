@@ -118,6 +118,7 @@ void Check::Parameters(const drd_Keyword& keyword) {
 }
 
 void Check::DataLines(const drd_Keyword& keyword) {
+    if (keyword.lines == 0) return;
     for (const drd_DataRef& ref : drd_DataRefs(keyword.key)) {
         if (!drd_Applies(ref, keyword)) continue;
         const auto first = static_cast<std::uint64_t>(ref.firstLine);

@@ -140,6 +140,7 @@ struct drd_Deck {
     drd_Rows<drd_Keyword> keywords;
     drd_Rows<drd_Block> blocks;
     std::vector<drd_Mesh> meshes;
+    drd_Flat<int> definitions; ///< the keywords that define a name
     drd_Rows<drd_SetPart> setParts;
     std::vector<std::string> types;  ///< element types as they stand
     std::vector<std::string> owners; ///< names of instances, without quotes

@@ -92,10 +92,7 @@ drd_Names::drd_Names(const drd_Deck& deck)
         if (block.kind != drd_BlockEnm::INSTANCE) continue;
         partOf_[i] = FindPart(deck.keywords[static_cast<std::size_t>(block.begin)].Value("part"));
     }
-    const auto defined = std::count_if(deck.keywords.begin(), deck.keywords.end(), [](const auto& keyword) {
-        return keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE;
-    });
-    index_.Reserve(deck.setParts.size() + static_cast<std::size_t>(defined));
+    index_.Reserve(deck.setParts.size() + deck.definitions.Size());
     AddSets();
     AddDefinitions();
 }
@@ -123,9 +120,8 @@ void drd_Names::AddSets() {
 }
 
 void drd_Names::AddDefinitions() {
-    for (std::size_t i = 0; i < deck_.keywords.size(); ++i) {
-        const drd_Keyword& keyword = deck_.keywords[i];
-        if (keyword.row == nullptr || keyword.row->defines == drd_KindEnm::NONE) continue;
+    for (const int index : deck_.definitions) {
+        const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(index)];
         const std::string name = drd_FoldName(keyword.Value(drd_NameParameter(*keyword.row)));
         if (name.empty()) continue;
         const drd_KindEnm kind = keyword.row->defines;
@@ -133,9 +129,9 @@ void drd_Names::AddDefinitions() {
         int block = kind == drd_KindEnm::LOAD_CASE
                         ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
                         : (IsScoped(kind) ? keyword.block : -1);
-        if (!index_.TryEmplace(name, static_cast<int>(i), drd_ScopeOf(kind, block)).second &&
+        if (!index_.TryEmplace(name, index, drd_ScopeOf(kind, block)).second &&
             kind != drd_KindEnm::CONTACT_PAIR && kind != drd_KindEnm::DERIVED) {
-            definedTwice_.push_back(static_cast<int>(i));
+            definedTwice_.push_back(index);
         }
     }
 }

@@ -193,6 +193,7 @@ void drd_Parser::Finish() {
     deck_.keywords.shrink_to_fit();
     deck_.blocks.shrink_to_fit();
     deck_.setParts.shrink_to_fit();
+    deck_.definitions.Trim();
     deck_.labels.Trim();
     deck_.lines.Trim();
     deck_.comments.Trim();

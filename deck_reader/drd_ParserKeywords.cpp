@@ -156,6 +156,9 @@ void drd_Parser::AddKeyword(drd_Keyword& keyword) {
     keyword.end = static_cast<int>(deck_.keywords.size()) + 1;
     PlaceInBlock(keyword);
     FindOwner(keyword);
+    if (keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE) {
+        deck_.definitions.Add(static_cast<int>(deck_.keywords.size()));
+    }
     deck_.keywords.push_back(keyword);
     const drd_Word key = keyword.key;
     if (key == "node") {
