@@ -42,7 +42,7 @@ mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& p
                                         const std::string& modelFile) const {
     const std::string place = path.Text();
     const bool changed =
-        std::ranges::any_of(changes_, [&](const std::string& change) { return mdf_IsBelow(change, place); });
+        std::ranges::any_of(changes_, [&](const std::string& change) { return fnd_IsBelow(change, place); });
     if (!changed) return place;
     const mdf_Value* file = json.IsObject() ? json.Find("file") : nullptr;
     if (file == nullptr || !file->IsString()) return {};

@@ -253,9 +253,7 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
     found.progress = &report.Watched().Work();
     if (report.ShowsAll()) found.most = std::numeric_limits<int>::max();
     std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found, choice);
-    if (odb != nullptr) {
-        for (const auto& [name, model] : odb->Models()) report.Ignore(*model);
-    }
+    if (odb != nullptr) report.Ignore(odiK_IgnoreList(*odb));
     report.AddAll(found);
     report.Times().End("reading");
     code = ExitCode::DONE;
