@@ -184,7 +184,8 @@
 {"element-without-node",
  "An element has a node that the mesh doesn't have. The message names both, and a node that several "
  "elements share is told of with each of them.",
- "It can't be assembled; solvers stop. Nodes were deleted, or an include with them is missing.",
+ "It can't be assembled; solvers stop. Nodes were deleted, or an include with them is "
+ "missing. A program that wrote elements before it wrote their nodes leaves such a deck when it is cut short.",
  "Add the node, or delete the element. Within a part only the part's own nodes count."},
 {"element-node-count",
  "The connectivity of elements has another number of nodes than their type takes.",

@@ -10,6 +10,7 @@
 #include <algorithm>
 #include <charconv>
 #include <memory>
+#include <mutex>
 #include <optional>
 
 namespace {
@@ -49,9 +50,22 @@ bool IsTaken(const SchemaPlace& place, const std::string& member) {
     return value != nullptr && !value->IsObject() && !value->IsArray();
 }
 
+/// The schema, made when it is first asked for, and anew when a program has added classes.
+std::shared_ptr<const Json> KeptSchema() {
+    static std::mutex mutex;
+    static std::shared_ptr<const Json> kept;
+    static std::size_t classes = 0;
+    const std::lock_guard<std::mutex> lock(mutex);
+    if (kept == nullptr || classes != cls_Classes().All().size()) {
+        classes = cls_Classes().All().size();
+        kept = std::make_shared<const Json>(mdf_Schema());
+    }
+    return kept;
+}
+
 class Placement {
 public:
-    explicit Placement(const mdf_Value& root) : root_(root), schema_(mdf_Schema()) {}
+    explicit Placement(const mdf_Value& root) : root_(root), kept_(KeptSchema()), schema_(*kept_) {}
 
     /// "is it meant for '/models/...'?" of the member at the pointer, or nothing.
     std::string HintOf(const std::string& pointer) const {
@@ -66,8 +80,10 @@ public:
             if (Has(*outer->object, member) && !IsTaken(*outer, member))
                 found.push_back(outer->pointer + "/" + member);
         }
-        for (auto outer = around.rbegin() + 1; found.empty() && outer != around.rend(); ++outer)
-            found = Within(*outer, member, true);
+        // What stands beside the models has no neighbours in them.
+        for (auto outer = around.rbegin() + 1; found.empty() && outer != around.rend(); ++outer) {
+            if (!outer->pointer.empty()) found = Within(*outer, member, true);
+        }
         if (found.empty() || found.size() > 2) return {};
         return "is it meant for " + fnd_Quoted(found.front()) +
                (found.size() == 2 ? " or " + fnd_Quoted(found.back()) : "") + "?";
@@ -148,9 +164,10 @@ private:
         });
     }
 
-    /// The places of the member within the object that need the fewest steps.
+    /// The places of the member within the object that need the fewest steps; or, of neighbours, those in
+    /// objects that go by their names and have no class: parts and instances.
     std::vector<std::string> Within(const SchemaPlace& place, const std::string& member,
-                                    bool namedAlone) const {
+                                    bool ofNeighbours) const {
         constexpr int deepest = 3;
         std::vector<std::string> found;
         std::vector<SchemaPlace> level{place};
@@ -160,9 +177,11 @@ private:
                 for (const auto& [name, node] : (*outer.object)["properties"].items())
                     AddObjects(inner, node, outer.pointer + "/" + name, false);
             }
+            if (ofNeighbours)
+                std::erase_if(inner, [](const SchemaPlace& each) { return Has(*each.object, "class"); });
             for (const SchemaPlace& each : inner) {
                 const std::string pointer = each.pointer + "/" + member;
-                if (Has(*each.object, member) && (each.isNamed || !namedAlone) &&
+                if (Has(*each.object, member) && (each.isNamed || !ofNeighbours) &&
                     std::ranges::find(found, pointer) == found.end())
                     found.push_back(pointer);
             }
@@ -172,7 +191,8 @@ private:
     }
 
     const mdf_Value& root_;
-    const Json schema_;
+    const std::shared_ptr<const Json> kept_;
+    const Json& schema_;
 };
 
 } // namespace

@@ -56,8 +56,8 @@ TEST(Placement, WhatBelongsIntoStates_AndStandsBesideThem_OrTheOtherWayRound) {
               MeantFor("/loads/L/states/.../magnitude"));
     EXPECT_EQ(
         HintOf(steps +
-               R"("loads": {"a/b": {"class": "Pressure", "states": {"I": {"distribution": "FIELD"}}}})"),
-        MeantFor("/loads/a~1b/distribution"));
+               R"("loads": {"a/b": {"class": "Pressure", "states": {"I": {"distributionType": "FIELD"}}}})"),
+        MeantFor("/loads/a~1b/distributionType"));
 }
 
 TEST(Placement, MembersOfAModel_AtTheTopOfTheFile) {
