@@ -74,6 +74,8 @@ class Decks:
         """Why no deck has lines of the object at the pointer, as the program says it; empty where it doesn't."""
         alone = copy.deepcopy(document)
         parent, last = parent_of(alone, pointer)
+        if isinstance(parent[last], dict) and parent[last].get("suppressed"):
+            return ""
         if isinstance(parent, dict):
             for other in set(parent) - {last}:
                 del parent[other]

@@ -29,7 +29,8 @@ std::string StateOf(const std::filesystem::path& file) {
     if (error) return {};
     const auto time = std::filesystem::last_write_time(file, error);
     if (error) return {};
-    return std::to_string(bytes) + "\n" + std::to_string(time.time_since_epoch().count());
+    return std::to_string(bytes) + "\n" +
+           std::to_string(static_cast<long long>(time.time_since_epoch().count()));
 }
 
 bool IsOfFile(const mdf_MeshShelf::Key& key) {
