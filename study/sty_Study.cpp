@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odb_Odb.h"
 #include "study/sty_Identity.h"
+#include "study/sty_MeshSums.h"
 #include "study/sty_Variants.h"
 
 #include <algorithm>
@@ -62,7 +63,8 @@ private:
 /// One run of a study.
 class Run {
 public:
-    Run(const sty_Request& request, sty_Observer& observer) : request_(request), observer_(observer) {}
+    Run(const sty_Request& request, sty_Observer& observer)
+        : request_(request), observer_(observer), rowMeshes_(request.model) {}
 
     sty_Outcome Do() {
         const Clock::time_point start = Clock::now();
@@ -152,7 +154,7 @@ private:
         if (ledger_->Exists() && !request_.resume)
             throw Unusable(request_.out, NameOfShard() + " was begun already: --resume goes on with it");
         if (ledger_->Exists()) RemoveUnplaced();
-        ledger_->TakeUp(*done_);
+        ledger_->TakeUp(*done_, [this](const sty_Entry& entry) { CheckMeshes(entry); });
         TakeUpOthers();
         for (long long row = rows_.first; row <= rows_.last; ++row)
             outcome_.counts.earlier += done_->Has(row);
@@ -186,8 +188,17 @@ private:
         if (!held) throw Unusable(place, "found a file that tells of no study");
         const std::string difference = identity_.DifferenceFrom(*held);
         if (difference.empty()) return;
-        throw Unusable(request_.out, "found another study: " + difference +
-                                         "; give it a folder of its own, or remove this one");
+        throw Unusable(request_.out, AnotherStudy(difference));
+    }
+
+    /// Rows that are done must not have got their decks from other meshes than those that are there now.
+    void CheckMeshes(const sty_Entry& entry) {
+        const std::string problem = rowMeshes_.ProblemOf(entry);
+        if (!problem.empty()) throw Unusable(request_.out, AnotherStudy(problem));
+    }
+
+    static std::string AnotherStudy(const std::string& difference) {
+        return "found another study: " + difference + "; give it a folder of its own, or remove this one";
     }
 
     /// Rows that were done under another division into shards. Shards of this one have rows of their own.
@@ -203,7 +214,9 @@ private:
                 const std::optional<sty_Entry> found = sty_EntryOf(line);
                 if (!found || found->deck.empty() || !done_->IsRow(found->row) || done_->Has(found->row))
                     return;
-                if (folder_->SizeOf(std::string(found->deck)) == found->bytes) done_->Add(found->row);
+                if (folder_->SizeOf(std::string(found->deck)) != found->bytes) return;
+                CheckMeshes(*found);
+                done_->Add(found->row);
             });
         }
     }
@@ -273,6 +286,7 @@ private:
             while (!stop_ && queue.Next(raw)) {
                 const Clock::time_point start = Clock::now();
                 sty_Result result = variants.Make(table_->Parse(raw), *columns_);
+                if (result.IsDone() && ledger_ != nullptr) SumUpMeshes(result);
                 if (result.IsDone()) Write(variants.Text(), placer.get(), result);
                 result.seconds = SecondsSince(start);
                 if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
@@ -282,6 +296,14 @@ private:
             Fail(std::make_exception_ptr(Unusable(request_.table, error.what(), true)));
         } catch (...) {
             Fail(std::current_exception());
+        }
+    }
+
+    void SumUpMeshes(sty_Result& result) {
+        for (auto& [file, sum] : result.meshes) {
+            std::string problem;
+            sum = rowMeshes_.Use(file, result.row, problem);
+            if (!problem.empty()) result.errors.push_back({{}, {}, std::move(problem)});
         }
     }
 
@@ -335,6 +357,7 @@ private:
     std::unique_ptr<mdf_Template> template_;
     std::vector<fnd_Finding> baseline_;
     sty_MeshTexts meshes_;
+    sty_MeshSums rowMeshes_;
     sty_Layout layout_;
     sty_Rows rows_;
     std::unique_ptr<sty_DoneRows> done_;
