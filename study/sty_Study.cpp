@@ -38,26 +38,40 @@ private:
     bool refused_;
 };
 
-/// The rows that are left, in order, for several threads.
+/// The rows that are left, in order, for several threads. A thread takes neighbours, of one folder: two that
+/// make files in one folder wait for each other. Towards the end it takes fewer, so that all end together.
 class RowQueue {
 public:
-    RowQueue(const sty_Table& table, sty_Rows rows, const sty_DoneRows& done)
-        : reader_(table), rows_(rows), done_(done) {}
+    RowQueue(const sty_Table& table, sty_Rows rows, const sty_DoneRows& done, long long left, int threads)
+        : reader_(table), rows_(rows), done_(done), left_(left), threads_(threads) {}
 
-    bool Next(sty_RawRow& raw) {
+    /// The next rows in the place of these; none when there are no more.
+    void Next(std::vector<sty_RawRow>& taken) {
         const std::lock_guard<std::mutex> lock(mutex_);
-        while (reader_.Next(raw)) {
-            if (raw.number > rows_.last) return false;
-            if (raw.number >= rows_.first && !done_.Has(raw.number)) return true;
+        const auto most = static_cast<std::size_t>(std::max(left_ / (4LL * threads_), 1LL));
+        std::size_t count = 0;
+        for (std::size_t bytes = 0; count < most && bytes < kMostBytes;) {
+            if (count == taken.size()) taken.emplace_back();
+            sty_RawRow& raw = taken[count];
+            if (!reader_.Next(raw) || raw.number > rows_.last) break;
+            if (raw.number < rows_.first || done_.Has(raw.number)) continue;
+            ++count;
+            bytes += raw.text.size();
+            if (raw.number % sty_Layout::kMostEntries == 0) break;
         }
-        return false;
+        taken.resize(count);
+        left_ -= static_cast<long long>(count);
     }
 
 private:
+    static constexpr std::size_t kMostBytes = std::size_t{1} << 20;
+
     std::mutex mutex_;
     sty_TableReader reader_;
     sty_Rows rows_;
     const sty_DoneRows& done_;
+    long long left_;
+    int threads_;
 };
 
 /// One run of a study.
@@ -74,9 +88,6 @@ public:
         TellBaseline(*first);
         RunRows(std::move(first), start);
         outcome_.counts.seconds = SecondsSince(start);
-        std::ranges::sort(outcome_.failures, {}, &sty_Failure::row);
-        if (outcome_.failures.size() > sty_Outcome::kMostFailures)
-            outcome_.failures.resize(sty_Outcome::kMostFailures);
         return std::move(outcome_);
     }
 
@@ -234,11 +245,11 @@ private:
     }
 
     void RunRows(std::unique_ptr<sty_Variants> first, Clock::time_point start) {
-        RowQueue queue(*table_, rows_, *done_);
         const long long left = outcome_.counts.rows - outcome_.counts.earlier;
         const int wanted =
             request_.jobs > 0 ? request_.jobs : static_cast<int>(std::thread::hardware_concurrency());
         const int jobs = static_cast<int>(std::clamp<long long>(wanted, 1, std::max(left, 1LL)));
+        RowQueue queue(*table_, rows_, *done_, left, jobs);
         std::vector<std::unique_ptr<sty_Variants>> variants;
         variants.push_back(std::move(first));
         for (int job = 1; job < jobs; ++job) {
@@ -282,21 +293,27 @@ private:
             if (folder_ != nullptr) {
                 placer = std::make_unique<sty_Placer>(*folder_, PlacerName() + std::to_string(job));
             }
-            sty_RawRow raw;
-            while (!stop_ && queue.Next(raw)) {
-                const Clock::time_point start = Clock::now();
-                sty_Result result = variants.Make(table_->Parse(raw), *columns_);
-                if (result.IsDone() && ledger_ != nullptr) SumUpMeshes(result);
-                if (result.IsDone()) Write(variants.Text(), placer.get(), result);
-                result.seconds = SecondsSince(start);
-                if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
-                Count(result);
+            std::vector<sty_RawRow> rows;
+            for (queue.Next(rows); !rows.empty() && !stop_; queue.Next(rows)) {
+                for (const sty_RawRow& raw : rows) {
+                    if (!stop_) DoRow(raw, variants, placer.get());
+                }
             }
         } catch (const sty_TableError& error) {
             Fail(std::make_exception_ptr(Unusable(request_.table, error.what(), true)));
         } catch (...) {
             Fail(std::current_exception());
         }
+    }
+
+    void DoRow(const sty_RawRow& raw, sty_Variants& variants, sty_Placer* placer) {
+        const Clock::time_point start = Clock::now();
+        sty_Result result = variants.Make(table_->Parse(raw), *columns_);
+        if (result.IsDone() && ledger_ != nullptr) SumUpMeshes(result);
+        if (result.IsDone()) Write(variants.Text(), placer, result);
+        result.seconds = SecondsSince(start);
+        if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
+        Count(result);
     }
 
     void SumUpMeshes(sty_Result& result) {
@@ -336,10 +353,13 @@ private:
             return;
         }
         ++outcome_.counts.failed;
-        // Threads are hardly ever more rows apart.
-        constexpr std::size_t kept = 10 * sty_Outcome::kMostFailures;
-        if (outcome_.failures.size() < kept)
-            outcome_.failures.push_back({result.row, result.name, result.Reason()});
+        // The first ones by row, whenever they come.
+        std::vector<sty_Failure>& failures = outcome_.failures;
+        const bool isFull = failures.size() >= sty_Outcome::kMostFailures;
+        if (isFull && failures.back().row < result.row) return;
+        if (isFull) failures.pop_back();
+        const auto place = std::ranges::upper_bound(failures, result.row, {}, &sty_Failure::row);
+        failures.insert(place, {result.row, result.name, result.Reason()});
     }
 
     void Fail(std::exception_ptr failure) {
