@@ -1,4 +1,4 @@
-// The page in a real browser, opened from disk: node browser.mjs QRXDECK PROJECT [--pictures]
+// The page in a real browser, opened from disk: node browser.mjs QRXDECK PROJECT [--pictures] [[--but] TEST]
 // With --pictures the expected pictures are made anew, to be looked at.
 import assert from "node:assert/strict";
 import { execFileSync, spawnSync } from "node:child_process";
@@ -294,7 +294,7 @@ let failed = 0;
 const begin = performance.now();
 try {
     for (const [name, test] of Object.entries(tests)) {
-        if (only !== undefined && !name.includes(only)) continue;
+        if (only !== undefined && name.includes(only) === options.includes("--but")) continue;
         const tab = await browser.newPage();
         const start = performance.now();
         try {
