@@ -104,7 +104,7 @@ const tests = {
         };
         assert.match(await press("Initial"), /not yet active$/);
         const before = await red();
-        assert.match(await press("Push"), /created$/);
+        assert.match(await press("Push"), /created · 3$/);
         const during = await red();
         assert.match(await press("Pull"), /deactivated$/);
         const after = await red();

@@ -179,7 +179,7 @@ async function checkHeads(tab, object, deck, size, takeChange, what) {
         const part = object.bolt && place > begin + length ? (end - place) / length : (place - begin) / length;
         for (const [name, [from, to]] of Object.entries(spans)) if (part >= from && part <= to) counts[name] += count;
     }
-    assert.ok(counts.head >= counts.shaft && counts.tail > 1.2 * counts.tip, `${what}: ${JSON.stringify(counts)}`);
+    assert.ok(counts.head >= counts.shaft && counts.tail > 1.1 * counts.tip, `${what}: ${JSON.stringify(counts)}`);
 }
 
 /** What has no arrows is seen on its regions and nowhere else. */
