@@ -219,7 +219,10 @@ export class Page {
         place.replaceChildren();
         const { header } = this.model;
         const step = header.steps[this.step];
-        if (step === undefined) return;
+        if (step === undefined) {
+            place.append(make("p", { class: "soft" }, "There are no steps here. A click on the picture, on an instance or on a set tells of it."));
+            return;
+        }
         place.append(make("h2", {}, `Step ${step.name}`));
         const facts = [step.procedure, step.perturbation ? "linear perturbation" : "", step.period === undefined ? "" : `time ${step.period}`, step.description];
         place.append(make("p", { class: "soft" }, facts.filter((fact) => fact !== "").join(" · ")));
@@ -320,7 +323,7 @@ export class Page {
         else if (selection.kind === "set") box = this.body?.light([selection.region]) ?? box;
         else if (selection.kind === "instance") box = this.body?.light([], selection.hit === undefined ? [selection.index] : []) ?? box;
         else box = this.body?.light(at(this.model.header.objects, selection.index).regions) ?? box;
-        if (zoom && selection?.kind === "set" && !box.isEmpty()) this.stage?.fit(box);
+        if (zoom && selection?.kind === "set" && !box.isEmpty()) this.zoomToSelection();
         this.fillLabels();
         this.markSelection();
         this.fillCard();
@@ -335,7 +338,8 @@ export class Page {
         if (selection.kind === "instance") box.copy(at(this.body.instances, selection.index).box);
         const regions = selection.kind === "set" ? [selection.region] : selection.kind === "object" ? at(this.model.header.objects, selection.index).regions : [];
         for (const region of regions) for (const part of this.model.partsOf(region)) box.union(this.body.boxOf(part));
-        this.stage?.fit(box.isEmpty() ? undefined : box);
+        // With some of what is around it.
+        this.stage?.fit(box.isEmpty() ? undefined : box.expandByScalar(0.04 * this.stage.size));
     }
 
     private fillCard(): void {
