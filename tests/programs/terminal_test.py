@@ -84,13 +84,25 @@ class Program(unittest.TestCase):
         run.output, run.errors = run.stdout.decode(), run.stderr.decode()
         return run
 
-    def on_terminal(self, *words, columns=80, stdout=None):
-        """The exit code, and all that a terminal was sent: on both streams, or the standard error alone."""
+    @staticmethod
+    def halt(run, seconds):
+        time.sleep(0.05)
+        run.send_signal(signal.SIGSTOP)
+        time.sleep(seconds)
+        run.send_signal(signal.SIGCONT)
+
+    def on_terminal(self, *words, columns=80, stdout=None, pause=0.0):
+        """The exit code, and all that a terminal was sent: on both streams, or the standard error alone.
+
+        With a pause the run is halted soon after its beginning, so that it takes as long by the clock as a larger one.
+        """
         ours, theirs = pty.openpty()
         fcntl.ioctl(theirs, termios.TIOCSWINSZ, struct.pack("HHHH", 24, columns, 0, 0))
         run = subprocess.Popen([PROGRAM, *words], cwd=self.folder, env=self.environment, stdin=theirs,
                                stdout=theirs if stdout is None else stdout, stderr=theirs)
         os.close(theirs)
+        if pause:
+            self.halt(run, pause)
         seen = b""
         while True:
             try:
@@ -478,9 +490,9 @@ class Watching(Program):
 
     def lines_of_long_run(self, prepare, *words, columns=100):
         """What a run shows that is long enough to show something: the larger, the quicker the machine."""
-        for nodes in (1500000, 6000000, 24000000):
+        for nodes in (300000, 1500000, 6000000, 24000000):
             prepare(nodes)
-            code, seen = self.on_terminal(*words, columns=columns)
+            code, seen = self.on_terminal(*words, columns=columns, pause=0.6)
             self.assertEqual(code, 0)
             if lines := self.LINE.findall(seen):
                 return lines, seen
@@ -511,12 +523,13 @@ class Watching(Program):
         self.assertRegex(b" ".join(lines), rb"(reading|checking) large\.inp")
 
     def test_RunThatIsEnded_TakesTheLineAway(self):
-        self.put("bridge.json", changed(with_many_nodes(6000000)))
+        self.put("bridge.json", changed(with_many_nodes(1500000)))
         ours, theirs = pty.openpty()
         run = subprocess.Popen([PROGRAM, "write", "bridge.json", "--threads", "1"], cwd=self.folder,
                                env=self.environment, stdin=theirs, stdout=theirs, stderr=theirs)
         os.close(theirs)
         self.addCleanup(os.close, ours)
+        self.halt(run, 0.6)
         seen = b""
         while not self.LINE.search(seen):
             self.assertTrue(select.select([ours], [], [], 60)[0])
@@ -542,7 +555,7 @@ class Watching(Program):
         self.assertEqual((run.returncode, run.errors), (0, ""))
 
     def test_TimesOfTheSummary_AreThoseOfTheWholeRun(self):
-        self.put("bridge.json", changed(with_many_nodes(1500000)))
+        self.put("bridge.json", changed(with_many_nodes(600000)))
         begin = time.monotonic()
         run = self.run_program("write", "bridge.json", "--verify", "--json")
         wall = time.monotonic() - begin

@@ -1,8 +1,9 @@
 #!/usr/bin/env python3
-"""Compiles every header of the libraries alone, twice in one source.
+"""Compiles every header of the libraries as if it stood alone, twice in its source.
 
-The standard library's headers that many include are parsed once for all, so whether a header includes what it takes
-of that library is looked up in a table: each std:: name, and the headers that give it.
+A source holds several, each of which includes all that stand before it, so that none finds what it should have
+included itself. The standard library's headers that many include are parsed once for all; whether a header includes
+what it takes of that library is looked up in a table: each std:: name, and the headers that give it.
 
 usage: check_headers.py REPOSITORY COMPILER [FLAG ...]
 """
@@ -89,6 +90,7 @@ class Includes:
     def __init__(self, root):
         self.bases = [root, root / DECK_WRITER]
         self.known = {}
+        self.closures = {}
 
     def text(self, name):
         for base in self.bases:
@@ -96,13 +98,33 @@ class Includes:
                 return (base / name).read_text(encoding="utf-8")
         return None
 
+    def closure(self, name):
+        """The header and all of the tree that comes with it."""
+        if name not in self.closures:
+            self.closures[name] = found = {name}
+            for other in re.findall(r'^ *# *include "([^"]+)"', self.text(name) or "", re.MULTILINE):
+                found |= self.closure(other)
+        return self.closures[name]
+
     def standard(self, name):
         if name not in self.known:
-            self.known[name] = found = set()
-            found.update(self.own(name))
-            for other in re.findall(r'^ *# *include "([^"]+)"', self.text(name) or "", re.MULTILINE):
-                found |= self.standard(other)
+            self.known[name] = {header for other in self.closure(name) for header in self.own(other)}
         return self.known[name]
+
+    def chains(self, names):
+        """All the headers in lists, within which each comes with all before it."""
+        def size(name):
+            return len(self.closure(name))
+
+        left = set(names)
+        for name in sorted(names, key=size, reverse=True):
+            chain = []
+            while name in left:
+                left.remove(name)
+                chain.insert(0, name)
+                name = max(self.closure(name) & left, key=lambda other: (size(other), other), default=None)
+            if chain:
+                yield chain
 
     def frequent(self, names):
         """The standard library's headers that many of the headers include themselves."""
@@ -138,15 +160,16 @@ def main():
         flags = [*sys.argv[2:], "-I", root, "-I", root / DECK_WRITER, "-x"]
         subprocess.run([*flags, "c++-header", common, "-o", f"{common}.gch"], check=True)
 
-        def compile_alone(header):
-            source = f'#include "{header}"\n' * 2
+        def compile_chain(chain):
+            source = "".join(f'#include "{header}"\n' * 2 for header in chain)
             return subprocess.run([*flags, "c++", "-include", common, "-fsyntax-only", "-"], input=source, text=True,
                                   capture_output=True)
 
         with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
-            results = list(pool.map(compile_alone, names))
-    findings += [f"{name} does not compile alone:\n{result.stderr}" for name, result in zip(names, results)
-                 if result.returncode != 0]
+            chains = list(includes.chains(names))
+            results = list(pool.map(compile_chain, chains))
+    findings += [f"{', '.join(chain)}: not all compile alone:\n{result.stderr}"
+                 for chain, result in zip(chains, results) if result.returncode != 0]
     for finding in findings:
         print(finding)
     print(f"{len(names)} headers, {len(findings)} findings")

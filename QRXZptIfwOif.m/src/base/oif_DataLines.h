@@ -18,6 +18,12 @@ inline void oif_PrintGeometry(utl_Stream& stream, std::initializer_list<double> 
     }
 }
 
+/// Further numbers of a line that has been begun: the separator before each.
+inline void oif_AddNumbers(utl_Stream& stream, std::initializer_list<double> numbers,
+                           const char* separator = ", ") {
+    for (const double number : numbers) stream << separator << number;
+}
+
 /// Writes values in data lines of at most `perLine`: ", " between two of a line, and nothing but its end
 /// behind the last.
 class oif_DataLines {

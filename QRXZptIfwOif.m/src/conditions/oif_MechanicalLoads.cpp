@@ -1,5 +1,6 @@
 #include "conditions/oif_MechanicalLoads.h"
 
+#include "base/oif_DataLines.h"
 #include "base/oif_Utils.h"
 #include "mesh/oif_SetName.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -25,10 +26,6 @@ constexpr const char* kEdgeLabels[] = {"EDNOR", "EDTRA", "EDSHR", "EDMOM", "EDLD
 
 constexpr int kThreeDimensional = 1;
 constexpr int kAxisymmetric = 4;
-
-void WriteNumbers(utl_Stream& stream, std::initializer_list<double> numbers, const char* separator = ", ") {
-    for (const double number : numbers) stream << separator << number;
-}
 
 /// Of unit length; a zero vector gives zeros, whatever their signs were.
 gsl_Vector Unit(gsl_Vector vector) {
@@ -262,10 +259,10 @@ void oif_Dload::WriteGravity(utl_Stream& stream) const {
         if (space_ == kAxisymmetric) {
             stream << ", ";
         } else {
-            WriteNumbers(stream, {cosines.X()});
+            oif_AddNumbers(stream, {cosines.X()});
         }
-        WriteNumbers(stream, {cosines.Y()});
-        if (space_ == kThreeDimensional) WriteNumbers(stream, {cosines.Z()});
+        oif_AddNumbers(stream, {cosines.Y()});
+        if (space_ == kThreeDimensional) oif_AddNumbers(stream, {cosines.Z()});
         stream.LineBreak();
     };
     const auto vectorOf = [&](int part) {
@@ -283,17 +280,17 @@ void oif_Dload::WriteGravity(utl_Stream& stream) const {
 }
 
 void oif_Dload::WritePipePressureData(utl_Stream& stream) const {
-    if (hydrostatic_) WriteNumbers(stream, {heights_[0], heights_[1]});
-    WriteNumbers(stream, {diameter_});
+    if (hydrostatic_) oif_AddNumbers(stream, {heights_[0], heights_[1]});
+    oif_AddNumbers(stream, {diameter_});
     stream.LineBreak();
 }
 
 void oif_Dload::WriteRotBodyForceData(utl_Stream& stream, double magnitude) const {
     BeginLine(stream, label_, ",");
     stream << magnitude;
-    WriteNumbers(stream, {axis_.Start().X(), axis_.Start().Y(), axis_.Start().Z()}, ",");
+    oif_AddNumbers(stream, {axis_.Start().X(), axis_.Start().Y(), axis_.Start().Z()}, ",");
     const gsl_Vector direction = Unit(axis_.Direction());
-    if (space_ < 3) WriteNumbers(stream, {direction.X(), direction.Y(), direction.Z()}, ",");
+    if (space_ < 3) oif_AddNumbers(stream, {direction.X(), direction.Y(), direction.Z()}, ",");
     if (space_ == kAxisymmetric) stream << ",0.0,1.0,0.0";
     stream.LineBreak();
 }
@@ -403,11 +400,11 @@ void oif_Dsload::WriteDsloadCard(utl_Stream& stream, int loadCase, bool follower
 }
 
 void oif_Dsload::WriteHydrostaticData(utl_Stream& stream) const {
-    WriteNumbers(stream, {heights_[0], heights_[1]});
+    oif_AddNumbers(stream, {heights_[0], heights_[1]});
 }
 
 void oif_Dsload::WriteDirectionVectorData(utl_Stream& stream) const {
-    WriteNumbers(stream, {direction_.X(), direction_.Y(), direction_.Z()});
+    oif_AddNumbers(stream, {direction_.X(), direction_.Y(), direction_.Z()});
 }
 
 void oif_Dsload::WritePressure(utl_Stream& stream) const {

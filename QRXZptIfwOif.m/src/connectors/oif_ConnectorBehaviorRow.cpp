@@ -5,17 +5,18 @@
 
 namespace {
 
-using Option = kbeC_ConnectorBehaviorOption;
+using BehaviorOption = kbeC_ConnectorBehaviorOption;
 
 template <class R>
-qkw_KeywordHandle Make(const Option& option, const qkw_ModelInfo&, int, oif_DerivedComponents&) {
+qkw_KeywordHandle Make(const BehaviorOption& option, const qkw_ModelInfo&, int, oif_DerivedComponents&) {
     return qkw_KeywordHandle(oif_ConnectorOption<R>(static_cast<const R&>(option)));
 }
 
 /// An option with potentials, whose terms may be derived components.
 template <class R, class Keyword>
-qkw_KeywordHandle MakeWithDerived(const Option& option, [[maybe_unused]] const qkw_ModelInfo& modelInfo,
-                                  int index, oif_DerivedComponents& derived) {
+qkw_KeywordHandle MakeWithDerived(const BehaviorOption& option,
+                                  [[maybe_unused]] const qkw_ModelInfo& modelInfo, int index,
+                                  oif_DerivedComponents& derived) {
     const auto file = [&](const Keyword& keyword) {
         keyword.GetDerivedComponents(derived);
         return qkw_KeywordHandle(keyword);

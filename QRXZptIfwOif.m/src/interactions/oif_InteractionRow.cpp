@@ -45,7 +45,7 @@ constexpr oif_InteractionRow History(std::span<const Rule> regions = {}) {
 }
 
 template <class R, void (*add)(oif_InteractionBuilder&, const cow_String&, const R&)>
-constexpr oif_InteractionRow Pair(oif_ContactSolver solver, std::span<const Rule> regions) {
+constexpr oif_InteractionRow ContactPair(oif_ContactSolver solver, std::span<const Rule> regions) {
     return {R::Class.Id(), regions, solver, HistoryOf<R, add>, oif_ContactPair::WriteAs<R>};
 }
 
@@ -96,10 +96,12 @@ constexpr oif_InteractionRow ElasticFoundation() {
 using enum oif_ContactSolver;
 
 constexpr oif_InteractionRow kInteractionRows[] = {
-    Pair<kinC_SurfaceToSurfaceContactStd, oif_SurfaceToSurfaceContactStdHistory>(IMPLICIT, kPairRegions),
-    Pair<kinC_SurfaceToSurfaceContactXpl, oif_SurfaceToSurfaceContactXplHistory>(EXPLICIT, kPairRegions),
-    Pair<kinC_SelfContactStd, oif_SelfContactStdHistory>(IMPLICIT, kSelfRegions),
-    Pair<kinC_SelfContactXpl, oif_SelfContactXplHistory>(EXPLICIT, kSelfRegions),
+    ContactPair<kinC_SurfaceToSurfaceContactStd, oif_SurfaceToSurfaceContactStdHistory>(IMPLICIT,
+                                                                                        kPairRegions),
+    ContactPair<kinC_SurfaceToSurfaceContactXpl, oif_SurfaceToSurfaceContactXplHistory>(EXPLICIT,
+                                                                                        kPairRegions),
+    ContactPair<kinC_SelfContactStd, oif_SelfContactStdHistory>(IMPLICIT, kSelfRegions),
+    ContactPair<kinC_SelfContactXpl, oif_SelfContactXplHistory>(EXPLICIT, kSelfRegions),
     History<kinC_ContactExp, oif_ContactExpHistory>(),
     History<kinC_CavityRadiation, oif_CavityRadiationHistory>(),
     SaidOnSurface<kinC_FilmCondition, oif_Sfilm, oif_RegionKind::SURFACE>(),

@@ -1,5 +1,6 @@
 #include "interactions/oif_WaveInteractions.h"
 
+#include "base/oif_DataLines.h"
 #include "keyword_layer/qkw_QuorixName.h"
 #include "materials/oif_MaterialTable.h"
 #include "mesh/oif_SetName.h"
@@ -10,10 +11,6 @@ constexpr const char* kBoundaryTypes[] = {"PLANAR",    "IMPROVED",   "CIRCULAR",
                                           "SPHERICAL", "ELLIPTICAL", "PROLATE SPHEROIDAL"};
 enum BoundaryType { CIRCULAR = 2, SPHERICAL = 3, ELLIPTICAL = 4, PROLATE_SPHEROIDAL = 5 };
 enum BubbleModel { CHARGE = 1, DECAY = 2 };
-
-void WriteNumbers(utl_Stream& stream, std::initializer_list<double> values) {
-    for (const double value : values) stream << ", " << value;
-}
 
 } // namespace
 
@@ -40,8 +37,8 @@ void oif_AcousticImpedance::WriteData(utl_Stream& stream) const {
     case PROLATE_SPHEROIDAL: {
         const gsl_Point& center = impedance.center;
         const gsl_Vector axis = impedance.axis.Direction();
-        WriteNumbers(stream, {impedance.semiAxisA, impedance.semiAxisB, center.X(), center.Y(), center.Z(),
-                              axis.X(), axis.Y(), axis.Z()});
+        oif_AddNumbers(stream, {impedance.semiAxisA, impedance.semiAxisB, center.X(), center.Y(), center.Z(),
+                                axis.X(), axis.Y(), axis.Z()});
         break;
     }
     default: break;
@@ -92,7 +89,7 @@ void oif_IncidentWaveProperty::Write(utl_Stream& stream) const {
         .End();
     stream << property_.speed << ", " << property_.density;
     if (property_.bubbleModel == DECAY) {
-        WriteNumbers(stream, {property_.decayA, property_.decayB, property_.decayC});
+        oif_AddNumbers(stream, {property_.decayA, property_.decayB, property_.decayC});
     }
     stream << endl;
     if (property_.bubbleModel == CHARGE) WriteCharge(stream);
@@ -101,17 +98,17 @@ void oif_IncidentWaveProperty::Write(utl_Stream& stream) const {
 void oif_IncidentWaveProperty::WriteCharge(utl_Stream& stream) const {
     const kinC_IncidentWaveProperty& p = property_;
     stream << "*UNDEX Charge Property" << endl << p.pressureConstant;
-    WriteNumbers(stream, {p.timeConstant, p.pressureExponent, p.timeExponent, p.adiabaticConstant,
-                          p.specificHeatRatio, p.chargeDensity, p.chargeMass});
+    oif_AddNumbers(stream, {p.timeConstant, p.pressureExponent, p.timeExponent, p.adiabaticConstant,
+                            p.specificHeatRatio, p.chargeDensity, p.chargeMass});
     stream << endl << p.fluidDensity;
-    WriteNumbers(stream, {p.fluidSoundSpeed, p.gravity, p.atmosphericPressure});
+    oif_AddNumbers(stream, {p.fluidSoundSpeed, p.gravity, p.atmosphericPressure});
     // The flag stands as a real.
     stream << ", " << (p.waveEffects ? "1.0, " : "0.0, ") << p.dragCoefficient << ", " << p.dragExponent
            << endl
            << p.maximumTime << ", " << p.maximumSteps;
-    WriteNumbers(stream, {p.relativeStepControl, p.absoluteStepControl, p.stepControlExponent});
+    oif_AddNumbers(stream, {p.relativeStepControl, p.absoluteStepControl, p.stepControlExponent});
     const gsl_Vector normal = normal_.Direction();
     stream << endl << depth_;
-    WriteNumbers(stream, {normal.X(), normal.Y(), normal.Z()});
+    oif_AddNumbers(stream, {normal.X(), normal.Y(), normal.Z()});
     stream << endl;
 }

@@ -7,14 +7,14 @@
 
 namespace {
 
-constexpr int kComponents = 6;
+constexpr int kConnectorComponents = 6;
 
 /// Components are numbers from 1 to 6, none of them twice.
 void CheckComponents(const char* field, const cow_List<int>& components, fnd_RecordCheck& check) {
-    std::array<bool, kComponents + 1> seen{};
+    std::array<bool, kConnectorComponents + 1> seen{};
     for (int i = 0; i < components.Length(); ++i) {
         const int component = components[i];
-        if (component < 1 || component > kComponents) {
+        if (component < 1 || component > kConnectorComponents) {
             check.Add("wrong-component", field, "found " + std::to_string(component),
                       "components from 1 to 6");
         } else if (seen[static_cast<std::size_t>(component)]) {
@@ -108,7 +108,7 @@ void CheckComponentsOf(const R& record, fnd_RecordCheck& check) {
     CheckComponents("components", record.components, check);
 }
 
-void CheckFriction(const kbeC_ConnectorFriction& record, fnd_RecordCheck& check) {
+void CheckConnectorFriction(const kbeC_ConnectorFriction& record, fnd_RecordCheck& check) {
     check.NotNegative("dependencies", record.dependencies);
     CheckComponents("independentComponents", record.independentComponents, check);
     if (record.formulation == kbeC_ConnectorFriction::FormulationEnm::PREDEFINED) return;
@@ -202,7 +202,7 @@ void fnd_AddConnectorRules(fnd_RecordRules& rules) {
     rules.Add<CheckComponentsOf<kbeC_ConnectorStop>>();
     rules.Add<CheckComponentsOf<kbeC_ConnectorLock>>();
     rules.Add<CheckComponentsOf<kbeC_ConnectorFailure>>();
-    rules.Add<CheckFriction>();
+    rules.Add<CheckConnectorFriction>();
     rules.Add<CheckTangentialBehavior>();
     rules.Add<CheckPlasticity>();
     rules.Add<CheckDamage>();

@@ -11,9 +11,9 @@
 namespace {
 
 enum Traits : unsigned {
-    kExplicit = 1U << 0,
-    kPerturbation = 1U << 1,
-    kNonmechanical = 1U << 2,
+    kIsExplicit = 1U << 0,
+    kIsPerturbation = 1U << 1,
+    kIsNonmechanical = 1U << 2,
     kLoadCases = 1U << 3,
     kMeshDomains = 1U << 4,
     kImplicitModal = 1U << 5,
@@ -28,30 +28,30 @@ struct Procedure {
 };
 
 constexpr Procedure kProcedures[] = {
-    {kprC_AnnealStep::Class.Id(), kExplicit},
-    {kprC_BuckleStep::Class.Id(), kPerturbation | kEigenvalues},
+    {kprC_AnnealStep::Class.Id(), kIsExplicit},
+    {kprC_BuckleStep::Class.Id(), kIsPerturbation | kEigenvalues},
     {kprC_CoupledTempDisplacementStep::Class.Id(), kMeshDomains | kIntervals},
-    {kprC_CoupledThermalElectricStep::Class.Id(), kNonmechanical | kIntervals},
-    {kprC_ExplicitDynamicsStep::Class.Id(), kExplicit | kMeshDomains | kIntervals},
-    {kprC_FrequencyStep::Class.Id(), kPerturbation | kEigenvalues},
+    {kprC_CoupledThermalElectricStep::Class.Id(), kIsNonmechanical | kIntervals},
+    {kprC_ExplicitDynamicsStep::Class.Id(), kIsExplicit | kMeshDomains | kIntervals},
+    {kprC_FrequencyStep::Class.Id(), kIsPerturbation | kEigenvalues},
     {kprC_GeostaticStep::Class.Id(), 0},
-    {kprC_HeatTransferStep::Class.Id(), kNonmechanical | kIntervals},
+    {kprC_HeatTransferStep::Class.Id(), kIsNonmechanical | kIntervals},
     {kprC_ImplicitDynamicsStep::Class.Id(), kImplicitModal | kIntervals},
-    {kprC_MassDiffusionStep::Class.Id(), kNonmechanical | kIntervals},
-    {kprC_ModalDynamicsStep::Class.Id(), kPerturbation | kLoadCases | kImplicitModal | kContinued},
-    {kprC_RandomResponseStep::Class.Id(), kPerturbation},
-    {kprC_ResponseSpectrumStep::Class.Id(), kPerturbation},
+    {kprC_MassDiffusionStep::Class.Id(), kIsNonmechanical | kIntervals},
+    {kprC_ModalDynamicsStep::Class.Id(), kIsPerturbation | kLoadCases | kImplicitModal | kContinued},
+    {kprC_RandomResponseStep::Class.Id(), kIsPerturbation},
+    {kprC_ResponseSpectrumStep::Class.Id(), kIsPerturbation},
     {kprC_SoilsStep::Class.Id(), kMeshDomains | kIntervals},
     {kprC_StaticStep::Class.Id(), kMeshDomains | kIntervals},
     {kprC_StaticRiksStep::Class.Id(), 0},
-    {kprC_StaticLinearPerturbationStep::Class.Id(), kPerturbation | kLoadCases | kContinued},
-    {kprC_SteadyStateDirectStep::Class.Id(), kPerturbation | kLoadCases},
-    {kprC_SteadyStateModalStep::Class.Id(), kPerturbation | kLoadCases},
+    {kprC_StaticLinearPerturbationStep::Class.Id(), kIsPerturbation | kLoadCases | kContinued},
+    {kprC_SteadyStateDirectStep::Class.Id(), kIsPerturbation | kLoadCases},
+    {kprC_SteadyStateModalStep::Class.Id(), kIsPerturbation | kLoadCases},
     {kprC_SubspaceDynamicsStep::Class.Id(), kImplicitModal},
     {kprC_ViscoStep::Class.Id(), kIntervals},
-    {kprC_TempDisplacementDynamicsStep::Class.Id(), kExplicit | kMeshDomains | kIntervals},
-    {kprC_ComplexFrequencyStep::Class.Id(), kPerturbation | kEigenvalues},
-    {kprC_SteadyStateSubspaceStep::Class.Id(), kPerturbation},
+    {kprC_TempDisplacementDynamicsStep::Class.Id(), kIsExplicit | kMeshDomains | kIntervals},
+    {kprC_ComplexFrequencyStep::Class.Id(), kIsPerturbation | kEigenvalues},
+    {kprC_SteadyStateSubspaceStep::Class.Id(), kIsPerturbation},
 };
 
 unsigned TraitsOf(unsigned stepType) {
@@ -73,15 +73,15 @@ bool IsProcedure(unsigned stepType) {
 } // namespace
 
 bool kprC_IsExplicit(unsigned stepType) {
-    return Has(stepType, kExplicit);
+    return Has(stepType, kIsExplicit);
 }
 
 bool kprC_IsPerturbation(unsigned stepType) {
-    return Has(stepType, kPerturbation);
+    return Has(stepType, kIsPerturbation);
 }
 
 bool kprC_IsNonmechanical(unsigned stepType) {
-    return Has(stepType, kNonmechanical);
+    return Has(stepType, kIsNonmechanical);
 }
 
 bool kprC_LoadCasesAreAllowed(unsigned stepType) {
@@ -109,11 +109,11 @@ bool kprC_ModesIsAllowed(unsigned stepType) {
 }
 
 bool kprC_OutputFrequencyIsAllowed(unsigned stepType, bool isField) {
-    return IsProcedure(stepType) && !Has(stepType, isField ? kExplicit | kEigenvalues : kEigenvalues);
+    return IsProcedure(stepType) && !Has(stepType, isField ? kIsExplicit | kEigenvalues : kEigenvalues);
 }
 
 bool kprC_NumberIntervalIsAllowed(const kprC_AnalysisStep& step) {
-    return Has(step.DynTypeId(), kExplicit | kIntervals);
+    return Has(step.DynTypeId(), kIsExplicit | kIntervals);
 }
 
 bool kprC_TimeIntervalIsAllowed(unsigned stepType) {
@@ -121,7 +121,7 @@ bool kprC_TimeIntervalIsAllowed(unsigned stepType) {
 }
 
 bool kprC_TimePointIsAllowed(unsigned stepType, bool isField) {
-    return Has(stepType, kIntervals) && (isField || !Has(stepType, kExplicit));
+    return Has(stepType, kIntervals) && (isField || !Has(stepType, kIsExplicit));
 }
 
 bool kprC_TimeMarksIsAllowed(unsigned stepType, bool isField) {
