@@ -44,7 +44,7 @@ set(QRX_SANITIZER_FLAGS -fsanitize=address,undefined -fno-sanitize=null,object-s
 target_compile_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS} -O0 -g1)
 target_link_options(qrx_sanitizers INTERFACE ${QRX_SANITIZER_FLAGS})
 
-# What runs once for a class or a run, and not for each node or row, takes a third less to compile with this.
+# What has no loops over nodes or rows of its own, or none that count, takes a third less to compile with this.
 add_library(qrx_brief INTERFACE)
 target_compile_options(qrx_brief INTERFACE $<$<CONFIG:Release>:-O1>)
 

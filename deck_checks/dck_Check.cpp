@@ -7,7 +7,7 @@
 #include "foundation/qio_Device.h"
 #include "foundation/thr_Poll.h"
 #include "foundation/thr_Progress.h"
-#include "store_interface/model/odb_Odb.h"
+#include "store_interface/model/odiK_IgnoreList.h"
 
 #include <algorithm>
 
@@ -85,5 +85,6 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store) {
         dck_CheckMeshes(store, name, list);
         dck_Rehearse(store, std::vector<fnd_Finding>(list.findings), list);
     }
+    odiK_IgnoreList(store).TakeFrom(list.findings);
     return std::move(list.findings);
 }

@@ -12,7 +12,8 @@ struct thr_Progress;
 /// Everything that can be said of a store's model before its deck is written, whether
 /// the store was filled in memory or from a file: errors that a model file would be refused for, and warnings
 /// of what the deck can't say, what writing raises, what no step writes. Places are JSON pointers into the
-/// model file that the store would make. Raises when the model can't be completed or isn't there.
+/// model file that the store would make. What the model says is to be ignored is left out. Raises when the
+/// model can't be completed or isn't there.
 std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
 
 /// The part that a reader of a model file has said already: names, references, fields that a record can't do

@@ -90,7 +90,7 @@ Found IdleOptions(const odiK_Model& model, bool ofGasket) {
 }
 
 constexpr LeftOutRule kLeftOutRules[] = {
-    {"other models", "a deck is always written from \"Default Model\"", OtherModels},
+    {"other models", "a deck is written from one of them", OtherModels},
     {"parts without an instance", "only instances show a mesh", IdleParts},
     {"entries of the assembly", "they are no part instances", OtherEntries},
     {"nodes of the assembly", "there is no node block for the assembly", AssemblyNodes},

@@ -70,6 +70,31 @@ class Decks:
                   if each.get("code") in ("no-such-name", "no-such-set")]
         return None, places
 
+    def why_not(self, document, pointer):
+        """Why no deck has lines of the object at the pointer, as the program says it; empty where it doesn't."""
+        alone = copy.deepcopy(document)
+        parent, last = parent_of(alone, pointer)
+        if isinstance(parent[last], dict) and parent[last].get("suppressed"):
+            return ""
+        if isinstance(parent, dict):
+            for other in set(parent) - {last}:
+                del parent[other]
+        # Of several that can't be written the program may tell one.
+        return self.reason(document, pointer) or self.reason(alone, pointer)
+
+    def reason(self, document, pointer):
+        folder = pathlib.Path(self.scratch.name)
+        (folder / "model.json").write_text(json.dumps(document), encoding="utf-8")
+        result = subprocess.run([self.program, "check", "model.json", "--json"], cwd=folder, capture_output=True, text=True,
+                                timeout=120)
+        told = json.loads(result.stdout)
+        for message in told["messages"]:
+            if message.get("code") == "cannot-be-written" and (message["pointer"] + "/").startswith(pointer + "/"):
+                return message["text"]
+        name = tokens(pointer)[-1]
+        reasons = [each["why"] for each in told.get("leftOut", []) if name in each["names"]]
+        return reasons[0] if reasons else ""
+
     def lines_of(self, name, document, pointer):
         """The lines of the object at the pointer, with those of objects that can't be without it; None where
         there are none to be found."""

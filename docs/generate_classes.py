@@ -42,7 +42,11 @@ FRAME = ["MODEL", "PART", "INSTANCE", "ASSEMBLY", "MESH", "NODES", "ELEMENTS", "
 FRAME_NAMES = {"MODEL": "A model", "PART": "A part", "INSTANCE": "An instance", "ASSEMBLY": "The assembly",
                "MESH": "A mesh", "NODES": "Nodes", "ELEMENTS": "Elements of a type", "SET": "A set of a mesh",
                "ASSEMBLY_SET": "A set of the assembly", "DATUM": "A datum"}
-MODELS = ["tests/decks/*.json", "examples/*/*.json", "docs/recipes/*.json"]
+MODELS = ["tests/decks/*.json", "examples/*/*.json", "docs/recipes/*.json", "docs/classes.json"]
+# Classes whose lines are told of elsewhere, or that are for nobody but the program.
+ELSEWHERE = {"odiK_Tie": "Its lines are those of a Tie.",
+             "kinC_SurfacePair": "Its lines are those of the general contact that it stands in.",
+             "odiK_IgnoredFinding": "It is for the reports of the program; no deck tells of it."}
 # Most lines of an example, and of the lines of a deck that are shown.
 MOST_LINES, MOST_TEXT = 24, 900
 # How many objects of a class are tried for one that shows well.
@@ -105,6 +109,8 @@ class Reference:
         self.decks = Decks(program)
         self.found = {}
         self.shown = 0
+        # Classes of which there is neither a line nor a word why.
+        self.bare = []
 
     def read_models(self):
         """Objects of all models, by class."""
@@ -123,16 +129,17 @@ class Reference:
                         self.found.setdefault(key, []).append((name, pointer, each))
 
     def example(self, key):
-        """JSON and deck lines of an object of the class that shows well, or None."""
+        """Pointer, JSON, deck lines of an object of the class that shows well, and why there are none; or None."""
         def distance(entry):
             return abs(len(json.dumps(entry[2])) - 220)
         best = None
         for name, pointer, value in sorted(self.found.get(key, []), key=distance)[:TRIES]:
             lines = self.decks.lines_of(name, self.models[name], pointer)
+            why = "" if lines else self.decks.why_not(self.models[name], pointer)
             if lines and len(lines) <= MOST_LINES:
-                return pointer, value, lines
-            if best is None:
-                best = (pointer, value, lines or [])
+                return pointer, value, lines, ""
+            if best is None or (why and not best[3]):
+                best = (pointer, value, lines or [], why)
         return best
 
     def class_text(self, key, common, common_states, level="##"):
@@ -144,8 +151,8 @@ class Reference:
         lines += table([field for field in record.states if field not in common_states], "in a step")
         example = self.example(key)
         if example is None:
-            return lines
-        pointer, value, deck = example
+            return lines + self.reason(key)
+        pointer, value, deck, why = example
         text = compact(value)
         if len(text) <= MOST_TEXT:
             name = pointer.split("/")[-1].replace("~1", "/").replace("~0", "~")
@@ -156,7 +163,16 @@ class Reference:
                 if len(deck) > MOST_LINES:
                     deck = deck[:MOST_LINES] + ["..."]
                 lines += ["```inp", *deck, "```", ""]
-        return lines
+        return lines if deck else lines + self.reason(key, why)
+
+    def reason(self, key, why=""):
+        """Why a class has no lines."""
+        if key in ELSEWHERE:
+            return [ELSEWHERE[key], ""]
+        if not why:
+            self.bare.append(key)
+            return []
+        return ["No deck has lines of it: " + escaped(why) + ".", ""]
 
     def deal(self):
         """Which page tells of which classes: by page all of them, and those that stand in a model themselves."""
@@ -278,7 +294,9 @@ def main():
     reference = Reference(arguments.qrxdeck, arguments.root, arguments.folder)
     classes = reference.write()
     print(f"{classes} classes, {reference.shown} with lines of a deck")
-    return 0
+    if reference.bare:
+        print("neither lines nor a word why there are none: " + ", ".join(reference.bare), file=sys.stderr)
+    return 1 if reference.bare else 0
 
 
 if __name__ == "__main__":

@@ -10,5 +10,7 @@ std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Findi
                                           mdf_Report& report, mdf_MeshShelf* shelf = nullptr,
                                           const mdf_GivenMeshes& given = {},
                                           const mdf_ModelChoice& choice = {});
+/// Reads the file that the report is then of. False, with the reason in the report, when it can't be read.
+bool mdf_ReadTold(const std::string& path, std::string& text, mdf_Report& report);
 
 #endif

@@ -178,7 +178,8 @@ private:
 };
 
 long long TimeOf(const std::string& path, std::error_code& error) {
-    return std::filesystem::last_write_time(plt_Path(path), error).time_since_epoch().count();
+    const auto time = std::filesystem::last_write_time(plt_Path(path), error).time_since_epoch();
+    return static_cast<long long>(time.count());
 }
 
 } // namespace

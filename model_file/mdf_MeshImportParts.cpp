@@ -135,7 +135,6 @@ std::vector<int> mdf_MeshImport::NodesOfCells(std::size_t place) {
     const msf_Group& group = source_.groups[place];
     if (group.dimension == 0) return group.nodes;
     std::vector<int> nodes;
-    long long missing = 0;
     for (const msf_Run& run : group.cells) {
         const msf_Block& block = Block(run.block);
         for (const int* node = block.Row(run.begin); node != block.Row(run.end); ++node)
@@ -143,9 +142,10 @@ std::vector<int> mdf_MeshImport::NodesOfCells(std::size_t place) {
     }
     std::sort(nodes.begin(), nodes.end());
     nodes.erase(std::unique(nodes.begin(), nodes.end()), nodes.end());
-    missing = std::erase_if(nodes, [this](int node) { return isUsed_[static_cast<std::size_t>(node)] != 1; });
+    const auto isUnused = [this](int node) { return isUsed_[static_cast<std::size_t>(node)] != 1; };
+    const auto missing = std::erase_if(nodes, isUnused);
     if (missing > 0)
-        Note(msf_Counted(missing, "node") + " of group " + fnd_Quoted(group.name) +
+        Note(msf_Counted(static_cast<long long>(missing), "node") + " of group " + fnd_Quoted(group.name) +
              " belong to no element and were left out of its set");
     return nodes;
 }

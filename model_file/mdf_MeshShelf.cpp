@@ -29,14 +29,15 @@ std::string mdf_MeshShelf::StateOf(const std::filesystem::path& file) {
     if (error) return {};
     const auto time = std::filesystem::last_write_time(file, error);
     if (error) return {};
-    return std::to_string(bytes) + "\n" + std::to_string(time.time_since_epoch().count());
+    return std::to_string(bytes) + "\n" +
+           std::to_string(static_cast<long long>(time.time_since_epoch().count()));
 }
 
 mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& path,
                                         const std::string& modelFile) const {
     const std::string place = path.Text();
     const bool changed =
-        std::ranges::any_of(changes_, [&](const std::string& change) { return mdf_IsBelow(change, place); });
+        std::ranges::any_of(changes_, [&](const std::string& change) { return fnd_IsBelow(change, place); });
     if (!changed) return place;
     const mdf_Value* file = json.IsObject() ? json.Find("file") : nullptr;
     if (file == nullptr || !file->IsString()) return {};

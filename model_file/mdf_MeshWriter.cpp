@@ -23,6 +23,18 @@ const odiK_Instance* InstanceOf(const odiK_Model& model, int meshIndex) {
     return nullptr;
 }
 
+/// The mesher's file as a model file in the folder names it: as it was named, where that leads to it.
+std::filesystem::path PathOf(const mdf_MeshOrigin& origin, const std::filesystem::path& given,
+                             const std::filesystem::path& folder) {
+    const std::filesystem::path file = plt_Path(origin.path);
+    // Behind a link to a folder "x/.." is another place than ".".
+    for (const std::filesystem::path& path : {given.lexically_normal(), given}) {
+        std::error_code error;
+        if (std::filesystem::equivalent(folder / path, file, error)) return path;
+    }
+    return std::filesystem::proximate(file, folder);
+}
+
 } // namespace
 
 void mdf_MeshWriter::WriteOrigin(const mdf_MeshOrigin& origin) {
@@ -31,9 +43,8 @@ void mdf_MeshWriter::WriteOrigin(const mdf_MeshOrigin& origin) {
     for (const mdf_Member& member : origin.given.Members()) {
         out_.Key(member.name);
         if (member.name == "file" && given.is_relative()) {
-            out_.String(
-                std::filesystem::proximate(plt_Path(origin.path), plt_Path(folder_.empty() ? "." : folder_))
-                    .generic_string());
+            const std::filesystem::path folder = plt_Path(folder_.empty() ? "." : folder_);
+            out_.String(PathOf(origin, given, folder).generic_string());
         } else {
             out_.Value(member.value);
         }

@@ -4,6 +4,7 @@
 #include "model_file/mdf_Locate.h"
 #include "model_file/mdf_ModelReader.h"
 #include "model_file/mdf_Parser.h"
+#include "model_file/mdf_Placement.h"
 #include "store_interface/findings/fnd_TextRules.h"
 
 #include <algorithm>
@@ -65,13 +66,9 @@ void ReadModels(odb_Odb& odb, mdf_Value& models, const fnd_Path& path, mdf_Diagn
     ChooseModel(odb, choice, names, path, diagnostics);
 }
 
-} // namespace
-
-std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
-                                          mdf_Report& report, mdf_MeshShelf* shelf,
-                                          const mdf_GivenMeshes& given, const mdf_ModelChoice& choice) {
-    mdf_Diagnostics diagnostics(report);
-    if (!IsDocument(errors, diagnostics)) return nullptr;
+std::unique_ptr<odb_Odb> ReadRoot(mdf_Value& root, mdf_Diagnostics& diagnostics, mdf_Report& report,
+                                  mdf_MeshShelf* shelf, const mdf_GivenMeshes& given,
+                                  const mdf_ModelChoice& choice) {
     const fnd_Path top;
     if (!root.IsObject()) {
         diagnostics.Expected(top, root, "an object with the members \"format\" and \"models\"");
@@ -101,17 +98,32 @@ std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Findi
     return diagnostics.NumErrors() > 0 ? nullptr : std::move(odb);
 }
 
+} // namespace
+
+std::unique_ptr<odb_Odb> mdf_ReadDocument(mdf_Value& root, std::vector<fnd_Finding>& errors,
+                                          mdf_Report& report, mdf_MeshShelf* shelf,
+                                          const mdf_GivenMeshes& given, const mdf_ModelChoice& choice) {
+    mdf_Diagnostics diagnostics(report);
+    if (!IsDocument(errors, diagnostics)) return nullptr;
+    std::unique_ptr<odb_Odb> odb = ReadRoot(root, diagnostics, report, shelf, given, choice);
+    mdf_HintPlaces(root, report.findings);
+    return odb;
+}
+
+bool mdf_ReadTold(const std::string& path, std::string& text, mdf_Report& report) {
+    report.fileName = path;
+    fnd_Finding error;
+    if (mdf_ReadFile(path, text, error)) return true;
+    report.unreadable = true;
+    report.findings.push_back(std::move(error));
+    return false;
+}
+
 std::unique_ptr<odb_Odb> mdf_ReadModelFile(const std::string& path, mdf_Report& report,
                                            const mdf_ModelChoice& choice) {
-    report.fileName = path;
     const auto file = std::make_shared<mdf_FileText>(path);
     std::string text;
-    fnd_Finding error;
-    if (!mdf_ReadFile(path, text, error)) {
-        report.unreadable = true;
-        report.findings.push_back(std::move(error));
-        return nullptr;
-    }
+    if (!mdf_ReadTold(path, text, report)) return nullptr;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
     mdf_Parse(text, root, errors, report.progress);

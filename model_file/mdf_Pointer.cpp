@@ -68,10 +68,6 @@ std::optional<std::vector<std::string>> mdf_PointerTokens(std::string_view point
     return tokens;
 }
 
-bool mdf_IsBelow(std::string_view place, std::string_view pointer) {
-    return place.starts_with(pointer) && (place.size() == pointer.size() || place[pointer.size()] == '/');
-}
-
 int mdf_FirstWrongToken(const mdf_Value& root, std::span<const std::string> tokens,
                         std::vector<std::string>* names) {
     const mdf_Value* at = &root;

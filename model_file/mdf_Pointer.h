@@ -13,8 +13,6 @@
 
 /// The tokens of a pointer; nothing for a text that is none.
 std::optional<std::vector<std::string>> mdf_PointerTokens(std::string_view pointer);
-/// Whether `place` is the place of `pointer` or lies below it.
-bool mdf_IsBelow(std::string_view place, std::string_view pointer);
 /// Whether there is a value at the end of the tokens.
 bool mdf_HasPlace(const mdf_Value& root, std::span<const std::string> tokens);
 /// The first token that leads nowhere, and the names that stand there instead; -1 when all lead on.

@@ -1,3 +1,5 @@
+#include "model_file/mdf_Schema.h"
+
 #include "model_file/mdf_ClassChoice.h"
 #include "model_file/mdf_Example.h"
 #include "model_file/mdf_MeshFile.h"
@@ -442,7 +444,11 @@ private:
 
 } // namespace
 
+Json mdf_Schema() {
+    return SchemaMaker().Make();
+}
+
 bool mdf_WriteSchema(std::ostream& out) {
-    out << SchemaMaker().Make().dump(1) << '\n';
+    out << mdf_Schema().dump(1) << '\n';
     return static_cast<bool>(out.flush());
 }

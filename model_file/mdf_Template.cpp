@@ -50,7 +50,7 @@ mdf_Value CopyWithoutMeshes(mdf_Value& root, std::span<const std::string> places
         // A given mesh is a number.
         const bool isSmall = !mesh.IsObject() || mesh.Find("file") != nullptr;
         const bool varies = std::ranges::any_of(
-            places, [&](const std::string& place) { return mdf_IsBelow(place, pointer); });
+            places, [&](const std::string& place) { return fnd_IsBelow(place, pointer); });
         if (!isSmall && !varies) apart.emplace_back(&mesh, std::exchange(mesh, mdf_Value()));
     });
     mdf_Value copy = root;
@@ -86,21 +86,16 @@ struct mdf_Template::Target {
 mdf_Template::~mdf_Template() = default;
 
 std::unique_ptr<mdf_Template> mdf_Template::OfFile(const std::string& path, const Places& places,
-                                                   mdf_Report& report) {
-    report.fileName = path;
+                                                   mdf_Report& report, const mdf_ModelChoice& choice) {
     std::string text;
-    fnd_Finding error;
-    if (!mdf_ReadFile(path, text, error)) {
-        report.unreadable = true;
-        report.findings.push_back(std::move(error));
-        return nullptr;
-    }
-    return OfText(text, path, places, report);
+    if (!mdf_ReadTold(path, text, report)) return nullptr;
+    return OfText(text, path, places, report, {}, choice);
 }
 
 std::unique_ptr<mdf_Template> mdf_Template::OfText(std::string_view text, const std::string& fileName,
                                                    const Places& places, mdf_Report& report,
-                                                   const mdf_GivenMeshes& given) {
+                                                   const mdf_GivenMeshes& given,
+                                                   const mdf_ModelChoice& choice) {
     report.fileName = fileName;
     mdf_Value root;
     std::vector<fnd_Finding> errors;
@@ -108,6 +103,7 @@ std::unique_ptr<mdf_Template> mdf_Template::OfText(std::string_view text, const 
     std::unique_ptr<mdf_Template> made(new mdf_Template());
     made->fileName_ = fileName;
     made->given_ = given;
+    made->choice_ = choice;
     const bool isRead = made->Read(root, errors, places, report);
     mdf_Locate(text, report.findings);
     return isRead ? std::move(made) : nullptr;
@@ -122,7 +118,7 @@ bool mdf_Template::Read(mdf_Value& root, std::vector<fnd_Finding>& errors, const
         parameters_ = mdf_ReadParameters(root, diagnostics);
     }
     root_ = CopyWithoutMeshes(root, places(parameters_));
-    store_ = mdf_ReadDocument(root, errors, report, &shelf_, given_);
+    store_ = mdf_ReadDocument(root, errors, report, &shelf_, given_, choice_);
     if (store_ == nullptr) return false;
     fnd_List rules;
     for (const auto& [name, model] : store_->Models()) AddRules(*model, rules);
@@ -142,12 +138,13 @@ std::unique_ptr<mdf_Template> mdf_Template::Twin() const {
     twin->root_ = root_;
     twin->shelf_ = mdf_MeshShelf(shelf_, {});
     twin->given_ = given_;
+    twin->choice_ = choice_;
     twin->findings_ = findings_;
     mdf_Value read = root_;
     std::vector<fnd_Finding> errors;
     mdf_Report report;
     report.fileName = fileName_;
-    twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_, given_);
+    twin->store_ = mdf_ReadDocument(read, errors, report, &twin->shelf_, given_, choice_);
     if (twin->store_ == nullptr) throw std::logic_error("a template that was read can't be read again");
     twin->timeline_ = std::make_unique<kprC_Timeline>(twin->store_->DeckModel()->steps);
     return twin;
@@ -226,7 +223,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfObjects(std::span<const mdf_Chan
     }
     for (const fnd_Finding& finding : findings_) {
         const bool ofChanged = std::ranges::any_of(
-            objects, [&](const auto& object) { return mdf_IsBelow(finding.place, object.first); });
+            objects, [&](const auto& object) { return fnd_IsBelow(finding.place, object.first); });
         if (!ofChanged) diagnostics.Take(finding);
     }
     auto store = std::make_unique<odb_Odb>();
@@ -268,7 +265,7 @@ std::unique_ptr<odb_Odb> mdf_Template::VariantOfModels(std::span<const mdf_Chang
         const bool readAnew = std::ranges::any_of(models, [&](const auto& model) {
             std::string pointer = "/models";
             fnd_AppendPointer(pointer, model.first);
-            return mdf_IsBelow(finding.place, pointer);
+            return fnd_IsBelow(finding.place, pointer);
         });
         if (!readAnew) diagnostics.Take(finding);
     }

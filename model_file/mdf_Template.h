@@ -25,10 +25,11 @@ public:
     using Places = std::function<std::vector<std::string>(const std::vector<mdf_Parameter>& parameters)>;
     /// Null when the file has errors.
     static std::unique_ptr<mdf_Template> OfFile(const std::string& path, const Places& places,
-                                                mdf_Report& report);
+                                                mdf_Report& report, const mdf_ModelChoice& choice = {});
     static std::unique_ptr<mdf_Template> OfText(std::string_view text, const std::string& fileName,
                                                 const Places& places, mdf_Report& report,
-                                                const mdf_GivenMeshes& given = {});
+                                                const mdf_GivenMeshes& given = {},
+                                                const mdf_ModelChoice& choice = {});
     mdf_Template(const mdf_Template&) = delete;
     mdf_Template& operator=(const mdf_Template&) = delete;
     ~mdf_Template();
@@ -68,6 +69,7 @@ private:
     mdf_Value root_; // without what the shelf has
     mdf_MeshShelf shelf_;
     mdf_GivenMeshes given_;
+    mdf_ModelChoice choice_;
     std::unique_ptr<odb_Odb> store_;
     /// What reading the template says but for the rules of whole models, which are asked of each variant.
     std::vector<fnd_Finding> findings_;

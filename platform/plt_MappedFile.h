@@ -18,6 +18,10 @@ public:
     std::string_view Bytes() const { return {begin_, size_}; }
 
 private:
+    /// Those of the system. Opening waits for nobody; mapping gives null where it fails. Both set errno then.
+    static int Open(const char* path);
+    static const char* Map(int file, std::size_t bytes);
+
     const char* begin_ = nullptr;
     std::size_t size_ = 0;
     int error_ = 0;

@@ -7,6 +7,7 @@
 #include "python/pyx_Document.h"
 #include "python/pyx_Run.h"
 #include "python/pyx_Tree.h"
+#include "store_interface/model/odiK_IgnoreList.h"
 #include "tools/ModelDescription.h"
 #include "tools/ModelHistory.h"
 #include "view_page/vpg_Html.h"
@@ -79,6 +80,7 @@ std::unique_ptr<odb_Odb> Read(const pyx_Document& document, mdf_Report& report) 
     pyx_Released([&] { odb = mdf_ReadModelText(document.Text(), "", report, document.Meshes()); });
     DropLines(report.findings);
     report.meshOrigins = document.Origins();
+    if (odb != nullptr) odiK_IgnoreList(*odb).TakeFrom(report.findings);
     return odb;
 }
 
@@ -87,6 +89,7 @@ void AddDeckChecks(const odb_Odb& odb, fnd_List& list) {
     dck_CheckDeck(odb, name, list);
     dck_CheckMeshes(odb, name, list);
     dck_Rehearse(odb, std::vector<fnd_Finding>(list.findings), list);
+    odiK_IgnoreList(odb).TakeFrom(list.findings);
 }
 
 /// The table of one kind alone.
@@ -231,8 +234,7 @@ void pyx_Store::Add(py::module_& module) {
         .def("history", &pyx_Store::History)
         .def("description", &pyx_Store::Description)
         .def("deck_lines", &pyx_Store::DeckLines)
-        .def("page", &pyx_Store::Page)
-        .def_property_readonly("warnings", &pyx_Store::Warnings);
+        .def("page", &pyx_Store::Page);
     module.def("store_of", &pyx_Store::Of);
     module.def("load", &pyx_Store::Load);
     module.def("check", &pyx_Store::Check);

@@ -32,7 +32,6 @@ public:
     /// [(load case, text)].
     py::list DeckLines(const std::string& repository, const std::string& name, const std::string& step) const;
     std::string Page(const std::string& title) const;
-    py::list Warnings() const { return pyx_TuplesOf(report_.findings); }
 
     static void Add(py::module_& module);
 

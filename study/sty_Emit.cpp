@@ -23,6 +23,7 @@ std::string Filled(std::string text, const sty_Request& request, const std::stri
     ReplaceAll(text, "@PROGRAM@", quote(program));
     ReplaceAll(text, "@TEMPLATE@", quote(request.model));
     ReplaceAll(text, "@TABLE@", quote(request.table));
+    ReplaceAll(text, "@MODEL@", quote(request.modelName));
     ReplaceAll(text, "@OUT@", quote(request.out));
     ReplaceAll(text, "@SHARDS@", std::to_string(request.shards));
     ReplaceAll(text, "@JOBS@", std::to_string(std::max(request.jobs, 1)));
@@ -49,6 +50,8 @@ at_once=
 program=@PROGRAM@
 template=@TEMPLATE@
 table=@TABLE@
+# One of the template's models; empty: the only one, or "Default Model".
+model=@MODEL@
 out=@OUT@
 
 if [ -z "${SLURM_ARRAY_TASK_ID-}" ]; then
@@ -62,8 +65,8 @@ if [ -z "${SLURM_ARRAY_TASK_ID-}" ]; then
 fi
 
 # The shell gives its place to the program, which the signal ahead of the time limit then reaches.
-exec "$program" study "$template" "$table" --out "$out" --shard "$SLURM_ARRAY_TASK_ID/@SHARDS@" \
-    --jobs "${SLURM_CPUS_PER_TASK:-1}" --resume
+exec "$program" study "$template" "$table" --out "$out" ${model:+--model="$model"} \
+    --shard "$SLURM_ARRAY_TASK_ID/@SHARDS@" --jobs "${SLURM_CPUS_PER_TASK:-1}" --resume
 )";
 
 constexpr const char* kSnakemake =
@@ -72,6 +75,8 @@ constexpr const char* kSnakemake =
 PROGRAM = @PROGRAM@
 TEMPLATE = @TEMPLATE@
 TABLE = @TABLE@
+# One of the template's models; empty: the only one, or "Default Model".
+MODEL = @MODEL@
 OUT = @OUT@
 SHARDS = @SHARDS@
 JOBS = @JOBS@
@@ -109,6 +114,7 @@ rule shard:
         program=PROGRAM,
         template=TEMPLATE,
         table=TABLE,
+        model=["--model=" + MODEL] if MODEL else [],
         out=OUT,
         shards=SHARDS,
     threads: JOBS
@@ -117,7 +123,7 @@ rule shard:
         mem_mb=MEMORY_MB,
         slurm_account=ACCOUNT,
     shell:
-        "{params.program:q} study {params.template:q} {params.table:q} --out {params.out:q}"
+        "{params.program:q} study {params.template:q} {params.table:q} {params.model:q} --out {params.out:q}"
         " --shard {wildcards.shard}/{params.shards} --jobs {threads} --resume || [ $? -eq 1 ]"
 )";
 

@@ -24,6 +24,7 @@ std::string TextAt(const mdf_Value& object, const char* name) {
 std::string sty_Identity::Text() const {
     std::string text = "{\n  \"format\": " + sty_Quoted(kStudyFormat) +
                        ",\n  \"template\": " + FileText(templatePath, templateSha256) +
+                       ",\n  \"model\": " + sty_Quoted(model) +
                        ",\n  \"table\": " + FileText(tablePath, tableSha256) + ",\n  \"rows\": \"" +
                        std::to_string(rows) + "\",\n  \"meshes\": [";
     for (const auto& [path, sum] : meshes)
@@ -42,6 +43,7 @@ std::optional<sty_Identity> sty_Identity::Of(const std::string& text) {
     sty_Identity identity;
     identity.templatePath = TextAt(*model, "file");
     identity.templateSha256 = TextAt(*model, "sha256");
+    identity.model = TextAt(root, "model");
     identity.tablePath = TextAt(*table, "file");
     identity.tableSha256 = TextAt(*table, "sha256");
     const std::string rows = TextAt(root, "rows");
@@ -61,6 +63,8 @@ std::string sty_Identity::DifferenceFrom(const sty_Identity& held) const {
                              : what + " is another one than " + fnd_Quoted(other);
     };
     if (templateSha256 != held.templateSha256) return changed("template", templatePath, held.templatePath);
+    if (!held.model.empty() && model != held.model)
+        return "the model " + fnd_Quoted(model) + " is another one than " + fnd_Quoted(held.model);
     if (tableSha256 != held.tableSha256) return changed("table", tablePath, held.tablePath);
     for (std::size_t i = 0; i < meshes.size() && i < held.meshes.size(); ++i) {
         if (meshes[i].second != held.meshes[i].second)

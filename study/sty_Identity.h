@@ -10,6 +10,8 @@
 struct sty_Identity {
     std::string templatePath;
     std::string templateSha256;
+    /// The model of the template whose decks they are; empty in folders of earlier versions.
+    std::string model;
     std::string tablePath;
     std::string tableSha256;
     /// Mesher's files that the template names.

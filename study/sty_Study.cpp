@@ -3,7 +3,7 @@
 #include "foundation/nex_Exception.h"
 #include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
-#include "store_interface/model/odb_Odb.h"
+#include "store_interface/model/odiK_IgnoreList.h"
 #include "study/sty_Identity.h"
 #include "study/sty_MeshSums.h"
 #include "study/sty_Variants.h"
@@ -105,9 +105,10 @@ private:
             return columns_->Pointers();
         };
         identity_.templateSha256 = sty_Sha256OfFile(request_.model);
-        template_ = mdf_Template::OfFile(request_.model, places, report);
+        template_ = mdf_Template::OfFile(request_.model, places, report, {request_.modelName});
         baseline_ = report.findings;
-        for (const fnd_Finding& finding : report.findings) observer_.Tell(request_.model, finding);
+        if (template_ != nullptr) ignored_ = odiK_IgnoreList(template_->Store());
+        Tell(report.findings);
         if (template_ == nullptr) {
             throw Unusable(request_.model,
                            report.unreadable ? "the template can't be read" : "the template is wrong",
@@ -121,6 +122,7 @@ private:
                                (problem->hint.empty() ? "" : "; " + problem->hint));
         }
         identity_.templatePath = request_.model;
+        identity_.model = std::string(template_->Store().DeckModelName().View());
         identity_.tablePath = request_.table;
         identity_.tableSha256 = table_->Sha256();
         identity_.rows = table_->Rows();
@@ -232,12 +234,16 @@ private:
         }
     }
 
+    void Tell(std::vector<fnd_Finding> findings) {
+        ignored_.TakeFrom(findings);
+        for (const fnd_Finding& finding : findings) observer_.Tell(request_.model, finding);
+    }
+
     void TellBaseline(sty_Variants& variants) {
         try {
-            for (fnd_Finding& finding : variants.Baseline()) {
-                observer_.Tell(request_.model, finding);
-                baseline_.push_back(std::move(finding));
-            }
+            const std::vector<fnd_Finding> findings = variants.Baseline();
+            baseline_.insert(baseline_.end(), findings.begin(), findings.end());
+            Tell(findings);
         } catch (const QRXBasException&) {
             // Rows may mend what can't be written; those that don't will tell.
         }
@@ -376,6 +382,7 @@ private:
     std::unique_ptr<sty_Columns> columns_;
     std::unique_ptr<mdf_Template> template_;
     std::vector<fnd_Finding> baseline_;
+    odiK_IgnoreList ignored_;
     sty_MeshTexts meshes_;
     sty_MeshSums rowMeshes_;
     sty_Layout layout_;

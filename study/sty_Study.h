@@ -9,6 +9,8 @@
 /// What the user asks for.
 struct sty_Request {
     std::string model;
+    /// Which of the template's models; empty: the one that "write" takes.
+    std::string modelName;
     std::string table;
     /// The study's folder.
     std::string out;

@@ -5,6 +5,7 @@
 #include "foundation/nex_Exception.h"
 #include "model_file/mdf_Diagnostics.h"
 #include "model_file/mdf_Pointer.h"
+#include "store_interface/model/odiK_IgnoreList.h"
 #include "study/sty_Json.h"
 
 #include <algorithm>
@@ -36,7 +37,7 @@ void TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>
         if (!finding.IsError() || result.errors.size() >= kMostErrors) continue;
         // The column whose place the finding is about, or lies around it.
         const auto blamed = std::ranges::find_if(changes, [&](const sty_Columns::Change& change) {
-            return mdf_IsBelow(finding.place, change.change.pointer);
+            return fnd_IsBelow(finding.place, change.change.pointer);
         });
         const std::string column = blamed == changes.end() ? "" : columns.NameOf(blamed->column);
         result.errors.push_back({column, finding.place, finding.Text()});
@@ -83,7 +84,7 @@ void sty_Columns::FindConflicts(bool refuse) {
     std::ranges::stable_sort(places, Before, [](const auto& place) { return place.first; });
     std::size_t above = 0;
     for (std::size_t i = 1; i < places.size(); ++i) {
-        if (!mdf_IsBelow(places[i].first, places[above].first)) {
+        if (!fnd_IsBelow(places[i].first, places[above].first)) {
             above = i;
             continue;
         }
@@ -231,6 +232,7 @@ sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
         const std::string context = failure.Context();
         result.errors.push_back({{}, {}, failure.what() + (context.empty() ? "" : " (" + context + ")")});
     }
+    odiK_IgnoreList(*store).TakeFrom(findings);
     std::erase_if(findings, [&](const fnd_Finding& finding) { return leftOut_.contains(KeyOf(finding)); });
     result.findings = std::move(findings);
     if (!result.IsDone()) return result;

@@ -418,6 +418,7 @@ void CommandLine::AddStudy() {
                              "Table: .csv, .tsv, or .jsonl; columns are JSON pointers into the template, its "
                              "parameters, or \"name\""),
          Values::FILES, {"csv", "tsv", "jsonl"});
+    AddModelName(command, study_.request.modelName);
     Take(command
              ->add_option("--out", study_.request.out,
                           "Folder of the decks and the ledger (default: the table's name without extension)")

@@ -253,9 +253,7 @@ std::unique_ptr<odb_Odb> ReadModel(const std::string& path, RunReport& report, E
     found.progress = &report.Watched().Work();
     if (report.ShowsAll()) found.most = std::numeric_limits<int>::max();
     std::unique_ptr<odb_Odb> odb = ReadModelInput(path, found, choice);
-    if (odb != nullptr) {
-        for (const auto& [name, model] : odb->Models()) report.Ignore(*model);
-    }
+    if (odb != nullptr) report.Ignore(odiK_IgnoreList(*odb));
     report.AddAll(found);
     report.Times().End("reading");
     code = ExitCode::DONE;
@@ -407,12 +405,13 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     const std::unique_ptr<odb_Odb> odb = mdf_ReadModelText(text, file, found, {}, {{}, false});
     report.AddAll(found);
     if (odb == nullptr) return found.unreadable ? ExitCode::FILE_SYSTEM_REFUSED : ExitCode::MODEL_IS_WRONG;
-    std::ostringstream formatted;
+    std::ostringstream stream;
     const bool toOutput = request.output.empty() || request.output == kStandardStream;
     const std::string place = toOutput ? file : request.output;
-    mdf_WriteModelFile(*odb, formatted, found.meshOrigins, plt_Path(place).parent_path().string(),
+    mdf_WriteModelFile(*odb, stream, found.meshOrigins, plt_Path(place).parent_path().string(),
                        found.parameters, found.schema);
-    const bool isCanonical = formatted.view() == text;
+    const std::string formatted = std::move(stream).str();
+    const bool isCanonical = formatted == text;
     report.Member("formatted") = {{"file", file}, {"wasCanonical", isCanonical}};
     if (request.check) {
         if (!isCanonical) report.Print(fnd_Visible(file) + "\n");
@@ -420,11 +419,11 @@ ExitCode RunFormat(const FormatRequest& request, RunReport& report) {
     }
     if (mdf_HasComments(text)) report.Warning(file, "its comments are left out");
     if (toOutput) {
-        if (report.AsJson()) report.Member("formatted")["text"] = formatted.str();
-        report.Print(formatted.str());
+        if (report.AsJson()) report.Member("formatted")["text"] = formatted;
+        report.Print(formatted);
         return ExitCode::DONE;
     }
-    return WriteWholeFile(request.output, "model file", formatted.str(), report);
+    return WriteWholeFile(request.output, "model file", formatted, report);
 }
 
 bool ReplaceFile(const std::string& target, const char* thing, const std::function<void(qio_ostream&)>& write,

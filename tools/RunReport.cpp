@@ -46,9 +46,8 @@ void RunReport::Clear() {
     fileRead_.clear();
     textRead_.reset();
     foretold_.clear();
-    modelIgnores_.clear();
-    ignored_.clear();
-    for (const std::string& code : options_.ignored) ignored_.push_back({nullptr, code, {}, 0});
+    ignored_.assign(options_.ignored.size(), 0);
+    Ignore({});
     strictErrors_ = 0;
     std::ranges::fill(shown_, 0);
     std::ranges::fill(more_, 0);
@@ -76,26 +75,21 @@ void RunReport::EndRun(ExitCode code) {
     Clear();
 }
 
-void RunReport::Ignore(const odiK_Model& model) {
-    const fnd_Path root;
-    const fnd_Path models(root, "models");
-    const std::string within = fnd_Path(models, model.Name().View()).Text();
-    for (const odiK_IgnoredFinding& entry : model.ignore) {
-        modelIgnores_.push_back(entry);
-        ignored_.push_back({&modelIgnores_.back(), modelIgnores_.back().code.View(), within, 0});
-    }
+void RunReport::Ignore(odiK_IgnoreList list) {
+    modelIgnores_ = std::move(list);
+    ignoredByModel_.assign(modelIgnores_.Entries().size(), 0);
 }
 
 bool RunReport::IsIgnored(const fnd_Finding& finding) {
     if (finding.IsError()) return false;
-    for (Ignored& ignored : ignored_) {
-        const bool is = ignored.entry == nullptr
-                            ? ignored.code == finding.code->name
-                            : finding.place.starts_with(ignored.within) && ignored.entry->Is(finding);
-        if (is) ++ignored.count;
-        if (is) return true;
+    const auto asked = std::ranges::find(options_.ignored, finding.code->name);
+    if (asked != options_.ignored.end()) {
+        ++ignored_[static_cast<std::size_t>(asked - options_.ignored.begin())];
+        return true;
     }
-    return false;
+    const int entry = modelIgnores_.EntryFor(finding);
+    if (entry >= 0) ++ignoredByModel_[static_cast<std::size_t>(entry)];
+    return entry >= 0;
 }
 
 bool RunReport::HasRoomFor(fnd_Severity severity) {
@@ -109,21 +103,21 @@ bool RunReport::HasRoomFor(fnd_Severity severity) {
 }
 
 void RunReport::TellIgnored() {
-    const std::vector<Ignored> told = ignored_;
-    for (Ignored& ignored : ignored_) ignored.count = 0;
-    if (AsJson()) {
-        for (const Ignored& ignored : told) {
-            if (ignored.count == 0) continue;
-            root_["ignored"].push_back({{"code", ignored.code}, {"count", ignored.count}});
-            if (ignored.entry != nullptr)
-                root_["ignored"].back()["reason"] = std::string(ignored.entry->reason.View());
-        }
-        return;
+    for (std::size_t i = 0; i < ignored_.size(); ++i) {
+        const long long count = std::exchange(ignored_[i], 0);
+        if (count > 0 && AsJson())
+            root_["ignored"].push_back({{"code", options_.ignored[i]}, {"count", count}});
     }
-    for (const Ignored& ignored : told) {
-        if (ignored.count == 0 || ignored.entry == nullptr) continue;
-        Print("ignored: " + std::to_string(ignored.count) + " " + std::string(ignored.code) + ", " +
-              fnd_Visible(ignored.entry->reason.View()) + "\n");
+    for (std::size_t i = 0; i < ignoredByModel_.size(); ++i) {
+        const odiK_IgnoredFinding& entry = modelIgnores_.Entries()[i];
+        const std::string code(entry.code.View());
+        const std::string reason(entry.reason.View());
+        const long long count = std::exchange(ignoredByModel_[i], 0);
+        if (count == 0) continue;
+        if (AsJson())
+            root_["ignored"].push_back({{"code", code}, {"count", count}, {"reason", reason}});
+        else
+            Print("ignored: " + std::to_string(count) + " " + code + ", " + fnd_Visible(reason) + "\n");
     }
 }
 

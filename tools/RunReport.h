@@ -2,7 +2,7 @@
 #define QRX_TOOLS_RUNREPORT_H
 
 #include "model_file/mdf_ModelFile.h"
-#include "store_interface/model/odiK_Model.h"
+#include "store_interface/model/odiK_IgnoreList.h"
 #include "tools/ProgressLine.h"
 #include "tools/Terminal.h"
 
@@ -10,7 +10,6 @@
 
 #include <chrono>
 #include <deque>
-#include <list>
 #include <string>
 #include <utility>
 #include <vector>
@@ -77,8 +76,8 @@ public:
     /// Of several runs, the one on the file begins. In JSON each is an object of its own.
     void BeginRun(const std::string& file);
     void EndRun(ExitCode code);
-    /// From now on says nothing of what the model says to pass over.
-    void Ignore(const odiK_Model& model);
+    /// From now on says nothing of what the models say to pass over.
+    void Ignore(odiK_IgnoreList list);
     bool IsStrict() const { return options_.strict; }
     /// The standard output belongs to what the command writes; nothing is printed there any more.
     void LeaveOutput() { isOutputLeft_ = true; }
@@ -113,13 +112,6 @@ public:
     ExitCode Finish(ExitCode code);
 
 private:
-    struct Ignored {
-        const odiK_IgnoredFinding* entry; // null: asked for on the command line
-        std::string_view code;
-        std::string within; // the model's pointer
-        long long count;
-    };
-
     /// False, with the reason told, when it can't be written.
     bool Put(std::string_view text);
     void PutError(std::string line);
@@ -137,9 +129,10 @@ private:
     RunTimes times_;
     std::string runFile_; // empty: the call is one run
     nlohmann::ordered_json runs_;
-    std::list<odiK_IgnoredFinding> modelIgnores_;
-    std::vector<Ignored> ignored_;
-    std::deque<fnd_Code> raised_; // codes of warnings that are errors here
+    odiK_IgnoreList modelIgnores_;
+    std::vector<long long> ignored_;        // by code of the options
+    std::vector<long long> ignoredByModel_; // by entry
+    std::deque<fnd_Code> raised_;           // codes of warnings that are errors here
     int strictErrors_ = 0;
     long shown_[3] = {}; // by severity
     long more_[3] = {};  // not shown

@@ -1,35 +1,18 @@
 #include "platform/plt_MappedFile.h"
 
-#include "platform/plt_Files.h"
-
-#include <cerrno>
-
+#include <fcntl.h>
 #include <sys/mman.h>
 
-plt_MappedFile::plt_MappedFile(const std::string& path) {
+int plt_MappedFile::Open(const char* path) {
     // A pipe without a writer would hang an ordinary open.
-    const int file = ::open(path.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
-    if (file < 0) {
-        error_ = errno;
-        return;
-    }
-    plt_Status status = {};
-    if (plt_InspectOpen(file, &status) != 0) {
-        error_ = errno;
-    } else if (!plt_IsFile(status)) {
-        error_ = plt_IsFolder(status) ? EISDIR : ENOTSUP;
-    } else if (status.st_size > 0) {
-        size_ = static_cast<std::size_t>(status.st_size);
-        void* mapped = ::mmap(nullptr, size_, PROT_READ, MAP_PRIVATE, file, 0);
-        if (mapped == MAP_FAILED) {
-            error_ = errno;
-            size_ = 0;
-        } else {
-            begin_ = static_cast<const char*>(mapped);
-            ::madvise(mapped, size_, MADV_SEQUENTIAL);
-        }
-    }
-    plt_Close(file);
+    return ::open(path, O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+}
+
+const char* plt_MappedFile::Map(int file, std::size_t bytes) {
+    void* const mapped = ::mmap(nullptr, bytes, PROT_READ, MAP_PRIVATE, file, 0);
+    if (mapped == MAP_FAILED) return nullptr;
+    ::madvise(mapped, bytes, MADV_SEQUENTIAL);
+    return static_cast<const char*>(mapped);
 }
 
 plt_MappedFile::~plt_MappedFile() {

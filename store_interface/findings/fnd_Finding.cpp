@@ -15,6 +15,11 @@ void fnd_AppendPointer(std::string& pointer, std::string_view token) {
     }
 }
 
+bool fnd_IsBelow(std::string_view place, std::string_view pointer) {
+    if (!place.starts_with(pointer)) return false;
+    return pointer.empty() || place.size() == pointer.size() || place[pointer.size()] == '/';
+}
+
 std::string fnd_Path::Text() const {
     if (parent_ == nullptr) return {};
     std::string text = parent_->Text();

@@ -26,6 +26,8 @@ private:
 
 /// Appends "/" and the token, as a JSON pointer spells it.
 void fnd_AppendPointer(std::string& pointer, std::string_view token);
+/// Whether the place is the pointer's or lies below it. All are below "".
+bool fnd_IsBelow(std::string_view place, std::string_view pointer);
 
 /// Something to say about a model: what, where, and how to mend it.
 struct fnd_Finding {

@@ -41,9 +41,17 @@ fnd_Nearest::fnd_Nearest(std::string_view name) {
 
 void fnd_Nearest::Try(std::string_view candidate) {
     const std::size_t gap = std::max(candidate.size(), length_) - std::min(candidate.size(), length_);
-    if (gap >= least_ || candidate.size() > kLongest) return;
+    if (candidate.size() > kLongest) return;
+    const std::size_t common = std::min(candidate.size(), length_);
+    const bool mayBegin = gap < leastRest_ && common >= kBeginning;
+    if (gap >= least_ && !mayBegin) return;
     char lower[kLongest];
     std::transform(candidate.begin(), candidate.end(), lower, [](char c) { return fnd_LowerCase(c); });
+    if (mayBegin && std::memcmp(lower, name_, common) == 0) {
+        leastRest_ = gap;
+        sameBeginning_ = candidate;
+    }
+    if (gap >= least_) return;
     // Each change takes away or brings at most one character.
     const unsigned long long letters = LettersOf(lower, candidate.size());
     const int lost = std::max(std::popcount(letters_ & ~letters), std::popcount(letters & ~letters_));
@@ -91,7 +99,8 @@ std::size_t fnd_Nearest::DistanceTo(const char* candidate, std::size_t length) c
 }
 
 std::string fnd_Nearest::Hint() const {
-    return nearest_.empty() ? std::string() : "did you mean " + fnd_Quoted(nearest_) + "?";
+    const std::string& meant = nearest_.empty() ? sameBeginning_ : nearest_;
+    return meant.empty() ? std::string() : "did you mean " + fnd_Quoted(meant) + "?";
 }
 
 std::string fnd_DidYouMean(std::string_view name, const std::vector<std::string>& known) {

@@ -4,7 +4,8 @@
 #include "store_interface/findings/fnd_Finding.h"
 
 /// Looks among known names for the one that a wrong name was meant to be: the nearest by characters put in,
-/// left out, changed or swapped with the next, capitals not counted.
+/// left out, changed or swapped with the next, capitals not counted. Where none is near, one that begins as
+/// the name does and goes on, or the name after it.
 class fnd_Nearest {
 public:
     explicit fnd_Nearest(std::string_view name);
@@ -14,6 +15,8 @@ public:
 
 private:
     static constexpr std::size_t kLongest = 80;
+    /// So much says which name is meant.
+    static constexpr std::size_t kBeginning = 3;
 
     /// The distance when it is below `least_`, else `least_`.
     std::size_t DistanceTo(const char* candidate, std::size_t length) const;
@@ -23,6 +26,8 @@ private:
     unsigned long long letters_ = 0;
     std::size_t least_ = 0; ///< only what is nearer counts
     std::string nearest_;
+    std::size_t leastRest_ = kLongest;
+    std::string sameBeginning_;
 };
 
 /// The known name that is nearest to `name`, as "did you mean 'x'?", or nothing when none is near.

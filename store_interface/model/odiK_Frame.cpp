@@ -114,13 +114,6 @@ const cls_FieldTable& odiK_IgnoredFinding::Fields() {
     return fields;
 }
 
-bool odiK_IgnoredFinding::Is(const fnd_Finding& finding) const {
-    if (finding.code->name != code.View()) return false;
-    if (!finding.place.starts_with(place.View())) return false;
-    const std::size_t end = place.View().size();
-    return end == 0 || end == finding.place.size() || finding.place[end] == '/';
-}
-
 const cls_FieldTable& odiK_Datum::Fields() {
     using R = odiK_Datum;
     static const cls_FieldTable fields =

@@ -88,7 +88,6 @@ struct odiK_MemberInput {
     std::span<const odiK_FacetInput> facets;
 };
 
-/// The data of a model besides its tree, its steps and its repositories.
 /// A kind of finding that is known and meant to be as it is.
 class odiK_IgnoredFinding final : public cls_RecordOf<odiK_IgnoredFinding> {
 public:
@@ -100,12 +99,10 @@ public:
     /// JSON pointer into the model file; empty: wherever it is found.
     cow_String place;
 
-    /// Whether it is this one, in a place at or below the own.
-    bool Is(const fnd_Finding& finding) const;
-
     static const cls_FieldTable& Fields();
 };
 
+/// The data of a model besides its tree, its steps and its repositories.
 struct odiK_ModelData : cls_RecordOf<odiK_ModelData> {
     static constexpr cls_ClassInfo Class{"odiK_ModelData", "A model: all that one deck is written from."};
 

@@ -26,7 +26,7 @@ constexpr odiK_Repository kRepositories[] = {
     Row<&M::constraints>("constraints", "a constraint", "constraints", "constraint"),
     Row<&M::contactControls>("contactControls", "contact controls", "contact controls", "contactControls"),
     Row<&M::contactInitializations>("contactInitializations", "a contact initialization",
-                                    "contact initializations"),
+                                    "contact initializations", nullptr, "they are not written"),
     Row<&M::interactionProperties>("interactionProperties", "an interaction property",
                                    "interaction properties", "interactionProperty"),
     Row<&M::timePoints>("timePoints", "time points", "time points", "timePoints",

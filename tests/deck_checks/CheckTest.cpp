@@ -7,6 +7,7 @@
 #include "store_interface/records/steps/kprC_StaticSteps.h"
 #include "support/DeckTest.h"
 
+#include <algorithm>
 #include <set>
 
 namespace {
@@ -30,6 +31,42 @@ Texts Found(const odb_Odb& odb) {
 TEST(Check, EmptyStore_HasNothingToSay) {
     TestStore store;
     EXPECT_EQ(Found(store.odb), Texts{});
+}
+
+TEST(Check, WhatTheModelIgnores_IsNotTold_ErrorsAre) {
+    TestStore store;
+    store.model.materials.Insert("Steel", kmaC_Material());
+    store.model.materials.Insert("Spare", kmaC_Material());
+    EXPECT_EQ(Found(store.odb).size(), 3U);
+    odiK_IgnoredFinding entry;
+    entry.code = "unused";
+    entry.reason = "our library";
+    store.model.ignore.Append(entry);
+    entry.code = "empty-material";
+    entry.place = "/models/Default Model/materials/Spare";
+    store.model.ignore.Append(entry);
+    EXPECT_EQ(Found(store.odb),
+              Texts{"empty-material /materials/Steel: found no option, expected one at least"});
+    kseC_HomogenousSolidSection section;
+    section.materialName = "Stell";
+    store.model.sections.Insert("Solid", section);
+    entry.code = "no-such-name";
+    entry.place = cow_String();
+    store.model.ignore.Append(entry);
+    const Texts found = Found(store.odb);
+    EXPECT_EQ(std::ranges::count_if(found,
+                                    [](const std::string& text) { return text.starts_with("no-such-name"); }),
+              1);
+}
+
+TEST(Check, WhatOneModelIgnores_IsToldOfAnother) {
+    TestStore store;
+    store.model.materials.Insert("Steel", kmaC_Material());
+    odiK_IgnoredFinding entry;
+    entry.code = "empty-material";
+    entry.reason = "to come";
+    store.odb.AddModel("Default").ignore.Append(entry);
+    EXPECT_EQ(Found(store.odb).size(), 2U);
 }
 
 TEST(Check, StoreFilledInMemory_IsHeldAgainstTheRulesOfModelFiles) {

@@ -157,7 +157,7 @@ TEST(WriteDeck, SummaryForPeople_ListsTheSame) {
               "      1  steps\n"
               "      1  materials\n"
               "left out, since a deck can't carry it:\n"
-              "      1  other models (a deck is always written from \"Default Model\"): Study\n");
+              "      1  other models (a deck is written from one of them): Study\n");
 }
 
 } // namespace

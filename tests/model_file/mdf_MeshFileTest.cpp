@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <fstream>
 #include <sstream>
 
@@ -245,6 +246,37 @@ TEST_F(MeshFiles, ModelWrittenBack_StillNamesTheFile) {
     std::ostringstream whole;
     ASSERT_TRUE(mdf_WriteModelFile(*store, whole));
     EXPECT_NE(whole.str().find("\"nodes\""), std::string::npos);
+}
+
+TEST_F(MeshFiles, BehindLinksToFolders_TheModelWrittenBackStillFindsTheFile) {
+    namespace fs = std::filesystem;
+    fs::create_directories(folder_.Path("store/deep"));
+    folder_.Put("store/two.msh", TwoTetrahedra());
+    fs::create_directory_symlink("store/deep", folder_.Path("link"));
+    const auto written = [&](const std::string& from, const std::string& file, const std::string& to) {
+        mdf_Report report;
+        const auto model = [](const std::string& mesh) {
+            return R"({"format": "qrx-model/1", "models": {"M": {"parts": {"P": {"mesh": {"file": ")" + mesh +
+                   R"("}}}}}})";
+        };
+        const auto store = mdf_ReadModelText(model(file), folder_.Path(from + "m.json"), report);
+        if (store == nullptr) return std::string("not read");
+        std::ostringstream text;
+        mdf_WriteModelFile(*store, text, report.meshOrigins,
+                           fs::path(folder_.Path(to + "m.json")).parent_path().string());
+        mdf_Report again;
+        EXPECT_NE(mdf_ReadModelText(text.str(), folder_.Path(to + "m.json"), again), nullptr) << text.str();
+        const std::string begin = "\"file\": \"";
+        const std::size_t at = text.str().find(begin) + begin.size();
+        return text.str().substr(at, text.str().find('"', at) - at);
+    };
+    // What leads there is kept; "link/.." is "store", not the folder of the link.
+    EXPECT_EQ(written("", "link/../two.msh", ""), "link/../two.msh");
+    EXPECT_EQ(written("", "./store/two.msh", ""), "store/two.msh");
+    EXPECT_EQ(written("link/", "../two.msh", "link/"), "../two.msh");
+    EXPECT_EQ(written("link/", "../two.msh", ""), "store/two.msh");
+    EXPECT_EQ(written("", "store/two.msh", "link/"), "../two.msh");
+    EXPECT_EQ(written("", "link/../two.msh", "store/deep/"), "../two.msh");
 }
 
 TEST_F(MeshFiles, OneMeshInEveryFormat_GivesTheSameSetsAndElements) {

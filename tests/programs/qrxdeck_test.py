@@ -17,27 +17,9 @@ import tempfile
 import time
 import unittest
 
-OLD_DECK = b"** the old deck\n"
+from rigid_link import MODEL, changed
 
-MODEL = {
-    "format": "qrx-model/1",
-    "models": {
-        "Default Model": {
-            "topLevelSolverInput": ["*Heading", "One rigid link"],
-            "parts": {
-                "ROD": {
-                    "mesh": {
-                        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [2.5, 0, 0]]},
-                        "elements": [{"type": "R2D2", "labels": [1], "connectivity": [[1, 2]]}],
-                        "sets": [{"name": "TIP", "kind": "node", "labels": [2]}],
-                    }
-                }
-            },
-            "assembly": {"instances": {"ROD-1": {"part": "ROD", "translation": [0, 1, 0]}}},
-            "steps": [{"name": "Initial", "class": "kprC_InitialStep"}],
-        }
-    },
-}
+OLD_DECK = b"** the old deck\n"
 
 DECK = b"""\
 *Heading
@@ -63,13 +45,6 @@ One rigid link
 *End Instance
 *End Assembly
 """
-
-
-def changed(change):
-    """The model with a change made to its default model."""
-    model = json.loads(json.dumps(MODEL))
-    change(model["models"]["Default Model"])
-    return model
 
 
 def without_positions(text):

@@ -21,33 +21,11 @@ import termios
 import time
 import unittest
 
+from rigid_link import MODEL, changed
+
 PROGRAM = str(pathlib.Path(sys.argv[1]).resolve())
 PROJECT = pathlib.Path(sys.argv[2]).resolve()
 ERASE = b"\r\x1b[K"
-BRIDGE = {
-    "format": "qrx-model/1",
-    "models": {
-        "Default Model": {
-            "topLevelSolverInput": ["*Heading", "One rigid link"],
-            "parts": {
-                "ROD": {
-                    "mesh": {
-                        "nodes": {"labels": [1, 2], "coordinates": [[0, 0, 0], [2.5, 0, 0]]},
-                        "elements": [{"type": "R2D2", "labels": [1], "connectivity": [[1, 2]]}],
-                    }
-                }
-            },
-            "assembly": {"instances": {"ROD-1": {"part": "ROD"}}},
-            "steps": [{"name": "Initial", "class": "InitialStep"}],
-        }
-    },
-}
-
-
-def changed(change):
-    model = json.loads(json.dumps(BRIDGE))
-    change(model["models"]["Default Model"])
-    return model
 
 
 def with_warning(model):
@@ -69,7 +47,7 @@ class Program(unittest.TestCase):
     def setUp(self):
         self.folder = pathlib.Path(tempfile.mkdtemp(prefix="qrxdeck_terminal_"))
         self.addCleanup(shutil.rmtree, self.folder)
-        self.put("bridge.json", BRIDGE)
+        self.put("bridge.json", MODEL)
         self.environment = {**os.environ, "TERM": "xterm", "TMPDIR": str(self.folder)}
         self.environment.pop("NO_COLOR", None)
 
@@ -147,7 +125,7 @@ class Help(Program):
 
     def test_EveryExample_Works(self):
         shutil.copytree(PROJECT / "examples", self.folder / "examples")
-        self.put("frame.json", BRIDGE)
+        self.put("frame.json", MODEL)
         shutil.copy(self.mesh(), self.folder / "plate.msh")
         self.put("loads.csv", "/models/Default Model/parts/ROD/mesh/nodes/coordinates/1/0,name\n2.5,one\n3,two\n")
         self.run_program("write", "bridge.json")
@@ -249,7 +227,7 @@ class Streams(Program):
 class Several(Program):
     def setUp(self):
         super().setUp()
-        self.put("frame.json", BRIDGE)
+        self.put("frame.json", MODEL)
         self.put("wrong.json", changed(lambda model: model.update(loads=3)))
         self.put("whirl.json", changed(lambda model: model["steps"].append(
             {"name": "Whirl", "class": "ComplexFrequencyStep"})))
@@ -282,7 +260,7 @@ class Several(Program):
         self.assertEqual(result["runs"][1]["written"]["target"], "bridge.inp")
 
     def test_TwoModelsOfOneDeck_AreRefusedAhead(self):
-        self.put("other/bridge.json", BRIDGE)
+        self.put("other/bridge.json", MODEL)
         run = self.run_program("write", "bridge.json", "other/bridge.json")
         self.assertEqual((run.returncode, self.decks()), (2, []))
         self.assertIn("'bridge.json' and 'other/bridge.json' would have one deck, 'bridge.inp'", run.errors)
@@ -295,7 +273,7 @@ class Several(Program):
 
     def test_FormatCheck_NamesAllThatAreNotCanonical(self):
         self.assertEqual(self.run_program("format", "frame.json", "-o", "frame.json").returncode, 0)
-        self.put("b.json", BRIDGE)
+        self.put("b.json", MODEL)
         run = self.run_program("format", "--check", "b.json", "frame.json", "bridge.json")
         self.assertEqual((run.returncode, run.output), (1, "b.json\nbridge.json\n"))
         self.assertEqual(self.run_program("format", "b.json", "frame.json").returncode, 2)
@@ -465,14 +443,19 @@ class Explain(Program):
         texts = [finding[part] for finding in result["findings"] for part in ("means", "matters")]
         self.assertEqual(len(texts), len(set(texts)))
 
-    def test_Code_IsExplainedInSomeTenLines(self):
+    def test_EachCode_IsExplainedInSomeTenLines(self):
+        codes = [finding["code"] for finding in json.loads(self.run_program("explain", "--json").output)["findings"]]
+        for code in codes:
+            with self.subTest(code=code):
+                run = self.run_program("explain", code)
+                self.assertEqual((run.returncode, run.errors), (0, ""))
+                lines = [line for line in run.output.splitlines() if line]
+                self.assertTrue(lines[0].startswith(code + " ("))
+                self.assertEqual([line for line in lines[1:] if not line.startswith("  ")][-3:],
+                                 ["What it means", "Why it matters", "What to do"])
+                self.assertTrue(10 <= len(lines) <= 14)
         run = self.run_program("explain", "unused-nodes")
-        self.assertEqual((run.returncode, run.errors), (0, ""))
-        lines = run.output.splitlines()
-        self.assertEqual(lines[0], "unused-nodes (note): nodes belong to no element")
-        self.assertEqual([line for line in lines if line and not line.startswith("  ")][1:],
-                         ["What it means", "Why it matters", "What to do"])
-        self.assertTrue(8 <= len(lines) <= 20)
+        self.assertEqual(run.output.splitlines()[0], "unused-nodes (note): nodes belong to no element")
 
     def test_UnknownCode_GetsTheNearest(self):
         run = self.run_program("explain", "unused-node")

@@ -40,6 +40,16 @@ def test_RightModel_HasNoFindings():
     assert rod.model().check() == []
 
 
+def test_WhatTheModelIgnores_IsNotTold():
+    model = rod.model()
+    model.materials["Spare"] = qrx.Material()
+    assert {finding.code for finding in model.check()} == {"empty-material", "unused"}
+    model.ignore.append(qrx.IgnoredFinding(code="empty-material", reason="to come"))
+    assert [finding.code for finding in model.check()] == ["unused"]
+    model.ignore.append(qrx.IgnoredFinding(code="unused", reason="our library", place="/models/Default Model/parts"))
+    assert [finding.code for finding in model.check()] == ["unused"]
+
+
 def test_WrongModel_IsToldWithPlacesAndHints():
     model = rod.model()
     model.sections["Round"].material = "Stel"

@@ -32,12 +32,21 @@ std::size_t Distance(const std::string& a, const std::string& b) {
 std::string Expected(const std::string& name, const std::vector<std::string>& known) {
     std::size_t least = std::min(std::max<std::size_t>(1, name.size() / 3) + 1, name.size());
     std::string nearest;
+    std::string beginning;
+    std::size_t rest = 80;
     for (const std::string& candidate : known) {
+        const std::size_t common = std::min(name.size(), candidate.size());
+        const std::size_t beyond = std::max(name.size(), candidate.size()) - common;
+        if (common >= 3 && name.substr(0, common) == candidate.substr(0, common) && beyond < rest) {
+            rest = beyond;
+            beginning = candidate;
+        }
         const std::size_t distance = Distance(name, candidate);
         if (distance >= least || candidate.empty()) continue;
         least = distance;
         nearest = candidate;
     }
+    if (nearest.empty()) nearest = beginning;
     return nearest.empty() ? "" : "did you mean '" + nearest + "'?";
 }
 
@@ -66,6 +75,16 @@ TEST(Nearest, CapitalsAreNotCounted) {
     EXPECT_EQ(fnd_DidYouMean(std::string(81, 'x'), {std::string(80, 'x')}), "");
     EXPECT_EQ(fnd_DidYouMean(std::string(80, 'x'), {std::string(79, 'x')}),
               "did you mean '" + std::string(79, 'x') + "'?");
+}
+
+TEST(Nearest, WhereNoneIsNear_OneOfTheSameBeginningIsMeant) {
+    EXPECT_EQ(fnd_DidYouMean("profile", {"poissonRatio", "profileName"}), "did you mean 'profileName'?");
+    EXPECT_EQ(fnd_DidYouMean("MATERIAL", {"materialTable", "materialName"}), "did you mean 'materialName'?");
+    EXPECT_EQ(fnd_DidYouMean("densityOfSteel", {"elastic", "density"}), "did you mean 'density'?");
+    EXPECT_EQ(fnd_DidYouMean("mass", {"massFlowRate", "mess"}), "did you mean 'mess'?");
+    EXPECT_EQ(fnd_DidYouMean("ma", {"materialName"}), "");
+    EXPECT_EQ(fnd_DidYouMean("name", {"materialName"}), "");
+    EXPECT_EQ(fnd_DidYouMean("TOP", {std::string(81, 'T')}), "");
 }
 
 TEST(Nearest, SinkThatHasHadEnough_IsNotSearchedFor) {

@@ -95,6 +95,16 @@ class Decks(StudyTest):
         self.assertNotEqual(lines[2]["findings"], [])
         self.assertEqual(lines[3]["findings"], [])
 
+    def test_WhatTheTemplateIgnores_IsToldOfNoRow(self):
+        model = copy.deepcopy(MODEL)
+        model["models"]["Default Model"]["ignore"] = [{"code": "poisson-ratio", "reason": "auxetic"},
+                                                      {"code": "unused", "reason": "our library"}]
+        self.write_model(model)
+        self.write_lines([{at("/materials/Steel/elastic/table/0/1"): 0.7}])
+        run = self.study("template.json", "table.jsonl", "--out", "out")
+        self.assertNotIn("[unused]", run.stderr)
+        self.assertEqual(self.ledger("out")[1]["findings"], [])
+
     def test_PointerWithEscapesAndNamesWithSlashes_FindsItsPlace(self):
         model = copy.deepcopy(MODEL)
         loads = model["models"]["Default Model"]["loads"]

@@ -4,6 +4,7 @@
 usage: runs_test.py PROGRAM [unittest options]
 """
 
+import copy
 import hashlib
 import json
 import os
@@ -205,6 +206,29 @@ class Runs(StudyTest):
                 (self.folder / name).write_bytes(held)
         self.study("template.json", "table.csv", "--out", "out", "--resume")
 
+    def test_OneOfSeveralModels_IsChosen_AndTheFolderIsItsAlone(self):
+        model = copy.deepcopy(studies.MODEL)
+        other = copy.deepcopy(model["models"].pop("Default Model"))
+        other["loads"]["F"]["states"]["Pull"]["component3"] = -50
+        model["models"] = {"A": copy.deepcopy(studies.MODEL["models"]["Default Model"]), "B b": other}
+        self.write_model(model)
+        self.write_csv([FORCE.replace("Default Model", "B b")], [[1], [2]])
+        run = self.study("template.json", "table.csv", "--out", "out", code=2)
+        self.assertIn("found 2 models, none of them 'Default Model'", run.stderr)
+        run = self.study("template.json", "table.csv", "--out", "out", "--model", "C", code=2)
+        self.assertIn("found no model named 'C'", run.stderr)
+        self.study("template.json", "table.csv", "--out", "out", "--model", "B b")
+        decks = [(self.folder / "out" / name).read_text() for name in self.decks_in("out")]
+        self.assertEqual([("BAR-1.TIP, 1, 1.\n" in deck, "BAR-1.TIP, 1, 2.\n" in deck, "BAR-1.TIP, 3, -50.\n" in deck)
+                          for deck in decks], [(True, False, True), (False, True, True)])
+        run = self.study("template.json", "table.csv", "--out", "out", "--model", "A", "--resume", code=2)
+        self.assertIn("the model 'A' is another one than 'B b'", run.stderr)
+        self.study("template.json", "table.csv", "--out", "out", "--model", "B b", "--resume")
+        for scheduler, words in (("slurm", "\nmodel='B b'\n"), ("snakemake", '\nMODEL = "B b"\n')):
+            run = self.study("template.json", "table.csv", "--out", "out", "--model", "B b", "--emit", scheduler,
+                             "--shards", 2)
+            self.assertIn(words, run.stdout)
+
     def write_plates(self, names):
         """A template with a mesh file, and a table whose rows name others; each has a description of its own."""
         mesh = (studies.ROOT / "examples/perforated_plate/plate.unv").read_bytes()
@@ -350,6 +374,17 @@ class Runs(StudyTest):
         environment = dict(os.environ, SLURM_ARRAY_TASK_ID="2", SLURM_CPUS_PER_TASK="2")
         subprocess.run(["bash", self.path("job.sh")], check=True, env=environment, stdout=subprocess.DEVNULL)
         self.assertTrue((self.folder / "it's out/study.02-of-40.jsonl").exists())
+
+    def test_SlurmScript_ChoosesTheModel(self):
+        model = {**studies.MODEL, "models": {"A": studies.MODEL["models"]["Default Model"], "B b": {}}}
+        self.write_model(model)
+        self.write_csv([FORCE.replace("Default Model", "A")], [[1]])
+        script = self.study("template.json", "table.csv", "--out", "out", "--model", "A", "--emit", "slurm",
+                            "--shards", 1).stdout
+        (self.folder / "job.sh").write_text(script)
+        environment = dict(os.environ, SLURM_ARRAY_TASK_ID="1", SLURM_CPUS_PER_TASK="1")
+        subprocess.run(["bash", self.path("job.sh")], check=True, env=environment, stdout=subprocess.DEVNULL)
+        self.assertEqual(self.decks_in("out"), ["1.inp"])
 
     def test_Snakefile_IsPython(self):
         self.write_model()

@@ -54,11 +54,11 @@ TEST(mdf_PointerTokens, Escapes_StandForSlashAndTilde) {
     for (const char* text : {"a", "/a~", "/a~2"}) EXPECT_FALSE(mdf_PointerTokens(text)) << text;
 }
 
-TEST(mdf_IsBelow, OnlyWholeTokensCount) {
-    EXPECT_TRUE(mdf_IsBelow("/a/b", "/a"));
-    EXPECT_TRUE(mdf_IsBelow("/a", "/a"));
-    EXPECT_FALSE(mdf_IsBelow("/ab", "/a"));
-    EXPECT_FALSE(mdf_IsBelow("/a", "/a/b"));
+TEST(fnd_IsBelow, OnlyWholeTokensCount) {
+    EXPECT_TRUE(fnd_IsBelow("/a/b", "/a"));
+    EXPECT_TRUE(fnd_IsBelow("/a", "/a"));
+    EXPECT_FALSE(fnd_IsBelow("/ab", "/a"));
+    EXPECT_FALSE(fnd_IsBelow("/a", "/a/b"));
 }
 
 TEST(mdf_HasPlace, InArraysOfAnyForm_FindsItems) {

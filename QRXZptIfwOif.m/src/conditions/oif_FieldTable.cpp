@@ -6,7 +6,6 @@
 namespace {
 
 using enum oif_RegionKind;
-using FieldDistribution = kpfC_Field::DistribTypeEnm;
 
 /// Fields of class R, written as keywords of class Initial in the initial step and of class Later behind it.
 template <class R, class Initial, class Later>
@@ -47,7 +46,8 @@ std::span<const oif_FieldRow> oif_FieldRows() {
 }
 
 oif_RegionKind oif_FieldRow::RegionOf(const kpfC_Field& field) const {
-    const bool isOfTheModel = field.distributionType == FieldDistribution::FROM_FILE ||
-                              field.distributionType == FieldDistribution::FROM_FILE_AND_USER_DEFINED;
+    const bool isOfTheModel =
+        field.distributionType == kpfC_Field::DistribTypeEnm::FROM_FILE ||
+        field.distributionType == kpfC_Field::DistribTypeEnm::FROM_FILE_AND_USER_DEFINED;
     return isOfTheModel ? ANY : region;
 }

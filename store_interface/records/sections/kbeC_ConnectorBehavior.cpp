@@ -26,6 +26,18 @@ constexpr auto kFrequencyDependencyField = []<class R>(cls_Describe<R>& fields) 
 constexpr auto kComponentsField = []<class R>(cls_Describe<R>& fields) {
     fields.template Field<&R::components>("components", "connector components 1 to 6, in the user's order");
 };
+constexpr auto kMotionLimitFields = []<class R>(cls_Describe<R>& fields) {
+    fields.template Field<&R::minMotion>("minMotion", "least motion; unset: blank")
+        .Unit("length or radians")
+        .template Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
+        .Unit("length or radians");
+};
+constexpr auto kForceLimitFields = []<class R>(cls_Describe<R>& fields) {
+    fields.template Field<&R::minForce>("minForce", "least force or moment; unset: blank")
+        .Unit("force or force*length")
+        .template Field<&R::maxForce>("maxForce", "greatest force or moment; unset: blank")
+        .Unit("force or force*length");
+};
 
 } // namespace
 
@@ -228,10 +240,7 @@ const cls_FieldTable& kbeC_ConnectorStop::Fields() {
     using R = kbeC_ConnectorStop;
     static const cls_FieldTable fields =
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
-            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
-            .Unit("length or radians")
-            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
-            .Unit("length or radians")
+            .With(kMotionLimitFields)
             .With(kComponentsField)
             .Example(R"({"components": [1], "minMotion": -5, "maxMotion": 5})");
     return fields;
@@ -243,14 +252,8 @@ const cls_FieldTable& kbeC_ConnectorFailure::Fields() {
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::releaseComponent>(
                 "releaseComponent", "component that is released; unset: no ', release=' (all components)")
-            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
-            .Unit("length or radians")
-            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
-            .Unit("length or radians")
-            .Field<&R::minForce>("minForce", "least force or moment; unset: blank")
-            .Unit("force or force*length")
-            .Field<&R::maxForce>("maxForce", "greatest force or moment; unset: blank")
-            .Unit("force or force*length")
+            .With(kMotionLimitFields)
+            .With(kForceLimitFields)
             .With(kComponentsField)
             .Example(R"({"components": [1], "maxForce": 10000})");
     return fields;
@@ -262,14 +265,8 @@ const cls_FieldTable& kbeC_ConnectorLock::Fields() {
         cls_Describe<R>(kbeC_ConnectorBehaviorOption::Fields())
             .Field<&R::lockingComponent>("lockingComponent",
                                          "component that is locked; unset: no ', lock=' (all components)")
-            .Field<&R::minMotion>("minMotion", "least motion; unset: blank")
-            .Unit("length or radians")
-            .Field<&R::maxMotion>("maxMotion", "greatest motion; unset: blank")
-            .Unit("length or radians")
-            .Field<&R::minForce>("minForce", "least force or moment; unset: blank")
-            .Unit("force or force*length")
-            .Field<&R::maxForce>("maxForce", "greatest force or moment; unset: blank")
-            .Unit("force or force*length")
+            .With(kMotionLimitFields)
+            .With(kForceLimitFields)
             .With(kComponentsField)
             .Example(R"({"components": [1], "maxMotion": 10})");
     return fields;
