@@ -173,6 +173,19 @@ class View(unittest.TestCase):
                           status["DEACTIVATED"]])
         self.assertEqual(pulled["states"][0]["components"], [5, -3, 0])
         self.assertEqual(pulled["cards"][0], [{"loadCase": "", "text": "*Cload\nFAR, 1, 5.\nFAR, 2, -3.\n"}])
+        self.assertEqual([field["value"] for field in pulled["states"][0]["fields"]], ["1, 5.", "2, -3."])
+
+    def test_DeckWithGravityAndCoupling_TellsDirectionAndReferenceNode(self):
+        deck = DECK.replace("*Cload\n", "*Dload\nFAR, GRAV, 9.81, 0., 0., -1.\n*Cload\n", 1)
+        deck = deck.replace("*End Part", "*Elset, elset=ALL\n1,\n*End Part")
+        deck = deck.replace("*Boundary", "*Rigid Body, ref node=FAR, elset=ROD-1.ALL\n*Boundary", 1)
+        (self.folder / "job.inp").write_text(deck)
+        run = self.view_with_page("job.inp")
+        self.assertEqual(run.returncode, 0, run.stderr)
+        objects = {shown["class"]: shown for shown in self.header("job.html")["objects"]}
+        self.assertEqual((objects["dload"]["mark"], objects["dload"]["states"][0]["components"]),
+                         ("gravity", [0, 0, -9.81]))
+        self.assertEqual([region["role"] for region in objects["rigidbody"]["regions"]], ["region", "refNode"])
 
     def test_DeckWithErrors_HasNoPage(self):
         (self.folder / "job.inp").write_text("*Node\n1, 0., zero, 0.\n")
