@@ -56,7 +56,7 @@ GIVEN_BY = {
     "memcpy": "cstring", "memset": "cstring", "memchr": "cstring", "memcmp": "cstring", "strlen": "cstring",
     "strcmp": "cstring", "malloc": "cstdlib", "realloc": "cstdlib", "free": "cstdlib", "abort": "cstdlib",
     "fclose": "cstdio", "FILE": "cstdio", "fopen": "cstdio", "snprintf": "cstdio", "fabs": "cmath", "sqrt": "cmath",
-    "isfinite": "cmath", "bad_alloc": "new", "nothrow": "new", "bit_cast": "bit", "popcount": "bit", "countr_zero": "bit", "endian": "bit",
+    "isfinite": "cmath", "bad_alloc": "new", "launder": "new", "partial_sum": "numeric", "same_as": "concepts", "nothrow": "new", "bit_cast": "bit", "popcount": "bit", "countr_zero": "bit", "endian": "bit",
     "exception": "exception stdexcept", "exception_ptr": "exception", "current_exception": "exception",
     "logic_error": "stdexcept", "runtime_error": "stdexcept", "invalid_argument": "stdexcept",
     "strong_ordering": "compare", "mutex": "mutex", "lock_guard": "mutex", "unique_lock": "mutex", "thread": "thread",
