@@ -67,29 +67,34 @@ bool BigMesh(const std::string& path, int nodes) {
     }
     const long before = MemoryOf("VmRSS:");
     double best = 1e9;
+    double both = 1e9;
     double ratio = 0.0;
     for (int run = 0; run < 5; ++run) {
-        drd_Findings findings;
-        drd_Deck deck;
-        best = std::min(best, SecondsOf([&] { deck = drd_ReadDeck(path, {}, findings); }));
-        if (findings.HasErrors() || deck.meshes.size() != 1) return false;
-        if (run == 0) {
-            const double arrays = static_cast<double>(deck.meshes[0].Bytes()) / 1024.0;
-            ratio = static_cast<double>(MemoryOf("VmHWM:") - before) / arrays;
+        {
+            drd_Findings findings;
+            drd_Deck deck;
+            best = std::min(best, SecondsOf([&] { deck = drd_ReadDeck(path, {}, findings); }));
+            if (findings.HasErrors() || deck.meshes.size() != 1) return false;
+            if (run == 0) {
+                const double arrays = static_cast<double>(deck.meshes[0].Bytes()) / 1024.0;
+                ratio = static_cast<double>(MemoryOf("VmHWM:") - before) / arrays;
+            }
         }
+        // A deck and another with one node moved, as a program would compare them.
+        both = std::min(both, SecondsOf([&path] {
+                            drd_Findings findings;
+                            const drd_Deck first = drd_ReadDeck(path, {}, findings);
+                            drd_Deck second = drd_ReadDeck(path, {}, findings);
+                            second.meshes[0].coordinates[0] += 1.0;
+                            if (drd_Diff(first, second, {}).differences.size() != 1) std::abort();
+                        }));
     }
-    // A deck and another with one node moved, as a program would compare them.
-    const double both = SecondsOf([&path] {
-        drd_Findings findings;
-        const drd_Deck first = drd_ReadDeck(path, {}, findings);
-        drd_Deck second = drd_ReadDeck(path, {}, findings);
-        second.meshes[0].coordinates[0] += 1.0;
-        if (drd_Diff(first, second, {}).differences.size() != 1) std::abort();
-    });
-    std::printf("%d nodes and elements, %.0f MB: %.3f s, %.0f MB/s, %.2f times the flat arrays\n", nodes,
-                static_cast<double>(bytes) / 1e6, best, static_cast<double>(bytes) / 1e6 / best, ratio);
-    std::printf("reading two and comparing them: %.3f s, %.2f times the time of reading one\n", both,
-                both / best);
+    std::printf(
+        "%d nodes and elements, %.0f MB: %.3f s, %.0f MB/s (at least 400), %.2f times the flat arrays "
+        "(at most 1.3)\n",
+        nodes, static_cast<double>(bytes) / 1e6, best, static_cast<double>(bytes) / 1e6 / best, ratio);
+    std::printf("reading two and comparing them: %.3f s, %.2f times the time of reading one (at most 2.5)\n",
+                both, both / best);
     return true;
 }
 
@@ -132,8 +137,8 @@ void Growth(const char* what, std::string (*make)(int), int count) {
                                    }));
         }
     }
-    std::printf("%-10s %7d: %.4f s; ten times as many: %.4f s, %.1f times\n", what, count, times[0], times[1],
-                times[1] / times[0]);
+    std::printf("%-10s %7d: %.4f s; ten times as many: %.4f s, %.1f times (at most 12)\n", what, count,
+                times[0], times[1], times[1] / times[0]);
 }
 
 } // namespace

@@ -35,6 +35,15 @@ inline std::string Set(const char* kind, const std::string& i) {
     return R"({"name": "S)" + i + R"(", "kind": ")" + kind + R"(", "labels": [)" + label + "]}";
 }
 
+inline std::string Steps(int count) {
+    return R"("steps": [{"name": "Initial", "class": "kprC_InitialStep"},)" +
+           Join(count,
+                [](const std::string& i) {
+                    return R"({"name": "Step-)" + i + R"(", "class": "kprC_StaticStep"})";
+                }) +
+           "]";
+}
+
 /// Each element of a part with a section of its own.
 inline std::string Sections(int count) {
     return Model(
@@ -79,16 +88,57 @@ inline std::string AssemblySet(int count) {
 inline std::string Loads(int count) {
     return Model(Part(count, Join(count, [](const std::string& i) { return Set("node", i); })) +
                  R"(, "assembly": {"instances": {"I": {"part": "P"}}},
-            "steps": [{"name": "Initial", "class": "kprC_InitialStep"},)" +
-                 Join(count,
-                      [](const std::string& i) {
-                          return R"({"name": "Step-)" + i + R"(", "class": "kprC_StaticStep"})";
-                      }) +
-                 R"(], "loads": {)" +
+)" + Steps(count) +
+                 R"(, "loads": {)" +
                  Join(count,
                       [](const std::string& i) {
                           return R"("L)" + i + R"(": {"class": "kloC_ConcentratedForce", "region": "I.S)" +
                                  i + R"(", "states": {"Step-)" + i + R"(": {"component1": 1}}})";
+                      }) +
+                 "}");
+}
+
+/// Sets of a part that is shown twice.
+inline std::string Sets(int count) {
+    return Model(Part(count, Join(count, [](const std::string& i) { return Set("node", i); })) +
+                 R"(, "assembly": {"instances": {"I": {"part": "P"}, "J": {"part": "P"}}})");
+}
+
+/// Instances of a part with a few sets.
+inline std::string Instances(int count) {
+    return Model(Part(20, Join(10, [](const std::string& i) { return Set("node", i); })) +
+                 R"(, "assembly": {"instances": {)" +
+                 Join(count, [](const std::string& i) { return R"("I)" + i + R"(": {"part": "P"})"; }) +
+                 "}}");
+}
+
+/// Steps of which each changes one of a hundred loads; the others go on.
+inline std::string StepsOfChanges(int count) {
+    return Model(Part(100, Join(100, [](const std::string& i) { return Set("node", i); })) +
+                 R"(, "assembly": {"instances": {"I": {"part": "P"}}}, )" + Steps(count) + R"(, "loads": {)" +
+                 Join(100,
+                      [count](const std::string& i) {
+                          std::string states = R"("Step-0": {"component1": 1})";
+                          for (int step = 1; step < count; ++step) {
+                              if (step % 100 != std::stoi(i)) continue;
+                              states += R"(, "Step-)" + std::to_string(step) + R"(": {"component1": )" +
+                                        std::to_string(step) + "}";
+                          }
+                          return R"("L)" + i + R"(": {"class": "kloC_ConcentratedForce", "region": "I.S)" +
+                                 i + R"(", "states": {)" + states + "}}";
+                      }) +
+                 "}");
+}
+
+/// Conditions on sets of their own, which go on through five steps.
+inline std::string Conditions(int count) {
+    return Model(Part(count, Join(count, [](const std::string& i) { return Set("node", i); })) +
+                 R"(, "assembly": {"instances": {"I": {"part": "P"}}}, )" + Steps(5) +
+                 R"(, "boundaryConditions": {)" +
+                 Join(count,
+                      [](const std::string& i) {
+                          return R"("B)" + i + R"(": {"class": "kbcC_DisplacementBC", "region": "I.S)" + i +
+                                 R"(", "states": {"Initial": {"u1": 0}}})";
                       }) +
                  "}");
 }
@@ -98,12 +148,8 @@ inline std::string States(int count) {
     return Model(
         Part(1, R"({"name": "N", "kind": "node", "labels": [1]})") +
         R"(, "assembly": {"instances": {"I": {"part": "P"}}},
-            "steps": [{"name": "Initial", "class": "kprC_InitialStep"},)" +
-        Join(count,
-             [](const std::string& i) {
-                 return R"({"name": "Step-)" + i + R"(", "class": "kprC_StaticStep"})";
-             }) +
-        R"(], "loads": {"L": {"class": "kloC_ConcentratedForce", "region": "I.N", "states": {)" +
+)" + Steps(count) +
+        R"(, "loads": {"L": {"class": "kloC_ConcentratedForce", "region": "I.N", "states": {)" +
         Join(count,
              [](const std::string& i) { return R"("Step-)" + i + R"(": {"component1": )" + i + "}"; }) +
         "}}}");
@@ -145,6 +191,10 @@ struct Task {
     int count;
 };
 inline constexpr Task kTasks[] = {
+    {"Sets", Sets, 100000},
+    {"Instances", Instances, 10000},
+    {"Steps", StepsOfChanges, 1000},
+    {"Conditions", Conditions, 100000},
     {"Sections", Sections, 32000},
     {"Datums", Datums, 30000},
     {"AssemblySet", AssemblySet, 16000},

@@ -5,7 +5,7 @@
 #include <algorithm>
 #include <bit>
 #include <cmath>
-#include <map>
+#include <numeric>
 
 namespace {
 
@@ -17,10 +17,28 @@ std::uint64_t Mixed(std::uint64_t hash, std::uint64_t value) {
     return hash ^ (hash >> 32U);
 }
 
+constexpr std::uint64_t kEmptyText = 0xCBF29CE484222325U;
+
+std::uint64_t WithByte(std::uint64_t hash, char c) {
+    return (hash ^ static_cast<unsigned char>(c)) * 0x100000001B3U;
+}
+
 std::uint64_t HashOf(std::string_view text) {
-    std::uint64_t hash = 0xCBF29CE484222325U;
-    for (const char c : text) hash = (hash ^ static_cast<unsigned char>(c)) * 0x100000001B3U;
+    std::uint64_t hash = kEmptyText;
+    for (const char c : text) hash = WithByte(hash, c);
     return Mixed(hash, text.size());
+}
+
+/// That of drd_FoldName(value).
+std::uint64_t HashOfName(std::string_view value) {
+    std::uint64_t hash = kEmptyText;
+    std::size_t size = 0;
+    for (const char c : drd_Trim(value)) {
+        if (c == '"') continue;
+        hash = WithByte(hash, drd_LowerCase(c));
+        ++size;
+    }
+    return Mixed(hash, size);
 }
 
 std::uint64_t HashOf(double number) {
@@ -34,15 +52,23 @@ bool drd_IsNear(double a, double b, double tolerance) {
 }
 
 drd_Canonical::drd_Canonical(const drd_Deck& deck, bool ignoreTitles)
-    : deck_(deck), ignoreTitles_(ignoreTitles), names_(deck), items_(deck.blocks.size()) {
+    : deck_(deck), ignoreTitles_(ignoreTitles), names_(deck), endsOfItems_(deck.blocks.size() + 1, 0) {
+    const auto isItem = [&deck](std::size_t index) {
+        const drd_Keyword& keyword = deck.keywords[index];
+        return keyword.parent < 0 && !keyword.isBulk &&
+               deck.blocks[static_cast<std::size_t>(keyword.block)].begin != static_cast<int>(index) &&
+               !(keyword.key.starts_with("end") && keyword.row != nullptr);
+    };
+    std::vector<std::pair<int, int>> items; // block and keyword
     for (std::size_t i = 0; i < deck.keywords.size(); ++i) {
-        const drd_Keyword& keyword = deck.keywords[i];
-        const drd_Block& block = deck.blocks[static_cast<std::size_t>(keyword.block)];
-        const int index = static_cast<int>(i);
-        if (keyword.parent >= 0 || keyword.isBulk || block.begin == index) continue;
-        if (keyword.key.starts_with("end") && keyword.row != nullptr) continue;
-        items_[static_cast<std::size_t>(keyword.block)].push_back(index);
+        if (!isItem(i)) continue;
+        items.emplace_back(deck.keywords[i].block, static_cast<int>(i));
+        ++endsOfItems_[static_cast<std::size_t>(deck.keywords[i].block) + 1];
     }
+    // Each block's end begins as its first place and moves on with every item.
+    std::partial_sum(endsOfItems_.begin(), endsOfItems_.end(), endsOfItems_.begin());
+    items_.resize(items.size());
+    for (const auto& [block, item] : items) items_[endsOfItems_[static_cast<std::size_t>(block)]++] = item;
 }
 
 void drd_Canonical::Sign(const Renames& renames) {
@@ -59,8 +85,10 @@ std::uint64_t drd_Canonical::NamelessSignature(int keyword) const {
     return Mixed(OwnHash(deck_.keywords[static_cast<std::size_t>(keyword)], false), OptionsHash(keyword));
 }
 
-std::vector<int> drd_Canonical::ItemsOf(int block) const {
-    return items_[static_cast<std::size_t>(block)];
+std::span<const int> drd_Canonical::ItemsOf(int block) const {
+    const auto place = static_cast<std::size_t>(block);
+    const std::size_t begin = place == 0 ? 0 : endsOfItems_[place - 1];
+    return std::span(items_).subspan(begin, endsOfItems_[place] - begin);
 }
 
 std::vector<int> drd_Canonical::OptionsOf(int keyword) const {
@@ -106,9 +134,7 @@ std::uint64_t drd_Canonical::OwnHash(const drd_Keyword& keyword, bool withName) 
     const bool isNamed = keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE;
     for (const drd_Parameter& parameter : keyword.parameters) {
         if (!withName && isNamed && parameter.key == drd_NameParameter(*keyword.row)) continue;
-        double number = 0.0;
-        const bool isNumber = drd_ReadReal(parameter.value, number);
-        parameters += Mixed(HashOf(parameter.key), isNumber ? HashOf(number) : HashOf(Name(parameter.value)));
+        parameters += Mixed(HashOf(parameter.key), FieldHash(parameter.value));
     }
     return Mixed(Mixed(HashOf(keyword.key), parameters), DataHash(keyword));
 }
@@ -124,25 +150,39 @@ std::uint64_t drd_Canonical::DataHash(const drd_Keyword& keyword) const {
             continue;
         }
         std::uint64_t lineHash = 7;
-        for (const Field& field : Fields(line)) {
-            lineHash = Mixed(lineHash, field.isNumber ? HashOf(field.number) : HashOf(field.text));
-        }
+        drd_SplitFields(line, fields_);
+        while (!fields_.empty() && fields_.back().empty()) fields_.pop_back();
+        for (const std::string_view field : fields_) lineHash = Mixed(lineHash, FieldHash(field));
         // The faces of a surface have no order.
         hash = keyword.key == "surface" ? hash + lineHash : Mixed(hash, lineHash);
     }
     return hash;
 }
 
+std::uint64_t drd_Canonical::FieldHash(std::string_view field) const {
+    double number = 0.0;
+    if (drd_ReadReal(field, number)) return HashOf(number);
+    return renames_ != nullptr ? HashOf(std::string_view(Name(field))) : HashOfName(field);
+}
+
 std::uint64_t drd_Canonical::OptionsHash(int keyword) const {
-    // Options of different keywords have no order among each other; those of one keyword have.
-    std::map<std::string_view, std::uint64_t> byKey;
-    for (int i = keyword + 1; i < deck_.keywords[static_cast<std::size_t>(keyword)].end; ++i) {
+    const int end = deck_.keywords[static_cast<std::size_t>(keyword)].end;
+    if (end == keyword + 1) return 0;
+    options_.clear();
+    for (int i = keyword + 1; i < end; ++i) {
         const drd_Keyword& option = deck_.keywords[static_cast<std::size_t>(i)];
-        if (option.parent != keyword) continue;
-        std::uint64_t& hash = byKey.try_emplace(option.key, 1).first->second;
-        hash = Mixed(hash, signatures_[static_cast<std::size_t>(i)]);
+        if (option.parent == keyword)
+            options_.emplace_back(option.key, signatures_[static_cast<std::size_t>(i)]);
     }
+    // Options of different keywords have no order among each other; those of one keyword have.
+    std::stable_sort(options_.begin(), options_.end(),
+                     [](const auto& a, const auto& b) { return a.first < b.first; });
     std::uint64_t sum = 0;
-    for (const auto& [key, hash] : byKey) sum += hash;
+    for (auto option = options_.begin(); option != options_.end();) {
+        std::uint64_t hash = 1;
+        const std::string_view key = option->first;
+        for (; option != options_.end() && option->first == key; ++option) hash = Mixed(hash, option->second);
+        sum += hash;
+    }
     return sum;
 }

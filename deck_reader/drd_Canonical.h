@@ -4,6 +4,7 @@
 #include "deck_reader/drd_Names.h"
 
 #include <cstdint>
+#include <span>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -38,12 +39,13 @@ public:
     /// How many data lines there are ahead of blank ones at the end.
     std::uint64_t LineCount(const drd_Keyword& keyword) const;
     /// The keywords of a block that are no options, no data of meshes and sets, and no ends of blocks.
-    std::vector<int> ItemsOf(int block) const;
+    std::span<const int> ItemsOf(int block) const;
     std::vector<int> OptionsOf(int keyword) const;
 
 private:
     std::uint64_t OwnHash(const drd_Keyword& keyword, bool withName) const;
     std::uint64_t DataHash(const drd_Keyword& keyword) const;
+    std::uint64_t FieldHash(std::string_view field) const;
     std::uint64_t OptionsHash(int keyword) const;
 
     const drd_Deck& deck_;
@@ -51,8 +53,10 @@ private:
     drd_Names names_;
     std::vector<std::uint64_t> signatures_;
     const Renames* renames_ = nullptr;
-    std::vector<std::vector<int>> items_; // by block
+    std::vector<int> items_; // block by block
+    std::vector<std::size_t> endsOfItems_;
     mutable std::vector<std::string_view> fields_;
+    mutable std::vector<std::pair<std::string_view, std::uint64_t>> options_;
 };
 
 /// Whether two numbers are equal within the tolerance.

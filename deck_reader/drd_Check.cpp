@@ -39,7 +39,7 @@ private:
     const drd_ReadOptions& options_;
     drd_Findings& findings_;
     drd_Names names_;
-    std::multimap<int, int> usersOf_; // the instances that show the mesh of a part
+    std::vector<std::pair<int, int>> usersOf_; // the instances that show the mesh of a part, by its block
 };
 
 void Check::Run() {
@@ -53,8 +53,10 @@ void Check::Run() {
     }
     for (std::size_t i = 0; i < deck_.blocks.size(); ++i) {
         const int block = static_cast<int>(i);
-        if (deck_.blocks[i].kind == drd_BlockEnm::INSTANCE) usersOf_.emplace(names_.MeshBlock(block), block);
+        if (deck_.blocks[i].kind == drd_BlockEnm::INSTANCE)
+            usersOf_.emplace_back(names_.MeshBlock(block), block);
     }
+    std::sort(usersOf_.begin(), usersOf_.end());
     for (std::size_t block = 0; block < deck_.blocks.size(); ++block) {
         if (deck_.blocks[block].mesh < 0) continue;
         Labels(static_cast<int>(block));
@@ -116,6 +118,7 @@ void Check::Parameters(const drd_Keyword& keyword) {
 }
 
 void Check::DataLines(const drd_Keyword& keyword) {
+    if (keyword.lines == 0) return;
     for (const drd_DataRef& ref : drd_DataRefs(keyword.key)) {
         if (!drd_Applies(ref, keyword)) continue;
         const auto first = static_cast<std::uint64_t>(ref.firstLine);
@@ -273,8 +276,8 @@ std::vector<char> Check::CoveredElements(int block) const {
     cover(block);
     // An instance may give sections to the elements of its part.
     if (KindOf(block) == drd_BlockEnm::PART) {
-        const auto [first, last] = usersOf_.equal_range(block);
-        for (auto user = first; user != last; ++user) cover(user->second);
+        const auto first = std::lower_bound(usersOf_.begin(), usersOf_.end(), std::pair(block, 0));
+        for (auto user = first; user != usersOf_.end() && user->first == block; ++user) cover(user->second);
     }
     // A set's label stands for all elements that have it.
     for (const std::uint64_t place : index.Repeated()) {
@@ -346,7 +349,7 @@ void Check::SetPart(const drd_SetPart& part) {
         owner = names_.FindInstance(part.instance);
         if (owner < 0) return;
     }
-    for (const std::string& member : part.members) {
+    for (const drd_Word member : part.members) {
         Reference(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member, keyword,
                   keyword.place);
     }

@@ -4,23 +4,26 @@
 #include "deck_reader/drd_Finding.h"
 #include "deck_reader/drd_Flat.h"
 #include "deck_reader/drd_Keywords.h"
+#include "deck_reader/drd_Rows.h"
+#include "deck_reader/drd_Texts.h"
 
 #include <cstdint>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
 
 /// A parameter of a keyword line.
 struct drd_Parameter {
-    std::string name;  ///< as it stands
-    std::string key;   ///< folded (drd_FoldKey)
-    std::string value; ///< as it stands, quotes included, without blanks around it
+    drd_Word name;  ///< as it stands
+    drd_Word key;   ///< folded (drd_FoldKey)
+    drd_Word value; ///< as it stands, quotes included, without blanks around it
     bool hasValue = false;
 };
 
 /// A line of text that is kept as it stands.
 struct drd_Line {
-    std::uint64_t offset;
+    const char* text;
     std::uint32_t length;
     std::int32_t file;
     std::int64_t line;
@@ -36,10 +39,10 @@ struct drd_Comment {
 /// A keyword line with what belongs to it. Data of nodes, elements and sets are in the arrays of the mesh and
 /// of the set, all other lines in drd_Deck::lines.
 struct drd_Keyword {
-    std::string name;                    ///< as it stands
-    std::string key;                     ///< folded
+    drd_Word name;                       ///< as it stands
+    drd_Word key;                        ///< folded
     const drd_KeywordRow* row = nullptr; ///< null: unknown
-    std::vector<drd_Parameter> parameters;
+    std::span<const drd_Parameter> parameters;
     drd_Place place;
     int block = 0;   ///< where it stands, index of drd_Deck::blocks
     int parent = -1; ///< the keyword that it is an option of
@@ -106,18 +109,18 @@ struct drd_SetPart {
     drd_KindEnm kind = drd_KindEnm::NODE_SET;
     int keyword = -1; ///< -1 for none
     int block = 0;
-    std::string name;     ///< without quotes
-    std::string instance; ///< without quotes; "": none
+    drd_Word name;     ///< without quotes
+    drd_Word instance; ///< without quotes; "": none
     bool isGenerated = false;
     std::uint64_t first = 0; ///< index of drd_Deck::labels
     std::uint64_t count = 0;
-    std::vector<std::string> members; ///< names of sets, and labels of instances, as they stand
+    std::span<const drd_Word> members; ///< names of sets, and labels of instances, as they stand
 };
 
 /// A part, an instance, the assembly, a step, a load case; block 0 is the model itself.
 struct drd_Block {
     drd_BlockEnm kind = drd_BlockEnm::MODEL;
-    std::string name; ///< without quotes
+    drd_Word name; ///< without quotes
     int parent = -1;
     int begin = -1; ///< its keyword
     int end = -1;   ///< the keyword that ends it, -1 when there is none
@@ -130,21 +133,23 @@ struct drd_File {
     drd_Place includedAt{-1, 0};
 };
 
-/// A deck as it was read. Keywords stand in the order of the deck, includes in their place.
+/// A deck as it was read. Keywords stand in the order of the deck, includes in their place. They are plain
+/// values: all that they have words and rows of lies in `texts`.
 struct drd_Deck {
     std::vector<drd_File> files;
-    std::vector<drd_Keyword> keywords;
-    std::vector<drd_Block> blocks;
+    drd_Rows<drd_Keyword> keywords;
+    drd_Rows<drd_Block> blocks;
     std::vector<drd_Mesh> meshes;
-    std::vector<drd_SetPart> setParts;
+    drd_Flat<int> definitions; ///< the keywords that define a name
+    drd_Rows<drd_SetPart> setParts;
     std::vector<std::string> types;  ///< element types as they stand
     std::vector<std::string> owners; ///< names of instances, without quotes
     drd_Flat<int> labels;            ///< of sets
     drd_Flat<drd_Line> lines;
     drd_Flat<drd_Comment> comments;
-    drd_Flat<char> text;
+    drd_Texts texts;
 
-    std::string_view Text(const drd_Line& line) const { return {text.Data() + line.offset, line.length}; }
+    std::string_view Text(const drd_Line& line) const { return {line.text, line.length}; }
     /// A data line of a keyword.
     std::string_view DataLine(const drd_Keyword& keyword, std::uint64_t line) const {
         return Text(lines[keyword.firstLine + line]);

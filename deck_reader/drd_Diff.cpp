@@ -4,25 +4,35 @@
 #include "deck_reader/drd_Text.h"
 
 #include <algorithm>
+#include <numeric>
 
 namespace {
 
 constexpr drd_BlockEnm kKindsOfBlocks[] = {drd_BlockEnm::PART, drd_BlockEnm::ASSEMBLY, drd_BlockEnm::INSTANCE,
                                            drd_BlockEnm::STEP, drd_BlockEnm::LOAD_CASE};
 
-std::vector<std::vector<int>> BlocksByParent(const drd_Deck& deck) {
-    std::vector<std::vector<int>> children(deck.blocks.size());
-    for (std::size_t i = 1; i < deck.blocks.size(); ++i) {
-        children[static_cast<std::size_t>(deck.blocks[i].parent)].push_back(static_cast<int>(i));
-    }
-    return children;
-}
-
 std::string LowerWord(drd_BlockEnm kind) {
     return drd_FoldCase(drd_WordOf(kind));
 }
 
 } // namespace
+
+drd_BlockTree::drd_BlockTree(const drd_Deck& deck)
+    : blocks_(deck.blocks.size() - 1), ends_(deck.blocks.size() + 1, 0) {
+    // Each parent's end begins as its first place and moves on with every block.
+    const auto parentOf = [&deck](std::size_t block) {
+        return static_cast<std::size_t>(deck.blocks[block].parent);
+    };
+    for (std::size_t i = 1; i < deck.blocks.size(); ++i) ++ends_[parentOf(i) + 1];
+    std::partial_sum(ends_.begin(), ends_.end(), ends_.begin());
+    for (std::size_t i = 1; i < deck.blocks.size(); ++i) blocks_[ends_[parentOf(i)]++] = static_cast<int>(i);
+}
+
+std::span<const int> drd_BlockTree::In(int parent) const {
+    const auto place = static_cast<std::size_t>(parent);
+    const std::size_t begin = place == 0 ? 0 : ends_[place - 1];
+    return std::span(blocks_).subspan(begin, ends_[place] - begin);
+}
 
 std::string_view drd_WordOf(drd_ChangeEnm change) {
     constexpr std::string_view kWords[] = {"added", "removed", "changed", "moved", "renamed"};
@@ -55,8 +65,7 @@ std::vector<char> drd_LongestGrowing(const std::vector<int>& values) {
 
 drd_Differ::drd_Differ(const drd_Deck& first, const drd_Deck& second, const drd_DiffOptions& options)
     : options_(options), first_(first, options.ignoreTitles), second_(second, options.ignoreTitles),
-      blocksOfFirst_(BlocksByParent(first)), blocksOfSecond_(BlocksByParent(second)),
-      partners_(first.blocks.size(), -1) {}
+      blocksOfFirst_(first), blocksOfSecond_(second), partners_(first.blocks.size(), -1) {}
 
 drd_DiffResult drd_Differ::Run() {
     first_.Sign(renames_);
@@ -89,47 +98,28 @@ drd_Differ::Context drd_Differ::ContextOf(const Context& outer, const drd_Block&
     return outer + LowerWord(block.kind) + (block.name.empty() ? "" : " " + block.name) + ": ";
 }
 
+drd_Differ::Items drd_Differ::BlocksOfKind(const drd_Deck& deck, ItemView blocks, drd_BlockEnm kind) {
+    Items ofKind;
+    for (const int block : blocks) {
+        if (deck.blocks[static_cast<std::size_t>(block)].kind == kind) ofKind.push_back(block);
+    }
+    return ofKind;
+}
+
 drd_Differ::Match drd_Differ::MatchBlocks(drd_BlockEnm kind, Pair parents) const {
-    Match match;
-    // There is one assembly, whatever it is called.
-    const auto nameOf = [kind](const drd_Block& block) {
-        return kind == drd_BlockEnm::ASSEMBLY ? std::string() : drd_FoldCase(block.name);
+    const auto nameOf = [this, kind](const drd_Canonical& deck, int index) {
+        // There is one assembly, whatever it is called.
+        if (kind == drd_BlockEnm::ASSEMBLY) return std::string();
+        std::string name = drd_FoldCase(deck.Deck().blocks[static_cast<std::size_t>(index)].name);
+        const auto renamed = &deck == &first_ ? renames_.find(name) : renames_.end();
+        return renamed != renames_.end() ? renamed->second : name;
     };
-    const Items& others = blocksOfSecond_[static_cast<std::size_t>(parents.second)];
-    drd_Waiting byName;
-    for (const int other : others) {
-        const drd_Block& block = Second().blocks[static_cast<std::size_t>(other)];
-        if (block.kind == kind) byName.Put(nameOf(block), other);
-    }
-    Items taken;
-    for (const int own : blocksOfFirst_[static_cast<std::size_t>(parents.first)]) {
-        const drd_Block& block = First().blocks[static_cast<std::size_t>(own)];
-        if (block.kind != kind) continue;
-        std::string name = nameOf(block);
-        const auto renamed = renames_.find(name);
-        if (renamed != renames_.end()) name = renamed->second;
-        const int partner = byName.Take(name);
-        if (partner < 0) {
-            match.onlyFirst.push_back(own);
-            continue;
-        }
-        match.pairs.push_back({own, partner});
-        taken.push_back(partner);
-    }
-    std::sort(taken.begin(), taken.end());
-    for (const int other : others) {
-        const bool isOfKind = Second().blocks[static_cast<std::size_t>(other)].kind == kind;
-        if (isOfKind && !std::binary_search(taken.begin(), taken.end(), other))
-            match.onlySecond.push_back(other);
-    }
-    return match;
+    return MatchByKey(BlocksOfKind(First(), blocksOfFirst_.In(parents.first), kind),
+                      BlocksOfKind(Second(), blocksOfSecond_.In(parents.second), kind), nameOf);
 }
 
 void drd_Differ::Blocks(Pair parents, const Context& context) {
-    if (blocksOfFirst_[static_cast<std::size_t>(parents.first)].empty() &&
-        blocksOfSecond_[static_cast<std::size_t>(parents.second)].empty()) {
-        return;
-    }
+    if (blocksOfFirst_.In(parents.first).empty() && blocksOfSecond_.In(parents.second).empty()) return;
     for (const drd_BlockEnm kind : kKindsOfBlocks) {
         const Match match = MatchBlocks(kind, parents);
         for (const int block : match.onlyFirst) {

@@ -16,7 +16,9 @@ std::string Shortened(std::string_view text) {
     return text.size() <= kShown ? std::string(text) : std::string(text.substr(0, kShown)) + "...";
 }
 
-std::vector<int> Without(const std::vector<int>& items, std::vector<int>& taken) {
+} // namespace
+
+std::vector<int> drd_Without(std::span<const int> items, std::vector<int>& taken) {
     std::sort(taken.begin(), taken.end());
     std::vector<int> left;
     for (const int item : items) {
@@ -24,8 +26,6 @@ std::vector<int> Without(const std::vector<int>& items, std::vector<int>& taken)
     }
     return left;
 }
-
-} // namespace
 
 bool drd_Differ::IsIgnored(const drd_Keyword& keyword) const {
     return (options_.ignoreOutput && keyword.row != nullptr &&
@@ -51,7 +51,9 @@ std::string drd_Differ::NameOfItem(const drd_Keyword& keyword) const {
 
 /// Compares lists of keywords: kind by kind, since keywords of different kinds have no order among each
 /// other.
-void drd_Differ::CompareItems(const Items& first, const Items& second, const Context& context) {
+void drd_Differ::CompareItems(ItemView first, ItemView second, const Context& context) {
+    const auto isSame = [this](int a, int b) { return first_.Signature(a) == second_.Signature(b); };
+    if (std::equal(first.begin(), first.end(), second.begin(), second.end(), isSame)) return;
     struct Alike {
         Items first;
         Items second;
@@ -99,25 +101,6 @@ void drd_Differ::CompareAlike(const Items& first, const Items& second, const Con
     TellLonely(match, context);
 }
 
-template <class KeyOf>
-drd_Differ::Match drd_Differ::MatchByKey(const Items& first, const Items& second, const KeyOf& keyOf) const {
-    Match match;
-    std::vector<int> taken;
-    drd_Waiting byKey;
-    for (const int item : second) byKey.Put(keyOf(second_, item), item);
-    for (const int item : first) {
-        const int partner = byKey.Take(keyOf(first_, item));
-        if (partner < 0) {
-            match.onlyFirst.push_back(item);
-            continue;
-        }
-        match.pairs.push_back({item, partner});
-        taken.push_back(partner);
-    }
-    match.onlySecond = Without(second, taken);
-    return match;
-}
-
 drd_Differ::Match drd_Differ::MatchByName(const Items& first, const Items& second) const {
     return MatchByKey(first, second, [](const drd_Canonical& deck, int item) {
         const drd_Keyword& keyword = deck.Keyword(item);
@@ -150,7 +133,7 @@ void drd_Differ::MatchRenamed(Match& match, const Context& context) {
              FirstKeyword(item).place, after.place);
     }
     match.onlyFirst = std::move(left);
-    match.onlySecond = Without(match.onlySecond, taken);
+    match.onlySecond = drd_Without(match.onlySecond, taken);
 }
 
 void drd_Differ::TellMoved(std::vector<Pair> pairs, const Context& context) {

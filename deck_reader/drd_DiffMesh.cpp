@@ -102,6 +102,15 @@ void drd_Differ::CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pai
     drd_Place secondMoved = drd_Nowhere;
     std::uint64_t found = 0;
     for (std::uint64_t i = 0; i < first.nodes.Size(); ++i) {
+        // What is equal byte by byte needs no look at each number.
+        constexpr std::uint64_t kNodes = 512;
+        if (sameLabels && i % kNodes == 0 && i + kNodes <= first.nodes.Size() &&
+            std::memcmp(first.coordinates.Data() + 3 * i, second.coordinates.Data() + 3 * i,
+                        3 * kNodes * sizeof(double)) == 0) {
+            found += kNodes;
+            i += kNodes - 1;
+            continue;
+        }
         std::int64_t place = static_cast<std::int64_t>(i);
         if (!sameLabels) place = index == nullptr ? -1 : index->Find(first.nodes[i]);
         if (place < 0) {
@@ -239,9 +248,24 @@ void drd_Differ::CompareElements(const drd_Mesh& first, const drd_Mesh& second, 
 
 namespace {
 
-std::string SetKey(drd_KindEnm kind, int block, std::string_view folded) {
-    return std::to_string(static_cast<int>(kind)) + "/" + std::to_string(block) + "/" + std::string(folded);
-}
+/// Sets by kind, block and folded name.
+class SetIndex {
+public:
+    explicit SetIndex(const std::vector<drd_Set>& sets) {
+        sets_.Reserve(sets.size());
+        int place = 0;
+        for (const drd_Set& set : sets)
+            sets_.TryEmplace(drd_FoldCase(set.name), place++, drd_ScopeOf(set.kind, set.block));
+    }
+    /// -1 when there is none.
+    int Find(drd_KindEnm kind, int block, std::string_view folded) const {
+        const int* found = sets_.Find(folded, drd_ScopeOf(kind, block));
+        return found == nullptr ? -1 : *found;
+    }
+
+private:
+    drd_TextMap sets_;
+};
 
 drd_Place PlaceOfSet(const drd_Deck& deck, const drd_Set& set) {
     return deck
@@ -258,31 +282,32 @@ std::string drd_Differ::BlockWords(const drd_Deck& deck, int block) const {
     return {};
 }
 
+std::string drd_Differ::SetWords(const drd_Deck& deck, const drd_Set& set) const {
+    return std::string(drd_WordOf(set.kind)) + " " + BlockWords(deck, set.block) + set.name;
+}
+
 void drd_Differ::CompareSets() {
-    drd_TextMap others;
-    const auto& second = second_.Names().Sets();
-    for (std::size_t i = 0; i < second.size(); ++i) {
-        others.TryEmplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
-                          static_cast<int>(i));
-    }
+    const std::vector<drd_Set>& first = first_.Names().Sets();
+    const std::vector<drd_Set>& second = second_.Names().Sets();
     std::vector<char> isTaken(second.size(), 0);
-    const auto& first = first_.Names().Sets();
+    std::optional<SetIndex> index;
+    std::size_t next = 0; // in most decks the partner of the next set
     for (std::size_t i = 0; i < first.size(); ++i) {
         const std::optional<int> block = PartnerOf(first[i].block);
         if (!block) continue;
-        const int* found =
-            others.Find(SetKey(first[i].kind, *block, first_.Name("\"" + first[i].name + "\"")));
-        if (found == nullptr) {
+        const std::string name = first_.Name("\"" + first[i].name + "\"");
+        const bool isNext = next < second.size() && second[next].kind == first[i].kind &&
+                            second[next].block == *block && drd_FoldCase(second[next].name) == name;
+        if (!isNext && !index) index.emplace(second);
+        const int found = isNext ? static_cast<int>(next) : index->Find(first[i].kind, *block, name);
+        if (found < 0) {
             Tell(drd_ChangeEnm::REMOVED, std::string(drd_WordOf(first[i].kind)),
-                 std::string(drd_WordOf(first[i].kind)) + " " + BlockWords(First(), first[i].block) +
-                     first[i].name + " removed",
-                 PlaceOfSet(First(), first[i]), drd_Nowhere);
+                 SetWords(First(), first[i]) + " removed", PlaceOfSet(First(), first[i]), drd_Nowhere);
             continue;
         }
-        isTaken[static_cast<std::size_t>(*found)] = 1;
-        CompareSet({static_cast<int>(i), *found}, std::string(drd_WordOf(first[i].kind)) + " " +
-                                                      BlockWords(First(), first[i].block) + first[i].name +
-                                                      ": ");
+        isTaken[static_cast<std::size_t>(found)] = 1;
+        next = static_cast<std::size_t>(found) + 1;
+        CompareSet({static_cast<int>(i), found});
     }
     std::vector<char> hasPartner(Second().blocks.size(), 0);
     for (const int partner : partners_) {
@@ -291,9 +316,7 @@ void drd_Differ::CompareSets() {
     for (std::size_t i = 0; i < second.size(); ++i) {
         if (isTaken[i] != 0 || hasPartner[static_cast<std::size_t>(second[i].block)] == 0) continue;
         Tell(drd_ChangeEnm::ADDED, std::string(drd_WordOf(second[i].kind)),
-             std::string(drd_WordOf(second[i].kind)) + " " + BlockWords(Second(), second[i].block) +
-                 second[i].name + " added",
-             drd_Nowhere, PlaceOfSet(Second(), second[i]));
+             SetWords(Second(), second[i]) + " added", drd_Nowhere, PlaceOfSet(Second(), second[i]));
     }
 }
 
@@ -334,7 +357,7 @@ std::vector<drd_Member> drd_Differ::MembersOfSecond(int set) const {
     return members;
 }
 
-void drd_Differ::CompareSet(Pair sets, const Context& context) {
+void drd_Differ::CompareSet(Pair sets) {
     const drd_Set& first = first_.Names().Sets()[static_cast<std::size_t>(sets.first)];
     const drd_Set& second = second_.Names().Sets()[static_cast<std::size_t>(sets.second)];
     if (SameLabels(first, second)) return;
@@ -352,7 +375,7 @@ void drd_Differ::CompareSet(Pair sets, const Context& context) {
     };
     const Few removed = only(before, after);
     const Few added = only(after, before);
-    std::string text = context;
+    std::string text = SetWords(First(), first) + ": ";
     if (added.Count() > 0) text += added.Words(what) + " added";
     if (added.Count() > 0 && removed.Count() > 0) text += ", ";
     if (removed.Count() > 0) text += removed.Words(what) + " removed";
@@ -363,17 +386,13 @@ void drd_Differ::CompareSet(Pair sets, const Context& context) {
 /// Sets of the first deck without partner whose members are those of a set of the second without partner.
 void drd_Differ::RenamesOfSets() {
     const auto keyOf = [](drd_KindEnm kind, int block, const std::vector<drd_Member>& members) {
-        std::string key = SetKey(kind, block, "");
+        std::string key = std::to_string(static_cast<int>(kind)) + "/" + std::to_string(block) + "/";
         for (const drd_Member& m : members)
             key += std::to_string(m.instance) + "." + std::to_string(m.label) + ",";
         return key;
     };
-    drd_TextMap names;
     const auto& second = second_.Names().Sets();
-    for (std::size_t i = 0; i < second.size(); ++i) {
-        names.TryEmplace(SetKey(second[i].kind, second[i].block, drd_FoldCase(second[i].name)),
-                         static_cast<int>(i));
-    }
+    const SetIndex names(second);
     drd_Waiting lonely;
     std::vector<char> isKnown(second.size(), 0);
     const auto& first = first_.Names().Sets();
@@ -381,11 +400,11 @@ void drd_Differ::RenamesOfSets() {
     for (std::size_t i = 0; i < first.size(); ++i) {
         const std::optional<int> block = PartnerOf(first[i].block);
         if (!block) continue;
-        const int* found = names.Find(SetKey(first[i].kind, *block, drd_FoldCase(first[i].name)));
-        if (found == nullptr) {
+        const int found = names.Find(first[i].kind, *block, drd_FoldCase(first[i].name));
+        if (found < 0) {
             without.push_back(static_cast<int>(i));
         } else {
-            isKnown[static_cast<std::size_t>(*found)] = 1;
+            isKnown[static_cast<std::size_t>(found)] = 1;
         }
     }
     if (without.empty()) return;

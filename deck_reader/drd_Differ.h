@@ -5,7 +5,9 @@
 #include "deck_reader/drd_Diff.h"
 #include "deck_reader/drd_TextMap.h"
 
+#include <algorithm>
 #include <optional>
+#include <span>
 
 /// What a line of a condition is called, and how many of its fields tell what it acts on.
 struct drd_ConditionWord {
@@ -16,6 +18,20 @@ struct drd_ConditionWord {
 /// The row of keywords whose lines stand each for itself; null for all others.
 const drd_ConditionWord* drd_FindCondition(std::string_view key);
 
+/// The items that are not among those taken, which are sorted then.
+std::vector<int> drd_Without(std::span<const int> items, std::vector<int>& taken);
+
+/// The blocks of a deck by the block around them, in their order.
+class drd_BlockTree {
+public:
+    explicit drd_BlockTree(const drd_Deck& deck);
+    std::span<const int> In(int parent) const;
+
+private:
+    std::vector<int> blocks_; // parent by parent
+    std::vector<std::size_t> ends_;
+};
+
 /// One comparison of two decks.
 class drd_Differ {
 public:
@@ -24,6 +40,7 @@ public:
 
 private:
     using Items = std::vector<int>;
+    using ItemView = std::span<const int>;
     struct Pair {
         int first;
         int second;
@@ -42,6 +59,7 @@ private:
     void RenamesOfSets();
     void RenamesOfBlock(Pair blocks);
     Match MatchBlocks(drd_BlockEnm kind, Pair parents) const;
+    static Items BlocksOfKind(const drd_Deck& deck, ItemView blocks, drd_BlockEnm kind);
     void Blocks(Pair parents, const Context& context);
     void Block(Pair blocks, const Context& context);
     void OpeningLine(Pair blocks, const Context& context);
@@ -51,11 +69,11 @@ private:
     static Context ContextOf(const Context& outer, const drd_Block& block);
 
     // Keywords (drd_DiffItems.cpp).
-    void CompareItems(const Items& first, const Items& second, const Context& context);
+    void CompareItems(ItemView first, ItemView second, const Context& context);
     void CompareAlike(const Items& first, const Items& second, const Context& context);
     /// The items of one key each, in their order.
     template <class KeyOf>
-    Match MatchByKey(const Items& first, const Items& second, const KeyOf& keyOf) const;
+    Match MatchByKey(ItemView first, ItemView second, const KeyOf& keyOf) const;
     Match MatchByName(const Items& first, const Items& second) const;
     Match MatchBySignature(const Items& first, const Items& second) const;
     void MatchRenamed(Match& match, const Context& context);
@@ -92,11 +110,12 @@ private:
     bool SameOwners(const drd_Mesh& first, const drd_Mesh& second) const;
     bool SameElements(const drd_Mesh& first, const drd_Mesh& second) const;
     void CompareSets();
-    void CompareSet(Pair sets, const Context& context);
+    void CompareSet(Pair sets);
     bool SameLabels(const drd_Set& first, const drd_Set& second) const;
     std::vector<drd_Member> MembersInSecond(int set) const;
     std::vector<drd_Member> MembersOfSecond(int set) const;
     std::string BlockWords(const drd_Deck& deck, int block) const;
+    std::string SetWords(const drd_Deck& deck, const drd_Set& set) const;
 
     void Tell(drd_ChangeEnm change, std::string kind, std::string text, drd_Place first, drd_Place second);
     const drd_Deck& First() const { return first_.Deck(); }
@@ -108,11 +127,40 @@ private:
     drd_Canonical first_;
     drd_Canonical second_;
     drd_Canonical::Renames renames_;
-    std::vector<Items> blocksOfFirst_; // by the block around them
-    std::vector<Items> blocksOfSecond_;
+    drd_BlockTree blocksOfFirst_;
+    drd_BlockTree blocksOfSecond_;
     std::vector<int> partners_; // of the blocks of the first deck
     drd_DiffResult result_;
 };
+
+template <class KeyOf>
+drd_Differ::Match drd_Differ::MatchByKey(ItemView first, ItemView second, const KeyOf& keyOf) const {
+    Match match;
+    // Most decks have the same things in the same order: as long as they do, who comes first goes with who
+    // comes first.
+    std::size_t same = 0;
+    const std::size_t both = std::min(first.size(), second.size());
+    match.pairs.reserve(both);
+    for (; same < both && keyOf(first_, first[same]) == keyOf(second_, second[same]); ++same) {
+        match.pairs.push_back({first[same], second[same]});
+    }
+    first = first.subspan(same);
+    second = second.subspan(same);
+    Items taken;
+    drd_Waiting byKey;
+    for (const int item : second) byKey.Put(keyOf(second_, item), item);
+    for (const int item : first) {
+        const int partner = byKey.Take(keyOf(first_, item));
+        if (partner < 0) {
+            match.onlyFirst.push_back(item);
+            continue;
+        }
+        match.pairs.push_back({item, partner});
+        taken.push_back(partner);
+    }
+    match.onlySecond = drd_Without(second, taken);
+    return match;
+}
 
 /// The places of a longest run of values that grow; what is not in it has been moved.
 std::vector<char> drd_LongestGrowing(const std::vector<int>& values);

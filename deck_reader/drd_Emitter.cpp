@@ -44,7 +44,7 @@ std::string drd_Emitter::Real(double value, int digits) {
     return text;
 }
 
-void drd_Emitter::Keyword(std::string_view name, const std::vector<drd_Parameter>& parameters) {
+void drd_Emitter::Keyword(std::string_view name, std::span<const drd_Parameter> parameters) {
     std::size_t begin = text_.size();
     // Two stars would make a comment.
     text_.append(name.starts_with("*") ? "* " : "*").append(name);
@@ -97,9 +97,9 @@ void drd_Emitter::Labels(std::span<const int> labels) {
     }
 }
 
-void drd_Emitter::Member(const std::string& name) {
+void drd_Emitter::Member(std::string_view name) {
     // A star ahead would make it a keyword.
-    Line((name.starts_with("*") ? drd_QuotedName(drd_NameOf(name)) : name) + ",");
+    Line((name.starts_with("*") ? drd_QuotedName(drd_NameOf(name)) : std::string(name)) + ",");
 }
 
 namespace {
@@ -114,14 +114,15 @@ public:
 
 private:
     void Keyword(const drd_Keyword& keyword) {
-        std::vector<drd_Parameter> parameters = keyword.parameters;
+        std::vector<drd_Parameter> parameters(keyword.parameters.begin(), keyword.parameters.end());
+        values_.Clear();
         const bool isListed = keyword.set >= 0 && List(deck_.setParts[static_cast<std::size_t>(keyword.set)]);
         std::erase_if(parameters, [isListed](const drd_Parameter& p) {
             return p.name.empty() || (isListed && p.key == "generate");
         });
         std::stable_sort(parameters.begin(), parameters.end(),
                          [](const auto& a, const auto& b) { return a.key < b.key; });
-        for (drd_Parameter& parameter : parameters) parameter.value = Value(parameter.value);
+        for (drd_Parameter& parameter : parameters) parameter.value = values_.Keep(Value(parameter.value));
         const std::string name(keyword.row != nullptr ? keyword.row->name : std::string_view(keyword.name));
         emitter_.Keyword(name, parameters);
         if (keyword.isBulk) {
@@ -229,11 +230,12 @@ private:
                 emitter_.Labels(deck_.labels.Part(i, 3));
             }
         }
-        for (const std::string& member : part.members) emitter_.Member(member);
+        for (const drd_Word member : part.members) emitter_.Member(member);
     }
 
     const drd_Deck& deck_;
     drd_Emitter emitter_;
+    drd_Texts values_; // of the keyword that is being written
     std::vector<std::string_view> fields_;
     std::vector<int> listed_;
 };

@@ -20,7 +20,7 @@ public:
     /// A line as it stands; several with "\n" between.
     void Line(std::string_view text);
     /// `*Name, parameter=value`, over several lines where it is long.
-    void Keyword(std::string_view name, const std::vector<drd_Parameter>& parameters);
+    void Keyword(std::string_view name, std::span<const drd_Parameter> parameters);
     /// `label, x, y, z` with the digits that single precision needs.
     void Node(int label, const double (&point)[3]);
     /// `label, node, ...`, sixteen numbers a line.
@@ -28,7 +28,7 @@ public:
     /// Labels, sixteen a line.
     void Labels(std::span<const int> labels);
     /// The name of a set in a set, on a line of its own.
-    void Member(const std::string& name);
+    void Member(std::string_view name);
     void Flush();
 
     /// A real as decks have it, with so many digits.

@@ -3,6 +3,7 @@
 
 #include "deck_reader/drd_Names.h"
 
+#include <unordered_map>
 #include <unordered_set>
 
 /// What labels and names become in a flat deck.

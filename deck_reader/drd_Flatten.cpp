@@ -55,6 +55,7 @@ private:
     std::vector<char> isWritten_; // keywords of parts that stand once for all instances
     std::size_t comment_ = 0;
     std::vector<int> labels_;
+    drd_Texts values_; // of the keyword that is being written
 };
 
 bool Flattener::IsLocal(int block) const {
@@ -228,7 +229,8 @@ void Flattener::Keyword(int index, const Place& place) {
 
 std::vector<drd_Parameter> Flattener::Parameters(const drd_Keyword& keyword, const Place& place,
                                                  bool& changed) {
-    std::vector<drd_Parameter> parameters = keyword.parameters;
+    std::vector<drd_Parameter> parameters(keyword.parameters.begin(), keyword.parameters.end());
+    values_.Clear();
     const bool isSet = keyword.key == "nset" || keyword.key == "elset";
     const bool namesItself = keyword.key == "surface" || keyword.key == "orientation";
     for (drd_Parameter& parameter : parameters) {
@@ -245,8 +247,9 @@ std::vector<drd_Parameter> Flattener::Parameters(const drd_Keyword& keyword, con
                 value = FlatReference(ref.ref, ref.kind, parameter.value, keyword.block, place.instance);
             }
         }
-        if (value != parameter.value) changed = true;
-        parameter.value = std::move(value);
+        if (value == parameter.value) continue;
+        changed = true;
+        parameter.value = values_.Keep(value);
     }
     const std::size_t before = parameters.size();
     if (isSet) std::erase_if(parameters, [](const drd_Parameter& p) { return p.key == "instance"; });
@@ -428,7 +431,7 @@ void Flattener::Set(const drd_Keyword& keyword, const Place& place) {
         emitter_.Labels(labels_);
     }
     const int instance = part.instance.empty() ? place.instance : owner;
-    for (const std::string& member : part.members) {
+    for (const drd_Word member : part.members) {
         emitter_.Member(FlatReference(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member,
                                       keyword.block, instance));
     }

@@ -1,11 +1,11 @@
 #include "deck_reader/drd_Keywords.h"
 
 #include "deck_reader/drd_Text.h"
+#include "deck_reader/drd_TextMap.h"
 
 #include <algorithm>
 #include <array>
 #include <string>
-#include <unordered_map>
 
 namespace {
 
@@ -94,12 +94,13 @@ std::span<const drd_KeywordRow> drd_KeywordRows() {
 
 const drd_KeywordRow* drd_FindKeyword(std::string_view folded) {
     static const auto kIndex = [] {
-        std::unordered_map<std::string, const drd_KeywordRow*> index;
-        for (const drd_KeywordRow& row : kRows) index.emplace(drd_FoldKey(row.name), &row);
+        drd_TextMap index;
+        int place = 0;
+        for (const drd_KeywordRow& row : kRows) index.TryEmplace(drd_FoldKey(row.name), place++);
         return index;
     }();
-    const auto found = kIndex.find(std::string(folded));
-    return found == kIndex.end() ? nullptr : found->second;
+    const int* found = kIndex.Find(folded);
+    return found == nullptr ? nullptr : &kRows[*found];
 }
 
 std::string_view drd_NameParameter(const drd_KeywordRow& row) {

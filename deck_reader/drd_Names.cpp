@@ -64,14 +64,6 @@ std::int64_t drd_LabelIndex::Find(int label) const {
 
 namespace {
 
-std::string KeyOf(drd_KindEnm kind, int block, std::string_view folded) {
-    std::string key;
-    key.reserve(1 + sizeof block + folded.size());
-    key.push_back(static_cast<char>(kind));
-    key.append(reinterpret_cast<const char*>(&block), sizeof block);
-    return key.append(folded);
-}
-
 /// Names that a part, an instance and the assembly have each for itself.
 bool IsScoped(drd_KindEnm kind) {
     return kind == drd_KindEnm::NODE_SET || kind == drd_KindEnm::ELEMENT_SET ||
@@ -84,7 +76,9 @@ bool IsSet(drd_KindEnm kind) {
 
 } // namespace
 
-drd_Names::drd_Names(const drd_Deck& deck) : deck_(deck) {
+drd_Names::drd_Names(const drd_Deck& deck)
+    : deck_(deck), partOf_(deck.blocks.size(), -1), nodes_(deck.meshes.size()),
+      elements_(deck.meshes.size()) {
     for (std::size_t i = 0; i < deck.blocks.size(); ++i) {
         const drd_Block& block = deck.blocks[i];
         if (block.kind == drd_BlockEnm::ASSEMBLY && assembly_ < 0) assembly_ = static_cast<int>(i);
@@ -93,24 +87,41 @@ drd_Names::drd_Names(const drd_Deck& deck) : deck_(deck) {
         if (block.kind == drd_BlockEnm::INSTANCE)
             instances_.TryEmplace(drd_FoldCase(block.name), static_cast<int>(i));
     }
+    for (std::size_t i = 0; i < deck.blocks.size(); ++i) {
+        const drd_Block& block = deck.blocks[i];
+        if (block.kind != drd_BlockEnm::INSTANCE) continue;
+        partOf_[i] = FindPart(deck.keywords[static_cast<std::size_t>(block.begin)].Value("part"));
+    }
+    index_.Reserve(deck.setParts.size() + deck.definitions.Size());
     AddSets();
     AddDefinitions();
 }
 
 void drd_Names::AddSets() {
-    for (std::size_t i = 0; i < deck_.setParts.size(); ++i) {
-        const drd_SetPart& part = deck_.setParts[i];
-        const auto [place, isNew] = index_.TryEmplace(KeyOf(part.kind, part.block, drd_FoldCase(part.name)),
-                                                      static_cast<int>(sets_.size()));
+    std::vector<int> setOf;
+    setOf.reserve(deck_.setParts.size());
+    for (const drd_SetPart& part : deck_.setParts) {
+        const auto [place, isNew] = index_.TryEmplace(drd_FoldCase(part.name), static_cast<int>(sets_.size()),
+                                                      drd_ScopeOf(part.kind, part.block));
         if (isNew) sets_.push_back({part.kind, part.block, part.name, {}});
-        sets_[static_cast<std::size_t>(place)].parts.push_back(static_cast<int>(i));
+        setOf.push_back(place);
+    }
+    // Each set's end begins as its first place and moves on with every part.
+    std::vector<std::size_t> ends(sets_.size() + 1, 0);
+    for (const int set : setOf) ++ends[static_cast<std::size_t>(set) + 1];
+    std::partial_sum(ends.begin(), ends.end(), ends.begin());
+    partsOfSets_.resize(setOf.size());
+    for (std::size_t i = 0; i < setOf.size(); ++i) {
+        partsOfSets_[ends[static_cast<std::size_t>(setOf[i])]++] = static_cast<int>(i);
+    }
+    for (std::size_t i = 0, begin = 0; i < sets_.size(); begin = ends[i++]) {
+        sets_[i].parts = std::span(partsOfSets_).subspan(begin, ends[i] - begin);
     }
 }
 
 void drd_Names::AddDefinitions() {
-    for (std::size_t i = 0; i < deck_.keywords.size(); ++i) {
-        const drd_Keyword& keyword = deck_.keywords[i];
-        if (keyword.row == nullptr || keyword.row->defines == drd_KindEnm::NONE) continue;
+    for (const int index : deck_.definitions) {
+        const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(index)];
         const std::string name = drd_FoldName(keyword.Value(drd_NameParameter(*keyword.row)));
         if (name.empty()) continue;
         const drd_KindEnm kind = keyword.row->defines;
@@ -118,9 +129,9 @@ void drd_Names::AddDefinitions() {
         int block = kind == drd_KindEnm::LOAD_CASE
                         ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
                         : (IsScoped(kind) ? keyword.block : -1);
-        if (!index_.TryEmplace(KeyOf(kind, block, name), static_cast<int>(i)).second &&
+        if (!index_.TryEmplace(name, index, drd_ScopeOf(kind, block)).second &&
             kind != drd_KindEnm::CONTACT_PAIR && kind != drd_KindEnm::DERIVED) {
-            definedTwice_.push_back(static_cast<int>(i));
+            definedTwice_.push_back(index);
         }
     }
 }
@@ -133,42 +144,42 @@ int drd_Names::FindInstance(std::string_view name) const {
     return instances_.NumberOr(drd_FoldCase(name), -1);
 }
 
-int drd_Names::PartOf(int instance) const {
-    const drd_Block& block = deck_.blocks[static_cast<std::size_t>(instance)];
-    if (block.kind != drd_BlockEnm::INSTANCE) return -1;
-    return FindPart(deck_.keywords[static_cast<std::size_t>(block.begin)].Value("part"));
-}
-
 int drd_Names::MeshBlock(int block) const {
     if (deck_.blocks[static_cast<std::size_t>(block)].mesh >= 0) return block;
     const int part = PartOf(block);
     return part >= 0 ? part : block;
 }
 
+namespace {
+
+const drd_LabelIndex* LabelsOf(const drd_Deck& deck, int block, drd_Flat<int> drd_Mesh::*labels,
+                               std::vector<std::unique_ptr<drd_LabelIndex>>& indices) {
+    const int mesh = deck.blocks[static_cast<std::size_t>(block)].mesh;
+    if (mesh < 0) return nullptr;
+    const auto place = static_cast<std::size_t>(mesh);
+    if (indices[place] == nullptr)
+        indices[place] = std::make_unique<drd_LabelIndex>(deck.meshes[place].*labels);
+    return indices[place].get();
+}
+
+} // namespace
+
 const drd_LabelIndex* drd_Names::Nodes(int block) const {
-    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)]);
-    if (mesh == nullptr) return nullptr;
-    auto& index = nodes_[block];
-    if (index == nullptr) index = std::make_unique<drd_LabelIndex>(mesh->nodes);
-    return index.get();
+    return LabelsOf(deck_, block, &drd_Mesh::nodes, nodes_);
 }
 
 const drd_LabelIndex* drd_Names::Elements(int block) const {
-    const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(block)]);
-    if (mesh == nullptr) return nullptr;
-    auto& index = elements_[block];
-    if (index == nullptr) index = std::make_unique<drd_LabelIndex>(mesh->elements);
-    return index.get();
+    return LabelsOf(deck_, block, &drd_Mesh::elements, elements_);
 }
 
-int drd_Names::FindScoped(drd_KindEnm kind, const std::string& folded, int block) const {
-    if (const int* found = index_.Find(KeyOf(kind, block, folded))) return *found;
+int drd_Names::FindScoped(drd_KindEnm kind, std::string_view folded, int block) const {
+    if (const int* found = index_.Find(folded, drd_ScopeOf(kind, block))) return *found;
     const int part = PartOf(block);
     return part >= 0 ? FindScoped(kind, folded, part) : -1;
 }
 
 /// In the assembly and outside all blocks.
-int drd_Names::FindAbove(drd_KindEnm kind, const std::string& folded) const {
+int drd_Names::FindAbove(drd_KindEnm kind, std::string_view folded) const {
     const int inAssembly = assembly_ >= 0 ? FindScoped(kind, folded, assembly_) : -1;
     return inAssembly >= 0 ? inAssembly : FindScoped(kind, folded, 0);
 }
@@ -179,10 +190,10 @@ drd_Target drd_Names::TargetOf(drd_KindEnm kind, int index) const {
     return target;
 }
 
-drd_Target drd_Names::FindInInstances(drd_KindEnm kind, const std::string& folded) const {
+drd_Target drd_Names::FindInInstances(drd_KindEnm kind, std::string_view folded) const {
     // Names of instances may have dots too, so that every dot can be the one.
-    for (std::size_t dot = folded.find('.'); dot != std::string::npos; dot = folded.find('.', dot + 1)) {
-        const int* instance = instances_.Find(std::string_view(folded).substr(0, dot));
+    for (std::size_t dot = folded.find('.'); dot != std::string_view::npos; dot = folded.find('.', dot + 1)) {
+        const int* instance = instances_.Find(folded.substr(0, dot));
         if (instance == nullptr) continue;
         const int index = FindScoped(kind, folded.substr(dot + 1), *instance);
         if (index < 0) continue;
@@ -197,7 +208,7 @@ drd_Target drd_Names::Find(drd_KindEnm kind, std::string_view name, int block) c
     const std::string folded = drd_FoldName(name);
     if (folded.empty()) return {};
     if (!IsScoped(kind)) {
-        const int* found = index_.Find(KeyOf(kind, -1, folded));
+        const int* found = index_.Find(folded, drd_ScopeOf(kind, -1));
         return found == nullptr ? drd_Target() : TargetOf(kind, *found);
     }
     int index = FindScoped(kind, folded, block);
@@ -214,7 +225,7 @@ bool drd_Names::HasLabel(drd_KindEnm kind, int label, int block) const {
     return index != nullptr && index->Find(label) >= 0;
 }
 
-bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block, drd_Target& target) const {
+bool drd_Names::FindLabel(drd_KindEnm kind, std::string_view folded, int block, drd_Target& target) const {
     int label = 0;
     if (drd_ReadInt(folded, label)) {
         const drd_BlockEnm blockKind = deck_.blocks[static_cast<std::size_t>(block)].kind;
@@ -228,9 +239,8 @@ bool drd_Names::FindLabel(drd_KindEnm kind, const std::string& folded, int block
         return true;
     }
     const std::size_t dot = folded.rfind('.');
-    if (dot == std::string::npos || !drd_ReadInt(std::string_view(folded).substr(dot + 1), label))
-        return false;
-    const int* instance = instances_.Find(std::string_view(folded).substr(0, dot));
+    if (dot == std::string_view::npos || !drd_ReadInt(folded.substr(dot + 1), label)) return false;
+    const int* instance = instances_.Find(folded.substr(0, dot));
     if (instance == nullptr) return false;
     if (HasLabel(kind, label, *instance)) {
         target.label = label;
@@ -334,7 +344,7 @@ bool drd_Names::CollectPart(const drd_SetPart& part, int instance, Seen& seen,
     }
     CollectLabels(part, owner, members);
     bool isWhole = CollectFromMesh(part, owner, seen, members);
-    for (const std::string& member : part.members) {
+    for (const drd_Word member : part.members) {
         const int block = part.instance.empty() ? part.block : owner;
         const bool isNodes = part.kind == drd_KindEnm::NODE_SET;
         const drd_Target target =

@@ -5,9 +5,9 @@
 #include "deck_reader/drd_TextMap.h"
 
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <unordered_set>
 #include <vector>
 
@@ -38,12 +38,17 @@ struct drd_Member {
     friend auto operator<=>(const drd_Member&, const drd_Member&) = default;
 };
 
+/// The scope of a drd_TextMap that has the names of one kind in one block.
+inline std::uint64_t drd_ScopeOf(drd_KindEnm kind, int block) {
+    return std::uint64_t{static_cast<std::uint8_t>(kind)} << 32U | static_cast<std::uint32_t>(block);
+}
+
 /// A set under its name, with all the keywords that say something of it.
 struct drd_Set {
     drd_KindEnm kind = drd_KindEnm::NODE_SET;
     int block = 0;
-    std::string name;
-    std::vector<int> parts; ///< indices of drd_Deck::setParts
+    drd_Word name;
+    std::span<const int> parts; ///< indices of drd_Deck::setParts
 };
 
 /// What a reference leads to.
@@ -70,7 +75,7 @@ public:
     int FindPart(std::string_view value) const;
     int FindInstance(std::string_view name) const;
     /// The part of an instance, or -1.
-    int PartOf(int instance) const;
+    int PartOf(int instance) const { return partOf_[static_cast<std::size_t>(instance)]; }
     /// What the name leads to, seen from a block: NAME, `INSTANCE.NAME`, and where the reference takes
     /// labels, LABEL and `INSTANCE.LABEL`.
     drd_Target Find(drd_KindEnm kind, std::string_view name, int block) const;
@@ -96,11 +101,11 @@ private:
 
     void AddSets();
     void AddDefinitions();
-    int FindScoped(drd_KindEnm kind, const std::string& folded, int block) const;
-    int FindAbove(drd_KindEnm kind, const std::string& folded) const;
-    drd_Target FindInInstances(drd_KindEnm kind, const std::string& folded) const;
+    int FindScoped(drd_KindEnm kind, std::string_view folded, int block) const;
+    int FindAbove(drd_KindEnm kind, std::string_view folded) const;
+    drd_Target FindInInstances(drd_KindEnm kind, std::string_view folded) const;
     drd_Target TargetOf(drd_KindEnm kind, int index) const;
-    bool FindLabel(drd_KindEnm kind, const std::string& folded, int block, drd_Target& target) const;
+    bool FindLabel(drd_KindEnm kind, std::string_view folded, int block, drd_Target& target) const;
     bool HasLabel(drd_KindEnm kind, int label, int block) const;
     bool Collect(int set, int instance, Seen& seen, std::vector<drd_Member>& members) const;
     bool CollectPart(const drd_SetPart& part, int instance, Seen& seen,
@@ -113,14 +118,17 @@ private:
 
     const drd_Deck& deck_;
     std::vector<drd_Set> sets_;
+    std::vector<int> partsOfSets_; // set by set
     std::vector<int> definedTwice_;
-    // By kind, block (-1: any) and folded name.
+    // Folded names, each kind in each block (-1: any) a scope.
     drd_TextMap index_;
     drd_TextMap instances_;
     drd_TextMap parts_;
+    std::vector<int> partOf_; // by block
     int assembly_ = -1;
-    mutable std::unordered_map<int, std::unique_ptr<drd_LabelIndex>> nodes_;
-    mutable std::unordered_map<int, std::unique_ptr<drd_LabelIndex>> elements_;
+    // By mesh.
+    mutable std::vector<std::unique_ptr<drd_LabelIndex>> nodes_;
+    mutable std::vector<std::unique_ptr<drd_LabelIndex>> elements_;
 };
 
 /// Whether a column's rule holds for a keyword: it has the parameter that the rule asks for.

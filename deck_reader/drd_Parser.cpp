@@ -136,9 +136,8 @@ bool drd_Parser::NextDataLine(std::string_view& line) {
 }
 
 drd_Line drd_Parser::Keep(std::string_view text, drd_Place place) {
-    const drd_Line kept{deck_.text.Size(), static_cast<std::uint32_t>(text.size()), place.file, place.line};
-    deck_.text.Add(text.data(), text.size());
-    return kept;
+    const drd_Word kept = deck_.texts.Keep(text);
+    return {kept.data(), static_cast<std::uint32_t>(kept.size()), place.file, place.line};
 }
 
 void drd_Parser::Comment(std::string_view line) {
@@ -148,7 +147,7 @@ void drd_Parser::Comment(std::string_view line) {
 }
 
 drd_Deck drd_Parser::Run() {
-    deck_.blocks.emplace_back();
+    deck_.blocks.push_back({});
     std::string_view line;
     while (NextLine(line)) {
         if (line.starts_with("**")) {
@@ -191,10 +190,13 @@ void drd_Parser::Finish() {
         mesh.connectivity.Trim();
         mesh.owners.Trim();
     }
+    deck_.keywords.shrink_to_fit();
+    deck_.blocks.shrink_to_fit();
+    deck_.setParts.shrink_to_fit();
+    deck_.definitions.Trim();
     deck_.labels.Trim();
     deck_.lines.Trim();
     deck_.comments.Trim();
-    deck_.text.Trim();
     for (drd_Mesh& mesh : deck_.meshes) {
         // Nodes ahead of the first owner have none.
         if (!mesh.owners.IsEmpty()) {

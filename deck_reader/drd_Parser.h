@@ -40,11 +40,16 @@ private:
 
     // Keywords (drd_ParserKeywords.cpp).
     void Keyword(std::string_view line);
-    std::string Continued(std::string_view line, std::string& asItStands);
+    /// The keyword line, kept, with its continuations: in one line, and as `asItStands`.
+    std::string_view Header(std::string_view line, std::string_view& asItStands);
     bool ParseHeader(std::string_view header, drd_Keyword& keyword);
+    /// The word as it is compared; each spelling is folded once.
+    drd_Word Folded(drd_Word word);
+    /// A name without its quotes, of a value that is kept.
+    drd_Word NameOf(std::string_view value);
     bool Include(const drd_Keyword& keyword);
     void OpenFile(const std::filesystem::path& path, drd_Place includedAt);
-    void AddKeyword(drd_Keyword keyword);
+    void AddKeyword(drd_Keyword& keyword);
     void PlaceInBlock(drd_Keyword& keyword);
     void OpenBlock(drd_BlockEnm kind, const drd_Keyword& keyword);
     void CloseBlock(drd_BlockEnm kind, const drd_Keyword& keyword);
@@ -65,7 +70,7 @@ private:
     bool ElementNodes(drd_Mesh& mesh, const char* at);
     bool NodeOfInstance(drd_Mesh& mesh, const char*& at);
     void SetLines(std::string_view line);
-    void SetLine(drd_SetPart& part, std::string_view line);
+    void SetLine(std::string_view line);
     void GeneratedLine(std::string_view line);
     drd_Mesh& CurrentMesh();
     void AddPlace(std::vector<drd_PlaceRun>& runs, std::uint64_t record, drd_Place place);
@@ -86,7 +91,11 @@ private:
     int nodesOfType_ = 0;
     drd_TextMap typeIndex_;
     drd_TextMap ownerIndex_;
+    drd_TextMap spellings_; // index of folded_
+    std::vector<drd_Word> folded_;
     std::vector<std::string_view> fields_;
+    std::vector<drd_Parameter> parameters_; // of the keyword that is being read
+    std::vector<drd_Word> members_;         // of the set that is being read
     bool toldDataBeforeKeyword_ = false;
 };
 

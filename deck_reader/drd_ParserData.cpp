@@ -118,9 +118,9 @@ void drd_Parser::AddOwnSet(drd_KindEnm kind, std::string_view parameter) {
     part.kind = kind;
     part.keyword = static_cast<int>(deck_.keywords.size()) - 1;
     part.block = keyword.block;
-    part.name = drd_NameOf(keyword.Value(parameter));
+    part.name = NameOf(keyword.Value(parameter));
     part.first = deck_.labels.Size();
-    deck_.setParts.push_back(std::move(part));
+    deck_.setParts.push_back(part);
 }
 
 void drd_Parser::BeginElements() {
@@ -231,27 +231,29 @@ void drd_Parser::BeginSet(drd_KindEnm kind) {
     part.kind = kind;
     part.keyword = static_cast<int>(deck_.keywords.size()) - 1;
     part.block = keyword.block;
-    part.name = drd_NameOf(keyword.Value(kind == drd_KindEnm::NODE_SET ? "nset" : "elset"));
-    part.instance = drd_NameOf(keyword.Value("instance"));
+    part.name = NameOf(keyword.Value(kind == drd_KindEnm::NODE_SET ? "nset" : "elset"));
+    part.instance = NameOf(keyword.Value("instance"));
     part.isGenerated = keyword.Find("generate") != nullptr;
     part.first = deck_.labels.Size();
-    deck_.setParts.push_back(std::move(part));
+    deck_.setParts.push_back(part);
     bulk_ = &drd_Parser::SetLines;
 }
 
 void drd_Parser::SetLines(std::string_view line) {
     drd_SetPart& part = deck_.setParts.back();
+    members_.clear();
     do {
         if (part.isGenerated) {
             GeneratedLine(line);
         } else {
-            SetLine(part, line);
+            SetLine(line);
         }
     } while (NextDataLine(line));
     part.count = deck_.labels.Size() - part.first;
+    part.members = deck_.texts.Keep(members_);
 }
 
-void drd_Parser::SetLine(drd_SetPart& part, std::string_view line) {
+void drd_Parser::SetLine(std::string_view line) {
     const char* at = line.data();
     int label = 0;
     while (at != nullptr) {
@@ -266,7 +268,7 @@ void drd_Parser::SetLine(drd_SetPart& part, std::string_view line) {
             if (std::count(member.begin(), member.end(), '"') % 2 != 0) {
                 findings_.Add("quote-left-open", Here(), drd_Shown(member), "a second double quote");
             }
-            part.members.emplace_back(member);
+            members_.push_back(deck_.texts.Keep(member));
         }
     }
 }

@@ -46,9 +46,10 @@ std::string EndWord(drd_BlockEnm kind) {
 
 } // namespace
 
-std::string drd_Parser::Continued(std::string_view line, std::string& asItStands) {
+std::string_view drd_Parser::Header(std::string_view line, std::string_view& asItStands) {
+    if (!EndsWithComma(line) && line.size() <= drd_BreakLimit) return asItStands = deck_.texts.Keep(line);
     std::string header(line);
-    asItStands = header;
+    std::string whole = header;
     std::size_t lastBytes = line.size();
     std::string_view next;
     for (bool goesOn = EndsWithComma(line); goesOn || lastBytes > drd_BreakLimit;
@@ -74,10 +75,24 @@ std::string drd_Parser::Continued(std::string_view line, std::string& asItStands
             findings_.Add("comma-ahead", Here(), drd_Shown(next), "the comma at the end of the line before");
         }
         header.append(next);
-        asItStands.append("\n").append(next);
+        whole.append("\n").append(next);
         lastBytes = next.size();
     }
-    return header;
+    asItStands = deck_.texts.Keep(whole);
+    return header.size() == whole.size() ? asItStands : deck_.texts.Keep(header);
+}
+
+drd_Word drd_Parser::Folded(drd_Word word) {
+    const auto isFolded = [](char c) { return !drd_IsBlank(c) && c == drd_LowerCase(c); };
+    if (std::all_of(word.begin(), word.end(), isFolded)) return word;
+    const auto [place, isNew] = spellings_.TryEmplace(word, static_cast<int>(folded_.size()));
+    if (isNew) folded_.push_back(deck_.texts.Keep(drd_FoldKey(word)));
+    return folded_[static_cast<std::size_t>(place)];
+}
+
+drd_Word drd_Parser::NameOf(std::string_view value) {
+    const std::string_view name = drd_Trim(value);
+    return name.find('"') == std::string_view::npos ? drd_Word(name) : deck_.texts.Keep(drd_NameOf(name));
 }
 
 bool drd_Parser::ParseHeader(std::string_view header, drd_Keyword& keyword) {
@@ -88,36 +103,38 @@ bool drd_Parser::ParseHeader(std::string_view header, drd_Keyword& keyword) {
         findings_.Add("keyword-without-name", keyword.place, drd_Shown(header), "a keyword behind the *");
         return false;
     }
-    keyword.name.assign(fields_[0]);
-    keyword.key = drd_FoldKey(fields_[0]);
+    keyword.name = fields_[0];
+    keyword.key = Folded(fields_[0]);
     keyword.row = drd_FindKeyword(keyword.key);
-    keyword.parameters.reserve(fields_.size() - 1);
+    parameters_.clear();
     for (std::size_t i = 1; i < fields_.size(); ++i) {
         const std::string_view field = fields_[i];
         if (field.empty()) continue;
         const std::size_t equals = drd_FindOutsideQuotes(field, '=');
         drd_Parameter parameter;
-        parameter.name.assign(drd_Trim(field.substr(0, equals)));
-        parameter.key = drd_FoldKey(parameter.name);
+        parameter.name = drd_Trim(field.substr(0, equals));
+        parameter.key = Folded(parameter.name);
         if (parameter.key.empty()) {
             findings_.Add("parameter-without-name", keyword.place, drd_Shown(field), "NAME=value");
         }
         parameter.hasValue = equals != std::string_view::npos;
-        if (parameter.hasValue) parameter.value.assign(drd_Trim(field.substr(equals + 1)));
-        keyword.parameters.push_back(std::move(parameter));
+        if (parameter.hasValue) parameter.value = drd_Trim(field.substr(equals + 1));
+        parameters_.push_back(parameter);
     }
+    keyword.parameters = deck_.texts.Keep(parameters_);
     return true;
 }
 
 void drd_Parser::Keyword(std::string_view line) {
     drd_Keyword keyword;
     keyword.place = Here();
-    std::string asItStands;
-    const std::string header = Continued(line, asItStands);
+    std::string_view asItStands;
+    const std::string_view header = Header(line, asItStands);
     if (!ParseHeader(header, keyword)) return;
     if (keyword.key == "include" && options_.followIncludes && Include(keyword)) return;
-    keyword.header = Keep(asItStands, keyword.place);
-    AddKeyword(std::move(keyword));
+    keyword.header = {asItStands.data(), static_cast<std::uint32_t>(asItStands.size()), keyword.place.file,
+                      keyword.place.line};
+    AddKeyword(keyword);
 }
 
 /// True when the include is done with: its lines come next.
@@ -133,14 +150,17 @@ bool drd_Parser::Include(const drd_Keyword& keyword) {
     return true;
 }
 
-void drd_Parser::AddKeyword(drd_Keyword keyword) {
+void drd_Parser::AddKeyword(drd_Keyword& keyword) {
     bulk_ = nullptr;
     keyword.firstLine = deck_.lines.Size();
     keyword.end = static_cast<int>(deck_.keywords.size()) + 1;
     PlaceInBlock(keyword);
     FindOwner(keyword);
-    deck_.keywords.push_back(std::move(keyword));
-    const std::string& key = Last().key;
+    if (keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE) {
+        deck_.definitions.Add(static_cast<int>(deck_.keywords.size()));
+    }
+    deck_.keywords.push_back(keyword);
+    const drd_Word key = keyword.key;
     if (key == "node") {
         BeginNodes();
     } else if (key == "element") {
@@ -181,11 +201,11 @@ void drd_Parser::OpenBlock(drd_BlockEnm kind, const drd_Keyword& keyword) {
     }
     drd_Block block;
     block.kind = kind;
-    block.name = drd_NameOf(keyword.Value("name"));
+    block.name = NameOf(keyword.Value("name"));
     block.parent = blockStack_.back();
     block.begin = static_cast<int>(deck_.keywords.size());
     blockStack_.push_back(static_cast<int>(deck_.blocks.size()));
-    deck_.blocks.push_back(std::move(block));
+    deck_.blocks.push_back(block);
 }
 
 void drd_Parser::CloseBlock(drd_BlockEnm kind, const drd_Keyword& keyword) {

@@ -1,9 +1,10 @@
 #ifndef QRX_DECK_READER_DRD_TEXTMAP_H
 #define QRX_DECK_READER_DRD_TEXTMAP_H
 
+#include "deck_reader/drd_Texts.h"
+
 #include <cstddef>
 #include <cstdint>
-#include <string>
 #include <string_view>
 #include <utility>
 #include <vector>
@@ -12,18 +13,22 @@
 /// two or three places instead of the nodes of a std::unordered_map.
 class drd_TextMap {
 public:
-    /// The number under the text and true where it is new; else the one that stands there.
-    std::pair<int&, bool> TryEmplace(std::string_view text, int number);
+    /// The number under the text and true where it is new; else the one that stands there. Each scope has
+    /// texts of its own.
+    std::pair<int&, bool> TryEmplace(std::string_view text, int number, std::uint64_t scope = 0);
     /// Null when there is none.
-    const int* Find(std::string_view text) const;
+    const int* Find(std::string_view text, std::uint64_t scope = 0) const;
     int NumberOr(std::string_view text, int otherwise) const {
         const int* found = Find(text);
         return found == nullptr ? otherwise : *found;
     }
+    /// Makes room for so many texts.
+    void Reserve(std::size_t count);
 
 private:
     struct Entry {
-        std::uint64_t begin;
+        std::uint64_t scope;
+        const char* text;
         std::uint32_t length;
         int number;
     };
@@ -34,12 +39,12 @@ private:
     };
 
     /// The slot that has the text, or the free one where it would stand.
-    std::size_t SlotOf(std::string_view text, std::uint32_t hash) const;
-    void Grow();
+    std::size_t SlotOf(std::string_view text, std::uint64_t scope, std::uint32_t hash) const;
+    void Grow(std::size_t slots);
 
     std::vector<Slot> slots_; // a power of two, at most half of them taken
     std::vector<Entry> entries_;
-    std::string texts_;
+    drd_Texts texts_;
 };
 
 /// Things that wait under a text for a partner; the first that came goes first.

@@ -110,7 +110,7 @@ protected:
     }
     /// The banner ahead of a step's keywords of one kind, which is no object's own.
     void AddStepBanner(const cow_String& stepName, const qkw_KeywordHandle& banner) {
-        StepList(stepName, {}).Append(banner);
+        if (!banner.ConstGet().IsEmpty()) StepList(stepName, {}).Append(banner);
     }
     void AddAtomOptionDefinition(const qkw_Keyword& keyword) { atomOptionDefinitions_.Append(keyword); }
     void AddSingleTermDefinition(const qkw_Keyword& keyword) { singleTermDefinitions_.Append(keyword); }

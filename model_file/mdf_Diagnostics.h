@@ -22,6 +22,7 @@ public:
     const mdf_Report& Report() const { return *report_; }
     const std::string& FileName() const { return report_->fileName; }
     void SetUnreadable() { report_->unreadable = true; }
+    void NoteMeshFile(const std::string& file) { report_->variantMeshFiles.push_back(file); }
     mdf_MeshOrigin& AddMeshOrigin() { return report_->meshOrigins.emplace_back(); }
 
 private:

@@ -23,6 +23,7 @@ cow_CountedHld<odiK_Mesh> mdf_MeshReader::ReadMesh(mdf_Value& json, const fnd_Pa
         return given_[static_cast<std::size_t>(json.Int())];
     if (shelf_ == nullptr) return ReadNewMesh(json, path);
     const mdf_MeshShelf::Key key = shelf_->KeyOf(json, path, diagnostics_.FileName());
+    if (mdf_MeshShelf::IsOfFile(key)) diagnostics_.NoteMeshFile(json.Find("file")->String());
     if (const std::shared_ptr<const mdf_MeshShelf::Entry> known = shelf_->Find(key)) {
         for (const fnd_Finding& finding : known->findings) diagnostics_.Take(finding);
         return known->mesh;

@@ -4,7 +4,6 @@
 #include "platform/plt_Files.h"
 
 #include <algorithm>
-#include <filesystem>
 
 namespace {
 
@@ -22,8 +21,9 @@ std::size_t BytesOf(const odiK_Mesh& mesh) {
     return bytes;
 }
 
-/// Size and time of change: a file that was written anew is another one.
-std::string StateOf(const std::filesystem::path& file) {
+} // namespace
+
+std::string mdf_MeshShelf::StateOf(const std::filesystem::path& file) {
     std::error_code error;
     const auto bytes = std::filesystem::file_size(file, error);
     if (error) return {};
@@ -32,12 +32,6 @@ std::string StateOf(const std::filesystem::path& file) {
     return std::to_string(bytes) + "\n" +
            std::to_string(static_cast<long long>(time.time_since_epoch().count()));
 }
-
-bool IsOfFile(const mdf_MeshShelf::Key& key) {
-    return key.find('\n') != std::string::npos;
-}
-
-} // namespace
 
 mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& path,
                                         const std::string& modelFile) const {

@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/odiK_Mesh.h"
 
+#include <filesystem>
 #include <list>
 #include <map>
 #include <memory>
@@ -24,6 +25,10 @@ public:
     };
     /// Empty for a mesh that is read anew each time.
     using Key = std::string;
+    static bool IsOfFile(const Key& key) { return key.find('\n') != std::string::npos; }
+    /// Size and time of change of a file, empty where there is none: one that was written anew is another
+    /// one.
+    static std::string StateOf(const std::filesystem::path& file);
 
     /// With nothing on it.
     mdf_MeshShelf() : kept_(std::make_shared<Kept>()) {}

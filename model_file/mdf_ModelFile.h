@@ -63,6 +63,8 @@ struct mdf_Report {
     /// The file, or one that it names, could not be read; a finding says why.
     bool unreadable = false;
     std::list<mdf_MeshOrigin> meshOrigins;
+    /// Mesher's files of a variant that are not the template's, or read otherwise, as the variant names them.
+    std::vector<std::string> variantMeshFiles;
     /// The file, for Locate().
     std::shared_ptr<const mdf_FileText> text;
     std::vector<mdf_Parameter> parameters;

@@ -9,4 +9,4 @@ trap 'rm -rf "$scratch"' EXIT
 
 "$qrxdeck" view "$root/examples/bracket/bracket.json" -o "$scratch/bracket.html"
 node "$root/viewer/picture.mjs" "$scratch/bracket.html" "$root/docs/view.png" 1280x760
-node "$root/viewer/test/browser.mjs" "$qrxdeck" "$root" --pictures "pictures of all examples"
+node "$root/viewer/test/browser.mjs" "$qrxdeck" "$root" --pictures "the pictures of all examples"

@@ -14,6 +14,7 @@ constexpr std::string_view kRow = "{\"row\": ";
 constexpr std::string_view kDeck = ", \"deck\": \"";
 constexpr std::string_view kBytes = "\", \"bytes\": ";
 constexpr std::string_view kSum = ", \"sha256\": \"";
+constexpr std::string_view kMeshes = ", \"meshes\": ";
 constexpr std::string_view kError = ", \"error\": [";
 constexpr std::string_view kText = "\"text\": ";
 
@@ -47,6 +48,29 @@ void AppendErrors(std::string& json, const std::vector<sty_RowError>& errors) {
         json += '}';
     }
     json += ']';
+}
+
+void AppendMeshes(std::string& json, const std::vector<std::pair<std::string, std::string>>& meshes) {
+    if (meshes.empty()) return;
+    json += kMeshes;
+    const char* before = "[{\"file\": ";
+    for (const auto& [file, sum] : meshes) {
+        json += before;
+        sty_AppendQuoted(json, file);
+        json.append(kSum).append(sum).append("\"}");
+        before = ", {\"file\": ";
+    }
+    json += ']';
+}
+
+/// The meshes that a line goes on with, empty where it names none.
+std::string_view TakeMeshes(std::string_view line) {
+    if (!TakeWord(line, kMeshes)) return {};
+    // Within a name a quote has a backslash before it, and a sum ends in none.
+    constexpr std::string_view kEnd = "\"}]";
+    std::size_t end = line.find(kEnd);
+    while (end != std::string_view::npos && line[end - 1] == '\\') end = line.find(kEnd, end + 1);
+    return end == std::string_view::npos ? std::string_view() : line.substr(0, end + kEnd.size());
 }
 
 void AppendFindings(std::string& json, const std::vector<fnd_Finding>& findings) {
@@ -83,6 +107,7 @@ std::string sty_LineOf(const sty_Result& result) {
         json.append(kDeck).append(result.deck);
         json.append(kBytes).append(std::to_string(result.bytes));
         json.append(kSum).append(result.sha256).append("\"");
+        AppendMeshes(json, result.meshes);
     } else {
         AppendErrors(json, result.errors);
     }
@@ -106,6 +131,8 @@ std::optional<sty_Entry> sty_EntryOf(std::string_view line) {
     if (entry.deck.empty() || !TakeWord(line, kBytes) || !TakeNumber(line, entry.bytes) ||
         !TakeWord(line, kSum))
         return std::nullopt;
+    line.remove_prefix(std::min(line.find('"'), line.size()));
+    if (TakeWord(line, "\"")) entry.meshes = TakeMeshes(line);
     return entry;
 }
 
@@ -159,10 +186,10 @@ bool sty_Ledger::Exists() const {
     return folder_.SizeOf(name_) >= 0;
 }
 
-long long sty_Ledger::TakeUp(sty_DoneRows& done) {
+long long sty_Ledger::TakeUp(sty_DoneRows& done, const std::function<void(const sty_Entry& entry)>& look) {
     bool clean = true;
     long long count = 0;
-    const auto walk = [&](const std::function<void(std::string_view line)>& take) {
+    const auto walk = [&](const std::function<void(std::string_view line, const sty_Entry& entry)>& take) {
         sty_DoneRows seen = done;
         count = 0;
         const std::size_t cutOff = sty_ForEachLine(Path(), [&](std::string_view line, long long) {
@@ -174,19 +201,19 @@ long long sty_Ledger::TakeUp(sty_DoneRows& done) {
             if (!good) return;
             seen.Add(entry->row);
             ++count;
-            take(line);
+            take(line, *entry);
         });
         clean = clean && cutOff == 0;
         return seen;
     };
-    sty_DoneRows seen = walk([](std::string_view) {});
+    sty_DoneRows seen = walk([&](std::string_view, const sty_Entry& entry) { look(entry); });
     if (!clean) {
         // The lines that stay, as a new file.
         folder_.Write(
             name_,
             [&](int file) {
                 sty_LineWriter writer(file);
-                walk([&](std::string_view line) { writer.Add(line); });
+                walk([&](std::string_view line, const sty_Entry&) { writer.Add(line); });
                 return writer.End();
             },
             true);

@@ -24,6 +24,8 @@ struct sty_Result {
     std::string deck;
     long long bytes = 0;
     std::string sha256;
+    /// Mesher's files that the row's values lead to, each with its SHA-256.
+    std::vector<std::pair<std::string, std::string>> meshes;
     double seconds = 0.0;
     /// An object, as JSON text.
     std::string parameters;
@@ -44,6 +46,7 @@ struct sty_Entry {
     long long row = 0;
     std::string_view deck; ///< empty when the row failed
     long long bytes = 0;
+    std::string_view meshes; ///< JSON, empty where the row names none
 };
 /// Nothing for a line that is none, such as one that was cut off.
 std::optional<sty_Entry> sty_EntryOf(std::string_view line);
@@ -82,8 +85,9 @@ public:
     sty_Ledger(sty_Folder& folder, std::string name) : folder_(folder), name_(std::move(name)) {}
     bool Exists() const;
     /// Takes up what earlier runs left: rows with decks that are there are done. Lines that were cut off, of
-    /// rows that failed or whose decks are gone, are taken out. Gives the number of rows that are done.
-    long long TakeUp(sty_DoneRows& done);
+    /// rows that failed or whose decks are gone, are taken out. Gives the number of rows that are done;
+    /// `look` sees each of them.
+    long long TakeUp(sty_DoneRows& done, const std::function<void(const sty_Entry& entry)>& look);
     void Open();
     /// Appends the line as one piece. Raises sty_Refused, and then leaves the ledger as it was.
     void Append(const std::string& line);

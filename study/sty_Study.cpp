@@ -5,6 +5,7 @@
 #include "store_interface/findings/fnd_Text.h"
 #include "store_interface/model/odiK_IgnoreList.h"
 #include "study/sty_Identity.h"
+#include "study/sty_MeshSums.h"
 #include "study/sty_Variants.h"
 
 #include <algorithm>
@@ -37,32 +38,47 @@ private:
     bool refused_;
 };
 
-/// The rows that are left, in order, for several threads.
+/// The rows that are left, in order, for several threads. A thread takes neighbours, of one folder: two that
+/// make files in one folder wait for each other. Towards the end it takes fewer, so that all end together.
 class RowQueue {
 public:
-    RowQueue(const sty_Table& table, sty_Rows rows, const sty_DoneRows& done)
-        : reader_(table), rows_(rows), done_(done) {}
+    RowQueue(const sty_Table& table, sty_Rows rows, const sty_DoneRows& done, long long left, int threads)
+        : reader_(table), rows_(rows), done_(done), left_(left), threads_(threads) {}
 
-    bool Next(sty_RawRow& raw) {
+    /// The next rows in the place of these; none when there are no more.
+    void Next(std::vector<sty_RawRow>& taken) {
         const std::lock_guard<std::mutex> lock(mutex_);
-        while (reader_.Next(raw)) {
-            if (raw.number > rows_.last) return false;
-            if (raw.number >= rows_.first && !done_.Has(raw.number)) return true;
+        const auto most = static_cast<std::size_t>(std::max(left_ / (4LL * threads_), 1LL));
+        std::size_t count = 0;
+        for (std::size_t bytes = 0; count < most && bytes < kMostBytes;) {
+            if (count == taken.size()) taken.emplace_back();
+            sty_RawRow& raw = taken[count];
+            if (!reader_.Next(raw) || raw.number > rows_.last) break;
+            if (raw.number < rows_.first || done_.Has(raw.number)) continue;
+            ++count;
+            bytes += raw.text.size();
+            if (raw.number % sty_Layout::kMostEntries == 0) break;
         }
-        return false;
+        taken.resize(count);
+        left_ -= static_cast<long long>(count);
     }
 
 private:
+    static constexpr std::size_t kMostBytes = std::size_t{1} << 20;
+
     std::mutex mutex_;
     sty_TableReader reader_;
     sty_Rows rows_;
     const sty_DoneRows& done_;
+    long long left_;
+    int threads_;
 };
 
 /// One run of a study.
 class Run {
 public:
-    Run(const sty_Request& request, sty_Observer& observer) : request_(request), observer_(observer) {}
+    Run(const sty_Request& request, sty_Observer& observer)
+        : request_(request), observer_(observer), rowMeshes_(request.model) {}
 
     sty_Outcome Do() {
         const Clock::time_point start = Clock::now();
@@ -72,9 +88,6 @@ public:
         TellBaseline(*first);
         RunRows(std::move(first), start);
         outcome_.counts.seconds = SecondsSince(start);
-        std::ranges::sort(outcome_.failures, {}, &sty_Failure::row);
-        if (outcome_.failures.size() > sty_Outcome::kMostFailures)
-            outcome_.failures.resize(sty_Outcome::kMostFailures);
         return std::move(outcome_);
     }
 
@@ -154,7 +167,7 @@ private:
         if (ledger_->Exists() && !request_.resume)
             throw Unusable(request_.out, NameOfShard() + " was begun already: --resume goes on with it");
         if (ledger_->Exists()) RemoveUnplaced();
-        ledger_->TakeUp(*done_);
+        ledger_->TakeUp(*done_, [this](const sty_Entry& entry) { CheckMeshes(entry); });
         TakeUpOthers();
         for (long long row = rows_.first; row <= rows_.last; ++row)
             outcome_.counts.earlier += done_->Has(row);
@@ -188,8 +201,17 @@ private:
         if (!held) throw Unusable(place, "found a file that tells of no study");
         const std::string difference = identity_.DifferenceFrom(*held);
         if (difference.empty()) return;
-        throw Unusable(request_.out, "found another study: " + difference +
-                                         "; give it a folder of its own, or remove this one");
+        throw Unusable(request_.out, AnotherStudy(difference));
+    }
+
+    /// Rows that are done must not have got their decks from other meshes than those that are there now.
+    void CheckMeshes(const sty_Entry& entry) {
+        const std::string problem = rowMeshes_.ProblemOf(entry);
+        if (!problem.empty()) throw Unusable(request_.out, AnotherStudy(problem));
+    }
+
+    static std::string AnotherStudy(const std::string& difference) {
+        return "found another study: " + difference + "; give it a folder of its own, or remove this one";
     }
 
     /// Rows that were done under another division into shards. Shards of this one have rows of their own.
@@ -205,7 +227,9 @@ private:
                 const std::optional<sty_Entry> found = sty_EntryOf(line);
                 if (!found || found->deck.empty() || !done_->IsRow(found->row) || done_->Has(found->row))
                     return;
-                if (folder_->SizeOf(std::string(found->deck)) == found->bytes) done_->Add(found->row);
+                if (folder_->SizeOf(std::string(found->deck)) != found->bytes) return;
+                CheckMeshes(*found);
+                done_->Add(found->row);
             });
         }
     }
@@ -227,11 +251,11 @@ private:
     }
 
     void RunRows(std::unique_ptr<sty_Variants> first, Clock::time_point start) {
-        RowQueue queue(*table_, rows_, *done_);
         const long long left = outcome_.counts.rows - outcome_.counts.earlier;
         const int wanted =
             request_.jobs > 0 ? request_.jobs : static_cast<int>(std::thread::hardware_concurrency());
         const int jobs = static_cast<int>(std::clamp<long long>(wanted, 1, std::max(left, 1LL)));
+        RowQueue queue(*table_, rows_, *done_, left, jobs);
         std::vector<std::unique_ptr<sty_Variants>> variants;
         variants.push_back(std::move(first));
         for (int job = 1; job < jobs; ++job) {
@@ -275,19 +299,34 @@ private:
             if (folder_ != nullptr) {
                 placer = std::make_unique<sty_Placer>(*folder_, PlacerName() + std::to_string(job));
             }
-            sty_RawRow raw;
-            while (!stop_ && queue.Next(raw)) {
-                const Clock::time_point start = Clock::now();
-                sty_Result result = variants.Make(table_->Parse(raw), *columns_);
-                if (result.IsDone()) Write(variants.Text(), placer.get(), result);
-                result.seconds = SecondsSince(start);
-                if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
-                Count(result);
+            std::vector<sty_RawRow> rows;
+            for (queue.Next(rows); !rows.empty() && !stop_; queue.Next(rows)) {
+                for (const sty_RawRow& raw : rows) {
+                    if (!stop_) DoRow(raw, variants, placer.get());
+                }
             }
         } catch (const sty_TableError& error) {
             Fail(std::make_exception_ptr(Unusable(request_.table, error.what(), true)));
         } catch (...) {
             Fail(std::current_exception());
+        }
+    }
+
+    void DoRow(const sty_RawRow& raw, sty_Variants& variants, sty_Placer* placer) {
+        const Clock::time_point start = Clock::now();
+        sty_Result result = variants.Make(table_->Parse(raw), *columns_);
+        if (result.IsDone() && ledger_ != nullptr) SumUpMeshes(result);
+        if (result.IsDone()) Write(variants.Text(), placer, result);
+        result.seconds = SecondsSince(start);
+        if (ledger_ != nullptr) ledger_->Append(sty_LineOf(result));
+        Count(result);
+    }
+
+    void SumUpMeshes(sty_Result& result) {
+        for (auto& [file, sum] : result.meshes) {
+            std::string problem;
+            sum = rowMeshes_.Use(file, result.row, problem);
+            if (!problem.empty()) result.errors.push_back({{}, {}, std::move(problem)});
         }
     }
 
@@ -320,10 +359,13 @@ private:
             return;
         }
         ++outcome_.counts.failed;
-        // Threads are hardly ever more rows apart.
-        constexpr std::size_t kept = 10 * sty_Outcome::kMostFailures;
-        if (outcome_.failures.size() < kept)
-            outcome_.failures.push_back({result.row, result.name, result.Reason()});
+        // The first ones by row, whenever they come.
+        std::vector<sty_Failure>& failures = outcome_.failures;
+        const bool isFull = failures.size() >= sty_Outcome::kMostFailures;
+        if (isFull && failures.back().row < result.row) return;
+        if (isFull) failures.pop_back();
+        const auto place = std::ranges::upper_bound(failures, result.row, {}, &sty_Failure::row);
+        failures.insert(place, {result.row, result.name, result.Reason()});
     }
 
     void Fail(std::exception_ptr failure) {
@@ -342,6 +384,7 @@ private:
     std::vector<fnd_Finding> baseline_;
     odiK_IgnoreList ignored_;
     sty_MeshTexts meshes_;
+    sty_MeshSums rowMeshes_;
     sty_Layout layout_;
     sty_Rows rows_;
     std::unique_ptr<sty_DoneRows> done_;

@@ -236,6 +236,8 @@ sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
     std::erase_if(findings, [&](const fnd_Finding& finding) { return leftOut_.contains(KeyOf(finding)); });
     result.findings = std::move(findings);
     if (!result.IsDone()) return result;
+    for (std::string& file : report.variantMeshFiles)
+        result.meshes.emplace_back(std::move(file), std::string());
     result.bytes = text_.Bytes();
     return result;
 }

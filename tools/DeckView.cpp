@@ -329,6 +329,9 @@ private:
     std::size_t Say(const ShownKeyword& shown, const std::string& target, Said what, bool isPerturbation) {
         const auto [found, isNew] = places_.try_emplace({shown.key, drd_FoldCase(target)}, objects_.size());
         if (isNew) objects_.push_back({&shown, false, ObjectText(shown, target)});
+        // Of distributed loads gravity alone says which way it acts.
+        if (isNew && shown.key == "dload" && what.state.contains("components"))
+            objects_.back().text["mark"] = "gravity";
         Object& object = objects_[found->second];
         ordered_json& steps = object.text["steps"];
         const bool again = steps.size() > step_;
@@ -369,12 +372,13 @@ private:
                              {"cards", ordered_json::array()},
                              {"steps", ordered_json::array()}};
         std::size_t begin = 0;
-        const bool isPair =
-            std::string_view(shown.mark) == "pair" || std::string_view(shown.mark) == "couple";
+        const bool isPair = std::string_view(shown.mark) == "pair";
         while (begin <= target.size()) {
             const std::size_t end = std::min(target.find(", ", begin), target.size());
-            const char* roles[] = {isPair ? "slave" : "region", "master"};
-            AddRegion(text, std::string_view(target).substr(begin, end - begin), roles[begin == 0 ? 0 : 1]);
+            const bool isFirst = begin == 0;
+            const char* role = isFirst ? "region" : "refNode";
+            if (isPair) role = isFirst ? "slave" : "master";
+            AddRegion(text, std::string_view(target).substr(begin, end - begin), role);
             begin = end + 2;
         }
         for (std::size_t i = 0; i < step_; ++i)
@@ -411,12 +415,26 @@ private:
             Said& said = sayOf(target);
             said.text.append(line).append("\n");
             AddValues(keyword.key, line, said.state);
+            AddField(line, mark == "pair" ? 2 : 1, said.state);
         }
         return all;
     }
     void AddLines(const drd_Keyword& keyword, std::string& text) const {
         for (std::uint64_t i = 0; i < keyword.lines; ++i)
             text.append(deck_.DataLine(keyword, i)).append("\n");
+    }
+    /// The line behind its sets, as the value of a field.
+    static void AddField(std::string_view line, int first, ordered_json& state) {
+        constexpr std::size_t most = 6;
+        std::string values;
+        const auto fields = static_cast<int>(std::ranges::count(line, ',')) + 1;
+        for (int i = first; i < fields; ++i) {
+            const std::string_view field = drd_Field(line, i);
+            if (!field.empty()) values.append(values.empty() ? "" : ", ").append(field);
+        }
+        if (values.empty() || state["fields"].size() >= most) return;
+        state["fields"].push_back(
+            {{"name", "data"}, {"value", values}, {"doc", "what the line says of the set"}});
     }
     /// The surface and the reference node of a coupling, the elements and the node of a rigid body.
     static std::string CoupleOf(const drd_Keyword& keyword) {
@@ -430,7 +448,15 @@ private:
     static void AddValues(std::string_view key, std::string_view line, ordered_json& state) {
         if (key == "boundary") return AddHeld(line, state);
         double value = 0.0;
-        if (key == "cload") {
+        if (key == "dload" && drd_FoldKey(drd_Field(line, 1)) == "grav") {
+            if (!drd_ReadReal(drd_Field(line, 2), value)) return;
+            state["components"] = ordered_json::array();
+            for (int i = 3; i < 6; ++i) {
+                double direction = 0.0;
+                drd_ReadReal(drd_Field(line, i), direction);
+                state["components"].push_back(value * direction);
+            }
+        } else if (key == "cload") {
             int dof = 0;
             if (!drd_ReadInt(drd_Field(line, 1), dof) || !drd_ReadReal(drd_Field(line, 2), value)) return;
             if (dof < 1 || dof > 3) return;

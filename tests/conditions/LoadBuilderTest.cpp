@@ -271,3 +271,21 @@ TEST(LoadBuilder, ManyLoadsOverManySteps_TakeTimeThatGrowsWithThem) {
     const double few = seconds(500) + 1e-3;
     EXPECT_LT(seconds(2000), 40 * few);
 }
+
+// A goes on while the others end, so that it is said again.
+TEST(LoadBuilder, StepsThatSayALoadAgain_ShareItsKeyword) {
+    ConditionModel model = Loads(
+        "IGGGG", Force("A", "N", R"("S1": {"component1": 1}, "S4": {"component1": 2})") + ", " +
+                     Force("B", "N2", R"("S1": {"component1": 1}, "S2": {"deactivated": true})") + ", " +
+                     Force("C", "N3", R"("S1": {"component1": 1}, "S3": {"deactivated": true})"));
+    oif_LoadBuilder builder(model.Info());
+    builder.Build();
+    // The banner, then the comment and the keyword of A.
+    const auto keyword = [&](const char* step) {
+        return static_cast<qkw_BuilderComponent&>(builder).StepDefinition(step)[2];
+    };
+    EXPECT_EQ(Written(keyword("S2").ConstGet()), "*Cload, op=NEW\nA.N, 1, 1.\n");
+    EXPECT_EQ(keyword("S2"), keyword("S3"));
+    EXPECT_EQ(Written(keyword("S1").ConstGet()), "*Cload\nA.N, 1, 1.\n");
+    EXPECT_EQ(Written(keyword("S4").ConstGet()), "*Cload\nA.N, 1, 2.\n");
+}

@@ -107,7 +107,7 @@ TEST(Reader, Sets_KeepLabelsRangesAndNames) {
     const drd_SetPart& c = read.deck.setParts[2];
     EXPECT_EQ(c.name, "C d");
     EXPECT_EQ(c.instance, "I-1");
-    EXPECT_EQ(c.members, Strings({"A", "\"x, y\"", "I.5"}));
+    EXPECT_EQ(Strings(c.members.begin(), c.members.end()), Strings({"A", "\"x, y\"", "I.5"}));
 }
 
 TEST(Reader, Blocks_NestAndEnd) {

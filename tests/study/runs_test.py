@@ -5,6 +5,7 @@ usage: runs_test.py PROGRAM [unittest options]
 """
 
 import copy
+import hashlib
 import json
 import os
 import pty
@@ -227,6 +228,61 @@ class Runs(StudyTest):
             run = self.study("template.json", "table.csv", "--out", "out", "--model", "B b", "--emit", scheduler,
                              "--shards", 2)
             self.assertIn(words, run.stdout)
+
+    def write_plates(self, names):
+        """A template with a mesh file, and a table whose rows name others; each has a description of its own."""
+        mesh = (studies.ROOT / "examples/perforated_plate/plate.unv").read_bytes()
+        source = (studies.ROOT / "examples/perforated_plate/perforated_plate.json").read_text()
+        (self.folder / "models").mkdir()
+        (self.folder / "models/template.json").write_text(source)
+        for name in {"plate.unv", *names}:
+            (self.folder / "models" / name).write_bytes(mesh)
+        self.write_csv([MODEL_POINTER + "/parts/PLATE/mesh/file"], [[name] for name in names])
+        return "models/template.json", "table.csv"
+
+    def test_ChangedMeshThatOnlyRowsName_IsNoticed(self):
+        study = self.write_plates(["plate.unv", "b.unv", "c.unv", "b.unv"])
+        self.study(*study, "--out", "out")
+        lines = self.ledger("out")
+        digest = hashlib.sha256((self.folder / "models/b.unv").read_bytes()).hexdigest()
+        self.assertEqual(lines[4]["meshes"], [{"file": "b.unv", "sha256": digest}])
+        before = self.snapshot("out"), (self.folder / "out/study.jsonl").read_bytes()
+        self.study(*study, "--out", "out", "--resume")
+        held = (self.folder / "models/b.unv").read_bytes()
+        (self.folder / "models/b.unv").write_bytes(held + b" \n")
+        for options in ([], ["--shard", "1/2"]):
+            run = self.study(*study, "--out", "out", "--resume", *options, code=2)
+            self.assertRegex(run.stderr, "the mesh file 'models/b.unv' has changed since row [24] was written")
+        (self.folder / "models/b.unv").unlink()
+        run = self.study(*study, "--out", "out", "--resume", code=2)
+        self.assertIn("the mesh file 'models/b.unv' has changed since", run.stderr)
+        # Of the same content it is the same, wherever it comes from.
+        (self.folder / "models/b.unv").write_bytes(held)
+        self.study(*study, "--out", "out", "--resume")
+        self.assertEqual((self.snapshot("out"), (self.folder / "out/study.jsonl").read_bytes()), before)
+
+    def test_MeshOfRowThatFailed_MayBeMended(self):
+        study = self.write_plates(["b.unv", "c.unv"])
+        (self.folder / "models/c.unv").write_bytes(b"no mesh")
+        self.study(*study, "--out", "out", code=1)
+        self.assertNotIn("meshes", self.ledger("out")[2])
+        shutil.copy(self.folder / "models/b.unv", self.folder / "models/c.unv")
+        self.study(*study, "--out", "out", "--resume")
+        self.assertEqual(len(self.decks_in("out")), 2)
+
+    def test_MeshThatChangesWhileRowsAreWritten_FailsTheOthers(self):
+        study = self.write_plates(["b.unv"] * 2000)
+        process = self.start(*study, "--out", "out", "--jobs", 1)
+        self.wait_for_lines(self.folder / "out/study.jsonl", 20)
+        mesh = self.folder / "models/b.unv"
+        process.send_signal(signal.SIGSTOP)
+        mesh.write_bytes(mesh.read_bytes() + b" \n")
+        process.send_signal(signal.SIGCONT)
+        process.communicate()
+        failed = [line for line in self.ledger("out").values() if "error" in line]
+        self.assertGreater(len(failed), 0)
+        for line in failed:
+            self.assertIn("the mesh file 'models/b.unv' has changed since row 1 was written", line["error"][0]["text"])
 
     def test_Shards_TogetherAreTheStudy(self):
         self.write_model()

@@ -131,6 +131,18 @@ TEST(sty_Ledger, LinesOfResults_AreReadBack) {
     for (std::size_t length = 0; length < line.find("aaa"); ++length)
         EXPECT_FALSE(sty_EntryOf(std::string_view(line).substr(0, length))) << length;
 
+    // Names of meshes that look like the end of their list.
+    done.meshes = {{"a\"}]b", std::string(64, 'c')}, {"\\", std::string(64, 'd')}};
+    line = sty_LineOf(done);
+    line.pop_back();
+    ASSERT_TRUE(sty_EntryOf(line));
+    EXPECT_EQ(sty_EntryOf(line)->meshes, R"([{"file": "a\"}]b", "sha256": ")" + std::string(64, 'c') +
+                                             R"("}, {"file": "\\", "sha256": ")" + std::string(64, 'd') +
+                                             R"("}])");
+    done.meshes.clear();
+    line = sty_LineOf(done);
+    EXPECT_EQ(sty_EntryOf(std::string_view(line).substr(0, line.size() - 1))->meshes, "");
+
     sty_Result failed;
     failed.row = 3;
     failed.parameters = "{}";

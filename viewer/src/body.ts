@@ -5,6 +5,7 @@ import {
     BufferGeometry,
     Color,
     DoubleSide,
+    GreaterDepth,
     Group,
     LineBasicMaterial,
     LineSegments,
@@ -286,20 +287,26 @@ export class Body {
         return new Vector3(...body.cells.place(node)).applyMatrix4(body.group.matrix);
     }
 
-    /** Draws cells and nodes of an instance over the others. */
-    overlay(part: Part, colour: string, opacity: number, behind = false): Object3D[] {
+    /** Draws cells and nodes of an instance over the others; faintly, if so asked, where something hides them. */
+    overlay(part: Part, colour: string, opacity: number, throughBodies = false): Object3D[] {
         const body = at(this.instances, part.instance);
         const group = new Group();
         group.matrixAutoUpdate = false;
         group.matrix.copy(body.group.matrix);
-        const look = { color: new Color(colour), transparent: true, opacity, depthTest: !behind };
+        const look = { color: new Color(colour), transparent: true, opacity };
         const cells = [...part.cells, ...part.negative];
         const faces = body.cells.pieces(cells, 2).index;
         if (faces.length > 0) {
             const material = new MeshLambertMaterial({ ...look, side: DoubleSide, flatShading: true, polygonOffset: true });
             material.polygonOffsetFactor = -1;
             material.polygonOffsetUnits = -1;
-            group.add(new Mesh(body.geometry(faces), material));
+            const geometry = body.geometry(faces);
+            group.add(new Mesh(geometry, material));
+            if (throughBodies) {
+                const faint = material.clone();
+                Object.assign(faint, { opacity: 0.35 * opacity, depthFunc: GreaterDepth, depthWrite: false });
+                group.add(new Mesh(geometry, faint));
+            }
         }
         const lines = body.cells.pieces(cells, 1).index;
         if (lines.length > 0) group.add(new LineSegments(body.geometry(lines), new LineBasicMaterial({ ...look, depthTest: false })));

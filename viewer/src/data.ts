@@ -262,6 +262,11 @@ export class Model {
         return entry[0] < 0 ? "holds in all steps" : (this.header.statuses[entry[0]]?.words ?? "");
     }
 
+    /** Whether the step, a perturbation, finds the object's effect in the state that it starts from. */
+    isBuiltIn(object: ModelObject, step: number): boolean {
+        return this.header.statuses[object.steps[step]?.[0] ?? -1]?.name === "BUILT_INTO_BASE_STATE";
+    }
+
     stateIn(object: ModelObject, step: number): State | undefined {
         return object.states[object.steps[step]?.[1] ?? -1];
     }

@@ -38,6 +38,8 @@ const secondTint = "#c79a00";
 
 /** So many marks show one object at most; they are spread over its region. */
 const mostMarks = 120;
+/** At so many of them its name may point. */
+const mostPlaces = 24;
 
 type Shape = "arrow" | "double" | "cone" | "bar" | "dot" | "ball" | "ring";
 
@@ -67,6 +69,8 @@ interface Placed {
     place: Vector3;
     direction: Vector3;
     length: number;
+    /** How far it goes from its place along its direction. */
+    reach: number;
 }
 
 /** What acts on: faces with normals out of the body, and places. */
@@ -86,6 +90,8 @@ export class Marks {
     private readonly triads = new Group();
     private readonly hiddenKinds = new Set<string>();
     private shownStep = -1;
+    /** Told after each change of what is drawn. */
+    changed: () => void = () => undefined;
 
     constructor(
         private readonly model: Model,
@@ -120,7 +126,14 @@ export class Marks {
             drawn.userData["object"] = index;
             this.group.add(drawn);
         });
+        this.stage.marked.setFromPoints(this.named().flatMap(({ places }) => places));
+        this.changed();
         this.stage.draw();
+    }
+
+    /** The objects that are drawn, each with places at which a name can point. */
+    named(): { object: number; places: Vector3[] }[] {
+        return this.group.children.map((child) => ({ object: child.userData["object"] as number, places: child.userData["places"] as Vector3[] }));
     }
 
     private clear(group: Group): void {
@@ -151,7 +164,9 @@ export class Marks {
         const state = this.model.stateIn(object, step);
         const parts = object.regions.flatMap((region) => this.model.partsOf(region));
         const tint = (some: Part[], shade: string, opacity: number) => {
-            for (const part of some) for (const drawn of this.body.overlay(part, shade, opacity)) group.add(drawn);
+            // Fields cover whole bodies; all else may lie between two of them.
+            const throughBodies = object.kind !== "fields";
+            for (const part of some) for (const drawn of this.body.overlay(part, shade, opacity, throughBodies)) group.add(drawn);
         };
         switch (object.mark) {
             case "support":
@@ -200,12 +215,15 @@ export class Marks {
             default:
                 break;
         }
-        this.addMarks(group, marks);
+        this.addMarks(group, marks, this.model.isBuiltIn(object, step));
+        const drawn = sampled(marks, mostPlaces).flatMap((mark) => [mark.place, mark.place.clone().addScaledVector(mark.direction, mark.reach)]);
+        group.userData["places"] = drawn.length > 0 ? drawn : sampled(this.spots(parts), mostPlaces).map((spot) => spot.place);
         return group;
     }
 
     private at(place: Vector3, shape: Shape, colour: string, direction = new Vector3(0, 1, 0), length = this.unit): Placed {
-        return { shape, colour, place, direction, length };
+        const reach = length * { arrow: 1, double: 1, cone: -0.6, bar: 0, dot: 0, ball: 0, ring: 0 }[shape];
+        return { shape, colour, place, direction, length, reach };
     }
 
     /** Places of a region: its nodes, or the middles of its cells with their normals. */
@@ -306,7 +324,7 @@ export class Marks {
         const direction = new Vector3(...components.map((value) => value ?? 0));
         if (direction.length() === 0) return;
         direction.normalize();
-        const length = this.unit * 5;
+        const length = this.unit * 3;
         const centre = this.stage.box.getCenter(new Vector3());
         const reach = this.stage.box.getSize(new Vector3()).multiply(direction).length() / 2;
         marks.push(this.at(centre.addScaledVector(direction, -(reach + length * 1.1)), "arrow", colour, direction, length));
@@ -376,8 +394,8 @@ export class Marks {
         return lines;
     }
 
-    /** Marks of one shape and colour in one go; faint where something hides them. */
-    private addMarks(group: Group, marks: Placed[]): void {
+    /** Marks of one shape and colour in one go; faint where something hides them, or all of them. */
+    private addMarks(group: Group, marks: Placed[], allFaint = false): void {
         const alike = new Map<string, Placed[]>();
         for (const mark of marks) {
             const key = mark.shape + mark.colour;
@@ -389,7 +407,9 @@ export class Marks {
         for (const same of alike.values()) {
             const first = at(same, 0);
             const geometry = this.shapes[first.shape];
-            const solid = new InstancedMesh(geometry, new MeshLambertMaterial({ color: new Color(first.colour) }), same.length);
+            const material = new MeshLambertMaterial({ color: new Color(first.colour) });
+            if (allFaint) Object.assign(material, { transparent: true, opacity: 0.2, depthWrite: false });
+            const solid = new InstancedMesh(geometry, material, same.length);
             same.forEach((mark, i) => {
                 const turn = new Quaternion().setFromUnitVectors(up, mark.direction.clone().normalize());
                 solid.setMatrixAt(i, new Matrix4().compose(mark.place, turn, new Vector3().setScalar(mark.length)));

@@ -3,11 +3,12 @@ import { Box3, Vector3 } from "three";
 import { type Address, formatAddress, parseAddress } from "./address";
 import { Body, type ColourBy, type Hit } from "./body";
 import { fillCard } from "./card";
-import { at, type Model, type Region } from "./data";
+import { at, type Model, type ModelObject, type Region } from "./data";
 import { button, element, make, swatch } from "./dom";
 import { kindColours, Marks, profileLines } from "./marks";
+import { Overlay } from "./overlay";
 import { Stage, views } from "./stage";
-import { counted, kindHeading, kindOrder, kindWord } from "./text";
+import { briefText, counted, kindHeading, kindOrder, kindWord, shortened } from "./text";
 
 /** What is selected: an object of the model, a set, an instance. */
 export type Selection =
@@ -19,6 +20,7 @@ export class Page {
     private readonly stage: Stage | undefined;
     readonly body: Body | undefined;
     readonly marks: Marks | undefined;
+    private readonly overlay: Overlay | undefined;
     step = 0;
     selection: Selection | undefined;
     private colourBy: ColourBy = "instance";
@@ -32,6 +34,8 @@ export class Page {
         if (this.stage !== undefined && header.instances.length > 0) {
             this.body = new Body(model, this.stage);
             this.marks = new Marks(model, this.body, this.stage);
+            this.marks.changed = () => this.fillLabels();
+            this.overlay = new Overlay(this.stage);
         }
         this.fillFacts();
         this.fillInstances();
@@ -42,6 +46,7 @@ export class Page {
         // The last step tells most: what holds at the end of the analysis.
         this.step = Math.min(1, header.steps.length - 1);
         this.setColour("instance");
+        this.marks?.show(this.step);
         this.stage?.fit(undefined, new Vector3(...at(views, 0).eye), new Vector3(0, 0, 1));
         this.follow(parseAddress(location.hash));
         window.addEventListener("hashchange", () => this.follow(parseAddress(location.hash)));
@@ -214,7 +219,10 @@ export class Page {
         place.replaceChildren();
         const { header } = this.model;
         const step = header.steps[this.step];
-        if (step === undefined) return;
+        if (step === undefined) {
+            place.append(make("p", { class: "soft" }, "There are no steps here. A click on the picture, on an instance or on a set tells of it."));
+            return;
+        }
         place.append(make("h2", {}, `Step ${step.name}`));
         const facts = [step.procedure, step.perturbation ? "linear perturbation" : "", step.period === undefined ? "" : `time ${step.period}`, step.description];
         place.append(make("p", { class: "soft" }, facts.filter((fact) => fact !== "").join(" · ")));
@@ -242,10 +250,33 @@ export class Page {
         this.markSelection();
     }
 
+    /** What an object's state in the step says. */
+    private brief(object: ModelObject): string {
+        const state = this.model.stateIn(object, this.step);
+        const fields = state?.fields ?? [];
+        // A bolt whose length is held keeps the force of the step before in its record.
+        const isHeld = object.mark === "bolt" && state?.magnitude === 0;
+        return briefText(isHeld ? fields.filter((field) => typeof field.value !== "number") : fields);
+    }
+
+    /** The names on the picture: those of loads ahead of conditions, and so on. */
+    private fillLabels(): void {
+        const order = ["loads", "boundaryConditions", "interactions", "constraints", "fields"];
+        const labels = (this.marks?.named() ?? []).map(({ object: index, places }) => {
+            const object = at(this.model.header.objects, index);
+            const note = this.model.isBuiltIn(object, this.step) ? this.model.statusWords(object, this.step) : this.brief(object);
+            const text = shortened(note === "" ? object.name : `${object.name}: ${note}`);
+            return { object: index, text, colour: kindColours[object.kind] ?? "gray", places };
+        });
+        const rank = (label: { object: number }) => order.indexOf(at(this.model.header.objects, label.object).kind);
+        labels.sort((a, b) => rank(a) - rank(b));
+        this.overlay?.setLabels(labels, this.selection?.kind === "object" ? this.selection.index : -1);
+    }
+
     private objectItem(index: number, active: boolean): HTMLLIElement {
         const object = at(this.model.header.objects, index);
-        const words = this.model.statusWords(object, this.step);
-        const choose = button(object.name, false, () => this.select({ kind: "object", index }), " ", make("small", {}, `${object.label} · ${words}`));
+        const words = [object.label, this.model.statusWords(object, this.step), active ? this.brief(object) : ""];
+        const choose = button(object.name, false, () => this.select({ kind: "object", index }), " ", make("small", {}, words.filter((word) => word !== "").join(" · ")));
         if (!active) choose.classList.add("inactive");
         return make("li", { "data-select": `${object.kind}/${object.name}` }, choose);
     }
@@ -292,7 +323,8 @@ export class Page {
         else if (selection.kind === "set") box = this.body?.light([selection.region]) ?? box;
         else if (selection.kind === "instance") box = this.body?.light([], selection.hit === undefined ? [selection.index] : []) ?? box;
         else box = this.body?.light(at(this.model.header.objects, selection.index).regions) ?? box;
-        if (zoom && selection?.kind === "set" && !box.isEmpty()) this.stage?.fit(box);
+        if (zoom && selection?.kind === "set" && !box.isEmpty()) this.zoomToSelection();
+        this.fillLabels();
         this.markSelection();
         this.fillCard();
         if (selection !== undefined) this.announce(`Selected ${this.selectionText(selection).split("/").slice(1).join(" ")}`);
@@ -306,7 +338,8 @@ export class Page {
         if (selection.kind === "instance") box.copy(at(this.body.instances, selection.index).box);
         const regions = selection.kind === "set" ? [selection.region] : selection.kind === "object" ? at(this.model.header.objects, selection.index).regions : [];
         for (const region of regions) for (const part of this.model.partsOf(region)) box.union(this.body.boxOf(part));
-        this.stage?.fit(box.isEmpty() ? undefined : box);
+        // With some of what is around it.
+        this.stage?.fit(box.isEmpty() ? undefined : box.expandByScalar(0.04 * this.stage.size));
     }
 
     private fillCard(): void {
@@ -362,6 +395,7 @@ export class Page {
         }
         press("projection", (on) => this.stage?.setParallel(on));
         press("element-edges", (on) => this.body?.showMesh(on));
+        press("names", (on) => this.overlay?.showNames(on));
         press("orientations", (on) => this.marks?.showTriads(on));
         const profiles = this.body === undefined ? undefined : profileLines(this.model, this.body);
         if (profiles !== undefined) this.stage?.scene.add(profiles);
@@ -409,7 +443,7 @@ export class Page {
 
     /** Selects what lies under a point of the canvas: a mark, else an instance. */
     pickAt(x: number, y: number): void {
-        const object = this.marks?.pick(x, y);
+        const object = this.overlay?.objectAt(x, y) ?? this.marks?.pick(x, y);
         if (object !== undefined) return this.select({ kind: "object", index: object }, false);
         const hit = this.body?.pick(x, y);
         this.select(hit === undefined ? undefined : { kind: "instance", index: hit.instance, hit }, false);
@@ -435,6 +469,7 @@ export class Page {
             f: () => this.stage?.fit(),
             p: () => element("projection").click(),
             e: () => element("element-edges").click(),
+            n: () => element("names").click(),
             ",": () => this.goToStep(this.step - 1),
             ".": () => this.goToStep(this.step + 1),
             Escape: () => this.select(undefined),

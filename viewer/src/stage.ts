@@ -16,6 +16,7 @@ import {
 } from "three";
 import { OrbitControls } from "three/examples/jsm/controls/OrbitControls.js";
 import { at } from "./data";
+import type { Overlay } from "./overlay";
 
 /** The tangent of half the angle that the perspective camera sees. */
 const half = Math.tan((40 * Math.PI) / 360);
@@ -35,6 +36,10 @@ export class Stage {
     /** What fit() looks at. */
     readonly content = new Group();
     readonly box = new Box3(new Vector3(-0.5, -0.5, -0.5), new Vector3(0.5, 0.5, 0.5));
+    /** Where marks stand. */
+    readonly marked = new Box3();
+    /** Drawn over each picture. */
+    overlay: Overlay | undefined;
     private readonly renderer: WebGLRenderer;
     private readonly perspective = new PerspectiveCamera(40, 1, 0.1, 100);
     private readonly parallel = new OrthographicCamera(-1, 1, 1, -1, 0.1, 100);
@@ -126,6 +131,7 @@ export class Stage {
         this.light.position.copy(this.controls.target).add(offset);
         this.light.target.position.copy(this.controls.target);
         this.renderer.render(this.scene, camera);
+        this.overlay?.draw();
     }
 
     /** Takes the scene's content for what views are fitted to. */
@@ -137,14 +143,12 @@ export class Stage {
         return Math.max(this.box.getSize(new Vector3()).length(), 1e-9);
     }
 
-    /** Looks at a box from where the eye is, or along a direction. */
-    fit(box: Box3 = this.box, eye?: Vector3, up?: Vector3): void {
+    /** Looks at a box, or at all with its marks, from where the eye is, or along a direction. */
+    fit(box: Box3 = this.box.clone().union(this.marked), eye?: Vector3, up?: Vector3): void {
         const sphere = box.getBoundingSphere(new Sphere());
-        const radius = Math.max(sphere.radius, this.size * 0.02);
         const direction = eye?.clone() ?? this.camera.position.clone().sub(this.controls.target);
         if (direction.length() === 0) direction.set(1, -1.6, 1);
-        const aspect = Math.min(this.perspective.aspect, 1);
-        const distance = (radius / Math.sin(Math.atan(half * aspect))) * 1.02;
+        const distance = Math.max(this.distanceTo(box, sphere.center, direction, up ?? this.camera.up), this.size * 0.06);
         this.controls.target.copy(sphere.center);
         if (up !== undefined) {
             this.camera.up.copy(up);
@@ -157,6 +161,21 @@ export class Stage {
         this.controls.update();
         this.draw();
         this.moved();
+    }
+
+    /** How far off the middle of a box shows all of it, with some room. */
+    private distanceTo(box: Box3, middle: Vector3, direction: Vector3, up: Vector3): number {
+        const forward = direction.clone().normalize();
+        const right = new Vector3().crossVectors(up, forward).normalize();
+        const top = new Vector3().crossVectors(forward, right);
+        let distance = 0;
+        for (let corner = 0; corner < 8; ++corner) {
+            const arm = new Vector3(corner & 1 ? box.max.x : box.min.x, corner & 2 ? box.max.y : box.min.y, corner & 4 ? box.max.z : box.min.z);
+            arm.sub(middle);
+            const aside = Math.max(Math.abs(arm.dot(right)) / this.perspective.aspect, Math.abs(arm.dot(top))) / half;
+            distance = Math.max(distance, 1.15 * aside + arm.dot(forward));
+        }
+        return distance;
     }
 
     /** Orbiting turns about what was up when the controls were made. */
@@ -257,8 +276,14 @@ export class Stage {
         return this.renderer.clippingPlanes.some((plane: Plane) => plane.distanceToPoint(place) < 0);
     }
 
+    /** The picture as it is seen, names and axes included. */
     picture(): Promise<Blob | null> {
         this.drawNow();
-        return new Promise((done) => this.canvas.toBlob(done, "image/png"));
+        const whole = document.createElement("canvas");
+        Object.assign(whole, { width: this.canvas.width, height: this.canvas.height });
+        const context = whole.getContext("2d");
+        context?.drawImage(this.canvas, 0, 0);
+        if (context !== null) this.overlay?.draw(context);
+        return new Promise((done) => whole.toBlob(done, "image/png"));
     }
 }

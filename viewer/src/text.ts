@@ -1,4 +1,5 @@
 // Texts that the page makes of values.
+import type { Field } from "./data";
 
 export function numberText(value: number): string {
     if (value === 0) return "0";
@@ -19,6 +20,24 @@ export function valueText(value: unknown): string {
         .filter(([, item]) => item !== null)
         .map(([name, item]) => `${name} ${valueText(item)}`)
         .join(", ");
+}
+
+/** What a state says, in few words: values that are alike stand together, "u1, u2 = 0"; amplitudes are left to the card. */
+export function briefText(fields: Field[]): string {
+    const names = new Map<string, string[]>();
+    for (const { name, value } of fields) {
+        const plain = ["number", "string"].includes(typeof value) || (Array.isArray(value) && value.length === 1);
+        if (!plain || name === "amplitude") continue;
+        const text = valueText(value);
+        // A name that every load of its class has says nothing.
+        const word = typeof value === "number" && name !== "magnitude" ? name : "";
+        names.set(text, [...(names.get(text) ?? []), word]);
+    }
+    return [...names].map(([text, words]) => (words.every((word) => word === "") ? text : `${words.join(", ")} = ${text}`)).join(", ");
+}
+
+export function shortened(text: string, most = 44): string {
+    return text.length <= most ? text : `${text.slice(0, most - 1)}…`;
 }
 
 /** A count with its noun: "1 node", "1,200 nodes". */

@@ -100,7 +100,7 @@ class Tab {
     }
 
     async prepare(width, height) {
-        for (const domain of ["Page", "Runtime", "Log", "Network"]) await this.send(`${domain}.enable`);
+        for (const domain of ["Page", "Runtime", "Log", "Network", "Performance"]) await this.send(`${domain}.enable`);
         await this.resize(width, height);
     }
 
@@ -109,22 +109,22 @@ class Tab {
     }
 
     /** Opens an address afresh and waits until the page is ready; gives the milliseconds that took. */
-    async open(url) {
+    async open(url, pause = 50) {
         this.said = [];
         this.requests = [];
         await this.send("Page.navigate", { url: "about:blank" });
         const begin = performance.now();
         await this.send("Page.navigate", { url });
-        await this.until("document.documentElement?.dataset.ready === 'yes'");
+        await this.until("document.documentElement?.dataset.ready === 'yes'", 30, pause);
         await this.frame();
         return performance.now() - begin;
     }
 
-    async until(expression, seconds = 30) {
+    async until(expression, seconds = 30, pause = 50) {
         const end = Date.now() + seconds * 1000;
         while (!(await this.value(expression).catch(() => false))) {
             if (Date.now() > end) throw new Error(`${expression} didn't come true; the page said: ${this.said.join("; ")}`);
-            await new Promise((done) => setTimeout(done, 50));
+            await new Promise((done) => setTimeout(done, pause));
         }
     }
 

@@ -1,7 +1,7 @@
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import { formatAddress, parseAddress } from "../src/address";
-import { counted, numberText, valueText } from "../src/text";
+import { briefText, counted, numberText, shortened, valueText } from "../src/text";
 
 test("numbers are short and keep their size", () => {
     assert.equal(numberText(0), "0");
@@ -17,6 +17,20 @@ test("values of all shapes", () => {
     assert.equal(valueText([1, 2, 3]), "1, 2, 3");
     assert.equal(valueText([[1, 2], [3, 4]]), "1, 2; 3, 4");
     assert.equal(valueText({ a: 1, b: null, c: "x" }), "a 1, c x");
+});
+
+test("a state in few words: alike values together, amplitudes and tables left out", () => {
+    const field = (name: string, value: unknown) => ({ name, value, doc: "" });
+    assert.equal(briefText([field("u1", 0), field("u2", 0), field("u3", -0.05), field("amplitude", "Rise")]), "u1, u2 = 0, u3 = -0.05");
+    assert.equal(briefText([field("typeName", "ENCASTRE")]), "ENCASTRE");
+    assert.equal(briefText([field("values", [20])]), "20");
+    assert.equal(briefText([field("amplitude", "Rise"), field("magnitude", 0.5)]), "0.5");
+    assert.equal(briefText([field("table", [[1, 2], [3, 4]]), field("on", true)]), "");
+});
+
+test("long texts end in dots", () => {
+    assert.equal(shortened("abcdef", 6), "abcdef");
+    assert.equal(shortened("abcdefg", 6), "abcde…");
 });
 
 test("counts have their noun", () => {

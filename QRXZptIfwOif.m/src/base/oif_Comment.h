@@ -22,6 +22,7 @@ class oif_RawKeyword final : public qkw_KeywordOf<oif_RawKeyword> {
 public:
     explicit oif_RawKeyword(const cow_String& text) : text_(text) {}
     void Write(utl_Stream& stream) const override;
+    bool IsEmpty() const override { return text_.IsEmpty(); }
 
 private:
     cow_String text_;

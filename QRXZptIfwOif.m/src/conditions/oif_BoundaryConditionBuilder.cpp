@@ -81,11 +81,11 @@ void oif_BoundaryConditionBuilder::CreateAllBCs(const oif_ObjectsOfSteps<kbcC_BC
         [](const cow_String& name, const kbcC_BC& bc) {
             return Comment(name, oif_FindBCRow(bc.DynTypeId())->label);
         },
-        [&](const oif_BCCard& card, const auto& entry) { CreateBCCard(card, entry, submodels); });
+        [&](const oif_BCCard& card, auto& entry) { CreateBCCard(card, entry, submodels); });
 }
 
 void oif_BoundaryConditionBuilder::CreateBCCard(const oif_BCCard& card,
-                                                const oif_ObjectsOfSteps<kbcC_BC>::Entry& entry,
+                                                oif_ObjectsOfSteps<kbcC_BC>::Entry& entry,
                                                 oif_BoundarySubmodelList& submodels) {
     const cow_String& initialStep = Model().InitialStepName();
     if (const kbcC_ConnectorBC* motion = ConnectorCondition(card.Object())) {
@@ -94,12 +94,15 @@ void oif_BoundaryConditionBuilder::CreateBCCard(const oif_BCCard& card,
             oif_Comment(cow_String("Applies To: ") + oif_BoundarySubmodelList::Joined(motion->connectors)));
         return Add(card, oif_ConnectorMotion(card, initialStep));
     }
-    const oif_Boundary boundary(card, Model().ShellToSolid(), initialStep);
-    if (boundary.IsBCSubmodel()) {
-        return submodels.Append(card.step, card.name, boundary);
+    const auto make = [&] {
+        return oif_OwnKeyword(new oif_Boundary(card, Model().ShellToSolid(), initialStep));
+    };
+    if (card.Object().DynTypeId() == kbcC_SubmodelBC::TypeId()) {
+        const oif_Boundary boundary(card, Model().ShellToSolid(), initialStep);
+        if (boundary.IsBCSubmodel()) return submodels.Append(card.step, card.name, boundary);
     }
     AddComment(card, entry);
-    Add(card, boundary);
+    AddShared(card, entry, make);
 }
 
 cow_String oif_BoundaryConditionBuilder::Comment(const cow_String& name, const char* label) {

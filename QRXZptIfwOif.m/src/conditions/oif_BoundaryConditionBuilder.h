@@ -25,7 +25,7 @@ private:
     void BuildElementSets();
     void CreateAllBCs(const oif_ObjectsOfSteps<kbcC_BC>& written, const oif_BCOpStatus& opStatus, int step,
                       oif_BoundarySubmodelList& submodels);
-    void CreateBCCard(const oif_BCCard& card, const oif_ObjectsOfSteps<kbcC_BC>::Entry& entry,
+    void CreateBCCard(const oif_BCCard& card, oif_ObjectsOfSteps<kbcC_BC>::Entry& entry,
                       oif_BoundarySubmodelList& submodels);
     /// The comments alone: the force of a bolt is told among the concentrated loads. Gives the load cases
     /// that took a bolt load.

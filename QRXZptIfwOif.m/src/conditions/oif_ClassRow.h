@@ -17,16 +17,23 @@ constexpr int oif_NumberOfFamilies(std::span<const Row> rows) {
     return number;
 }
 
+/// A handle on a keyword of its own.
+inline qkw_KeywordHandle oif_OwnKeyword(qkw_Keyword* keyword) {
+    qkw_KeywordHandle handle;
+    handle.Reset(keyword);
+    return handle;
+}
+
 /// The keyword K of a record of class R, made from its card and as much of the setting as K asks for.
 template <class K, class R, class Card, class Setting>
 qkw_KeywordHandle oif_MakeKeyword(const Card& card, const Setting& setting) {
     [[maybe_unused]] const R& record = static_cast<const R&>(card.Object());
     if constexpr (std::is_constructible_v<K, const Card&, const R&, const Setting&>) {
-        return qkw_KeywordHandle(K(card, record, setting));
+        return oif_OwnKeyword(new K(card, record, setting));
     } else if constexpr (std::is_constructible_v<K, const Card&, const R&>) {
-        return qkw_KeywordHandle(K(card, record));
+        return oif_OwnKeyword(new K(card, record));
     } else {
-        return qkw_KeywordHandle(K(card));
+        return oif_OwnKeyword(new K(card));
     }
 }
 

@@ -23,10 +23,10 @@ void oif_FieldBuilder::BuildFieldsHistory() {
             [](const cow_String& name, const kpfC_Field& field) {
                 return cow_String("Name: ") + name + "   Type: " + oif_FindFieldRow(field.DynTypeId())->label;
             },
-            [&](const oif_FieldCard& card, const auto& entry) {
+            [&](const oif_FieldCard& card, auto& entry) {
                 const oif_FieldRow& row = *oif_FindFieldRow(card.Object().DynTypeId());
                 AddComment(card, entry);
-                Add(card, (i == 0 ? row.makeInitial : row.make)(card, setting));
+                AddShared(card, entry, [&] { return (i == 0 ? row.makeInitial : row.make)(card, setting); });
             });
     }
 }

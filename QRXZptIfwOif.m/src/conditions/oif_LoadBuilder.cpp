@@ -28,7 +28,7 @@ void oif_LoadBuilder::BuildLoadsHistory() {
             [](const cow_String& name, const kloC_Load& load) {
                 return cow_String("Name: ") + name + "   Type: " + oif_FindLoadRow(load.DynTypeId())->label;
             },
-            [&](const oif_LoadCard& card, const auto& entry) { LoadCardDetails(card, entry, setting); });
+            [&](const oif_LoadCard& card, auto& entry) { LoadCardDetails(card, entry, setting); });
     }
 }
 
@@ -40,8 +40,7 @@ const kinC_CyclicSymmetry* oif_LoadBuilder::FindCyclicInteraction() const {
     return nullptr;
 }
 
-void oif_LoadBuilder::LoadCardDetails(const oif_LoadCard& card,
-                                      const oif_ObjectsOfSteps<kloC_Load>::Entry& entry,
+void oif_LoadBuilder::LoadCardDetails(const oif_LoadCard& card, oif_ObjectsOfSteps<kloC_Load>::Entry& entry,
                                       const oif_LoadSetting& setting) {
     const oif_LoadRow& row = *oif_FindLoadRow(card.Object().DynTypeId());
     // The end of one of several inertia reliefs isn't told; the banner stands all the same.
@@ -52,7 +51,10 @@ void oif_LoadBuilder::LoadCardDetails(const oif_LoadCard& card,
     AddComment(card, entry);
     if (row.IsCommentAlone(card.Object())) return;
     if (row.CannotBeWritten()) nex_Raise(oif_LoadWithoutKeyword);
-    Add(card, row.make(card, setting));
+    const auto make = [&] { return row.make(card, setting); };
+    // The cyclic mode may change where the load goes on.
+    if (setting.cyclicMode) return Add(card, make());
+    AddShared(card, entry, make);
 }
 
 bool oif_LoadBuilder::CheckForUniqueIRLoad(const cow_String& name, const cow_String& stepName) const {

@@ -17,7 +17,7 @@ private:
     void BuildLoadsHistory();
     /// That of the model, null without one.
     const kinC_CyclicSymmetry* FindCyclicInteraction() const;
-    void LoadCardDetails(const oif_LoadCard& card, const oif_ObjectsOfSteps<kloC_Load>::Entry& entry,
+    void LoadCardDetails(const oif_LoadCard& card, oif_ObjectsOfSteps<kloC_Load>::Entry& entry,
                          const oif_LoadSetting& setting);
     /// Whether no other inertia relief load begins, changes or ends in the step.
     bool CheckForUniqueIRLoad(const cow_String& name, const cow_String& stepName) const;

@@ -169,18 +169,20 @@ void oif_ModelChange::Write(utl_Stream& stream) const {
     stream << slave_ << ", " << (isSelf ? cow_String() : master_) << endl;
 }
 
-const kinC_SurfaceToSurfaceContactStdState* oif_ContactInterference::State() const {
-    const auto* contact = nex_canDynamicCastPtr<kinC_SurfaceToSurfaceContactStd>(interaction_.Referent());
-    return contact == nullptr ? nullptr : &contact->ConstGetState(step_);
+const kinC_SurfaceToSurfaceContactStdState*
+oif_ContactInterference::State(const mdl_ObjCow<kinC_Interaction>& interaction, const cow_String& step) {
+    const auto* contact = nex_canDynamicCastPtr<kinC_SurfaceToSurfaceContactStd>(interaction.Referent());
+    return contact == nullptr ? nullptr : &contact->ConstGetState(step);
 }
 
-bool oif_ContactInterference::IsEmpty() const {
-    const auto* state = State();
+bool oif_ContactInterference::HasNone(const mdl_ObjCow<kinC_Interaction>& interaction,
+                                      const cow_String& step) {
+    const auto* state = State(interaction, step);
     return state != nullptr && state->interferenceType.ConstGet() == kinC_InterferenceTypeEnm::NONE;
 }
 
 void oif_ContactInterference::Write(utl_Stream& stream) const {
-    const auto* state = State();
+    const auto* state = State(interaction_, step_);
     if (state == nullptr || IsEmpty()) return;
     const kinC_InterferenceTypeEnm type = state->interferenceType.ConstGet();
     const bool shrink = type == kinC_InterferenceTypeEnm::SHRINK_FIT;

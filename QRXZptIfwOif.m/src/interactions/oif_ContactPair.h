@@ -95,12 +95,14 @@ public:
                             const qkw_ModelInfo& modelInfo)
         : qkw_KeywordOf(interaction, step, modelInfo) {}
     /// Whether a standard pair has no fit in the step; false for every other class.
-    bool IsEmpty() const override;
+    static bool HasNone(const mdl_ObjCow<kinC_Interaction>& interaction, const cow_String& step);
+    bool IsEmpty() const override { return HasNone(interaction_, step_); }
     void Write(utl_Stream& stream) const override;
 
 private:
     /// Null for every other class.
-    const kinC_SurfaceToSurfaceContactStdState* State() const;
+    static const kinC_SurfaceToSurfaceContactStdState* State(const mdl_ObjCow<kinC_Interaction>& interaction,
+                                                             const cow_String& step);
 };
 
 /// The initial clearance of a pair, named by its surfaces or by the set of contact pairs:

@@ -1,5 +1,6 @@
 #include "interactions/oif_InteractionBuilder.h"
 
+#include "interactions/oif_ContactProperty.h"
 #include "interactions/oif_InteractionProperty.h"
 #include "interactions/oif_InteractionRow.h"
 #include "interactions/oif_PropertyChanges.h"
@@ -14,6 +15,13 @@ void oif_InteractionBuilder::Build() {
 void oif_InteractionBuilder::AddProperty(const qkw_Keyword& keyword) {
     AddModelDefinition(propertyBlockHeader_.ModelHeader().ConstGet());
     AddModelDefinition(keyword);
+}
+
+const qkw_KeywordHandle& oif_InteractionBuilder::ChangedFriction(const cow_String& property) {
+    const kinC_InteractionProperty& record = Model().InteractionProperties().ConstGet(property);
+    qkw_KeywordHandle& friction = frictions_[property];
+    if (friction.IsNull()) friction = oif_Friction(record, ModelInfo(), true);
+    return friction;
 }
 
 void oif_InteractionBuilder::CreateInteractionProperties() {

@@ -5,6 +5,8 @@
 #include "base/oif_Component.h"
 #include "store_interface/records/interactions/kinC_Interaction.h"
 
+#include <map>
+
 /// Interactions and their properties: how each is begun, changed and ended over the steps.
 ///  - Properties go to the model. Where a standard contact changes its property, a copy of the first one is
 ///    written under a name of its own, for *Change Friction to address.
@@ -29,6 +31,8 @@ public:
         AddStepBanner(step, stepBlockHeader_.StepHeader(step));
         (AddStepDefinition(step, keywords), ...);
     }
+    /// The friction of one of the model's properties; all changes to it share the keyword.
+    const qkw_KeywordHandle& ChangedFriction(const cow_String& property);
     /// The banner of properties, then the keyword.
     void AddProperty(const qkw_Keyword& keyword);
     /// Calls `visit(name)` for each step but the initial one.
@@ -45,6 +49,7 @@ private:
     void CreateInteractionProperties();
     void CreateInteractionHistory();
 
+    std::map<cow_String, qkw_KeywordHandle> frictions_; // by property
     oif_BlockHeader stepBlockHeader_{"INTERACTIONS"};
     oif_BlockHeader propertyBlockHeader_{"INTERACTION PROPERTIES"};
 };

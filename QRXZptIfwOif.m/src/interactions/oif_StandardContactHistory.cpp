@@ -58,10 +58,13 @@ public:
         }
     }
     void AddChangedFriction(const cow_String& step) {
-        const kinC_InteractionProperty& property = builder_.Model().InteractionProperties().ConstGet(
-            Record().ConstGetState(step).InteractionProperty.ConstGet());
-        builder_.AddStepDefinition(step, oif_ChangeFriction(oif_ChangeablePropertyName(name_)));
-        builder_.AddStepDefinition(step, oif_Friction(property, builder_.ModelInfo(), true));
+        const qkw_KeywordHandle& friction =
+            builder_.ChangedFriction(Record().ConstGetState(step).InteractionProperty.ConstGet());
+        if (changeFriction_.IsNull()) {
+            changeFriction_ = oif_ChangeFriction(oif_ChangeablePropertyName(name_));
+        }
+        builder_.AddStepDefinition(step, changeFriction_);
+        builder_.AddStepDefinition(step, friction);
     }
     void AddInterference(const cow_String& step);
     void AddControls(const cow_String& step);
@@ -87,7 +90,9 @@ private:
     oif_InteractionBuilder& builder_;
     const cow_String& name_;
     Held held_;
-    oif_Comment comment_;
+    // Shared by its steps.
+    qkw_KeywordHandle comment_;
+    qkw_KeywordHandle changeFriction_ = {};
 };
 
 template <class Contact>
@@ -99,8 +104,8 @@ void ContactSteps<Contact>::AddInterference(const cow_String& step) {
         builder_.AddBlock(step, comment_);
         AddChangedFriction(step);
     }
+    if (oif_ContactInterference::HasNone(held_, step)) return;
     const oif_ContactInterference interference(held_, step, builder_.ModelInfo());
-    if (interference.IsEmpty()) return;
     // Where the pair is begun in the first general step, and only there, the comment stands ahead of the
     // banner.
     if (status == Status::CREATED) {

@@ -193,6 +193,20 @@ bool oif_PartAttributesBuilder::IsPartial(const bme_MapPropertyArray& groups, in
     return section != -1 && groups.NumElements(key) != assignmentSize_.at(section);
 }
 
+cow_String oif_PartAttributesBuilder::GroupSetName(const rgnC_Region& region, int key, bool isPartial) const {
+    oif_SetName name(region, ModelInfo());
+    constexpr auto context = oif_SetName::regionContext::INSTANCE;
+    return oif_SetName::QuoteIfNeeded(
+        isPartial ? name.UniqueSetName(region.SetName() + PartSetString() + cow_String(key + 1), context)
+                  : name.UniqueSetName(context));
+}
+
+cow_String oif_PartAttributesBuilder::OrientationName(const ddb_PartInstance& instance, int index) const {
+    const cow_String name = cow_String("Ori-") + cow_String(index + 1);
+    if (ModelInfo().V6Format()) return name;
+    return qkw_QuorixName(instance.name(), false).Printable() + "_" + name;
+}
+
 void oif_PartAttributesBuilder::CreateSetsAndAttributes(
     const ddb_PartInstance& instance, const std::shared_ptr<const bme_MapPropertyArray>& made) {
     const bme_MapPropertyArray& groups = *made;
@@ -208,12 +222,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(
         Group group;
         group.sectionName = assignment.SectionName();
         group.offset = assignment.Offset();
-        oif_SetName setName(assignment.RegionRef(), ModelInfo());
-        group.setName = oif_SetName::QuoteIfNeeded(
-            isPartial ? setName.UniqueSetName(assignment.RegionRef().SetName() + PartSetString() +
-                                                  cow_String(key + 1),
-                                              oif_SetName::regionContext::INSTANCE)
-                      : setName.UniqueSetName(oif_SetName::regionContext::INSTANCE));
+        group.setName = GroupSetName(assignment.RegionRef(), key, isPartial);
 
         cow_String text = cow_String(RegionString()) + "(" + assignment.SectionName() + ":" +
                           NameInComment(assignment.RegionRef()) + ")";
@@ -238,11 +247,7 @@ void oif_PartAttributesBuilder::CreateSetsAndAttributes(
                 instance.materialOrientations().materialOrientations().ConstGet(index), NEX_HERE);
             text = text + ", (Material Orientation:" + NameInComment(orientation.RegionRef()) + ")";
             if (!orientation.datum.IsNullRef()) {
-                group.orientationName = cow_String("Ori-") + cow_String(index + 1);
-                if (!ModelInfo().V6Format()) {
-                    group.orientationName =
-                        qkw_QuorixName(instance.name(), false).Printable() + "_" + group.orientationName;
-                }
+                group.orientationName = OrientationName(instance, index);
                 CreateMaterialOrientation(instance, orientation, group.orientationName);
             }
         }

@@ -45,6 +45,9 @@ private:
     void ProcessPropertyArray(const ddb_PartInstance& instance);
     /// Whether a group is a part only of what its section assignment names.
     bool IsPartial(const bme_MapPropertyArray& groups, int key) const;
+    cow_String GroupSetName(const rgnC_Region& region, int key, bool isPartial) const;
+    /// Of the material orientation with this number.
+    cow_String OrientationName(const ddb_PartInstance& instance, int index) const;
     void CreateSetsAndAttributes(const ddb_PartInstance& instance,
                                  const std::shared_ptr<const bme_MapPropertyArray>& groups);
     void CreateElementControls();
