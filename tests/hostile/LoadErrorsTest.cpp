@@ -34,7 +34,7 @@ const FindingCase loadCases[] = {
     {"ComplexObjectOfOtherMembers",
      Complex(R"({"magnitude": 1, "real": true})"),
      {"@/loads/L/complexMagnitude/magnitude: found an unknown member 'magnitude', expected one of form, "
-      "real, imag",
+      "real, imag; is it meant for '/models/Default Model/loads/L/states/.../magnitude'?",
       "@/loads/L/complexMagnitude/real: found true, expected a number"}},
     {"ComplexOfNoForm",
      Complex(R"({"form": "CARTESIAN"})"),

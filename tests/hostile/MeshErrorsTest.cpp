@@ -330,7 +330,7 @@ const FindingCase meshCases[] = {
      Whole(
          R"("sets": [{"name": "S", "kind": "node", "labels": [1], "members": [{"instance": "I", "labels": [1]}]}])"),
      {"@/assembly/sets/0/labels: found an unknown member 'labels', expected one of name, kind, internal, "
-      "members"}},
+      "members; is it meant for '/models/Default Model/assembly/sets/0/members/.../labels'?"}},
     {"AssemblySetMemberEmpty",
      AssemblySet(R"({"instance": "I", "labels": []})"),
      {"@/assembly/sets/0/members/0: found an entry without members, expected at least one"}},

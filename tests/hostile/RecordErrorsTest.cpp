@@ -59,7 +59,10 @@ const FindingCase recordCases[] = {
      {"@/sections/S/assembledtype: found an unknown member 'assembledtype'; did you mean "
       "'assembledType'? Expected one of assembledType, translationalType, rotationalType, regularize, "
       "regularization, extrapolationLinear, contactAngle, massPerLength, options, class, ... (4 more)",
-      "@/sections/S/assembly: found an unknown member 'assembly', expected one of " + connectorMembers}},
+      "@/sections/S/assembly: found an unknown member 'assembly'; is it meant for '/models/Default "
+      "Model/assembly'? "
+      "Expected one of " +
+          connectorMembers}},
     {"StatesWhereThereAreNone",
      Section(R"(, "states": {})"),
      {"@/sections/S/states: found an unknown member 'states', expected one of " + connectorMembers}},

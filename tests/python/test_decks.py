@@ -167,10 +167,9 @@ def _records_in(value):
 # Classes that no golden deck has beside those without a place: what no deck carries, or carries what stands for it.
 WITHOUT_DECK = {
     "ActuatorSensor", "ActuatorSensorProp", "ActuatorSensorState", "AdptMeshCons", "AdptMeshConsState", "AdptMeshCtrl",
-    "AnnealTemperature", "ComplexFrequencyStep", "ConcFilmCondition", "ConcFilmConditionState",
-    "ContactInitialization", "CycledPlastic", "DeformationPlasticity", "DruckerPragerCreep", "FailStrain",
-    "GeneralShellSection", "HeatGeneration", "Hypoelastic", "IgnoredFinding", "Ornl", "ResponseSpectrumComponent",
-    "SubmodelStressBased", "SubmodelStressBasedState", "Swelling", "UnwrittenLoad", "UserShellSection", "Viscous",
+    "ComplexFrequencyStep", "ConcFilmCondition", "ConcFilmConditionState", "ContactInitialization",
+    "GeneralShellSection", "IgnoredFinding", "SubmodelStressBased", "SubmodelStressBasedState", "UnwrittenLoad",
+    "UserShellSection",
 }
 
 
