@@ -1,11 +1,9 @@
 #ifndef QRX_DECK_READER_DRD_TEXTS_H
 #define QRX_DECK_READER_DRD_TEXTS_H
 
-#include <concepts>
 #include <cstddef>
 #include <cstring>
 #include <memory>
-#include <new>
 #include <span>
 #include <string>
 #include <string_view>
@@ -22,10 +20,9 @@ public:
     // NOLINTNEXTLINE(google-explicit-constructor): taken along, a word is a string of its own
     operator std::string() const { return std::string(data(), size()); }
 
-    template <std::same_as<std::string> Own>
-    friend std::string operator+(Own&& ahead, drd_Word word) {
-        return std::move(ahead.append(word));
-    }
+    template <class Own>
+    requires std::is_same_v<Own, std::string>
+    friend std::string operator+(Own&& ahead, drd_Word word) { return std::move(ahead.append(word)); }
     friend std::string operator+(std::string_view ahead, drd_Word word) { return std::string(ahead) + word; }
     friend std::string operator+(drd_Word word, std::string_view behind) {
         return std::string(word).append(behind);
@@ -48,7 +45,7 @@ public:
         if (row.empty()) return {};
         char* kept = Room(row.size() * sizeof(T), alignof(T));
         std::memcpy(kept, static_cast<const void*>(row.data()), row.size() * sizeof(T));
-        return {std::launder(reinterpret_cast<const T*>(kept)), row.size()};
+        return {reinterpret_cast<const T*>(kept), row.size()};
     }
     /// Lets all that was kept go.
     void Clear() {

@@ -5,6 +5,7 @@
 #include "store_interface/records/cls_ClassRegistrar.h"
 #include "store_interface/records/steps/kprC_StepTimes.h"
 #include "store_interface/records/steps/kprC_StepWords.h"
+#include "tools/JsonMembers.h"
 #include "tools/NumberText.h"
 #include "tools/TextTable.h"
 
@@ -33,7 +34,8 @@ ordered_json DescribeSets(const std::vector<cow_CountedHld<odiK_Set>>& sets) {
     for (const auto& set : sets) {
         long long members = 0;
         for (const rgnC_SubsetData& subset : set->subsets) members += subset.subset.Length();
-        kinds[omu_EnumTableOf(set->type).Row(static_cast<int>(set->type))->name][Text(set->name)] = members;
+        AddMember(kinds[omu_EnumTableOf(set->type).Row(static_cast<int>(set->type))->name], Text(set->name),
+                  members);
     }
     return kinds;
 }
@@ -173,11 +175,11 @@ ordered_json DescribeModel(const odiK_Model& model) {
             entry["mesh"] = DescribeMesh(*part->mesh);
             entry["sets"] = DescribeSets(part->mesh->Sets());
         }
-        parts[Text(name)] = std::move(entry);
+        AddMember(parts, Text(name), std::move(entry));
     }
     ordered_json& instances = root["instances"] = ordered_json::object();
     for (const auto& [name, instance] : model.Instances()) {
-        instances[Text(name)] = DescribeInstance(*instance);
+        AddMember(instances, Text(name), DescribeInstance(*instance));
     }
     ordered_json& assembly = root["assembly"] = {{"name", Text(model.AssemblyObject().name)}};
     if (!model.ConstAssemblyMesh().IsNull()) assembly["mesh"] = DescribeMesh(*model.ConstAssemblyMesh());
@@ -186,8 +188,10 @@ ordered_json DescribeModel(const odiK_Model& model) {
     ordered_json& named = root["objects"] = ordered_json::object();
     for (const odiK_Repository& repository : odiK_Repositories()) {
         if (repository.IsInOrder()) continue;
+        ordered_json objects = ordered_json::object();
         for (const auto& [name, record] : repository.In(model))
-            named[repository.member][Text(name)] = Text(cls_Classes().ShortNameOf(record.DynTypeId()));
+            AddMember(objects, Text(name), Text(cls_Classes().ShortNameOf(record.DynTypeId())));
+        if (!objects.empty()) named[repository.member] = std::move(objects);
     }
     return root;
 }

@@ -6,6 +6,7 @@
 #include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/propagation/mdl_StatusWords.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
+#include "tools/JsonMembers.h"
 #include "tools/TextTable.h"
 
 #include <algorithm>
@@ -49,9 +50,10 @@ ordered_json HistoryOf(const mdl_Repository& objects, const kprC_StepContainer& 
             }
             states.push_back(std::move(state));
         }
-        all[Text(name)] = {{"class", Text(cls_Classes().ShortNameOf(object.DynTypeId()))},
-                           {"suppressed", object.suppressed},
-                           {"steps", std::move(states)}};
+        AddMember(all, Text(name),
+                  {{"class", Text(cls_Classes().ShortNameOf(object.DynTypeId()))},
+                   {"suppressed", object.suppressed},
+                   {"steps", std::move(states)}});
     }
     return all;
 }

@@ -45,7 +45,7 @@ GIVEN_BY = {
     "copy_n": "algorithm", "equal": "algorithm", "fill": "algorithm", "find": "algorithm", "find_if": "algorithm",
     "count": "algorithm", "count_if": "algorithm", "any_of": "algorithm", "all_of": "algorithm",
     "lower_bound": "algorithm", "upper_bound": "algorithm", "transform": "algorithm", "move_backward": "algorithm",
-    "swap_ranges": "algorithm", "clamp": "algorithm", "ranges": "ranges algorithm",
+    "swap_ranges": "algorithm", "partial_sum": "numeric", "clamp": "algorithm", "ranges": "ranges algorithm",
     "begin": "iterator vector string span array map", "end": "iterator vector string span array map",
     "prev": "iterator", "next": "iterator", "distance": "iterator", "input_iterator_tag": "iterator",
     "forward_iterator_tag": "iterator", "random_access_iterator_tag": "iterator", "iterator_traits": "iterator",
