@@ -67,5 +67,5 @@ for preset in "${presets[@]}"; do
     sanitized=OFF
     [ "$preset" != release ] || sanitized=ON
     scripts/build.sh "$preset" all -DQRX_BUILD_TESTS=ON -DQRX_WARNINGS_AS_ERRORS=ON -DQRX_SANITIZED_TESTS="$sanitized"
-    ctest --preset "$preset" --parallel "$(($(nproc) + 1))" --no-tests=error ${select[@]+"${select[@]}"}
+    ctest --preset "$preset" --parallel "$(nproc)" --no-tests=error ${select[@]+"${select[@]}"}
 done
