@@ -314,6 +314,8 @@ std::vector<std::int16_t> vpg_Layout::SectionsOfElements(const Shown& shown) con
         const auto& assignment = nex_canDynamicCastRef<ptoC_SectionAssignment>(attribute, NEX_HERE);
         const auto section = placeOf.find(assignment.sectionName);
         if (section == placeOf.end() || !assignment.region.HasValue()) continue;
+        // The assembly may give sections to sets of instances, whose classes are those of another mesh.
+        if (isAssembly && assignment.region.InstanceName().Length() > 0) continue;
         const rgnC_SetData& set = assignment.region.ConstSet().Data();
         if (set.Kind() != static_cast<int>(res_SetTypeEnm::ELEMENTS)) continue;
         for (const rgnC_SubsetData& subset : set.Object().subsets) {
