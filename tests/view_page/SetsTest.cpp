@@ -107,6 +107,22 @@ TEST(Sections, AreKnownOfEachCell_TheLastAssignmentCounts) {
     EXPECT_EQ(page.header["instances"][0]["sections"], page.header["instances"][1]["sections"]);
 }
 
+TEST(Sections, OfInstancesSetsGivenByTheAssembly_AreNotTheAssemblys) {
+    // The instance's set is of its second class; the assembly's mesh has one class of two elements.
+    const PageOf page(
+        R"("parts": {"P": {"mesh": {"nodes": {"labels": [1, 2, 3], "coordinates": [[0, 0, 0], [1, 0, 0], [2, 0, 0]]},
+            "elements": [{"type": "T3D2", "labels": [1], "connectivity": [[1, 2]]},
+                         {"type": "B31", "labels": [2], "connectivity": [[2, 3]]}],
+            "sets": [{"name": "BEAM", "kind": "element", "labels": [2]}]}}},
+        "assembly": {"instances": {"I": {"part": "P"}},
+                     "mesh": {"elements": [{"type": "CONN3D2", "labels": [1, 2], "connectivity": [["I.1", "I.2"], ["I.2", "I.3"]]}]},
+                     "sectionAssignments": [{"region": "I.BEAM", "sectionName": "S"}]},
+        "materials": {"M": {}},
+        "sections": {"S": {"class": "kseC_TrussSection", "materialName": "M"}})");
+    for (const auto& instance : page.header["instances"])
+        EXPECT_FALSE(instance.contains("sections")) << instance;
+}
+
 TEST(Profiles, AreTheirOutlines) {
     kbpC_RectangularProfile rectangle;
     rectangle.a = 2.0;
