@@ -40,6 +40,7 @@ if $cluster; then
 fi
 if $packages; then
     scripts/install-dependencies.sh packages python
+    scripts/install-dependencies.sh viewer || echo "test.sh: the page can't be built here; the packages lack it" >&2
     exec python3 tests/packages/packages_test.py .
 fi
 # They have no test programs of their own: what they built is run as it is.
@@ -47,11 +48,13 @@ case ${presets[*]-} in
     windows)
         scripts/install-dependencies.sh build windows
         scripts/build-windows.sh
+        scripts/build.sh windows qrx_deck_tests -DQRX_BUILD_TESTS=ON
         exec python3 tests/windows/windows_test.py . build/windows build/windows-package/qrxdeck-*-windows-x86_64.zip
         ;;
     libcxx)
         scripts/install-dependencies.sh build libcxx
         scripts/build.sh libcxx all
+        build/libcxx/tests/decks/qrx_deck_tests --gtest_brief=1
         exec python3 tests/libcxx/golden_decks_test.py . build/libcxx/tools/qrxdeck build/libcxx/examples/two_instances
         ;;
 esac

@@ -11,6 +11,7 @@ set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
 # Where libraries that are headers alone are, which serve every system.
 set(QRX_HOST_HEADERS /usr/include)
+set(QRX_GOOGLETEST_SOURCES /usr/src/googletest/googletest)
 # CMake finds it by a program of this system, which gives this system's library.
 set(CMAKE_DISABLE_FIND_PACKAGE_HDF5 ON)
 # One file that needs no other.

@@ -31,8 +31,8 @@ python=(python3 python3-dev python3-pip python3-venv pybind11-dev python3-pybind
 docs=(doxygen python3-sphinx python3-myst-parser python3-breathe furo python3-sphinxcontrib.spelling hunspell-en-gb)
 
 packages=(dpkg-dev gzip xz-utils lintian debootstrap python3)
-windows=(g++-mingw-w64-x86-64-posix libz-mingw-w64-dev wine64 wine unzip python3)
-libcxx=(clang-16 libc++-16-dev libc++abi-16-dev python3)
+windows=(g++-mingw-w64-x86-64-posix libz-mingw-w64-dev googletest wine64 wine unzip python3)
+libcxx=(clang-16 libc++-16-dev libc++abi-16-dev googletest python3)
 
 viewer=(chromium)
 # Other sources of node than Debian's have npm in one package with it, and don't bear Debian's npm beside it.

@@ -16,6 +16,8 @@ import unittest
 import zipfile
 
 REPOSITORY = pathlib.Path(sys.argv[1]).resolve()
+sys.path.insert(0, str(REPOSITORY / "tests/programs"))
+import two_instances_test  # noqa: E402
 BUILD = pathlib.Path(sys.argv[2]).resolve()
 ARCHIVE = pathlib.Path(sys.argv[3]).resolve()
 SYSTEM_LIBRARIES = {"advapi32.dll", "kernel32.dll", "msvcrt.dll", "shell32.dll", "bcrypt.dll", "user32.dll"}
@@ -62,9 +64,9 @@ class Windows(unittest.TestCase):
     def setUp(self):
         self.folder = pathlib.Path(tempfile.mkdtemp(dir=self.scratch))
 
-    def run_there(self, *words, program=None, text=None):
+    def run_there(self, *words, program=None, text=None, seconds=120):
         return subprocess.run([WINE, program or self.program, *map(str, words)], cwd=self.folder, input=text,
-                              env=self.environment, capture_output=True, timeout=120)
+                              env=self.environment, capture_output=True, timeout=seconds)
 
     def run_batch(self, lines):
         """Many runs of the program in one start of the command interpreter."""
@@ -98,6 +100,14 @@ class Windows(unittest.TestCase):
                 different.append(model.name)
         self.assertEqual(different, [], output[-2000:])
         print(f"{len(pairs)} decks are the same", file=sys.stderr)
+
+    def test_GoldenDecksOfAllWays_AreTheSameToTheByte(self):
+        """Through a buffer of one byte, from copies, from the model written back, twice, from shuffled members."""
+        done = self.run_there("--gtest_brief=1", program=BUILD / "tests/decks/qrx_deck_tests.exe", seconds=1200)
+        passed = re.search(rb"\[  PASSED  \] (\d+) tests", done.stdout)
+        self.assertEqual((done.returncode, passed is not None), (0, True), (done.stdout + done.stderr)[-3000:])
+        self.assertGreater(int(passed[1]), 780)
+        print(f"{int(passed[1])} tests of decks pass", file=sys.stderr)
 
     def test_ModelsOfMeshersFiles_AreReadAndWritten(self):
         meshes = [mesh for mesh in sorted((REPOSITORY / "tests/mesh_file/meshes").iterdir())
@@ -180,10 +190,6 @@ class Windows(unittest.TestCase):
         self.assertIn(b"2 done before", done.stdout)
 
     def test_ExampleInMemory_WritesItsDeck(self):
-        arguments, sys.argv = sys.argv, [sys.argv[0], "none", "none"]
-        sys.path.insert(0, str(REPOSITORY / "tests/programs"))
-        import two_instances_test
-        sys.argv = arguments
         done = self.run_there(program=BUILD / "examples" / "two_instances.exe")
         self.assertEqual(done.returncode, 0, done.stderr)
         decks = list(self.folder.glob("*.inp"))

@@ -1,0 +1,16 @@
+# GoogleTest: an installed one, or, for compilers that Debian has none for, compiled from its sources in
+# QRX_GOOGLETEST_SOURCES.
+if(NOT QRX_GOOGLETEST_SOURCES)
+    find_package(GTest REQUIRED)
+    return()
+endif()
+set(folder ${QRX_GOOGLETEST_SOURCES})
+if(NOT EXISTS ${folder}/src/gtest-all.cc)
+    message(FATAL_ERROR "No ${folder}/src/gtest-all.cc: Debian's package googletest has it")
+endif()
+add_library(gtest STATIC ${folder}/src/gtest-all.cc)
+add_library(gtest_main STATIC ${folder}/src/gtest_main.cc)
+foreach(name gtest gtest_main)
+    target_include_directories(${name} SYSTEM PUBLIC ${folder}/include PRIVATE ${folder})
+    add_library(GTest::${name} ALIAS ${name})
+endforeach()
