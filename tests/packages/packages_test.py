@@ -1,13 +1,15 @@
 #!/usr/bin/env python3
 """Builds the packages twice, looks at them, and installs them into a fresh Debian root.
 
-usage: packages_test.py REPOSITORY [--built FOLDER] [--root FOLDER]
+usage: packages_test.py REPOSITORY [--built FOLDER [--again]] [--root FOLDER]
 
-With --built the packages are taken from there and not built. With --root a root is kept there for the next time. What
-isn't there for a part of it (lintian, debootstrap, root's rights) skips that part, with a message.
+With --built the packages are taken from there, and built once more for the comparison with --again alone. With --root a
+root is kept there for the next time. What isn't there for a part of it (lintian, debootstrap, root's rights) skips that
+part, with a message.
 """
 
 import argparse
+import functools
 import gzip
 import json
 import os
@@ -48,14 +50,22 @@ def build(folder):
     return folder / "packages"
 
 
+@functools.cache
+def packages():
+    """The folder of the packages that all tests look at."""
+    if OPTIONS.built:
+        return OPTIONS.built.resolve()
+    # In a place that stays the same, so that a compiler cache has what another run compiled.
+    folder = OPTIONS.repository / "build/packages-test"
+    shutil.rmtree(folder, ignore_errors=True)
+    return build(folder)
+
+
 class Packages(unittest.TestCase):
     @classmethod
     def setUpClass(cls):
         cls.scratch = pathlib.Path(cls.enterClassContext(tempfile.TemporaryDirectory()))
-        # In a place of its own, so that a compiler cache has what another run compiled.
-        first = OPTIONS.repository / "build/packages-test"
-        shutil.rmtree(first, ignore_errors=True)
-        cls.folder = OPTIONS.built or build(first)
+        cls.folder = packages()
         cls.debs = sorted(cls.folder.glob("*.deb"))
 
     def deb(self, name):
@@ -71,13 +81,14 @@ class Packages(unittest.TestCase):
         return folder
 
     def test_SameSourcesInAnotherFolder_MakeTheSameBytes(self):
-        if OPTIONS.built:
-            self.skipTest("the packages were given")
+        if OPTIONS.built and not OPTIONS.again:
+            self.skipTest("the packages were given, and not --again")
         # Nothing of the first build may serve the second.
         os.environ["CCACHE_DISABLE"] = "1"
         again = build(self.scratch / "another folder, with a longer name")
         del os.environ["CCACHE_DISABLE"]
-        names = sorted(path.name for path in self.folder.iterdir())
+        # That of the sources is git's own.
+        names = sorted(path.name for path in self.folder.iterdir() if not path.name.endswith("-sources.tar.gz"))
         self.assertGreaterEqual(len(names), 3)
         self.assertEqual(names, sorted(path.name for path in again.iterdir()))
         for name in names:
@@ -158,10 +169,10 @@ class InAFreshRoot(unittest.TestCase):
         cls.root = OPTIONS.root or pathlib.Path(cls.enterClassContext(tempfile.TemporaryDirectory()))
         if not (cls.root / "usr/bin/apt-get").exists():
             run("debootstrap", "--variant=minbase", SUITE, cls.root)
-        cls.addClassCleanup(shutil.rmtree, cls.root / "tmp/packages", ignore_errors=True)
-        shutil.copytree(Packages.folder if hasattr(Packages, "folder") else OPTIONS.built, cls.root / "tmp/packages",
-                        dirs_exist_ok=True)
-        shutil.copytree(OPTIONS.repository / "tests/consumer/project", cls.root / "tmp/consumer", dirs_exist_ok=True)
+        for folder in ("tmp/packages", "tmp/consumer"):
+            shutil.rmtree(cls.root / folder, ignore_errors=True)
+        shutil.copytree(packages(), cls.root / "tmp/packages")
+        shutil.copytree(OPTIONS.repository / "tests/consumer/project", cls.root / "tmp/consumer")
         cls.there("rm -rf /tmp/work && mkdir /tmp/work && apt-get -q update")
         cls.there("apt-get -q install -y --no-install-recommends /tmp/packages/*.deb g++ cmake make pkg-config "
                   "man-db bash-completion")
@@ -179,17 +190,28 @@ class InAFreshRoot(unittest.TestCase):
         blocks = re.findall(r"^<!-- files: (\S+) -->\n```sh\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
         self.assertGreater(len(blocks), 0)
         for file, commands in blocks:
-            shutil.copy(OPTIONS.repository / file, self.root / "tmp/work")
-            self.there(commands)
+            self.there(f"cp /usr/share/doc/qrxdeck/{file} .\n{commands}")
         self.assertTrue((self.root / "tmp/work/part.inp").read_text(encoding="utf-8").startswith("*Heading\n"))
         # And the lines that it shows of a deck.
-        for example in ("bracket.json", "bracket.msh"):
-            shutil.copy(OPTIONS.repository / "examples/bracket" / example, self.root / "tmp/work")
-        self.there("qrxdeck write bracket.json && qrxdeck check bracket.inp")
+        self.there("cp /usr/share/doc/qrxdeck/examples/bracket/* . && qrxdeck write bracket.json && qrxdeck check bracket.inp")
         shown = re.findall(r"^```inp\n(.*?)^```$", readme, re.MULTILINE | re.DOTALL)
         self.assertGreater(len(shown), 0)
         for lines in shown:
             self.assertIn(lines, (self.root / "tmp/work/bracket.inp").read_text(encoding="utf-8"))
+
+    def test_ExamplesOfThePackages_WriteTheirDecks(self):
+        written = self.there("""cd /usr/share/doc/qrxdeck/examples
+            for model in */*.json; do
+                qrxdeck write -o /tmp/work/example.inp "$model" >/dev/null
+                expected=${model%.json}.inp
+                [ ! -e "$expected" ] || cmp "$expected" /tmp/work/example.inp
+                echo "$model"
+            done""").split()
+        models = {path.relative_to(OPTIONS.repository / "examples").as_posix()
+                  for path in OPTIONS.repository.glob("examples/*/*.json")}
+        self.assertEqual(set(written), models)
+        self.there("g++ /usr/share/doc/libqrxptinputfilewriter-dev/examples/two_instances.cpp -o two_instances "
+                   "$(pkg-config --cflags --libs QRXZptInputFileWriter) && ./two_instances")
 
     def test_Version_TellsTheCommit(self):
         self.assertRegex(self.there("qrxdeck --version"), r"^qrxdeck \d+\.\d+\.\d+ \([0-9a-f]{12}\+?\)\n$")
@@ -214,8 +236,8 @@ class InAFreshRoot(unittest.TestCase):
     def test_Python_WritesTheSameDeck(self):
         if not any(path.name.startswith("python3-qrx_") for path in (self.root / "tmp/packages").iterdir()):
             self.skipTest("no package for Python was built")
-        shutil.copy(OPTIONS.repository / "examples/assembly/assembly.json", self.root / "tmp/work")
-        self.there("qrxdeck write assembly.json --job program && python3 -c \"import qrx; "
+        self.there("cp /usr/share/doc/qrxdeck/examples/assembly/assembly.json . && "
+                   "qrxdeck write assembly.json --job program && python3 -c \"import qrx; "
                    "qrx.load('assembly.json').write('python.inp')\" && cmp program.inp python.inp")
 
     def test_ProgramThatUsesTheLibrary_IsBuiltBothWays(self):
@@ -241,6 +263,7 @@ def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("repository", type=pathlib.Path)
     parser.add_argument("--built", type=pathlib.Path)
+    parser.add_argument("--again", action="store_true")
     parser.add_argument("--root", type=pathlib.Path)
     OPTIONS, rest = parser.parse_known_args()
     OPTIONS.repository = OPTIONS.repository.resolve()
