@@ -149,6 +149,14 @@ class Packages(unittest.TestCase):
         self.assertGreater(len(own), 1000)
         self.assertEqual(sorted(own - shown)[:10], [])
 
+    def test_Files_DoNotTellWhereTheyWereBuilt(self):
+        places = [os.fsencode(place) for place in (OPTIONS.repository, self.folder.parent)]
+        for deb in self.debs:
+            for path in self.unpacked(deb.name.split("_")[0]).rglob("*"):
+                if path.is_file() and not path.is_symlink():
+                    content = path.read_bytes()
+                    self.assertFalse([place for place in places if place in content], path)
+
     def test_Archive_HasProgramAndLibrary(self):
         archive = next(path for path in self.folder.glob("*.tar.gz") if "sources" not in path.name)
         with tarfile.open(archive) as content:
