@@ -1,5 +1,5 @@
-# Packs manual pages, as Debian wants them; what goes into an archive is listed before this. Then all that is in a package gets one time, that of the sources, so that the
-# same sources make the same package.
+# Packs manual pages of Debian's packages, as Debian wants them; an archive's contents are listed before this. Then all
+# that is in a package gets one time, that of the sources, so that the same sources make the same package.
 set(time "$ENV{SOURCE_DATE_EPOCH}")
 if(NOT time)
     set(time "${CPACK_QRX_TIME}")
