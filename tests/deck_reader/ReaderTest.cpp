@@ -22,6 +22,28 @@ TEST(Reader, KeywordLine_WithoutRegardToCapitalsAndBlanks) {
     EXPECT_EQ(keyword.Find("composite"), nullptr);
 }
 
+TEST(Reader, AParameterWithAnEmptyValue_IsNotOneWithoutAValue) {
+    const ReadDeckText read("*Static, direct, stabilize=\n");
+    const drd_Keyword& keyword = read.deck.keywords[0];
+    ASSERT_EQ(keyword.Parameters().size(), 2U);
+    EXPECT_FALSE(keyword.Parameters()[0].HasValue());
+    EXPECT_TRUE(keyword.Parameters()[1].HasValue());
+    EXPECT_EQ(keyword.Value("stabilize"), "");
+}
+
+TEST(Reader, EachSpelling_OfAKeywordIsKeptOnce) {
+    const ReadDeckText read("*Nset, nset=A\n1\n*NSET, Nset=B\n1\n*Nset, nset=C\n1\n");
+    ASSERT_EQ(read.deck.keywords.size(), 3U);
+    const drd_Keyword& first = read.deck.keywords[0];
+    EXPECT_EQ(first.word, read.deck.keywords[2].word);
+    EXPECT_NE(first.word, read.deck.keywords[1].word);
+    EXPECT_EQ(read.deck.keywords[1].Name(), "NSET");
+    EXPECT_EQ(read.deck.keywords[1].Key(), first.Key());
+    EXPECT_EQ(read.deck.keywords[1].Row(), first.Row());
+    EXPECT_TRUE(first.IsBulk());
+    EXPECT_FALSE(first.HasText());
+}
+
 TEST(Reader, KeywordLine_GoesOnBehindAComma_CommentsBetween) {
     const ReadDeckText read("*Shell Section, elset=A,\n** a comment\n  material=M,\noffset=0.5\n1., 5\n");
     ASSERT_EQ(read.deck.keywords.size(), 1U);
