@@ -207,7 +207,7 @@ class Model:
 
     def deck_lines(self, kind, name, step, load_case=""):
         """The lines that an object becomes in a step of the deck, or in a load case of it."""
-        member = _member_of(kind, {each: row[0] for each, row in repositories().items()})
+        member = _member_of(kind, {"steps": "steps", **{each: row[0] for each, row in repositories().items()}})
         if name not in getattr(self, _names.repository_name(member)):
             raise no_such(kind, name, getattr(self, _names.repository_name(member)))
         lines = self._store().deck_lines(member, name, self.steps[_records.step_name(step)].name)
