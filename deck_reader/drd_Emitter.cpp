@@ -51,8 +51,8 @@ void drd_Emitter::Keyword(std::string_view name, std::span<const drd_Parameter> 
     for (const drd_Parameter& parameter : parameters) {
         text_.append(", ");
         // What begins with anything but a letter would be a line of data there.
-        if (text_.size() - begin > kKeywordBytes && !parameter.name.empty() &&
-            drd_IsLetter(parameter.name.front())) {
+        if (text_.size() - begin > kKeywordBytes && !parameter.Name().empty() &&
+            drd_IsLetter(parameter.Name().front())) {
             text_.push_back('\n');
             begin = text_.size();
         }
