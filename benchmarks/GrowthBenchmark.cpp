@@ -1,7 +1,9 @@
 // How the time for a model grows with its size: each task at a quarter of its size and at all of it, in turn,
-// the best of three. An exponent of 1 is a time that grows as the model does.
+// each run in a process of its own, the best of three. An exponent of 1 is a time that grows as the model
+// does.
 //     bench_growth [TASK ...]
 #include "benchmarks/GrowthModels.h"
+#include "benchmarks/InChild.h"
 #include "deck/oif_Writer.h"
 #include "deck_checks/dck_Check.h"
 #include "foundation/qio_Device.h"
@@ -21,6 +23,7 @@ struct Times {
     double reading = 1e9;
     double checking = 1e9;
     double writing = 1e9;
+    long peak = 0; // in kB
 
     double Whole() const { return reading + checking + writing; }
 };
@@ -32,20 +35,27 @@ double SecondsOf(const Work& work) {
     return static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC;
 }
 
-void Measure(const std::string& text, Times& best) {
+Times Measure(const std::string& text) {
+    Times times;
     mdf_Report report;
     std::unique_ptr<odb_Odb> odb;
-    best.reading =
-        std::min(best.reading, SecondsOf([&] { odb = mdf_ReadModelText(text, "m.json", report); }));
-    if (odb == nullptr) {
-        best.checking = best.writing = 0.0;
-        return;
-    }
-    best.checking = std::min(best.checking, SecondsOf([&] { static_cast<void>(dck_Check(*odb)); }));
-    best.writing = std::min(best.writing, SecondsOf([&] {
-                                qio_StringDevice device;
-                                oif_Writer(*odb).WriteInput(device);
-                            }));
+    times.reading = SecondsOf([&] { odb = mdf_ReadModelText(text, "m.json", report); });
+    times.checking = odb == nullptr ? 0.0 : SecondsOf([&] { static_cast<void>(dck_Check(*odb)); });
+    times.writing = odb == nullptr ? 0.0 : SecondsOf([&] {
+        qio_StringDevice device;
+        oif_Writer(*odb).WriteInput(device);
+    });
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    times.peak = usage.ru_maxrss;
+    return times;
+}
+
+void KeepBest(Times& best, const Times& run) {
+    best.reading = std::min(best.reading, run.reading);
+    best.checking = std::min(best.checking, run.checking);
+    best.writing = std::min(best.writing, run.writing);
+    best.peak = run.peak;
 }
 
 double Exponent(double whole, double quarter) {
@@ -63,17 +73,15 @@ int main(int argc, char** argv) {
         const std::string small = task.text(task.count / 4);
         const std::string large = task.text(task.count);
         for (int run = 0; run < 3; ++run) {
-            Measure(small, quarter);
-            Measure(large, whole);
+            KeepBest(quarter, InChild([&small] { return Measure(small); }));
+            KeepBest(whole, InChild([&large] { return Measure(large); }));
         }
-        rusage usage{};
-        getrusage(RUSAGE_SELF, &usage);
         std::printf("%-16s %6d in %6.3f s, exponent %.2f; read in %6.3f s, %.2f; checked in %6.3f s, %.2f; "
-                    "written in %6.3f s, %.2f; file %.1f MB, peak so far %.0f MiB\n",
+                    "written in %6.3f s, %.2f; file %.1f MB, peak %.0f MiB\n",
                     task.name, task.count, whole.Whole(), Exponent(whole.Whole(), quarter.Whole()),
                     whole.reading, Exponent(whole.reading, quarter.reading), whole.checking,
                     Exponent(whole.checking, quarter.checking), whole.writing,
                     Exponent(whole.writing, quarter.writing), static_cast<double>(large.size()) / 1e6,
-                    static_cast<double>(usage.ru_maxrss) / 1024.0);
+                    static_cast<double>(whole.peak) / 1024.0);
     }
 }

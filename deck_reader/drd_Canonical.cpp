@@ -55,9 +55,9 @@ drd_Canonical::drd_Canonical(const drd_Deck& deck, bool ignoreTitles)
     : deck_(deck), ignoreTitles_(ignoreTitles), names_(deck), endsOfItems_(deck.blocks.size() + 1, 0) {
     const auto isItem = [&deck](std::size_t index) {
         const drd_Keyword& keyword = deck.keywords[index];
-        return keyword.parent < 0 && !keyword.isBulk &&
+        return keyword.parent < 0 && !keyword.IsBulk() &&
                deck.blocks[static_cast<std::size_t>(keyword.block)].begin != static_cast<int>(index) &&
-               !(keyword.key.starts_with("end") && keyword.row != nullptr);
+               !(keyword.Key().starts_with("end") && keyword.Row() != nullptr);
     };
     std::vector<std::pair<int, int>> items; // block and keyword
     for (std::size_t i = 0; i < deck.keywords.size(); ++i) {
@@ -76,7 +76,7 @@ void drd_Canonical::Sign(const Renames& renames) {
     signatures_.assign(deck_.keywords.size(), 0);
     // Options stand behind their owner.
     for (std::size_t i = deck_.keywords.size(); i-- > 0;) {
-        if (deck_.keywords[i].isBulk) continue;
+        if (deck_.keywords[i].IsBulk()) continue;
         signatures_[i] = Mixed(OwnHash(deck_.keywords[i], true), OptionsHash(static_cast<int>(i)));
     }
 }
@@ -131,21 +131,21 @@ std::uint64_t drd_Canonical::LineCount(const drd_Keyword& keyword) const {
 std::uint64_t drd_Canonical::OwnHash(const drd_Keyword& keyword, bool withName) const {
     // Added up, so that the order of parameters is no matter.
     std::uint64_t parameters = 0;
-    const bool isNamed = keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE;
-    for (const drd_Parameter& parameter : keyword.parameters) {
-        if (!withName && isNamed && parameter.key == drd_NameParameter(*keyword.row)) continue;
-        parameters += Mixed(HashOf(parameter.key), FieldHash(parameter.value));
+    const bool isNamed = keyword.Row() != nullptr && keyword.Row()->defines != drd_KindEnm::NONE;
+    for (const drd_Parameter& parameter : keyword.Parameters()) {
+        if (!withName && isNamed && parameter.Key() == drd_NameParameter(*keyword.Row())) continue;
+        parameters += Mixed(HashOf(parameter.Key()), FieldHash(parameter.value));
     }
-    return Mixed(Mixed(HashOf(keyword.key), parameters), DataHash(keyword));
+    return Mixed(Mixed(HashOf(keyword.Key()), parameters), DataHash(keyword));
 }
 
 std::uint64_t drd_Canonical::DataHash(const drd_Keyword& keyword) const {
     std::uint64_t hash = 0;
-    if (drd_HasText(keyword.key) && ignoreTitles_) return hash;
+    if (keyword.HasText() && ignoreTitles_) return hash;
     const std::uint64_t lines = LineCount(keyword);
     for (std::uint64_t i = 0; i < lines; ++i) {
         const std::string_view line = deck_.DataLine(keyword, i);
-        if (drd_HasText(keyword.key)) {
+        if (keyword.HasText()) {
             hash = Mixed(hash, HashOf(drd_Trim(line)));
             continue;
         }
@@ -154,7 +154,7 @@ std::uint64_t drd_Canonical::DataHash(const drd_Keyword& keyword) const {
         while (!fields_.empty() && fields_.back().empty()) fields_.pop_back();
         for (const std::string_view field : fields_) lineHash = Mixed(lineHash, FieldHash(field));
         // The faces of a surface have no order.
-        hash = keyword.key == "surface" ? hash + lineHash : Mixed(hash, lineHash);
+        hash = keyword.Key() == "surface" ? hash + lineHash : Mixed(hash, lineHash);
     }
     return hash;
 }
@@ -172,7 +172,7 @@ std::uint64_t drd_Canonical::OptionsHash(int keyword) const {
     for (int i = keyword + 1; i < end; ++i) {
         const drd_Keyword& option = deck_.keywords[static_cast<std::size_t>(i)];
         if (option.parent == keyword)
-            options_.emplace_back(option.key, signatures_[static_cast<std::size_t>(i)]);
+            options_.emplace_back(option.Key(), signatures_[static_cast<std::size_t>(i)]);
     }
     // Options of different keywords have no order among each other; those of one keyword have.
     std::stable_sort(options_.begin(), options_.end(),

@@ -46,9 +46,9 @@ void Check::Run() {
     for (const drd_Keyword& keyword : deck_.keywords) Keyword(keyword);
     for (const int keyword : names_.DefinedTwice()) {
         const drd_Keyword& second = deck_.keywords[static_cast<std::size_t>(keyword)];
-        findings_.Add("defined-twice", second.place,
-                      "the " + std::string(drd_WordOf(second.row->defines)) + " " +
-                          drd_Shown(second.Value(drd_NameParameter(*second.row))) + " again",
+        findings_.Add("defined-twice", second.Place(),
+                      "the " + std::string(drd_WordOf(second.Row()->defines)) + " " +
+                          drd_Shown(second.Value(drd_NameParameter(*second.Row()))) + " again",
                       "a name of its own");
     }
     for (std::size_t i = 0; i < deck_.blocks.size(); ++i) {
@@ -67,18 +67,19 @@ void Check::Run() {
 }
 
 void Check::Keyword(const drd_Keyword& keyword) {
-    if (keyword.row == nullptr) {
-        drd_Nearest nearest(keyword.name);
+    if (keyword.Row() == nullptr) {
+        drd_Nearest nearest(keyword.Name());
         for (const drd_KeywordRow& row : drd_KeywordRows()) nearest.Try(row.name);
-        findings_.Add("unknown-keyword", keyword.place, drd_Shown("*" + keyword.name), {}, nearest.Hint());
+        findings_.Add("unknown-keyword", keyword.Place(), drd_Shown("*" + keyword.Name()), {},
+                      nearest.Hint());
         return;
     }
     Place(keyword);
-    if (keyword.row->defines != drd_KindEnm::NONE && keyword.row->defines != drd_KindEnm::CONSTRAINT &&
-        keyword.row->defines != drd_KindEnm::CONTACT_PAIR &&
-        drd_NameOf(keyword.Value(drd_NameParameter(*keyword.row))).empty() && keyword.key != "step") {
-        findings_.Add("name-missing", keyword.place, drd_Shown("*" + keyword.name) + " without a name",
-                      std::string(drd_NameParameter(*keyword.row)) + "=");
+    if (keyword.Row()->defines != drd_KindEnm::NONE && keyword.Row()->defines != drd_KindEnm::CONSTRAINT &&
+        keyword.Row()->defines != drd_KindEnm::CONTACT_PAIR &&
+        !drd_HasName(keyword.Value(drd_NameParameter(*keyword.Row()))) && keyword.Key() != "step") {
+        findings_.Add("name-missing", keyword.Place(), drd_Shown("*" + keyword.Name()) + " without a name",
+                      std::string(drd_NameParameter(*keyword.Row())) + "=");
     }
     Parameters(keyword);
     DataLines(keyword);
@@ -92,42 +93,43 @@ void Check::Place(const drd_Keyword& keyword) {
                            deck_.blocks[static_cast<std::size_t>(keyword.block)].begin)] == &keyword;
     const int block = opens ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent : keyword.block;
     const drd_BlockEnm kind = KindOf(block);
-    if (!keyword.row->MayStandIn(kind) && !keyword.key.starts_with("end")) {
+    if (!keyword.Row()->MayStandIn(kind) && !keyword.Key().starts_with("end")) {
         findings_.Add(
-            "keyword-out-of-place", keyword.place,
-            drd_Shown("*" + keyword.name) + " in " +
+            "keyword-out-of-place", keyword.Place(),
+            drd_Shown("*" + keyword.Name()) + " in " +
                 (kind == drd_BlockEnm::MODEL ? "the model" : "a block *" + std::string(drd_WordOf(kind))));
     }
-    const bool needsOwner = keyword.row->groups != 0 && keyword.parent < 0;
-    if (needsOwner && keyword.key != "damping" && keyword.key != "rebarlayer") {
-        findings_.Add("option-without-owner", keyword.place,
-                      drd_Shown("*" + keyword.name) + " behind no keyword that has it as its option");
+    const bool needsOwner = keyword.Row()->groups != 0 && keyword.parent < 0;
+    if (needsOwner && keyword.Key() != "damping" && keyword.Key() != "rebarlayer") {
+        findings_.Add("option-without-owner", keyword.Place(),
+                      drd_Shown("*" + keyword.Name()) + " behind no keyword that has it as its option");
     }
 }
 
 void Check::Parameters(const drd_Keyword& keyword) {
-    for (const drd_Parameter& parameter : keyword.parameters) {
-        for (const drd_ParameterRef& ref : drd_ParameterRefs()) {
-            if (ref.parameter != parameter.key || !drd_Applies(ref, keyword)) continue;
+    for (const drd_Parameter& parameter : keyword.Parameters()) {
+        for (const drd_ParameterRef& ref : parameter.word->parameterRefs) {
+            if (!drd_Applies(ref, keyword)) continue;
             // What gaskets are made of stands under the name of a material.
-            const bool isGasket = keyword.key == "gasketsection" && parameter.key == "behavior";
+            const bool isGasket = keyword.Key() == "gasketsection" && parameter.Key() == "behavior";
             Reference(ref.ref, isGasket ? drd_KindEnm::MATERIAL : ref.kind, parameter.value, keyword,
-                      keyword.place);
+                      keyword.Place());
         }
     }
 }
 
 void Check::DataLines(const drd_Keyword& keyword) {
     if (keyword.lines == 0) return;
-    for (const drd_DataRef& ref : drd_DataRefs(keyword.key)) {
+    for (const drd_DataRef& ref : keyword.word->dataRefs) {
         if (!drd_Applies(ref, keyword)) continue;
         const auto first = static_cast<std::uint64_t>(ref.firstLine);
-        const std::uint64_t last = ref.lineStep == 0 ? std::min(keyword.lines, first + 1) : keyword.lines;
+        const std::uint64_t last =
+            ref.lineStep == 0 ? std::min<std::uint64_t>(keyword.lines, first + 1) : keyword.lines;
         for (std::uint64_t line = first; line < last; ++line) {
             const std::string_view text = deck_.DataLine(keyword, line);
             const drd_Place place = deck_.DataPlace(keyword, line);
             // The line of an equation that counts its terms.
-            if (keyword.key == "equation" && drd_Field(text, 1).empty()) continue;
+            if (keyword.Key() == "equation" && drd_Field(text, 1).empty()) continue;
             if (ref.column >= 0) {
                 Reference(ref.ref, ref.kind, drd_Field(text, static_cast<std::size_t>(ref.column)), keyword,
                           place);
@@ -142,7 +144,7 @@ void Check::DataLines(const drd_Keyword& keyword) {
 
 void Check::Reference(drd_RefEnm ref, drd_KindEnm kind, std::string_view name, const drd_Keyword& keyword,
                       drd_Place place) {
-    if (drd_NameOf(name).empty()) return;
+    if (!drd_HasName(name)) return;
     double number = 0.0;
     const bool isNumber = drd_ReadReal(name, number);
     if (isNumber && (ref == drd_RefEnm::NAME_UNLESS_NUMBER || ref == drd_RefEnm::NODES_UNLESS_NUMBER)) return;
@@ -152,12 +154,12 @@ void Check::Reference(drd_RefEnm ref, drd_KindEnm kind, std::string_view name, c
     if (names_.Find(ref, kind, name, keyword.block)) return;
     if (isNumber && ref == drd_RefEnm::NODES) {
         findings_.Add("undefined-node", place,
-                      "node " + std::string(name) + " of " + drd_Shown("*" + keyword.name));
+                      "node " + std::string(name) + " of " + drd_Shown("*" + keyword.Name()));
         return;
     }
     if (isNumber && ref == drd_RefEnm::ELEMENTS) {
         findings_.Add("undefined-element", place,
-                      "element " + std::string(name) + " of " + drd_Shown("*" + keyword.name));
+                      "element " + std::string(name) + " of " + drd_Shown("*" + keyword.Name()));
         return;
     }
     const drd_CodeName code = kind == drd_KindEnm::NODE_SET || kind == drd_KindEnm::ELEMENT_SET
@@ -168,7 +170,7 @@ void Check::Reference(drd_RefEnm ref, drd_KindEnm kind, std::string_view name, c
     std::string hint = findings_.Wants(code) ? names_.Nearest(kind, name) : std::string();
     findings_.Add(code, place,
                   "the " + std::string(drd_WordOf(kind)) + " " + drd_Shown(name) + " of " +
-                      drd_Shown("*" + keyword.name),
+                      drd_Shown("*" + keyword.Name()),
                   {}, std::move(hint));
 }
 
@@ -176,20 +178,20 @@ void Check::Section(const drd_Keyword& keyword) {
     constexpr std::string_view kOfMaterial[] = {"solidsection", "shellsection", "beamsection",
                                                 "membranesection", "gasketsection"};
     constexpr std::string_view kInstead[] = {"material", "composite", "behavior", "user"};
-    if (std::find(std::begin(kOfMaterial), std::end(kOfMaterial), keyword.key) == std::end(kOfMaterial))
+    if (std::find(std::begin(kOfMaterial), std::end(kOfMaterial), keyword.Key()) == std::end(kOfMaterial))
         return;
     for (const std::string_view parameter : kInstead) {
         if (keyword.Find(parameter) != nullptr) return;
     }
-    findings_.Add("section-without-material", keyword.place,
-                  drd_Shown("*" + keyword.name) + " without a material", "material=");
+    findings_.Add("section-without-material", keyword.Place(),
+                  drd_Shown("*" + keyword.Name()) + " without a material", "material=");
 }
 
 void Check::Placement(const drd_Keyword& keyword) {
-    if (keyword.key != "instance") return;
+    if (keyword.Key() != "instance") return;
     drd_Placement placement;
     if (!drd_PlacementOf(deck_, deck_.blocks[static_cast<std::size_t>(keyword.block)], placement)) {
-        findings_.Add("placement-wrong", keyword.place,
+        findings_.Add("placement-wrong", keyword.Place(),
                       "the lines of the instance " + drd_Shown(keyword.Value("name")),
                       "a translation, and two points of an axis with an angle");
     }
@@ -260,9 +262,9 @@ std::vector<char> Check::CoveredElements(int block) const {
         const int last = user == 0 ? static_cast<int>(deck_.keywords.size()) : owner.last;
         for (int i = std::max(owner.begin, 0); i < last; ++i) {
             const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(i)];
-            const bool isSection = keyword.row != nullptr &&
-                                   (keyword.row->owns == drd_GroupEnm::SECTION || keyword.key == "mass" ||
-                                    keyword.key == "rotaryi" || keyword.key == "uelproperty");
+            const bool isSection = keyword.Row() != nullptr &&
+                                   (keyword.Row()->owns == drd_GroupEnm::SECTION || keyword.Key() == "mass" ||
+                                    keyword.Key() == "rotaryi" || keyword.Key() == "uelproperty");
             if (!isSection || keyword.block != user) continue;
             const drd_Target set = names_.Find(drd_KindEnm::ELEMENT_SET, keyword.Value("elset"), user);
             if (set.set < 0) continue;
@@ -325,13 +327,13 @@ void Check::Sets() {
             SetPart(part);
             const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(part.keyword)];
             isEmpty = isEmpty && part.count == 0 && part.members.empty() && keyword.Find("elset") == nullptr;
-            isEmpty = isEmpty || (keyword.key == "elset" && part.count == 0 && part.members.empty());
+            isEmpty = isEmpty || (keyword.Key() == "elset" && part.count == 0 && part.members.empty());
         }
         if (!isEmpty) continue;
         const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(
             deck_.setParts[static_cast<std::size_t>(set.parts[0])].keyword)];
-        if (keyword.key == "node" || keyword.key == "element") continue;
-        findings_.Add("empty-set-in-deck", keyword.place,
+        if (keyword.Key() == "node" || keyword.Key() == "element") continue;
+        findings_.Add("empty-set-in-deck", keyword.Place(),
                       "the " + std::string(drd_WordOf(set.kind)) + " " +
                           drd_Shown(std::string_view(set.name)) + " has no members");
     }
@@ -341,7 +343,7 @@ void Check::SetPart(const drd_SetPart& part) {
     const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(part.keyword)];
     const bool isNodes = part.kind == drd_KindEnm::NODE_SET;
     if (part.name.empty()) {
-        findings_.Add("name-missing", keyword.place, drd_Shown("*" + keyword.name) + " without a name",
+        findings_.Add("name-missing", keyword.Place(), drd_Shown("*" + keyword.Name()) + " without a name",
                       isNodes ? "nset=" : "elset=");
     }
     int owner = part.block;
@@ -351,7 +353,7 @@ void Check::SetPart(const drd_SetPart& part) {
     }
     for (const drd_Word member : part.members) {
         Reference(isNodes ? drd_RefEnm::NODES : drd_RefEnm::ELEMENTS, part.kind, member, keyword,
-                  keyword.place);
+                  keyword.Place());
     }
     const int block = names_.MeshBlock(owner);
     const drd_LabelIndex* index = isNodes ? names_.Nodes(block) : names_.Elements(block);
@@ -368,9 +370,9 @@ void Check::SetPart(const drd_SetPart& part) {
                               drd_Shown(std::string_view(part.name)) +
                               (missing > 1 ? " and " + std::to_string(missing - 1) + " more" : std::string());
     if (isNodes) {
-        findings_.Add("undefined-node", keyword.place, found);
+        findings_.Add("undefined-node", keyword.Place(), found);
     } else {
-        findings_.Add("undefined-element", keyword.place, found);
+        findings_.Add("undefined-element", keyword.Place(), found);
     }
 }
 

@@ -7,9 +7,10 @@
 #include <numbers>
 
 const drd_Parameter* drd_Keyword::Find(std::string_view parameter) const {
-    const auto found = std::find_if(parameters.begin(), parameters.end(),
-                                    [parameter](const drd_Parameter& p) { return p.key == parameter; });
-    return found == parameters.end() ? nullptr : &*found;
+    for (const drd_Parameter& own : Parameters()) {
+        if (own.Key() == parameter) return &own;
+    }
+    return nullptr;
 }
 
 std::string_view drd_Keyword::Value(std::string_view parameter) const {

@@ -13,12 +13,26 @@
 #include <string_view>
 #include <vector>
 
+/// A word of keyword lines as it is spelled, once for all lines that have it, with what is known of it: as a
+/// keyword and as a parameter.
+struct drd_Spelling {
+    drd_Word name;                       ///< as it stands
+    drd_Word key;                        ///< folded (drd_FoldKey)
+    const drd_KeywordRow* row = nullptr; ///< null: no known keyword
+    const drd_BlockMark* mark = nullptr; ///< null: begins and ends no block
+    drd_DataEnm data = drd_DataEnm::LINES;
+    std::span<const drd_DataRef> dataRefs;
+    std::span<const drd_ParameterRef> parameterRefs;
+};
+
 /// A parameter of a keyword line.
 struct drd_Parameter {
-    drd_Word name;  ///< as it stands
-    drd_Word key;   ///< folded (drd_FoldKey)
-    drd_Word value; ///< as it stands, quotes included, without blanks around it
-    bool hasValue = false;
+    const drd_Spelling* word;
+    drd_Word value; ///< as it stands, quotes included, without blanks around it; null when there is none
+
+    drd_Word Name() const { return word->name; }
+    drd_Word Key() const { return word->key; }
+    bool HasValue() const { return value.data() != nullptr; }
 };
 
 /// A line of text that is kept as it stands.
@@ -39,19 +53,27 @@ struct drd_Comment {
 /// A keyword line with what belongs to it. Data of nodes, elements and sets are in the arrays of the mesh and
 /// of the set, all other lines in drd_Deck::lines.
 struct drd_Keyword {
-    drd_Word name;                       ///< as it stands
-    drd_Word key;                        ///< folded
-    const drd_KeywordRow* row = nullptr; ///< null: unknown
-    std::span<const drd_Parameter> parameters;
-    drd_Place place;
+    const drd_Spelling* word = nullptr;
+    drd_Line header{}; ///< the keyword line as it stands, continuations included
+    const drd_Parameter* firstParameter = nullptr;
+    std::uint32_t parameterCount = 0;
+    std::uint32_t lines = 0;
+    std::uint64_t firstLine = 0;
     int block = 0;   ///< where it stands, index of drd_Deck::blocks
     int parent = -1; ///< the keyword that it is an option of
     int end = 0;     ///< one past the last of its options
-    std::uint64_t firstLine = 0;
-    std::uint64_t lines = 0;
-    drd_Line header{}; ///< the keyword line as it stands, continuations included
-    int set = -1;      ///< of a set: index of drd_Deck::setParts
-    bool isBulk = false;
+    int set = -1;    ///< of a set: index of drd_Deck::setParts
+
+    drd_Word Name() const { return word->name; }
+    drd_Word Key() const { return word->key; }
+    /// Null: unknown.
+    const drd_KeywordRow* Row() const { return word->row; }
+    drd_Place Place() const { return {header.file, static_cast<long>(header.line)}; }
+    std::span<const drd_Parameter> Parameters() const { return {firstParameter, parameterCount}; }
+    /// Whether the data are in the arrays of a mesh or of sets.
+    bool IsBulk() const { return word->data > drd_DataEnm::TEXT; }
+    /// Whether the data lines are text for people.
+    bool HasText() const { return word->data == drd_DataEnm::TEXT; }
 
     const drd_Parameter* Find(std::string_view parameter) const;
     /// The value of a parameter as it stands; empty when there is none.
@@ -107,11 +129,11 @@ drd_Place drd_PlaceOf(const std::vector<drd_PlaceRun>& runs, std::uint64_t recor
 /// last, step) when they are generated.
 struct drd_SetPart {
     drd_KindEnm kind = drd_KindEnm::NODE_SET;
+    bool isGenerated = false;
     int keyword = -1; ///< -1 for none
     int block = 0;
-    drd_Word name;     ///< without quotes
-    drd_Word instance; ///< without quotes; "": none
-    bool isGenerated = false;
+    drd_Word name;           ///< without quotes
+    drd_Word instance;       ///< without quotes; "": none
     std::uint64_t first = 0; ///< index of drd_Deck::labels
     std::uint64_t count = 0;
     std::span<const drd_Word> members; ///< names of sets, and labels of instances, as they stand

@@ -125,12 +125,12 @@ void drd_Differ::Blocks(Pair parents, const Context& context) {
         for (const int block : match.onlyFirst) {
             const drd_Block& only = First().blocks[static_cast<std::size_t>(block)];
             Tell(drd_ChangeEnm::REMOVED, LowerWord(kind), ContextOf(context, only) + "removed",
-                 FirstKeyword(only.begin).place, drd_Nowhere);
+                 FirstKeyword(only.begin).Place(), drd_Nowhere);
         }
         for (const int block : match.onlySecond) {
             const drd_Block& only = Second().blocks[static_cast<std::size_t>(block)];
             Tell(drd_ChangeEnm::ADDED, LowerWord(kind), ContextOf(context, only) + "added", drd_Nowhere,
-                 SecondKeyword(only.begin).place);
+                 SecondKeyword(only.begin).Place());
         }
         if (kind == drd_BlockEnm::STEP) StepOrder(match, context);
         for (const Pair& pair : match.pairs) {
@@ -150,7 +150,7 @@ void drd_Differ::StepOrder(const Match& steps, const Context& context) {
         const drd_Block& second = Second().blocks[static_cast<std::size_t>(steps.pairs[i].second)];
         Tell(drd_ChangeEnm::MOVED, "step",
              ContextOf(context, first) + "stands in another place among the steps",
-             FirstKeyword(first.begin).place, SecondKeyword(second.begin).place);
+             FirstKeyword(first.begin).Place(), SecondKeyword(second.begin).Place());
     }
 }
 
@@ -213,7 +213,8 @@ void drd_Differ::RenamesOfBlock(Pair blocks) {
         Items items;
         for (const int item : deck.ItemsOf(block)) {
             const drd_Keyword& keyword = deck.Deck().keywords[static_cast<std::size_t>(item)];
-            if (keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE) items.push_back(item);
+            if (keyword.Row() != nullptr && keyword.Row()->defines != drd_KindEnm::NONE)
+                items.push_back(item);
         }
         return items;
     };
@@ -224,7 +225,7 @@ void drd_Differ::RenamesOfBlock(Pair blocks) {
         const int partner = bySignature.Take(first_.NamelessSignature(item));
         if (partner < 0) continue;
         const drd_Keyword& keyword = FirstKeyword(item);
-        const std::string_view parameter = drd_NameParameter(*keyword.row);
+        const std::string_view parameter = drd_NameParameter(*keyword.Row());
         std::string before = drd_FoldName(keyword.Value(parameter));
         std::string after = drd_FoldName(SecondKeyword(partner).Value(parameter));
         const drd_Block& block = First().blocks[static_cast<std::size_t>(blocks.first)];

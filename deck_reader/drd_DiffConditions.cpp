@@ -49,9 +49,9 @@ std::vector<drd_Differ::Condition> drd_Differ::ConditionsOf(const drd_Canonical&
         const drd_Keyword& keyword = deck.Deck().keywords[static_cast<std::size_t>(item)];
         std::vector<std::string> texts;
         std::string variant; // what makes two lines on one target different things
-        for (const drd_Parameter& parameter : keyword.parameters) {
-            texts.push_back(parameter.key + "=" + drd_FoldName(parameter.value));
-            if (parameter.key == "loadcase" || parameter.key == "type" || parameter.key == "variable") {
+        for (const drd_Parameter& parameter : keyword.Parameters()) {
+            texts.push_back(parameter.Key() + "=" + drd_FoldName(parameter.value));
+            if (parameter.Key() == "loadcase" || parameter.Key() == "type" || parameter.Key() == "variable") {
                 variant += "/" + texts.back();
             }
         }
@@ -111,7 +111,7 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
         if (partner < 0) {
             Tell(drd_ChangeEnm::REMOVED, std::string(word.word),
                  context + WordsOf(First(), condition, word) + " removed",
-                 condition.line < 0 ? FirstKeyword(condition.keyword).place
+                 condition.line < 0 ? FirstKeyword(condition.keyword).Place()
                                     : First().DataPlace(FirstKeyword(condition.keyword),
                                                         static_cast<std::uint64_t>(condition.line)),
                  drd_Nowhere);
@@ -130,7 +130,7 @@ void drd_Differ::CompareConditions(const Items& first, const Items& second, cons
                 std::string(drd_Trim(Second().DataLine(keyword, static_cast<std::uint64_t>(after[i].line))));
         }
         Tell(drd_ChangeEnm::ADDED, std::string(word.word), std::move(text), drd_Nowhere,
-             after[i].line < 0 ? keyword.place
+             after[i].line < 0 ? keyword.Place()
                                : Second().DataPlace(keyword, static_cast<std::uint64_t>(after[i].line)));
     }
 }
@@ -141,28 +141,30 @@ void drd_Differ::CompareCondition(const Condition& first, const Condition& secon
     const drd_Keyword& after = SecondKeyword(second.keyword);
     const std::string what = context + WordsOf(First(), first, word) + ": ";
     const auto placeOf = [](const drd_Deck& deck, const drd_Keyword& keyword, std::int64_t line) {
-        return line < 0 ? keyword.place : deck.DataPlace(keyword, static_cast<std::uint64_t>(line));
+        return line < 0 ? keyword.Place() : deck.DataPlace(keyword, static_cast<std::uint64_t>(line));
     };
     const drd_Place a = placeOf(First(), before, first.line);
     const drd_Place b = placeOf(Second(), after, second.line);
     if (first.parameters != second.parameters) {
-        for (const drd_Parameter& parameter : before.parameters) {
-            const drd_Parameter* now = after.Find(parameter.key);
+        for (const drd_Parameter& parameter : before.Parameters()) {
+            const drd_Parameter* now = after.Find(parameter.Key());
             if (now == nullptr) {
                 Tell(drd_ChangeEnm::CHANGED, std::string(word.word),
-                     what + "no longer " + parameter.key + (parameter.hasValue ? "=" + parameter.value : ""),
+                     what + "no longer " + parameter.Key() +
+                         (parameter.HasValue() ? "=" + parameter.value : ""),
                      a, b);
             } else if (!AreNear(parameter.value, now->value)) {
                 Tell(drd_ChangeEnm::CHANGED, std::string(word.word),
-                     what + parameter.key + "=" + parameter.value + " became " + now->key + "=" + now->value,
+                     what + parameter.Key() + "=" + parameter.value + " became " + now->Key() + "=" +
+                         now->value,
                      a, b);
             }
         }
-        for (const drd_Parameter& parameter : after.parameters) {
-            if (before.Find(parameter.key) != nullptr) continue;
+        for (const drd_Parameter& parameter : after.Parameters()) {
+            if (before.Find(parameter.Key()) != nullptr) continue;
             Tell(drd_ChangeEnm::CHANGED, std::string(word.word),
-                 what + "now with " + parameter.key + (parameter.hasValue ? "=" + parameter.value : ""), a,
-                 b);
+                 what + "now with " + parameter.Key() + (parameter.HasValue() ? "=" + parameter.value : ""),
+                 a, b);
         }
     }
     if (first.line < 0 || second.line < 0) return;

@@ -6,8 +6,8 @@
 namespace {
 
 bool HasName(const drd_Keyword& keyword) {
-    return keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE &&
-           keyword.Find(drd_NameParameter(*keyword.row)) != nullptr;
+    return keyword.Row() != nullptr && keyword.Row()->defines != drd_KindEnm::NONE &&
+           keyword.Find(drd_NameParameter(*keyword.Row())) != nullptr;
 }
 
 std::string Shortened(std::string_view text) {
@@ -28,19 +28,19 @@ std::vector<int> drd_Without(std::span<const int> items, std::vector<int>& taken
 }
 
 bool drd_Differ::IsIgnored(const drd_Keyword& keyword) const {
-    return (options_.ignoreOutput && keyword.row != nullptr &&
-            (keyword.row->owns == drd_GroupEnm::OUTPUT || keyword.row->IsOptionOf(drd_GroupEnm::OUTPUT) ||
-             keyword.key == "restart" || keyword.key == "print" || keyword.key == "monitor")) ||
-           (options_.ignoreTitles && keyword.key == "heading");
+    return (options_.ignoreOutput && keyword.Row() != nullptr &&
+            (keyword.Row()->owns == drd_GroupEnm::OUTPUT || keyword.Row()->IsOptionOf(drd_GroupEnm::OUTPUT) ||
+             keyword.Key() == "restart" || keyword.Key() == "print" || keyword.Key() == "monitor")) ||
+           (options_.ignoreTitles && keyword.Key() == "heading");
 }
 
 std::string drd_Differ::NameOfItem(const drd_Keyword& keyword) const {
     std::string text;
     if (HasName(keyword)) {
-        return std::string(drd_WordOf(keyword.row->defines)) + " " +
-               drd_NameOf(keyword.Value(drd_NameParameter(*keyword.row)));
+        return std::string(drd_WordOf(keyword.Row()->defines)) + " " +
+               drd_NameOf(keyword.Value(drd_NameParameter(*keyword.Row())));
     }
-    text = "*" + keyword.name;
+    text = "*" + keyword.Name();
     for (const std::string_view parameter : {"elset", "nset", "surface", "master", "refnode", "interaction",
                                              "cavity", "constraintname", "component", "type"}) {
         if (keyword.Find(parameter) == nullptr) continue;
@@ -61,7 +61,7 @@ void drd_Differ::CompareItems(ItemView first, ItemView second, const Context& co
     std::vector<Alike> kinds;
     drd_TextMap index;
     const auto listsOf = [&](const drd_Keyword& keyword) -> Alike& {
-        const auto [place, isNew] = index.TryEmplace(keyword.key, static_cast<int>(kinds.size()));
+        const auto [place, isNew] = index.TryEmplace(keyword.Key(), static_cast<int>(kinds.size()));
         if (isNew) kinds.emplace_back();
         return kinds[static_cast<std::size_t>(place)];
     };
@@ -84,7 +84,7 @@ void drd_Differ::CompareAlike(const Items& first, const Items& second, const Con
         match = MatchBySignature(first, second);
         TellMoved(match.pairs, context);
         match.pairs.clear();
-        if (const drd_ConditionWord* word = drd_FindCondition(sample.key)) {
+        if (const drd_ConditionWord* word = drd_FindCondition(sample.Key())) {
             CompareConditions(match.onlyFirst, match.onlySecond, *word, context);
             return;
         }
@@ -104,7 +104,7 @@ void drd_Differ::CompareAlike(const Items& first, const Items& second, const Con
 drd_Differ::Match drd_Differ::MatchByName(const Items& first, const Items& second) const {
     return MatchByKey(first, second, [](const drd_Canonical& deck, int item) {
         const drd_Keyword& keyword = deck.Keyword(item);
-        return keyword.key + "/" + deck.Name(keyword.Value(drd_NameParameter(*keyword.row)));
+        return keyword.Key() + "/" + deck.Name(keyword.Value(drd_NameParameter(*keyword.Row())));
     });
 }
 
@@ -127,10 +127,10 @@ void drd_Differ::MatchRenamed(Match& match, const Context& context) {
         }
         taken.push_back(partner);
         const drd_Keyword& after = SecondKeyword(partner);
-        Tell(drd_ChangeEnm::RENAMED, std::string(drd_WordOf(after.row->defines)),
+        Tell(drd_ChangeEnm::RENAMED, std::string(drd_WordOf(after.Row()->defines)),
              context + NameOfItem(FirstKeyword(item)) + " is now called " +
-                 drd_NameOf(after.Value(drd_NameParameter(*after.row))),
-             FirstKeyword(item).place, after.place);
+                 drd_NameOf(after.Value(drd_NameParameter(*after.Row()))),
+             FirstKeyword(item).Place(), after.Place());
     }
     match.onlyFirst = std::move(left);
     match.onlySecond = drd_Without(match.onlySecond, taken);
@@ -144,30 +144,30 @@ void drd_Differ::TellMoved(std::vector<Pair> pairs, const Context& context) {
     for (std::size_t i = 0; i < stays.size(); ++i) {
         if (stays[i] != 0) continue;
         const drd_Keyword& keyword = FirstKeyword(pairs[i].first);
-        const drd_ConditionWord* word = drd_FindCondition(keyword.key);
+        const drd_ConditionWord* word = drd_FindCondition(keyword.Key());
         std::string what = NameOfItem(keyword);
         if (word != nullptr && keyword.lines > 0) {
             what = std::string(word->word) + " on " + drd_NameOf(drd_Field(First().DataLine(keyword, 0), 0));
         }
-        Tell(drd_ChangeEnm::MOVED, word != nullptr ? std::string(word->word) : "*" + keyword.name,
-             context + what + " stands in another place", keyword.place,
-             SecondKeyword(pairs[i].second).place);
+        Tell(drd_ChangeEnm::MOVED, word != nullptr ? std::string(word->word) : "*" + keyword.Name(),
+             context + what + " stands in another place", keyword.Place(),
+             SecondKeyword(pairs[i].second).Place());
     }
 }
 
 void drd_Differ::TellLonely(const Match& match, const Context& context) {
     const auto kindOf = [](const drd_Keyword& keyword) {
-        return HasName(keyword) ? std::string(drd_WordOf(keyword.row->defines)) : "*" + keyword.name;
+        return HasName(keyword) ? std::string(drd_WordOf(keyword.Row()->defines)) : "*" + keyword.Name();
     };
     for (const int item : match.onlyFirst) {
         const drd_Keyword& keyword = FirstKeyword(item);
         Tell(drd_ChangeEnm::REMOVED, kindOf(keyword), context + NameOfItem(keyword) + " removed",
-             keyword.place, drd_Nowhere);
+             keyword.Place(), drd_Nowhere);
     }
     for (const int item : match.onlySecond) {
         const drd_Keyword& keyword = SecondKeyword(item);
         Tell(drd_ChangeEnm::ADDED, kindOf(keyword), context + NameOfItem(keyword) + " added", drd_Nowhere,
-             keyword.place);
+             keyword.Place());
     }
 }
 
@@ -193,22 +193,24 @@ bool drd_Differ::AreNear(std::string_view first, std::string_view second) const 
 void drd_Differ::CompareParameters(Pair keywords, const Context& context) {
     const drd_Keyword& first = FirstKeyword(keywords.first);
     const drd_Keyword& second = SecondKeyword(keywords.second);
-    const auto shown = [](const drd_Parameter& p) { return p.hasValue ? p.key + "=" + p.value : p.key; };
-    const std::string kind = "*" + first.name;
-    for (const drd_Parameter& before : first.parameters) {
-        const drd_Parameter* after = second.Find(before.key);
+    const auto shown = [](const drd_Parameter& p) {
+        return p.HasValue() ? p.Key() + "=" + p.value : p.Key();
+    };
+    const std::string kind = "*" + first.Name();
+    for (const drd_Parameter& before : first.Parameters()) {
+        const drd_Parameter* after = second.Find(before.Key());
         if (after == nullptr) {
-            Tell(drd_ChangeEnm::REMOVED, kind, context + shown(before) + " is gone", first.place,
-                 second.place);
-        } else if (before.hasValue != after->hasValue || !AreNear(before.value, after->value)) {
+            Tell(drd_ChangeEnm::REMOVED, kind, context + shown(before) + " is gone", first.Place(),
+                 second.Place());
+        } else if (before.HasValue() != after->HasValue() || !AreNear(before.value, after->value)) {
             // What the assembly or a step is called is told by its block.
             Tell(drd_ChangeEnm::CHANGED, kind, context + shown(before) + " became " + shown(*after),
-                 first.place, second.place);
+                 first.Place(), second.Place());
         }
     }
-    for (const drd_Parameter& after : second.parameters) {
-        if (first.Find(after.key) != nullptr) continue;
-        Tell(drd_ChangeEnm::ADDED, kind, context + shown(after) + " is new", first.place, second.place);
+    for (const drd_Parameter& after : second.Parameters()) {
+        if (first.Find(after.Key()) != nullptr) continue;
+        Tell(drd_ChangeEnm::ADDED, kind, context + shown(after) + " is new", first.Place(), second.Place());
     }
 }
 
@@ -243,17 +245,17 @@ void drd_Differ::CompareFields(std::string_view first, std::string_view second, 
         text = "\"" + Shortened(first) + "\" became \"" + Shortened(second) + "\"";
     }
     Tell(drd_ChangeEnm::CHANGED,
-         HasName(keyword) ? std::string(drd_WordOf(keyword.row->defines)) : "*" + keyword.name,
+         HasName(keyword) ? std::string(drd_WordOf(keyword.Row()->defines)) : "*" + keyword.Name(),
          context + text, First().DataPlace(keyword, line), Second().DataPlace(other, line));
 }
 
 void drd_Differ::CompareLines(Pair keywords, const Context& context) {
     const drd_Keyword& first = FirstKeyword(keywords.first);
     const drd_Keyword& second = SecondKeyword(keywords.second);
-    if (drd_HasText(first.key) && options_.ignoreTitles) return;
+    if (first.HasText() && options_.ignoreTitles) return;
     const std::uint64_t before = first_.LineCount(first);
     const std::uint64_t after = second_.LineCount(second);
-    if (before == after && !drd_HasText(first.key) && first.key != "surface") {
+    if (before == after && !first.HasText() && first.Key() != "surface") {
         for (std::uint64_t i = 0; i < before; ++i) {
             CompareFields(First().DataLine(first, i), Second().DataLine(second, i), i, keywords, context);
         }
@@ -264,7 +266,7 @@ void drd_Differ::CompareLines(Pair keywords, const Context& context) {
         std::vector<std::string> lines;
         for (std::uint64_t i = 0; i < count; ++i) {
             std::string line(drd_Trim(deck.DataLine(keyword, i)));
-            lines.push_back(drd_HasText(keyword.key) ? line : drd_FoldName(line));
+            lines.push_back(keyword.HasText() ? line : drd_FoldName(line));
         }
         return lines;
     };
@@ -284,9 +286,9 @@ void drd_Differ::CompareLines(Pair keywords, const Context& context) {
     };
     if (before == ahead + behind && after == ahead + behind) return;
     Tell(drd_ChangeEnm::CHANGED,
-         HasName(first) ? std::string(drd_WordOf(first.row->defines)) : "*" + first.name,
+         HasName(first) ? std::string(drd_WordOf(first.Row()->defines)) : "*" + first.Name(),
          context + said(First(), first, ahead, before - ahead - behind) + " became " +
              said(Second(), second, ahead, after - ahead - behind),
-         ahead < before ? First().DataPlace(first, ahead) : first.place,
-         ahead < after ? Second().DataPlace(second, ahead) : second.place);
+         ahead < before ? First().DataPlace(first, ahead) : first.Place(),
+         ahead < after ? Second().DataPlace(second, ahead) : second.Place());
 }

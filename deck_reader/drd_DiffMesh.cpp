@@ -270,7 +270,7 @@ private:
 drd_Place PlaceOfSet(const drd_Deck& deck, const drd_Set& set) {
     return deck
         .keywords[static_cast<std::size_t>(deck.setParts[static_cast<std::size_t>(set.parts[0])].keyword)]
-        .place;
+        .Place();
 }
 
 } // namespace

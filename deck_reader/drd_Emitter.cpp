@@ -51,13 +51,13 @@ void drd_Emitter::Keyword(std::string_view name, std::span<const drd_Parameter> 
     for (const drd_Parameter& parameter : parameters) {
         text_.append(", ");
         // What begins with anything but a letter would be a line of data there.
-        if (text_.size() - begin > kKeywordBytes && !parameter.name.empty() &&
-            drd_IsLetter(parameter.name.front())) {
+        if (text_.size() - begin > kKeywordBytes && !parameter.Name().empty() &&
+            drd_IsLetter(parameter.Name().front())) {
             text_.push_back('\n');
             begin = text_.size();
         }
-        text_.append(parameter.name);
-        if (parameter.hasValue) text_.append("=").append(parameter.value);
+        text_.append(parameter.Name());
+        if (parameter.HasValue()) text_.append("=").append(parameter.value);
     }
     EndLine();
 }
@@ -116,22 +116,25 @@ public:
 
 private:
     void Keyword(const drd_Keyword& keyword) {
-        std::vector<drd_Parameter> parameters(keyword.parameters.begin(), keyword.parameters.end());
+        std::vector<drd_Parameter> parameters(keyword.Parameters().begin(), keyword.Parameters().end());
         values_.Clear();
         const bool isListed = keyword.set >= 0 && List(deck_.setParts[static_cast<std::size_t>(keyword.set)]);
         std::erase_if(parameters, [isListed](const drd_Parameter& p) {
-            return p.name.empty() || (isListed && p.key == "generate");
+            return p.Name().empty() || (isListed && p.Key() == "generate");
         });
         std::stable_sort(parameters.begin(), parameters.end(),
-                         [](const auto& a, const auto& b) { return a.key < b.key; });
-        for (drd_Parameter& parameter : parameters) parameter.value = values_.Keep(Value(parameter.value));
-        const std::string name(keyword.row != nullptr ? keyword.row->name : std::string_view(keyword.name));
+                         [](const auto& a, const auto& b) { return a.Key() < b.Key(); });
+        for (drd_Parameter& parameter : parameters) {
+            if (parameter.HasValue()) parameter.value = values_.Keep(Value(parameter.value));
+        }
+        const std::string name(keyword.Row() != nullptr ? keyword.Row()->name
+                                                        : std::string_view(keyword.Name()));
         emitter_.Keyword(name, parameters);
-        if (keyword.isBulk) {
+        if (keyword.IsBulk()) {
             Bulk(keyword);
             return;
         }
-        const bool isText = drd_HasText(keyword.key) || keyword.row == nullptr;
+        const bool isText = keyword.HasText() || keyword.Row() == nullptr;
         for (std::uint64_t i = 0; i < keyword.lines; ++i) {
             const std::string_view line = deck_.DataLine(keyword, i);
             emitter_.Line(isText ? std::string(line) : Fields(line));
@@ -160,9 +163,9 @@ private:
     void Bulk(const drd_Keyword& keyword) {
         const int index = static_cast<int>(&keyword - deck_.keywords.data());
         const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(keyword.block)]);
-        if (keyword.key == "node" && mesh != nullptr) {
+        if (keyword.Key() == "node" && mesh != nullptr) {
             Nodes(*mesh, index);
-        } else if (keyword.key == "element" && mesh != nullptr) {
+        } else if (keyword.Key() == "element" && mesh != nullptr) {
             Elements(*mesh, index);
         } else if (keyword.set >= 0) {
             Set(deck_.setParts[static_cast<std::size_t>(keyword.set)]);

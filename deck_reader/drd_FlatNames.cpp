@@ -79,9 +79,9 @@ void drd_FlatNames::TakeNames() {
         if (stays(set.block)) taken_.insert(drd_FoldCase(set.name));
     }
     for (const drd_Keyword& keyword : deck_.keywords) {
-        if (keyword.row == nullptr || keyword.row->defines == drd_KindEnm::NONE || !stays(keyword.block))
+        if (keyword.Row() == nullptr || keyword.Row()->defines == drd_KindEnm::NONE || !stays(keyword.block))
             continue;
-        taken_.insert(drd_FoldName(keyword.Value(drd_NameParameter(*keyword.row))));
+        taken_.insert(drd_FoldName(keyword.Value(drd_NameParameter(*keyword.Row()))));
     }
 }
 

@@ -86,10 +86,10 @@ void Flattener::NameAll() {
                 const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(k)];
                 if (keyword.set >= 0) {
                     flat_.NameIn(instance, deck_.setParts[static_cast<std::size_t>(keyword.set)].name);
-                } else if (keyword.isBulk) {
-                    const std::string_view own = keyword.Value(keyword.key == "node" ? "nset" : "elset");
+                } else if (keyword.IsBulk()) {
+                    const std::string_view own = keyword.Value(keyword.Key() == "node" ? "nset" : "elset");
                     if (!own.empty()) flat_.NameIn(instance, drd_NameOf(own));
-                } else if (keyword.key == "surface" || keyword.key == "orientation") {
+                } else if (keyword.Key() == "surface" || keyword.Key() == "orientation") {
                     flat_.NameIn(instance, drd_NameOf(keyword.Value("name")));
                 }
             }
@@ -111,8 +111,8 @@ void Flattener::Table() {
 }
 
 bool Flattener::IsDropped(const drd_Keyword& keyword) const {
-    return keyword.key == "assembly" || keyword.key == "endassembly" || keyword.key == "endinstance" ||
-           keyword.key == "part" || keyword.key == "endpart" || keyword.key == "instance";
+    return keyword.Key() == "assembly" || keyword.Key() == "endassembly" || keyword.Key() == "endinstance" ||
+           keyword.Key() == "part" || keyword.Key() == "endpart" || keyword.Key() == "instance";
 }
 
 void Flattener::Comments(int keyword) {
@@ -148,7 +148,7 @@ void Flattener::Walk() {
     for (std::size_t i = 0; i < deck_.blocks.size(); ++i) {
         const drd_Block& block = deck_.blocks[i];
         if (block.kind != drd_BlockEnm::PART || isUsed[i] != 0) continue;
-        findings_.Add("flat-left-out", deck_.keywords[static_cast<std::size_t>(block.begin)].place,
+        findings_.Add("flat-left-out", deck_.keywords[static_cast<std::size_t>(block.begin)].Place(),
                       "the part " + drd_Shown(std::string_view(block.name)) + " has no instance");
     }
 }
@@ -158,7 +158,7 @@ void Flattener::Instance(int block) {
     Place place;
     place.instance = block;
     if (!drd_PlacementOf(deck_, instance, place.placement)) {
-        findings_.Add("placement-wrong", deck_.keywords[static_cast<std::size_t>(instance.begin)].place,
+        findings_.Add("placement-wrong", deck_.keywords[static_cast<std::size_t>(instance.begin)].Place(),
                       "the lines of the instance " + drd_Shown(std::string_view(instance.name)));
     }
     emitter_.Line("** Instance " + instance.name);
@@ -179,22 +179,22 @@ void Flattener::Instance(int block) {
 
 void Flattener::CheckExpressible(const drd_Keyword& keyword, const Place& place) {
     const bool isTurned = place.placement.degrees != 0.0;
-    if (keyword.row == nullptr) {
-        findings_.Add("flat-as-it-stands", keyword.place, drd_Shown("*" + keyword.name));
+    if (keyword.Row() == nullptr) {
+        findings_.Add("flat-as-it-stands", keyword.Place(), drd_Shown("*" + keyword.Name()));
     }
-    if (keyword.key == "node" && keyword.Find("system") != nullptr) {
-        findings_.Add("flat-left-out", keyword.place, "nodes in a system of their own", {},
+    if (keyword.Key() == "node" && keyword.Find("system") != nullptr) {
+        findings_.Add("flat-left-out", keyword.Place(), "nodes in a system of their own", {},
                       "their coordinates are taken for rectangular ones");
     }
-    if (isTurned && keyword.key == "rotaryi" && keyword.Find("orientation") == nullptr) {
-        findings_.Add("flat-left-out", keyword.place, "the inertia of a turned instance has no orientation",
+    if (isTurned && keyword.Key() == "rotaryi" && keyword.Find("orientation") == nullptr) {
+        findings_.Add("flat-left-out", keyword.Place(), "the inertia of a turned instance has no orientation",
                       {}, "its axes are taken for those of the assembly");
     }
     const bool hasDirections =
-        keyword.key == "equation" || keyword.key == "cload" || keyword.key == "boundary";
+        keyword.Key() == "equation" || keyword.Key() == "cload" || keyword.Key() == "boundary";
     if (isTurned && hasDirections) {
-        findings_.Add("flat-as-it-stands", keyword.place,
-                      drd_Shown("*" + keyword.name) + " of a turned instance names directions");
+        findings_.Add("flat-as-it-stands", keyword.Place(),
+                      drd_Shown("*" + keyword.Name()) + " of a turned instance names directions");
     }
 }
 
@@ -203,8 +203,8 @@ void Flattener::Keyword(int index, const Place& place) {
     if (place.instance >= 0) {
         CheckExpressible(keyword, place);
         // What has one name in the whole deck is written with the first instance.
-        const bool isShared = keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE &&
-                              keyword.key != "surface" && keyword.key != "orientation";
+        const bool isShared = keyword.Row() != nullptr && keyword.Row()->defines != drd_KindEnm::NONE &&
+                              keyword.Key() != "surface" && keyword.Key() != "orientation";
         char& written = isWritten_[static_cast<std::size_t>(index)];
         if (isShared && written != 0) return;
         written = 1;
@@ -212,13 +212,13 @@ void Flattener::Keyword(int index, const Place& place) {
     bool changed = false;
     const std::vector<drd_Parameter> parameters = Parameters(keyword, place, changed);
     if (changed) {
-        emitter_.Keyword(keyword.name, parameters);
+        emitter_.Keyword(keyword.Name(), parameters);
     } else {
         emitter_.Line(deck_.Text(keyword.header));
     }
-    if (keyword.key == "node" && keyword.isBulk) {
+    if (keyword.Key() == "node" && keyword.IsBulk()) {
         Nodes(keyword, index, place);
-    } else if (keyword.key == "element" && keyword.isBulk) {
+    } else if (keyword.Key() == "element" && keyword.IsBulk()) {
         Elements(index, place);
     } else if (keyword.set >= 0) {
         Set(keyword, place);
@@ -229,21 +229,21 @@ void Flattener::Keyword(int index, const Place& place) {
 
 std::vector<drd_Parameter> Flattener::Parameters(const drd_Keyword& keyword, const Place& place,
                                                  bool& changed) {
-    std::vector<drd_Parameter> parameters(keyword.parameters.begin(), keyword.parameters.end());
+    std::vector<drd_Parameter> parameters(keyword.Parameters().begin(), keyword.Parameters().end());
     values_.Clear();
-    const bool isSet = keyword.key == "nset" || keyword.key == "elset";
-    const bool namesItself = keyword.key == "surface" || keyword.key == "orientation";
+    const bool isSet = keyword.Key() == "nset" || keyword.Key() == "elset";
+    const bool namesItself = keyword.Key() == "surface" || keyword.Key() == "orientation";
     for (drd_Parameter& parameter : parameters) {
-        const bool isOwnName = (namesItself && parameter.key == "name") ||
-                               (isSet && parameter.key == keyword.key) ||
-                               (keyword.key == "node" && parameter.key == "nset") ||
-                               (keyword.key == "element" && parameter.key == "elset");
+        const bool isOwnName = (namesItself && parameter.Key() == "name") ||
+                               (isSet && parameter.Key() == keyword.Key()) ||
+                               (keyword.Key() == "node" && parameter.Key() == "nset") ||
+                               (keyword.Key() == "element" && parameter.Key() == "elset");
         std::string value = parameter.value;
         if (isOwnName) {
             if (place.instance >= 0) value = flat_.NameIn(place.instance, drd_NameOf(parameter.value));
         } else {
-            for (const drd_ParameterRef& ref : drd_ParameterRefs()) {
-                if (ref.parameter != parameter.key || !drd_Applies(ref, keyword)) continue;
+            for (const drd_ParameterRef& ref : parameter.word->parameterRefs) {
+                if (!drd_Applies(ref, keyword)) continue;
                 value = FlatReference(ref.ref, ref.kind, parameter.value, keyword.block, place.instance);
             }
         }
@@ -252,7 +252,7 @@ std::vector<drd_Parameter> Flattener::Parameters(const drd_Keyword& keyword, con
         parameter.value = values_.Keep(value);
     }
     const std::size_t before = parameters.size();
-    if (isSet) std::erase_if(parameters, [](const drd_Parameter& p) { return p.key == "instance"; });
+    if (isSet) std::erase_if(parameters, [](const drd_Parameter& p) { return p.Key() == "instance"; });
     changed = changed || parameters.size() != before;
     return parameters;
 }
@@ -293,8 +293,8 @@ std::string Flattener::DataLine(const drd_Keyword& keyword, std::uint64_t line, 
     const std::string_view text = deck_.DataLine(keyword, line);
     std::string turned;
     if (Turned(keyword, line, place, turned)) return turned;
-    const std::span<const drd_DataRef> refs = drd_DataRefs(keyword.key);
-    if (refs.empty() || (keyword.key == "equation" && drd_Field(text, 1).empty())) return std::string(text);
+    const std::span<const drd_DataRef> refs = keyword.word->dataRefs;
+    if (refs.empty() || (keyword.Key() == "equation" && drd_Field(text, 1).empty())) return std::string(text);
     // Fields are replaced in place; all else stays as it stands.
     std::string result;
     std::size_t begin = 0;
@@ -328,16 +328,17 @@ bool Flattener::Turned(const drd_Keyword& keyword, std::uint64_t line, const Pla
                        std::string& text) {
     if (place.instance < 0 || place.placement.IsNone()) return false;
     const std::string_view data = deck_.DataLine(keyword, line);
-    if (keyword.key == "transform" || keyword.key == "orientation") {
+    if (keyword.Key() == "transform" || keyword.Key() == "orientation") {
         if (line != 0 || drd_Trim(data).empty()) return false;
-        const std::string system = drd_FoldKey(keyword.Value(keyword.key == "transform" ? "type" : "system"));
+        const std::string system =
+            drd_FoldKey(keyword.Value(keyword.Key() == "transform" ? "type" : "system"));
         const bool isRound = system.starts_with("c") || system.starts_with("s");
         // With an origin of its own a rectangular system is given by points; else by directions from the
         // origin.
         text = TurnedPoints(data, place.placement, isRound || !drd_Field(data, 6).empty());
         return true;
     }
-    const bool isBeam = keyword.key == "beamsection" || keyword.key == "beamgeneralsection";
+    const bool isBeam = keyword.Key() == "beamsection" || keyword.Key() == "beamgeneralsection";
     if (isBeam && line >= 1 && place.placement.degrees != 0.0) {
         // The direction is the line of three numbers behind the profile's, which an open profile has several
         // of.

@@ -46,6 +46,14 @@ constexpr drd_ParameterRef kParameterRefs[] = {
 #include "deck_reader/drd_ParameterRefs.inl"
 };
 
+constexpr drd_BlockMark kBlockMarks[] = {
+    {"part", drd_BlockEnm::PART, false},          {"endpart", drd_BlockEnm::PART, true},
+    {"instance", drd_BlockEnm::INSTANCE, false},  {"endinstance", drd_BlockEnm::INSTANCE, true},
+    {"assembly", drd_BlockEnm::ASSEMBLY, false},  {"endassembly", drd_BlockEnm::ASSEMBLY, true},
+    {"step", drd_BlockEnm::STEP, false},          {"endstep", drd_BlockEnm::STEP, true},
+    {"loadcase", drd_BlockEnm::LOAD_CASE, false}, {"endloadcase", drd_BlockEnm::LOAD_CASE, true},
+};
+
 constexpr drd_DataRef kDataRefs[] = {
 #include "deck_reader/drd_DataRefs.inl"
 };
@@ -78,6 +86,24 @@ static_assert(kKindWords.size() == static_cast<std::size_t>(Kind::DERIVED) + 1);
 constexpr std::array<std::string_view, 6> kBlockWords = {"model",    "Part", "Instance",
                                                          "Assembly", "Step", "Load Case"};
 
+/// The rows with the word in the column that a table is ordered by.
+template <class Row, std::size_t N>
+std::span<const Row> RowsOf(const Row (&rows)[N], std::string_view Row::*column, std::string_view word) {
+    const auto first = std::lower_bound(
+        rows, rows + N, word, [column](const Row& row, std::string_view w) { return row.*column < w; });
+    const auto last = std::upper_bound(
+        first, rows + N, word, [column](std::string_view w, const Row& row) { return w < row.*column; });
+    return {first, last};
+}
+
+template <class Row, std::size_t N>
+constexpr bool IsOrdered(const Row (&rows)[N], std::string_view Row::*column) {
+    return std::is_sorted(rows, rows + N,
+                          [column](const Row& a, const Row& b) { return a.*column < b.*column; });
+}
+static_assert(IsOrdered(kParameterRefs, &drd_ParameterRef::parameter));
+static_assert(IsOrdered(kDataRefs, &drd_DataRef::keyword));
+
 } // namespace
 
 std::string_view drd_WordOf(drd_KindEnm kind) {
@@ -107,16 +133,28 @@ std::string_view drd_NameParameter(const drd_KeywordRow& row) {
     return row.defines == Kind::CONTACT_PAIR ? "cpset" : "name";
 }
 
+drd_DataEnm drd_DataOf(std::string_view folded) {
+    if (folded == "heading" || folded == "step") return drd_DataEnm::TEXT;
+    if (folded == "node") return drd_DataEnm::NODES;
+    if (folded == "element") return drd_DataEnm::ELEMENTS;
+    if (folded == "nset") return drd_DataEnm::NODE_SET;
+    return folded == "elset" ? drd_DataEnm::ELEMENT_SET : drd_DataEnm::LINES;
+}
+
+const drd_BlockMark* drd_FindBlockMark(std::string_view folded) {
+    const auto found = std::find_if(std::begin(kBlockMarks), std::end(kBlockMarks),
+                                    [folded](const drd_BlockMark& mark) { return mark.keyword == folded; });
+    return found == std::end(kBlockMarks) ? nullptr : &*found;
+}
+
 std::span<const drd_ParameterRef> drd_ParameterRefs() {
     return kParameterRefs;
 }
 
+std::span<const drd_ParameterRef> drd_ParameterRefs(std::string_view parameter) {
+    return RowsOf(kParameterRefs, &drd_ParameterRef::parameter, parameter);
+}
+
 std::span<const drd_DataRef> drd_DataRefs(std::string_view folded) {
-    static_assert(
-        std::is_sorted(std::begin(kDataRefs), std::end(kDataRefs),
-                       [](const drd_DataRef& a, const drd_DataRef& b) { return a.keyword < b.keyword; }));
-    const auto [first, last] = std::equal_range(
-        std::begin(kDataRefs), std::end(kDataRefs), drd_DataRef{folded, 0, 0, 0, NAME, Kind::NONE, ""},
-        [](const drd_DataRef& a, const drd_DataRef& b) { return a.keyword < b.keyword; });
-    return {first, last};
+    return RowsOf(kDataRefs, &drd_DataRef::keyword, folded);
 }

@@ -70,10 +70,19 @@ const drd_KeywordRow* drd_FindKeyword(std::string_view folded);
 /// The parameter that holds the name of what the keyword defines.
 std::string_view drd_NameParameter(const drd_KeywordRow& row);
 
-/// Whether the data lines of a keyword, folded, are text for people.
-inline bool drd_HasText(std::string_view folded) {
-    return folded == "heading" || folded == "step";
-}
+/// What the data lines of a keyword are: kept as they stand, as what they are or as text for people, or read
+/// into arrays.
+enum class drd_DataEnm : std::uint8_t { LINES, TEXT, NODES, ELEMENTS, NODE_SET, ELEMENT_SET };
+drd_DataEnm drd_DataOf(std::string_view folded);
+
+/// A keyword that begins or ends a block.
+struct drd_BlockMark {
+    std::string_view keyword; ///< folded
+    drd_BlockEnm kind;
+    bool ends;
+};
+/// Null for all other keywords.
+const drd_BlockMark* drd_FindBlockMark(std::string_view folded);
 
 /// A kind of thing that a field or a parameter may name. Both kinds of a set or a label are looked for where
 /// a place takes either.
@@ -94,6 +103,9 @@ struct drd_ParameterRef {
     drd_RefEnm ref;
     drd_KindEnm kind;
 };
+/// The rows of a parameter, folded.
+std::span<const drd_ParameterRef> drd_ParameterRefs(std::string_view parameter);
+/// All of them.
 std::span<const drd_ParameterRef> drd_ParameterRefs();
 
 /// A column of data lines that refers to something by name.

@@ -84,56 +84,71 @@ drd_Names::drd_Names(const drd_Deck& deck)
         if (block.kind == drd_BlockEnm::ASSEMBLY && assembly_ < 0) assembly_ = static_cast<int>(i);
         if (block.kind == drd_BlockEnm::PART)
             parts_.TryEmplace(drd_FoldCase(block.name), static_cast<int>(i));
-        if (block.kind == drd_BlockEnm::INSTANCE)
-            instances_.TryEmplace(drd_FoldCase(block.name), static_cast<int>(i));
     }
     for (std::size_t i = 0; i < deck.blocks.size(); ++i) {
         const drd_Block& block = deck.blocks[i];
         if (block.kind != drd_BlockEnm::INSTANCE) continue;
         partOf_[i] = FindPart(deck.keywords[static_cast<std::size_t>(block.begin)].Value("part"));
     }
-    index_.Reserve(deck.setParts.size() + deck.definitions.Size());
-    AddSets();
-    AddDefinitions();
 }
 
-void drd_Names::AddSets() {
+const drd_Names::SetTable& drd_Names::SetNames() const {
+    if (sets_ != nullptr) return *sets_;
+    sets_ = std::make_unique<SetTable>();
+    auto& [sets, parts, index] = *sets_;
+    index.Reserve(deck_.setParts.size());
     std::vector<int> setOf;
     setOf.reserve(deck_.setParts.size());
     for (const drd_SetPart& part : deck_.setParts) {
-        const auto [place, isNew] = index_.TryEmplace(drd_FoldCase(part.name), static_cast<int>(sets_.size()),
-                                                      drd_ScopeOf(part.kind, part.block));
-        if (isNew) sets_.push_back({part.kind, part.block, part.name, {}});
+        const auto [place, isNew] = index.TryEmplace(drd_FoldCase(part.name), static_cast<int>(sets.size()),
+                                                     drd_ScopeOf(part.kind, part.block));
+        if (isNew) sets.push_back({part.kind, part.block, part.name, {}});
         setOf.push_back(place);
     }
     // Each set's end begins as its first place and moves on with every part.
-    std::vector<std::size_t> ends(sets_.size() + 1, 0);
+    std::vector<std::size_t> ends(sets.size() + 1, 0);
     for (const int set : setOf) ++ends[static_cast<std::size_t>(set) + 1];
     std::partial_sum(ends.begin(), ends.end(), ends.begin());
-    partsOfSets_.resize(setOf.size());
+    parts.resize(setOf.size());
     for (std::size_t i = 0; i < setOf.size(); ++i) {
-        partsOfSets_[ends[static_cast<std::size_t>(setOf[i])]++] = static_cast<int>(i);
+        parts[ends[static_cast<std::size_t>(setOf[i])]++] = static_cast<int>(i);
     }
-    for (std::size_t i = 0, begin = 0; i < sets_.size(); begin = ends[i++]) {
-        sets_[i].parts = std::span(partsOfSets_).subspan(begin, ends[i] - begin);
+    for (std::size_t i = 0, begin = 0; i < sets.size(); begin = ends[i++]) {
+        sets[i].parts = std::span(parts).subspan(begin, ends[i] - begin);
     }
+    return *sets_;
 }
 
-void drd_Names::AddDefinitions() {
+const drd_Names::DefinitionTable& drd_Names::Definitions() const {
+    if (definitions_ != nullptr) return *definitions_;
+    definitions_ = std::make_unique<DefinitionTable>();
+    definitions_->index.Reserve(deck_.definitions.Size());
     for (const int index : deck_.definitions) {
         const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(index)];
-        const std::string name = drd_FoldName(keyword.Value(drd_NameParameter(*keyword.row)));
+        const std::string name = drd_FoldName(keyword.Value(drd_NameParameter(*keyword.Row())));
         if (name.empty()) continue;
-        const drd_KindEnm kind = keyword.row->defines;
+        const drd_KindEnm kind = keyword.Row()->defines;
         // A step may begin as a part ends: blocks are known by the block around them.
-        int block = kind == drd_KindEnm::LOAD_CASE
-                        ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
-                        : (IsScoped(kind) ? keyword.block : -1);
-        if (!index_.TryEmplace(name, index, drd_ScopeOf(kind, block)).second &&
+        const int block = kind == drd_KindEnm::LOAD_CASE
+                              ? deck_.blocks[static_cast<std::size_t>(keyword.block)].parent
+                              : (IsScoped(kind) ? keyword.block : -1);
+        if (!definitions_->index.TryEmplace(name, index, drd_ScopeOf(kind, block)).second &&
             kind != drd_KindEnm::CONTACT_PAIR && kind != drd_KindEnm::DERIVED) {
-            definedTwice_.push_back(index);
+            definitions_->twice.push_back(index);
         }
     }
+    return *definitions_;
+}
+
+const drd_TextMap& drd_Names::Instances() const {
+    if (instances_ != nullptr) return *instances_;
+    instances_ = std::make_unique<drd_TextMap>();
+    int place = -1;
+    for (const drd_Block& block : deck_.blocks) {
+        ++place;
+        if (block.kind == drd_BlockEnm::INSTANCE) instances_->TryEmplace(drd_FoldCase(block.name), place);
+    }
+    return *instances_;
 }
 
 int drd_Names::FindPart(std::string_view value) const {
@@ -141,7 +156,7 @@ int drd_Names::FindPart(std::string_view value) const {
 }
 
 int drd_Names::FindInstance(std::string_view name) const {
-    return instances_.NumberOr(drd_FoldCase(name), -1);
+    return Instances().NumberOr(drd_FoldCase(name), -1);
 }
 
 int drd_Names::MeshBlock(int block) const {
@@ -172,8 +187,13 @@ const drd_LabelIndex* drd_Names::Elements(int block) const {
     return LabelsOf(deck_, block, &drd_Mesh::elements, elements_);
 }
 
+const int* drd_Names::Indexed(drd_KindEnm kind, std::string_view folded, int block) const {
+    const drd_TextMap& index = IsSet(kind) ? SetNames().index : Definitions().index;
+    return index.Find(folded, drd_ScopeOf(kind, block));
+}
+
 int drd_Names::FindScoped(drd_KindEnm kind, std::string_view folded, int block) const {
-    if (const int* found = index_.Find(folded, drd_ScopeOf(kind, block))) return *found;
+    if (const int* found = Indexed(kind, folded, block)) return *found;
     const int part = PartOf(block);
     return part >= 0 ? FindScoped(kind, folded, part) : -1;
 }
@@ -193,7 +213,7 @@ drd_Target drd_Names::TargetOf(drd_KindEnm kind, int index) const {
 drd_Target drd_Names::FindInInstances(drd_KindEnm kind, std::string_view folded) const {
     // Names of instances may have dots too, so that every dot can be the one.
     for (std::size_t dot = folded.find('.'); dot != std::string_view::npos; dot = folded.find('.', dot + 1)) {
-        const int* instance = instances_.Find(folded.substr(0, dot));
+        const int* instance = Instances().Find(folded.substr(0, dot));
         if (instance == nullptr) continue;
         const int index = FindScoped(kind, folded.substr(dot + 1), *instance);
         if (index < 0) continue;
@@ -208,7 +228,7 @@ drd_Target drd_Names::Find(drd_KindEnm kind, std::string_view name, int block) c
     const std::string folded = drd_FoldName(name);
     if (folded.empty()) return {};
     if (!IsScoped(kind)) {
-        const int* found = index_.Find(folded, drd_ScopeOf(kind, -1));
+        const int* found = Indexed(kind, folded, -1);
         return found == nullptr ? drd_Target() : TargetOf(kind, *found);
     }
     int index = FindScoped(kind, folded, block);
@@ -240,7 +260,7 @@ bool drd_Names::FindLabel(drd_KindEnm kind, std::string_view folded, int block, 
     }
     const std::size_t dot = folded.rfind('.');
     if (dot == std::string_view::npos || !drd_ReadInt(folded.substr(dot + 1), label)) return false;
-    const int* instance = instances_.Find(folded.substr(0, dot));
+    const int* instance = Instances().Find(folded.substr(0, dot));
     if (instance == nullptr) return false;
     if (HasLabel(kind, label, *instance)) {
         target.label = label;
@@ -282,14 +302,14 @@ std::string drd_Names::Nearest(drd_KindEnm kind, std::string_view name) const {
         nearest.Try(known, whole);
     };
     if (IsSet(kind)) {
-        for (const drd_Set& set : sets_) {
+        for (const drd_Set& set : Sets()) {
             if (set.kind == kind && ++tried < kTried) tryIn(set.block, set.name);
         }
         return nearest.Hint();
     }
     for (const drd_Keyword& keyword : deck_.keywords) {
-        if (keyword.row == nullptr || keyword.row->defines != kind || ++tried > kTried) continue;
-        const std::string known = drd_NameOf(keyword.Value(drd_NameParameter(*keyword.row)));
+        if (keyword.Row() == nullptr || keyword.Row()->defines != kind || ++tried > kTried) continue;
+        const std::string known = drd_NameOf(keyword.Value(drd_NameParameter(*keyword.Row())));
         if (IsScoped(kind)) {
             tryIn(keyword.block, known);
         } else {
@@ -315,7 +335,7 @@ bool drd_Names::Collect(int set, int instance, Seen& seen, std::vector<drd_Membe
     if (seen.depth == kDeepest) return false;
     ++seen.depth;
     bool isWhole = true;
-    for (const int part : sets_[static_cast<std::size_t>(set)].parts) {
+    for (const int part : Sets()[static_cast<std::size_t>(set)].parts) {
         isWhole &= CollectPart(deck_.setParts[static_cast<std::size_t>(part)], instance, seen, members);
     }
     --seen.depth;
@@ -368,20 +388,20 @@ bool drd_Names::CollectFromMesh(const drd_SetPart& part, int instance, Seen& see
     const drd_Keyword& keyword = deck_.keywords[static_cast<std::size_t>(part.keyword)];
     const drd_Mesh* mesh = deck_.MeshOf(deck_.blocks[static_cast<std::size_t>(MeshBlock(part.block))]);
     const auto isAhead = [](const auto& run, int of) { return run.keyword < of; };
-    if (keyword.key == "node" && mesh != nullptr) {
+    if (keyword.Key() == "node" && mesh != nullptr) {
         auto run = std::lower_bound(mesh->nodeRuns.begin(), mesh->nodeRuns.end(), part.keyword, isAhead);
         for (; run != mesh->nodeRuns.end() && run->keyword == part.keyword; ++run) {
             for (const int label : mesh->nodes.Part(run->first, run->count))
                 members.push_back({instance, label});
         }
-    } else if (keyword.key == "element" && mesh != nullptr) {
+    } else if (keyword.Key() == "element" && mesh != nullptr) {
         auto run =
             std::lower_bound(mesh->elementRuns.begin(), mesh->elementRuns.end(), part.keyword, isAhead);
         for (; run != mesh->elementRuns.end() && run->keyword == part.keyword; ++run) {
             for (const int label : mesh->elements.Part(run->first, run->count))
                 members.push_back({instance, label});
         }
-    } else if (keyword.key == "nset" && keyword.Find("elset") != nullptr) {
+    } else if (keyword.Key() == "nset" && keyword.Find("elset") != nullptr) {
         return CollectNodesOfElements(part, instance, seen, members);
     }
     return true;

@@ -67,9 +67,9 @@ class drd_Names {
 public:
     explicit drd_Names(const drd_Deck& deck);
 
-    const std::vector<drd_Set>& Sets() const { return sets_; }
+    const std::vector<drd_Set>& Sets() const { return SetNames().sets; }
     /// Keywords whose name stood before.
-    const std::vector<int>& DefinedTwice() const { return definedTwice_; }
+    const std::vector<int>& DefinedTwice() const { return Definitions().twice; }
 
     /// The part of a name as it stands, and the instance of one without quotes, as a block, or -1.
     int FindPart(std::string_view value) const;
@@ -99,8 +99,23 @@ private:
         int depth = 0;
     };
 
-    void AddSets();
-    void AddDefinitions();
+    /// The names of sets, each kind in each block a scope.
+    struct SetTable {
+        std::vector<drd_Set> sets;
+        std::vector<int> parts; // set by set
+        drd_TextMap index;
+    };
+    /// The names that keywords define, each kind in each block (-1: any) a scope.
+    struct DefinitionTable {
+        std::vector<int> twice;
+        drd_TextMap index;
+    };
+
+    // Made when they are first asked for: two decks that are alike are compared without most of them.
+    const SetTable& SetNames() const;
+    const DefinitionTable& Definitions() const;
+    const drd_TextMap& Instances() const;
+    const int* Indexed(drd_KindEnm kind, std::string_view folded, int block) const;
     int FindScoped(drd_KindEnm kind, std::string_view folded, int block) const;
     int FindAbove(drd_KindEnm kind, std::string_view folded) const;
     drd_Target FindInInstances(drd_KindEnm kind, std::string_view folded) const;
@@ -117,12 +132,9 @@ private:
                                 std::vector<drd_Member>& members) const;
 
     const drd_Deck& deck_;
-    std::vector<drd_Set> sets_;
-    std::vector<int> partsOfSets_; // set by set
-    std::vector<int> definedTwice_;
-    // Folded names, each kind in each block (-1: any) a scope.
-    drd_TextMap index_;
-    drd_TextMap instances_;
+    mutable std::unique_ptr<SetTable> sets_;
+    mutable std::unique_ptr<DefinitionTable> definitions_;
+    mutable std::unique_ptr<drd_TextMap> instances_;
     drd_TextMap parts_;
     std::vector<int> partOf_; // by block
     int assembly_ = -1;
@@ -136,7 +148,7 @@ bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword);
 /// Whether the row of a parameter is about the keyword.
 inline bool drd_Applies(const drd_ParameterRef& ref, const drd_Keyword& keyword) {
     // The amplitude of a step is a word for how its loads come.
-    return ref.keyword.empty() ? keyword.key != "step" : ref.keyword == keyword.key;
+    return ref.keyword.empty() ? keyword.Key() != "step" : ref.keyword == keyword.Key();
 }
 
 #endif

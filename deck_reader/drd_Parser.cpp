@@ -172,8 +172,7 @@ void drd_Parser::Data(std::string_view line) {
         }
         return;
     }
-    if (Last().row != nullptr && !drd_HasText(Last().key) &&
-        std::count(line.begin(), line.end(), '"') % 2 != 0) {
+    if (Last().Row() != nullptr && !Last().HasText() && std::count(line.begin(), line.end(), '"') % 2 != 0) {
         findings_.Add("quote-left-open", Here(), drd_Shown(line), "a second double quote");
     }
     deck_.lines.Add(Keep(line, Here()));

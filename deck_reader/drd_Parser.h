@@ -43,13 +43,15 @@ private:
     /// The keyword line, kept, with its continuations: in one line, and as `asItStands`.
     std::string_view Header(std::string_view line, std::string_view& asItStands);
     bool ParseHeader(std::string_view header, drd_Keyword& keyword);
-    /// The word as it is compared; each spelling is folded once.
-    drd_Word Folded(drd_Word word);
+    /// What is known of a word that is kept; each spelling is looked up once.
+    const drd_Spelling* SpellingOf(drd_Word word);
     /// A name without its quotes, of a value that is kept.
     drd_Word NameOf(std::string_view value);
     bool Include(const drd_Keyword& keyword);
     void OpenFile(const std::filesystem::path& path, drd_Place includedAt);
     void AddKeyword(drd_Keyword& keyword);
+    /// Begins to read its data.
+    void BeginData(drd_DataEnm data);
     void PlaceInBlock(drd_Keyword& keyword);
     void OpenBlock(drd_BlockEnm kind, const drd_Keyword& keyword);
     void CloseBlock(drd_BlockEnm kind, const drd_Keyword& keyword);
@@ -91,8 +93,8 @@ private:
     int nodesOfType_ = 0;
     drd_TextMap typeIndex_;
     drd_TextMap ownerIndex_;
-    drd_TextMap spellings_; // index of folded_
-    std::vector<drd_Word> folded_;
+    drd_TextMap spellingIndex_;
+    std::vector<const drd_Spelling*> spellings_;
     std::vector<std::string_view> fields_;
     std::vector<drd_Parameter> parameters_; // of the keyword that is being read
     std::vector<drd_Word> members_;         // of the set that is being read

@@ -70,7 +70,6 @@ void drd_Parser::WrongNumber(std::string_view line, const char* expected) {
 }
 
 void drd_Parser::BeginNodes() {
-    Last().isBulk = true;
     drd_Mesh& mesh = CurrentMesh();
     mesh.nodeRuns.push_back({mesh.nodes.Size(), 0, static_cast<int>(deck_.keywords.size()) - 1});
     AddOwnSet(drd_KindEnm::NODE_SET, "nset");
@@ -125,12 +124,11 @@ void drd_Parser::AddOwnSet(drd_KindEnm kind, std::string_view parameter) {
 
 void drd_Parser::BeginElements() {
     AddOwnSet(drd_KindEnm::ELEMENT_SET, "elset");
-    drd_Keyword& keyword = Last();
-    keyword.isBulk = true;
+    const drd_Keyword& keyword = Last();
     CurrentMesh();
     const std::string type = drd_NameOf(keyword.Value("type"));
     if (type.empty())
-        findings_.Add("element-without-type", keyword.place, "elements without a type", "type=");
+        findings_.Add("element-without-type", keyword.Place(), "elements without a type", "type=");
     type_ = IndexOf(type, typeIndex_, deck_.types);
     nodesOfType_ = options_.typeInfo == nullptr ? 0 : options_.typeInfo(type).maxNodes;
     bulk_ = &drd_Parser::Elements;
@@ -225,7 +223,6 @@ bool drd_Parser::NodeOfInstance(drd_Mesh& mesh, const char*& at) {
 
 void drd_Parser::BeginSet(drd_KindEnm kind) {
     drd_Keyword& keyword = Last();
-    keyword.isBulk = true;
     keyword.set = static_cast<int>(deck_.setParts.size());
     drd_SetPart part;
     part.kind = kind;

@@ -18,19 +18,6 @@ bool BeginsWithCommaAndWord(std::string_view line) {
     return !line.empty() && drd_IsLetter(line.front());
 }
 
-struct BlockWord {
-    std::string_view key;
-    drd_BlockEnm kind;
-    bool ends;
-};
-constexpr BlockWord kBlockPrefixes[] = {
-    {"part", drd_BlockEnm::PART, false},          {"endpart", drd_BlockEnm::PART, true},
-    {"instance", drd_BlockEnm::INSTANCE, false},  {"endinstance", drd_BlockEnm::INSTANCE, true},
-    {"assembly", drd_BlockEnm::ASSEMBLY, false},  {"endassembly", drd_BlockEnm::ASSEMBLY, true},
-    {"step", drd_BlockEnm::STEP, false},          {"endstep", drd_BlockEnm::STEP, true},
-    {"loadcase", drd_BlockEnm::LOAD_CASE, false}, {"endloadcase", drd_BlockEnm::LOAD_CASE, true},
-};
-
 /// The blocks that one of the kind stands in.
 bool MayStandInside(drd_BlockEnm inner, drd_BlockEnm outer) {
     switch (inner) {
@@ -82,12 +69,18 @@ std::string_view drd_Parser::Header(std::string_view line, std::string_view& asI
     return header.size() == whole.size() ? asItStands : deck_.texts.Keep(header);
 }
 
-drd_Word drd_Parser::Folded(drd_Word word) {
-    const auto isFolded = [](char c) { return !drd_IsBlank(c) && c == drd_LowerCase(c); };
-    if (std::all_of(word.begin(), word.end(), isFolded)) return word;
-    const auto [place, isNew] = spellings_.TryEmplace(word, static_cast<int>(folded_.size()));
-    if (isNew) folded_.push_back(deck_.texts.Keep(drd_FoldKey(word)));
-    return folded_[static_cast<std::size_t>(place)];
+const drd_Spelling* drd_Parser::SpellingOf(drd_Word word) {
+    const auto [place, isNew] = spellingIndex_.TryEmplace(word, static_cast<int>(spellings_.size()));
+    if (!isNew) return spellings_[static_cast<std::size_t>(place)];
+    drd_Spelling spelling;
+    spelling.name = word;
+    spelling.key = deck_.texts.Keep(drd_FoldKey(word));
+    spelling.row = drd_FindKeyword(spelling.key);
+    spelling.mark = drd_FindBlockMark(spelling.key);
+    spelling.data = drd_DataOf(spelling.key);
+    spelling.dataRefs = drd_DataRefs(spelling.key);
+    spelling.parameterRefs = drd_ParameterRefs(spelling.key);
+    return spellings_.emplace_back(deck_.texts.KeepOne(spelling));
 }
 
 drd_Word drd_Parser::NameOf(std::string_view value) {
@@ -97,43 +90,42 @@ drd_Word drd_Parser::NameOf(std::string_view value) {
 
 bool drd_Parser::ParseHeader(std::string_view header, drd_Keyword& keyword) {
     if (!drd_SplitFields(header.substr(1), fields_)) {
-        findings_.Add("quote-left-open", keyword.place, drd_Shown(header), "a second double quote");
+        findings_.Add("quote-left-open", keyword.Place(), drd_Shown(header), "a second double quote");
     }
     if (fields_.empty() || fields_[0].empty()) {
-        findings_.Add("keyword-without-name", keyword.place, drd_Shown(header), "a keyword behind the *");
+        findings_.Add("keyword-without-name", keyword.Place(), drd_Shown(header), "a keyword behind the *");
         return false;
     }
-    keyword.name = fields_[0];
-    keyword.key = Folded(fields_[0]);
-    keyword.row = drd_FindKeyword(keyword.key);
+    keyword.word = SpellingOf(fields_[0]);
     parameters_.clear();
     for (std::size_t i = 1; i < fields_.size(); ++i) {
         const std::string_view field = fields_[i];
         if (field.empty()) continue;
         const std::size_t equals = drd_FindOutsideQuotes(field, '=');
         drd_Parameter parameter;
-        parameter.name = drd_Trim(field.substr(0, equals));
-        parameter.key = Folded(parameter.name);
-        if (parameter.key.empty()) {
-            findings_.Add("parameter-without-name", keyword.place, drd_Shown(field), "NAME=value");
+        parameter.word = SpellingOf(drd_Trim(field.substr(0, equals)));
+        if (parameter.Key().empty()) {
+            findings_.Add("parameter-without-name", keyword.Place(), drd_Shown(field), "NAME=value");
         }
-        parameter.hasValue = equals != std::string_view::npos;
-        if (parameter.hasValue) parameter.value = drd_Trim(field.substr(equals + 1));
+        if (equals != std::string_view::npos) parameter.value = drd_Trim(field.substr(equals + 1));
         parameters_.push_back(parameter);
     }
-    keyword.parameters = deck_.texts.Keep(parameters_);
+    const std::span<const drd_Parameter> kept = deck_.texts.Keep(parameters_);
+    keyword.firstParameter = kept.data();
+    keyword.parameterCount = static_cast<std::uint32_t>(kept.size());
     return true;
 }
 
 void drd_Parser::Keyword(std::string_view line) {
     drd_Keyword keyword;
-    keyword.place = Here();
+    keyword.header.file = Here().file;
+    keyword.header.line = Here().line;
     std::string_view asItStands;
     const std::string_view header = Header(line, asItStands);
+    keyword.header.text = asItStands.data();
+    keyword.header.length = static_cast<std::uint32_t>(asItStands.size());
     if (!ParseHeader(header, keyword)) return;
-    if (keyword.key == "include" && options_.followIncludes && Include(keyword)) return;
-    keyword.header = {asItStands.data(), static_cast<std::uint32_t>(asItStands.size()), keyword.place.file,
-                      keyword.place.line};
+    if (keyword.Key() == "include" && options_.followIncludes && Include(keyword)) return;
     AddKeyword(keyword);
 }
 
@@ -141,12 +133,12 @@ void drd_Parser::Keyword(std::string_view line) {
 bool drd_Parser::Include(const drd_Keyword& keyword) {
     const std::string name = drd_NameOf(keyword.Value("input"));
     if (name.empty()) {
-        findings_.Add("include-without-file", keyword.place, "an include without a file", "input=FILE");
+        findings_.Add("include-without-file", keyword.Place(), "an include without a file", "input=FILE");
         return true;
     }
     const std::filesystem::path folder =
-        plt_Path(deck_.files[static_cast<std::size_t>(keyword.place.file)].name).parent_path();
-    OpenFile(folder / plt_Path(name), keyword.place);
+        plt_Path(deck_.files[static_cast<std::size_t>(keyword.Place().file)].name).parent_path();
+    OpenFile(folder / plt_Path(name), keyword.Place());
     return true;
 }
 
@@ -156,37 +148,38 @@ void drd_Parser::AddKeyword(drd_Keyword& keyword) {
     keyword.end = static_cast<int>(deck_.keywords.size()) + 1;
     PlaceInBlock(keyword);
     FindOwner(keyword);
-    if (keyword.row != nullptr && keyword.row->defines != drd_KindEnm::NONE) {
+    if (keyword.Row() != nullptr && keyword.Row()->defines != drd_KindEnm::NONE) {
         deck_.definitions.Add(static_cast<int>(deck_.keywords.size()));
     }
     deck_.keywords.push_back(keyword);
-    const drd_Word key = keyword.key;
-    if (key == "node") {
-        BeginNodes();
-    } else if (key == "element") {
-        BeginElements();
-    } else if (key == "nset") {
-        BeginSet(drd_KindEnm::NODE_SET);
-    } else if (key == "elset") {
-        BeginSet(drd_KindEnm::ELEMENT_SET);
+    BeginData(keyword.word->data);
+}
+
+void drd_Parser::BeginData(drd_DataEnm data) {
+    switch (data) {
+    case drd_DataEnm::LINES:
+    case drd_DataEnm::TEXT: break;
+    case drd_DataEnm::NODES: BeginNodes(); break;
+    case drd_DataEnm::ELEMENTS: BeginElements(); break;
+    case drd_DataEnm::NODE_SET: BeginSet(drd_KindEnm::NODE_SET); break;
+    case drd_DataEnm::ELEMENT_SET: BeginSet(drd_KindEnm::ELEMENT_SET); break;
     }
 }
 
 void drd_Parser::PlaceInBlock(drd_Keyword& keyword) {
-    const auto word = std::find_if(std::begin(kBlockPrefixes), std::end(kBlockPrefixes),
-                                   [&keyword](const BlockWord& w) { return w.key == keyword.key; });
-    if (word == std::end(kBlockPrefixes)) {
+    const drd_BlockMark* mark = keyword.word->mark;
+    if (mark == nullptr) {
         keyword.block = blockStack_.back();
         return;
     }
     owner_ = -1;
-    if (word->ends) {
-        CloseBlock(word->kind, keyword);
+    if (mark->ends) {
+        CloseBlock(mark->kind, keyword);
     } else {
-        OpenBlock(word->kind, keyword);
+        OpenBlock(mark->kind, keyword);
     }
     keyword.block = blockStack_.back();
-    if (word->ends && deck_.blocks[static_cast<std::size_t>(blockStack_.back())].kind == word->kind)
+    if (mark->ends && deck_.blocks[static_cast<std::size_t>(blockStack_.back())].kind == mark->kind)
         LeaveBlock();
 }
 
@@ -213,7 +206,7 @@ void drd_Parser::CloseBlock(drd_BlockEnm kind, const drd_Keyword& keyword) {
         return deck_.blocks[static_cast<std::size_t>(block)].kind == kind;
     };
     if (!std::any_of(blockStack_.begin(), blockStack_.end(), isOfKind)) {
-        findings_.Add("end-without-begin", keyword.place, drd_Shown("*" + keyword.name),
+        findings_.Add("end-without-begin", keyword.Place(), drd_Shown("*" + keyword.Name()),
                       "*" + std::string(drd_WordOf(kind)) + " ahead of it");
         return;
     }
@@ -230,7 +223,7 @@ void drd_Parser::LeaveBlock() {
         ++block.last; // its end is filed next
         return;
     }
-    findings_.Add("block-left-open", deck_.keywords[static_cast<std::size_t>(block.begin)].place,
+    findings_.Add("block-left-open", deck_.keywords[static_cast<std::size_t>(block.begin)].Place(),
                   "the " + std::string(drd_WordOf(block.kind)) + " " +
                       drd_Shown(std::string_view(block.name)) + " has no end",
                   EndWord(block.kind));
@@ -239,13 +232,13 @@ void drd_Parser::LeaveBlock() {
 void drd_Parser::FindOwner(drd_Keyword& keyword) {
     const int index = static_cast<int>(deck_.keywords.size());
     // A keyword that isn't known may be an option as well as not.
-    const bool isKnown = keyword.row != nullptr;
+    const bool isKnown = keyword.Row() != nullptr;
     drd_Keyword* owner = owner_ < 0 ? nullptr : &deck_.keywords[static_cast<std::size_t>(owner_)];
-    const bool isOption = owner != nullptr && (!isKnown || keyword.row->IsOptionOf(owner->row->owns));
+    const bool isOption = owner != nullptr && (!isKnown || keyword.Row()->IsOptionOf(owner->Row()->owns));
     if (isOption) {
         keyword.parent = owner_;
         owner->end = index + 1;
     } else {
-        owner_ = isKnown && keyword.row->owns != drd_GroupEnm::NONE ? index : -1;
+        owner_ = isKnown && keyword.Row()->owns != drd_GroupEnm::NONE ? index : -1;
     }
 }

@@ -31,6 +31,10 @@ std::string drd_NameOf(std::string_view value) {
     return name;
 }
 
+bool drd_HasName(std::string_view value) {
+    return drd_Trim(value).find_first_not_of('"') != std::string_view::npos;
+}
+
 std::string drd_FoldCase(std::string_view name) {
     std::string folded(name);
     for (char& c : folded) c = drd_LowerCase(c);
@@ -38,7 +42,9 @@ std::string drd_FoldCase(std::string_view name) {
 }
 
 std::string drd_FoldName(std::string_view value) {
-    return drd_FoldCase(drd_NameOf(value));
+    std::string folded = drd_NameOf(value);
+    for (char& c : folded) c = drd_LowerCase(c);
+    return folded;
 }
 
 std::string drd_QuotedName(std::string_view name) {

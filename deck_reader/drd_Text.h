@@ -31,6 +31,8 @@ std::string drd_FoldKey(std::string_view text);
 /// A name without its quotes, those of the parts of a dotted name included: `"two words".TIP` is
 /// `two words.TIP`. Blanks count inside quotes only.
 std::string drd_NameOf(std::string_view value);
+/// Whether a name is left of a value without its quotes.
+bool drd_HasName(std::string_view value);
 /// A name without quotes in small letters, as names are compared.
 std::string drd_FoldCase(std::string_view name);
 /// Both.

@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <cstring>
 #include <memory>
+#include <new>
 #include <span>
 #include <string>
 #include <string_view>
@@ -46,6 +47,11 @@ public:
         char* kept = Room(row.size() * sizeof(T), alignof(T));
         std::memcpy(kept, static_cast<const void*>(row.data()), row.size() * sizeof(T));
         return {reinterpret_cast<const T*>(kept), row.size()};
+    }
+    template <class T>
+    const T* KeepOne(const T& value) {
+        static_assert(std::is_trivially_copyable_v<T>);
+        return new (Room(sizeof(T), alignof(T))) T(value);
     }
     /// Lets all that was kept go.
     void Clear() {

@@ -129,7 +129,11 @@ void thr_SetUsualThreads(int threads) {
 int thr_NumThreads(int wanted) {
     constexpr int most = 64;
     if (wanted <= 0) wanted = usualThreads;
-    if (wanted <= 0) wanted = static_cast<int>(std::thread::hardware_concurrency());
+    if (wanted <= 0) {
+        // Asking the system reads a file.
+        static const auto cores = static_cast<int>(std::thread::hardware_concurrency());
+        wanted = cores;
+    }
     return std::clamp(wanted, 1, most);
 }
 

@@ -2,9 +2,17 @@
 
 namespace {
 
-qkw_KeywordList ListOf(const cow_Map<cow_String, qkw_KeywordList>& lists, const cow_String& key) {
+qkw_KeywordList ListOf(const qkw_ByName<qkw_KeywordList>& lists, const cow_String& key) {
     const qkw_KeywordList* list = lists.Find(key);
     return list == nullptr ? qkw_KeywordList() : *list;
+}
+
+qkw_KeywordList ListOf(const qkw_ByName<std::vector<qkw_KeywordHandle>>& lists, const cow_String& key) {
+    qkw_KeywordList list;
+    if (const auto* keywords = lists.Find(key)) {
+        for (const qkw_KeywordHandle& keyword : *keywords) list.Append(keyword);
+    }
+    return list;
 }
 
 } // namespace
@@ -27,7 +35,8 @@ qkw_KeywordList qkw_BuilderComponent::AssemblyDefinition() {
 
 qkw_KeywordList qkw_BuilderComponent::StepDefinition(const cow_String& stepName,
                                                      const cow_String& secondKey) {
-    const ListsByName* lists = stepDefinitions_.Find(stepName);
+    if (secondKey.IsEmpty()) return ListOf(stepDefinitions_, stepName);
+    const StepsByName* lists = loadCaseDefinitions_.Find(stepName);
     return lists == nullptr ? qkw_KeywordList() : ListOf(*lists, secondKey);
 }
 

@@ -1,8 +1,8 @@
 #ifndef QRX_KEYWORD_QKW_BUILDERCOMPONENT_H
 #define QRX_KEYWORD_QKW_BUILDERCOMPONENT_H
 
-#include "foundation/cow_Map.h"
 #include "foundation/nex_Exception.h"
+#include "keyword_layer/qkw_ByName.h"
 #include "keyword_layer/qkw_Keyword.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 
@@ -101,7 +101,7 @@ protected:
     /// For a keyword that stands in many places: the lists share it.
     void AddStepDefinition(const cow_String& stepName, const qkw_KeywordHandle& keyword,
                            const cow_String& secondKey = {}) {
-        StepList(stepName, secondKey).Append(keyword);
+        FileInStep(stepName, secondKey, keyword);
         Log(stepName, keyword, secondKey);
     }
     void AddStepDefinition(const cow_String& stepName, const qkw_Keyword& keyword,
@@ -110,7 +110,7 @@ protected:
     }
     /// The banner ahead of a step's keywords of one kind, which is no object's own.
     void AddStepBanner(const cow_String& stepName, const qkw_KeywordHandle& banner) {
-        if (!banner.ConstGet().IsEmpty()) StepList(stepName, {}).Append(banner);
+        if (!banner.ConstGet().IsEmpty()) FileInStep(stepName, {}, banner);
     }
     void AddAtomOptionDefinition(const qkw_Keyword& keyword) { atomOptionDefinitions_.Append(keyword); }
     void AddSingleTermDefinition(const qkw_Keyword& keyword) { singleTermDefinitions_.Append(keyword); }
@@ -121,10 +121,15 @@ protected:
     qkw_ModelInfo& ModelInfo() const { return *modelInfo_; }
 
 private:
-    using ListsByName = cow_Map<cow_String, qkw_KeywordList>;
+    using ListsByName = qkw_ByName<qkw_KeywordList>;
+    // Of thousands of steps, most have a few keywords, for which a list takes twenty times their room.
+    using StepsByName = qkw_ByName<std::vector<qkw_KeywordHandle>>;
 
-    qkw_KeywordList& StepList(const cow_String& stepName, const cow_String& secondKey) {
-        return stepDefinitions_.GetOrInsert(stepName).GetOrInsert(secondKey);
+    void FileInStep(const cow_String& stepName, const cow_String& secondKey,
+                    const qkw_KeywordHandle& keyword) {
+        StepsByName& lists =
+            secondKey.IsEmpty() ? stepDefinitions_ : loadCaseDefinitions_.GetOrInsert(stepName);
+        lists.GetOrInsert(secondKey.IsEmpty() ? stepName : secondKey).push_back(keyword);
     }
     void Log(const cow_String& step, const qkw_KeywordHandle& keyword, const cow_String& loadCase = {}) {
         if (making_ != nullptr) LogAs(making_->kind_, *making_->name_, step, keyword, loadCase);
@@ -136,7 +141,8 @@ private:
     ListsByName partDefinitions_;
     ListsByName instanceDefinitions_;
     qkw_KeywordList assemblyDefinitions_;
-    cow_Map<cow_String, ListsByName> stepDefinitions_;
+    StepsByName stepDefinitions_;
+    qkw_ByName<StepsByName> loadCaseDefinitions_; // step by step, then by load case
     qkw_KeywordList atomOptionDefinitions_;
     qkw_KeywordList singleTermDefinitions_;
     qkw_KeywordList combinedTermDefinitions_;

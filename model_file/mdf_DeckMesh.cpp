@@ -245,7 +245,7 @@ void mdf_DeckMesh::AddSets(odiK_Mesh& mesh) {
 
 void mdf_DeckMesh::AddSurfaces(odiK_Mesh& mesh) {
     for (const drd_Keyword& keyword : deck_->keywords) {
-        if (keyword.key == "surface" && keyword.block == block_) AddSurface(mesh, keyword);
+        if (keyword.Key() == "surface" && keyword.block == block_) AddSurface(mesh, keyword);
     }
 }
 

@@ -59,7 +59,7 @@ constexpr ShownKeyword kShown[] = {
 };
 
 const ShownKeyword* FindShown(const drd_Keyword& keyword) {
-    const auto* found = std::ranges::find(kShown, std::string_view(keyword.key), &ShownKeyword::key);
+    const auto* found = std::ranges::find(kShown, std::string_view(keyword.Key()), &ShownKeyword::key);
     return found == std::end(kShown) ? nullptr : found;
 }
 
@@ -162,7 +162,7 @@ private:
         for (const drd_Keyword& keyword : deck_.keywords) {
             const bool ofAssembly =
                 deck_.blocks[static_cast<std::size_t>(keyword.block)].kind == drd_BlockEnm::ASSEMBLY;
-            if (keyword.key == "surface" && ofAssembly) AddSurface(keyword);
+            if (keyword.Key() == "surface" && ofAssembly) AddSurface(keyword);
         }
     }
     void AddSurface(const drd_Keyword& keyword) {
@@ -249,7 +249,7 @@ private:
         const drd_Keyword& step = deck_.keywords[static_cast<std::size_t>(block.begin)];
         std::string procedure;
         if (block.begin + 1 < block.last)
-            procedure = deck_.keywords[static_cast<std::size_t>(block.begin) + 1].name;
+            procedure = deck_.keywords[static_cast<std::size_t>(block.begin) + 1].Name();
         perturbations_.push_back(step.Find("perturbation") != nullptr);
         header_["steps"].push_back(StepText(block.name, procedure, perturbations_.back()));
         std::string lines;
@@ -417,7 +417,7 @@ private:
             if (mark == "none") target = {};
             Said& said = sayOf(target);
             said.text.append(line).append("\n");
-            AddValues(keyword.key, line, said.state);
+            AddValues(keyword.Key(), line, said.state);
             AddField(line, mark == "pair" ? 2 : 1, said.state);
         }
         return all;

@@ -37,7 +37,7 @@ ddb_Set ddb_SetList::get(int index) const {
     const auto* sets = Sets();
     if (sets == nullptr || index < 0 || index >= static_cast<int>(sets->size()))
         cow_RaiseOutOfRange(index, size());
-    return {index, model_->Region(instanceName_, (*sets)[static_cast<std::size_t>(index)]->name)};
+    return {index, model_->RegionAt(instanceName_, index)};
 }
 
 ddb_SetListIT ddb_SetList::createIterator() const {

@@ -50,8 +50,15 @@ void Propagate(mdl_Repository& repository, const kprC_Timeline& timeline) {
     }
 }
 
-std::string PathOfSet(const cow_String& owner, int id) {
-    return std::string(owner.View()) + ".setData[" + std::to_string(id) + "]";
+std::string PathOfSet(std::string owner, int id) {
+    return owner.append(".setData[").append(std::to_string(id)).append("]");
+}
+
+rgnC_Region RegionOf(const odiK_Instance& instance, const cow_String& instanceName, int place) {
+    const cow_CountedHld<odiK_Set>& set = instance.Mesh()->Sets()[static_cast<std::size_t>(place)];
+    const std::string owner = "rootAssembly.mesh[" + std::to_string(instance.meshIndex) + "]";
+    return {ddr_Shortcut(PathOfSet(owner, place), set->name), instanceName,
+            rgnC_Set(place, rgnC_SetData(set, instance.meshIndex))};
 }
 
 rgnC_SubsetData& SubsetOf(std::vector<rgnC_SubsetData>& subsets, int meshIndex) {
@@ -237,18 +244,21 @@ void odiK_Model::AddAssemblySet(const cow_String& name, res_SetTypeEnm type,
 rgnC_Region odiK_Model::FindRegion(const cow_String& instanceName, const cow_String& setName) {
     SealInstances();
     if (instanceName.IsEmpty()) {
-        const int id = FindAssemblySet(setName);
-        if (id < 0) return {};
-        const rgnC_SetData data(assemblySets_[static_cast<std::size_t>(id)]);
-        return {ddr_Shortcut(PathOfSet("rootAssembly", id), setName), instanceName, rgnC_Set(id, data)};
+        const int place = FindAssemblySet(setName);
+        return place < 0 ? rgnC_Region() : RegionAt(instanceName, place);
     }
     const odiK_Instance* instance = FindInstance(instanceName);
     if (instance == nullptr || instance->Mesh().IsNull()) return {};
-    const int id = instance->Mesh()->FindSet(setName);
-    if (id < 0) return {};
-    const rgnC_SetData data(instance->Mesh()->Sets()[static_cast<std::size_t>(id)], instance->meshIndex);
-    const cow_String owner = cow_String("rootAssembly.mesh[") + cow_String(instance->meshIndex) + "]";
-    return {ddr_Shortcut(PathOfSet(owner, id), setName), instanceName, rgnC_Set(id, data)};
+    const int place = instance->Mesh()->FindSet(setName);
+    return place < 0 ? rgnC_Region() : RegionOf(*instance, instanceName, place);
+}
+
+rgnC_Region odiK_Model::RegionAt(const cow_String& instanceName, int place) {
+    SealInstances();
+    if (!instanceName.IsEmpty()) return RegionOf(*FindInstance(instanceName), instanceName, place);
+    const cow_CountedHld<odiK_Set>& set = assemblySets_[static_cast<std::size_t>(place)];
+    return {ddr_Shortcut(PathOfSet("rootAssembly", place), set->name), instanceName,
+            rgnC_Set(place, rgnC_SetData(set))};
 }
 
 rgnC_Region odiK_Model::Region(const cow_String& instanceName, const cow_String& setName) {

@@ -204,6 +204,8 @@ public:
     /// The region of a set of the assembly (`instanceName` empty) or of an instance; without a value when
     /// there is no such set. Seals the instances.
     rgnC_Region FindRegion(const cow_String& instanceName, const cow_String& setName);
+    /// That of the set at a place among the sets, which must be there.
+    rgnC_Region RegionAt(const cow_String& instanceName, int place);
     /// The same; a set that is not there raises.
     rgnC_Region Region(const cow_String& instanceName, const cow_String& setName);
 

@@ -56,8 +56,8 @@ TEST(KeywordTable, HasEveryKeywordOfTheGoldenDecks_InItsPlaces) {
         drd_Findings findings;
         const drd_Deck deck = drd_ReadDeck((ProjectFolder() / (pair + ".inp")).string(), {}, findings);
         for (const drd_Keyword& keyword : deck.keywords) {
-            if (keyword.row == nullptr) {
-                EXPECT_TRUE(kUsersOwn.contains(keyword.name)) << keyword.name << " in " << pair;
+            if (keyword.Row() == nullptr) {
+                EXPECT_TRUE(kUsersOwn.contains(keyword.Name())) << keyword.Name() << " in " << pair;
             }
         }
     }

@@ -14,12 +14,34 @@ TEST(Reader, KeywordLine_WithoutRegardToCapitalsAndBlanks) {
     const ReadDeckText read("* SOLID section , ELSET = \"Two, Words\", material=Steel,\n");
     ASSERT_EQ(read.deck.keywords.size(), 1U);
     const drd_Keyword& keyword = read.deck.keywords[0];
-    EXPECT_EQ(keyword.key, "solidsection");
-    ASSERT_NE(keyword.row, nullptr);
-    EXPECT_EQ(keyword.row->name, "Solid Section");
+    EXPECT_EQ(keyword.Key(), "solidsection");
+    ASSERT_NE(keyword.Row(), nullptr);
+    EXPECT_EQ(keyword.Row()->name, "Solid Section");
     EXPECT_EQ(keyword.Value("elset"), "\"Two, Words\"");
     EXPECT_EQ(keyword.Value("material"), "Steel");
     EXPECT_EQ(keyword.Find("composite"), nullptr);
+}
+
+TEST(Reader, AParameterWithAnEmptyValue_IsNotOneWithoutAValue) {
+    const ReadDeckText read("*Static, direct, stabilize=\n");
+    const drd_Keyword& keyword = read.deck.keywords[0];
+    ASSERT_EQ(keyword.Parameters().size(), 2U);
+    EXPECT_FALSE(keyword.Parameters()[0].HasValue());
+    EXPECT_TRUE(keyword.Parameters()[1].HasValue());
+    EXPECT_EQ(keyword.Value("stabilize"), "");
+}
+
+TEST(Reader, EachSpelling_OfAKeywordIsKeptOnce) {
+    const ReadDeckText read("*Nset, nset=A\n1\n*NSET, Nset=B\n1\n*Nset, nset=C\n1\n");
+    ASSERT_EQ(read.deck.keywords.size(), 3U);
+    const drd_Keyword& first = read.deck.keywords[0];
+    EXPECT_EQ(first.word, read.deck.keywords[2].word);
+    EXPECT_NE(first.word, read.deck.keywords[1].word);
+    EXPECT_EQ(read.deck.keywords[1].Name(), "NSET");
+    EXPECT_EQ(read.deck.keywords[1].Key(), first.Key());
+    EXPECT_EQ(read.deck.keywords[1].Row(), first.Row());
+    EXPECT_TRUE(first.IsBulk());
+    EXPECT_FALSE(first.HasText());
 }
 
 TEST(Reader, KeywordLine_GoesOnBehindAComma_CommentsBetween) {
@@ -35,7 +57,7 @@ TEST(Reader, KeywordLine_GoesOnBehindAComma_CommentsBetween) {
 // The writer leaves such lines for profiles without a word of their own.
 TEST(Reader, KeywordLine_ThatEndsWithACommaAheadOfNumbers_IsNotGoneOnWith) {
     const ReadDeckText read("*Beam Section, elset=E4, temperature=GRADIENTS, \n0.,0.,-1.\n");
-    EXPECT_EQ(read.deck.keywords[0].parameters.size(), 2U);
+    EXPECT_EQ(read.deck.keywords[0].Parameters().size(), 2U);
     EXPECT_EQ(read.deck.keywords[0].lines, 1U);
     EXPECT_EQ(read.Codes(), Strings({"keyword-left-open:1"}));
 }
@@ -127,7 +149,7 @@ TEST(Reader, Blocks_NestAndEnd) {
     for (std::size_t i = 1; i < deck.blocks.size(); ++i) EXPECT_GE(deck.blocks[i].end, 0) << i;
     // Elastic and Density are the material's, the amplitude is no option of it.
     const drd_Keyword& material = deck.keywords[8];
-    EXPECT_EQ(material.key, "material");
+    EXPECT_EQ(material.Key(), "material");
     EXPECT_EQ(material.end, 11);
     EXPECT_EQ(deck.keywords[9].parent, 8);
     EXPECT_EQ(deck.keywords[10].parent, 8);
@@ -206,7 +228,7 @@ TEST(Reader, Includes_AreReadInTheirPlace) {
     shut.followIncludes = false;
     const drd_Deck outer = drd_ReadDeck(folder.Path("job.inp"), shut, findings);
     EXPECT_EQ(outer.files.size(), 1U);
-    EXPECT_EQ(outer.keywords[1].key, "include");
+    EXPECT_EQ(outer.keywords[1].Key(), "include");
 }
 
 TEST(Reader, IncludesInACircle_AndOfNothing_AreTold) {

@@ -1,9 +1,7 @@
 #include "base/oif_BlockHeader.h"
 
 const qkw_KeywordHandle& oif_BlockHeader::StepHeader(const cow_String& stepName) {
-    bool given = stepHeadersGiven_.IsMember(stepName);
-    if (!given) stepHeadersGiven_.Insert(stepName, 1);
-    return Once(given);
+    return Once(stepHeadersGiven_.GetOrInsert(stepName));
 }
 
 const qkw_KeywordHandle& oif_BlockHeader::Once(bool& given) {

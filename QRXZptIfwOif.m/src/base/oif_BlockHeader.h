@@ -2,7 +2,7 @@
 #define QRX_OIF_BLOCKHEADER_H
 
 #include "base/oif_Comment.h"
-#include "foundation/cow_Map.h"
+#include "keyword_layer/qkw_ByName.h"
 
 /// A banner of three comment lines that stands once in the model section, once in the assembly and once in
 /// each step. A component adds what these operations give before each keyword of the group: the banner the
@@ -23,7 +23,7 @@ private:
     qkw_KeywordHandle empty_;
     bool assyHeaderGiven_ = false;
     bool modelHeaderGiven_ = false;
-    cow_Map<cow_String, int> stepHeadersGiven_;
+    qkw_ByName<bool> stepHeadersGiven_;
 };
 
 #endif

@@ -2,6 +2,7 @@
 #define QRX_OIF_OPSTATUS_H
 
 #include "base/oif_Op.h"
+#include "foundation/cow_Map.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 

@@ -2,6 +2,7 @@
 #define QRX_OIF_PARTATTRIBUTESBUILDER_H
 
 #include "base/oif_Component.h"
+#include "foundation/cow_Map.h"
 #include "store_interface/records/part_attributes/bme_ElemCtrlParams.h"
 #include "store_interface/records/part_attributes/bme_MapPropertyArray.h"
 #include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
