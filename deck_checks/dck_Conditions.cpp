@@ -75,9 +75,9 @@ void dck_CheckConditions(const odiK_Model& model, fnd_Sink& sink) {
             return status.Writes(each, stepName, inLoadCase);
         };
         const std::vector<int> written = finder.Of("boundary condition", name, bc, writes);
-        const bool isWritten = std::ranges::any_of(written, [&](int i) {
+        const bool isWritten = std::ranges::any_of(written, [&, &key = name, &of = bc](int i) {
             const cow_String& stepName = model.steps.NameAt(i);
-            return !oif_BCOpStatus::Places(model.steps.StepAt(i), name, bc.Status(stepName)).empty();
+            return !oif_BCOpStatus::Places(model.steps.StepAt(i), key, of.Status(stepName)).empty();
         });
         if (!isWritten) sink.Add("never-written", place, "no step writes the condition");
     }

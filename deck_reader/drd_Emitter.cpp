@@ -50,7 +50,9 @@ void drd_Emitter::Keyword(std::string_view name, std::span<const drd_Parameter> 
     text_.append(name.starts_with("*") ? "* " : "*").append(name);
     for (const drd_Parameter& parameter : parameters) {
         text_.append(", ");
-        if (text_.size() - begin > kKeywordBytes) {
+        // What begins with anything but a letter would be a line of data there.
+        if (text_.size() - begin > kKeywordBytes && !parameter.name.empty() &&
+            drd_IsLetter(parameter.name.front())) {
             text_.push_back('\n');
             begin = text_.size();
         }

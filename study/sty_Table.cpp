@@ -211,7 +211,7 @@ void sty_Table::CheckNames(std::vector<std::size_t>& hashes) const {
     while (reader.Next(raw)) {
         const sty_Row row = Parse(raw);
         const std::size_t sum = std::hash<std::string>()(row.name);
-        const auto [low, high] = std::ranges::equal_range(hashes, sum);
+        const auto [low, high] = std::equal_range(hashes.begin(), hashes.end(), sum);
         if (row.name.empty() || high - low < 2) continue;
         const auto [place, isNew] = first.emplace(row.name, raw.number);
         if (!isNew) {

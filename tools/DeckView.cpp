@@ -252,6 +252,10 @@ private:
             procedure = deck_.keywords[static_cast<std::size_t>(block.begin) + 1].name;
         perturbations_.push_back(step.Find("perturbation") != nullptr);
         header_["steps"].push_back(StepText(block.name, procedure, perturbations_.back()));
+        std::string lines;
+        for (int i = block.begin; i < std::min(block.begin + 2, block.last); ++i)
+            AddKeyword(deck_.keywords[static_cast<std::size_t>(i)], lines);
+        header_["steps"].back()["lines"] = lines;
     }
 
     /// The places of sets in the header by instance (-1: assembly) and folded name.
@@ -402,8 +406,7 @@ private:
             AddLines(keyword, said.text);
             const auto place = static_cast<std::size_t>(&keyword - deck_.keywords.data());
             for (std::size_t i = place + 1; i < static_cast<std::size_t>(keyword.end); ++i) {
-                said.text.append(deck_.Text(deck_.keywords[i].header)).append("\n");
-                AddLines(deck_.keywords[i], said.text);
+                AddKeyword(deck_.keywords[i], said.text);
             }
             return all;
         }
@@ -418,6 +421,10 @@ private:
             AddField(line, mark == "pair" ? 2 : 1, said.state);
         }
         return all;
+    }
+    void AddKeyword(const drd_Keyword& keyword, std::string& text) const {
+        text.append(deck_.Text(keyword.header)).append("\n");
+        AddLines(keyword, text);
     }
     void AddLines(const drd_Keyword& keyword, std::string& text) const {
         for (std::uint64_t i = 0; i < keyword.lines; ++i)

@@ -28,7 +28,7 @@ ordered_json StatusesText() {
     return statuses;
 }
 
-ordered_json StepsText(const kprC_StepContainer& steps) {
+ordered_json StepsText(const kprC_StepContainer& steps, const oif_DeckLines& lines) {
     ordered_json texts = ordered_json::array();
     for (int i = 0; i < steps.Size(); ++i) {
         const kprC_Step& step = steps.StepAt(i);
@@ -39,6 +39,8 @@ ordered_json StepsText(const kprC_StepContainer& steps) {
                              {"perturbation", step.Perturbation()},
                              {"loadCases", ordered_json::array()}};
         if (times.period.IsSet()) text["period"] = times.period.value;
+        for (const oif_ObjectLines& own : lines.Of("steps", steps.NameAt(i), steps.NameAt(i)))
+            if (own.loadCase.IsEmpty()) text["lines"] = vpg_Text(cow_String(own.text));
         if (const auto* analysis = nex_canDynamicCastPtr<kprC_AnalysisStep>(&step)) {
             for (const auto& [name, loadCase] : analysis->loadCases)
                 text["loadCases"].push_back(vpg_Text(name));
@@ -197,7 +199,7 @@ private:
 
 void vpg_DescribeObjects(const vpg_Layout& layout, const oif_DeckLines& lines, ordered_json& header) {
     header["statuses"] = StatusesText();
-    header["steps"] = StepsText(layout.Model().steps);
+    header["steps"] = StepsText(layout.Model().steps, lines);
     header["datums"] = DatumsText(layout.Model().Datums());
     ordered_json& objects = header["objects"] = ordered_json::array();
     for (const odiK_Repository& repository : odiK_Repositories()) {

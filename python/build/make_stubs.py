@@ -5,7 +5,7 @@ import pathlib
 import sys
 import textwrap
 
-from qrx import _names, _qrx, _records
+from qrx import _docs, _names, _qrx, _records, _values
 
 HEAD = '''"""Stubs of the package; made from the store's tables."""
 
@@ -353,7 +353,7 @@ def own_fields(cls):
 
 
 def doc(cls, indent="    "):
-    text = _records.class_doc(cls).replace("\\", "\\\\").replace('"""', '\\"\\"\\"')
+    text = _docs.class_doc(cls).replace("\\", "\\\\").replace('"""', '\\"\\"\\"')
     return textwrap.indent(f'"""{text}\n"""', indent, lambda line: bool(line.strip()))
 
 
@@ -429,7 +429,7 @@ def frame_stub(name, full, base, extra, body=""):
 def stubs():
     lines = [HEAD]
     for full in _qrx.enum_names():
-        members = _records.enum_class(full)
+        members = _values.enum_class(full)
         lines.append(f"class {members.__name__}(_Word):")
         lines += [f"    {each} = {member.value!r}" for each, member in members.__members__.items()]
     lines.append(BASES.format(step="_StepBase", state="State", propagating="Propagating"))

@@ -17,12 +17,12 @@ __version__ = _qrx.__version__
 # What is written by hand; all else is made of the store's tables when it is first asked for.
 _PLACES = {
     "Model": "_model",
-    "Part": "_model",
-    "Instance": "_model",
-    "Assembly": "_model",
-    "AssemblyMesh": "_model",
-    "AssemblySet": "_model",
-    "Parameter": "_model",
+    "Part": "_assembly",
+    "Instance": "_assembly",
+    "Assembly": "_assembly",
+    "AssemblyMesh": "_assembly",
+    "AssemblySet": "_assembly",
+    "Parameter": "_containers",
     "load": "_model",
     "load_all": "_model",
     "save": "_model",
@@ -33,10 +33,10 @@ _PLACES = {
     "ModelError": "_errors",
     "DeckError": "_errors",
     "Record": "_records",
-    "Polar": "_records",
+    "Polar": "_values",
     "study": "_study",
     "StudyResult": "_study",
-    "Region": "_records",
+    "Region": "_values",
 }
 
 
@@ -80,9 +80,9 @@ def _hooks():
 
     _qrx.set_hooks(
         record=lazily("._records", "record_of"),
-        member=lazily("._records", "member_of"),
-        polar=lazily("._records", "Polar"),
-        region=lazily("._records", "Region"),
+        member=lazily("._values", "member_of"),
+        polar=lazily("._values", "Polar"),
+        region=lazily("._values", "Region"),
         model_error=lazily("._records", "model_error"),
         deck_error=lazily("._errors", "DeckError"),
     )

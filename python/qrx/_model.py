@@ -1,567 +1,19 @@
 """Models: parts, the assembly, materials, steps and what lives across them."""
 
 import functools
-import html
 import json
 import os
-from collections.abc import Mapping, MutableMapping
-from typing import NamedTuple
+from collections.abc import Mapping
 
 from . import _names, _qrx, _records
+from ._assembly import Assembly, AssemblyMesh, AssemblySet, Instance, Part, plain
+from ._containers import Datums, Named, Parameter, Parameters, Repository, Steps, filled, no_such, repositories
+from ._docs import doc_of
 from ._errors import Finding, ModelError, wrong
-from ._mesh import Mesh
+from ._told import Page, history_of, kinds_of, summary
 
 DEFAULT_NAME = "Default Model"
 FORMAT = "qrx-model/1"
-
-
-class Repository(MutableMapping):
-    """The objects of one kind by name."""
-
-    def __init__(self, member, class_name, plural):
-        self._member = member
-        self._class_name = class_name
-        self._plural = plural
-        self._items = {}
-
-    def _checked(self, name, record):
-        if not isinstance(name, str):
-            raise TypeError(f"names of {self._plural} are texts, not {name!r}")
-        wanted = _records.class_named(self._class_name)
-        if isinstance(record, wanted):
-            return record
-        raise wrong(f"/{self._member}/{name}", f"found {record!r}", f"a qrx.{wanted.__name__}")
-
-    def __getitem__(self, name):
-        try:
-            return self._items[name]
-        except KeyError:
-            raise _no_such(self._plural, name, self._items) from None
-
-    def __setitem__(self, name, record):
-        self._items[name] = self._checked(name, record)
-
-    def __delitem__(self, name):
-        if name not in self._items:
-            raise _no_such(self._plural, name, self._items)
-        del self._items[name]
-
-    def __iter__(self):
-        return iter(self._items)
-
-    def __len__(self):
-        return len(self._items)
-
-    def __repr__(self):
-        return repr(self._items)
-
-    def _document(self):
-        return self._items
-
-
-def _no_such(plural, name, known):
-    hint = _qrx.nearest(str(name), list(known))
-    return KeyError(f"{plural}: there is no {name!r}" + (f"; {hint}" if hint else ""))
-
-
-class Steps(Mapping):
-    """The steps by name, in their order; the initial one comes first."""
-
-    def __init__(self):
-        self._list = [_records.class_named("kprC_InitialStep")()]
-
-    def __getitem__(self, name):
-        for step in self._list:
-            if step.name == name:
-                return step
-        raise _no_such("steps", name, [step.name for step in self._list])
-
-    def __iter__(self):
-        return iter([step.name for step in self._list])
-
-    def __len__(self):
-        return len(self._list)
-
-    def __delitem__(self, name):
-        self._list.remove(self[name])
-
-    def add(self, step, *, before=None, after=None):
-        """Adds a step, at the end or beside another one; an initial step takes the place of the one there is."""
-        if not isinstance(step, _records.class_named("kprC_Step")):
-            raise wrong("/steps", f"found {step!r}", "a step, such as qrx.StaticStep('Load')")
-        if step._full_name == "kprC_InitialStep":
-            self._list[:1] = [step]
-            return step
-        if step.name in self:
-            raise wrong("/steps", f"found a second step named {step.name!r}", "names that are unique")
-        place = len(self._list)
-        if before is not None:
-            place = self._place(before)
-        elif after is not None:
-            place = self._place(after) + 1
-        self._list.insert(max(place, 1), step)
-        return step
-
-    def _place(self, step):
-        return [each.name for each in self._list].index(self[_records.step_name(step)].name)
-
-    def __eq__(self, other):
-        return isinstance(other, Steps) and self._list == other._list
-
-    __hash__ = None
-
-    def __repr__(self):
-        return repr(self._list)
-
-    def _document(self):
-        return self._list
-
-
-class _Attributes:
-    """A list of what is assigned to sets."""
-
-    def __init__(self, name, class_name, optional):
-        self.name = name
-        self.class_name = class_name
-        self.optional = optional
-
-    def __set_name__(self, owner, name):
-        self.slot = "_" + name
-
-    def __get__(self, owner, kind=None):
-        return self if owner is None else getattr(owner, self.slot)
-
-    def __set__(self, owner, value):
-        if value is None and self.optional:
-            object.__setattr__(owner, self.slot, None)
-            return
-        wanted = _records.class_named(self.class_name)
-        records = [wanted(**each) if isinstance(each, dict) else each for each in value]
-        for each in records:
-            if not isinstance(each, wanted):
-                raise wrong("/" + self.name, f"found {each!r}", f"a qrx.{wanted.__name__}")
-        object.__setattr__(owner, self.slot, records)
-
-
-class _Mesh:
-    def __get__(self, owner, kind=None):
-        return self if owner is None else owner._mesh
-
-    def __set__(self, owner, value):
-        object.__setattr__(owner, "_mesh", None if value is None else Mesh.of(value))
-
-
-_SLOTS = ("_mesh", "_section_assignments", "_material_orientations", "_beam_orientations")
-_LISTS = {
-    "section_assignments": "sectionAssignments",
-    "material_orientations": "materialOrientations",
-    "beam_orientations": "beamOrientations",
-}
-
-
-class _Owner:
-    """What parts and instances have: a mesh, and what its sets are assigned."""
-
-    __slots__ = ()
-
-    def _extras(self):
-        return ("mesh", *_LISTS)
-
-    def __setattr__(self, name, value):
-        if name in self._extras():
-            object.__setattr__(self, name, value)
-        else:
-            super().__setattr__(name, value)
-
-    def assign(self, region, section, *, offset=0.0):
-        """Gives a section to the elements of a set of the mesh; a later assignment wins."""
-        record = _records.class_named("ptoC_SectionAssignment")(region, getattr(section, "name", section))
-        if offset:
-            record.offset = offset
-        self._append("section_assignments", record)
-        return record
-
-    def orient_material(self, region, datum=None, **fields):
-        """Gives the material of a set's elements a coordinate system."""
-        record = _records.class_named("ptoC_MaterialOrientation")(region=region, datum=datum, **fields)
-        self._append("material_orientations", record)
-        return record
-
-    def orient_beams(self, region, vector):
-        """Gives the beams of a set the direction of their first cross-section axis."""
-        record = _records.class_named("ptoC_BeamOrientation")(region=region, vector=vector)
-        self._append("beam_orientations", record)
-        return record
-
-    def _append(self, name, record):
-        if getattr(self, name) is None:
-            setattr(self, name, [])
-        getattr(self, name).append(record)
-
-    def _document(self):
-        document = super()._document()
-        document.pop("class", None)
-        if self.mesh is not None:
-            document["mesh"] = self.mesh._native
-        for name, member in _LISTS.items():
-            records = getattr(self, name)
-            if records or (records is not None and self._optional_lists):
-                document[member] = records
-        return document
-
-    def _fill(self, tree):
-        record = type(self)._taken(tree)
-        self._values = record._values
-        if "mesh" in tree:
-            self.mesh = Mesh._of(tree["mesh"])
-        for name, member in _LISTS.items():
-            if member in tree:
-                setattr(self, name, tree[member])
-
-    def _same(self, other):
-        return super()._same(other) and all(getattr(self, name) == getattr(other, name) for name in self._extras())
-
-    def __deepcopy__(self, memo):
-        twin = super().__deepcopy__(memo)
-        twin._adopt({name: _records._deep(getattr(self, name), memo) for name in self._extras()}, self.name)
-        return twin
-
-    def __copy__(self):
-        twin = super().__copy__()
-        twin._adopt({name: getattr(self, name) for name in self._extras()}, self.name)
-        return twin
-
-    def _adopt(self, extras, name):
-        object.__setattr__(self, "_name", name)
-        for each, value in extras.items():
-            setattr(self, each, value)
-
-    @property
-    def name(self):
-        """By what the model calls it."""
-        return self._name
-
-    def __repr__(self):
-        text = super().__repr__()
-        return f"<{text.replace('()', '')} {self._name!r}: {self.mesh!r}>" if self.mesh is not None else text
-
-    def __reduce__(self):
-        raise TypeError("save a model as a file instead")
-
-
-class Part(_Owner, _records.class_named("odiK_Part")):
-    """A part: a mesh, and what its sets are assigned. Made by ``Model.add_part``."""
-
-    __slots__ = (*_SLOTS, "_name")
-    _tells_class = False
-    _optional_lists = False
-    mesh = _Mesh()
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", False)
-    material_orientations = _Attributes("materialOrientations", "ptoC_MaterialOrientation", False)
-    beam_orientations = _Attributes("beamOrientations", "ptoC_BeamOrientation", False)
-
-    def __init__(self, name, mesh=None, **fields):
-        object.__setattr__(self, "_name", name)
-        self.mesh = mesh
-        for each in _LISTS:
-            setattr(self, each, [])
-        super().__init__(**fields)
-
-
-class Instance(_Owner, _records.class_named("odiK_Instance")):
-    """An instance of a part, moved and turned. What it has of its own takes the place of the part's."""
-
-    __slots__ = (*_SLOTS, "_name")
-    _tells_class = False
-    _optional_lists = True
-    mesh = _Mesh()
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", True)
-    material_orientations = _Attributes("materialOrientations", "ptoC_MaterialOrientation", True)
-    beam_orientations = _Attributes("beamOrientations", "ptoC_BeamOrientation", True)
-
-    def __init__(self, name, part=None, **fields):
-        object.__setattr__(self, "_name", name)
-        for each in ("mesh", *_LISTS):
-            setattr(self, each, None)
-        super().__init__(**fields)
-        if part is not None:
-            self.part = getattr(part, "name", part)
-
-
-class AssemblySet(NamedTuple):
-    """A set of the assembly: ``members`` are (instance or None, labels, faces or None)."""
-
-    kind: str
-    members: list
-    internal: bool = False
-
-    def _document_as(self, name):
-        entries = []
-        for instance, labels, faces in self.members:
-            labels = labels.tolist() if hasattr(labels, "tolist") else list(labels)
-            entry = {} if instance is None else {"instance": instance}
-            if self.kind == "surface":
-                entry["facets"] = [[label, face] for label, face in zip(labels, faces)]
-            else:
-                entry["labels"] = labels
-            entries.append(entry)
-        document = {"name": name, "kind": self.kind, "members": entries}
-        if self.internal:
-            document["internal"] = True
-        return document
-
-
-class AssemblyMesh:
-    """The assembly's own mesh: few nodes, and elements such as connectors, whose ends may lie in instances.
-
-    ``cells`` are (type, rows of ends) or (type, rows, labels); an end is the label of a node of this mesh, or
-    "INSTANCE.LABEL".
-    """
-
-    def __init__(self, points=(), cells=(), *, point_labels=None, controls=None):
-        self.points = [tuple(float(number) for number in point) for point in points]
-        self.point_labels = list(range(1, len(self.points) + 1)) if point_labels is None else _plain(point_labels)
-        self.cells = []
-        first = 1
-        for block in cells.items() if isinstance(cells, dict) else cells:
-            kind, rows, *labels = block
-            rows = [list(row) for row in _plain(rows)]
-            given = _plain(labels[0]) if labels else list(range(first, first + len(rows)))
-            first = max([first - 1, *given]) + 1
-            self.cells.append((kind, rows, given))
-        self.controls = dict(controls or {})
-
-    def _document(self):
-        elements = []
-        for kind, rows, labels in self.cells:
-            block = {"type": kind, "labels": labels, "connectivity": rows}
-            controls = self.controls.get(kind)
-            if controls is not None:
-                document = dict(controls._document())
-                document.pop("class", None)
-                block["controls"] = document
-            elements.append(block)
-        document = {"nodes": {"labels": self.point_labels, "coordinates": self.points}} if self.points else {}
-        return {**document, "elements": elements} if elements else document
-
-    def __eq__(self, other):
-        return isinstance(other, AssemblyMesh) and self._document() == other._document()
-
-    __hash__ = None
-
-    def __repr__(self):
-        cells = [(kind, rows, labels) for kind, rows, labels in self.cells]
-        text = f"qrx.AssemblyMesh({self.points!r}, {cells!r}, point_labels={self.point_labels!r}"
-        return text + (f", controls={self.controls!r})" if self.controls else ")")
-
-
-def _plain(values):
-    return values.tolist() if hasattr(values, "tolist") else list(values)
-
-
-class Assembly(_records.class_named("odiK_Assembly")):
-    """The assembly: instances, and what spans them."""
-
-    __slots__ = ("instances", "sets", "_mesh", "_section_assignments", "_connector_orientations")
-    _tells_class = False
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", False)
-    connector_orientations = _Attributes("connectorOrientations", "ptoC_ConnectorOrientation", False)
-
-    def __init__(self, **fields):
-        object.__setattr__(self, "instances", _Named("instances", Instance))
-        object.__setattr__(self, "sets", _AssemblySets())
-        object.__setattr__(self, "_mesh", None)
-        self.section_assignments = []
-        self.connector_orientations = []
-        super().__init__(**fields)
-
-    def _extras(self):
-        return ("instances", "sets", "mesh", "section_assignments", "connector_orientations")
-
-    @property
-    def mesh(self):
-        """The assembly's own mesh, or None."""
-        return self._mesh
-
-    @mesh.setter
-    def mesh(self, value):
-        if value is not None and not isinstance(value, AssemblyMesh):
-            raise wrong("/assembly/mesh", f"found {value!r}", "a qrx.AssemblyMesh")
-        object.__setattr__(self, "_mesh", value)
-
-    def _document(self):
-        document = super()._document()
-        if self.instances:
-            document["instances"] = self.instances
-        if self.mesh is not None:
-            document["mesh"] = self.mesh
-        if self.sets:
-            document["sets"] = [each._document_as(name) for name, each in self.sets.items()]
-        if self.section_assignments:
-            document["sectionAssignments"] = self.section_assignments
-        if self.connector_orientations:
-            document["connectorOrientations"] = self.connector_orientations
-        return document
-
-    def _same(self, other):
-        return super()._same(other) and all(getattr(self, name) == getattr(other, name) for name in self._extras())
-
-    def __deepcopy__(self, memo):
-        twin = type(self)()
-        twin._values = {name: _records._deep(value, memo) for name, value in self._values.items()}
-        for name, instance in self.instances.items():
-            twin.instances._items[name] = instance.__deepcopy__(memo)
-        twin.sets.update(self.sets)
-        twin.mesh = self.mesh
-        twin.section_assignments = _records._deep(self.section_assignments, memo)
-        twin.connector_orientations = _records._deep(self.connector_orientations, memo)
-        return twin
-
-
-class _AssemblySets(dict):
-    def __missing__(self, name):
-        raise _no_such("sets of the assembly", name, self)
-
-
-class _Named(MutableMapping):
-    """Parts or instances by name."""
-
-    def __init__(self, plural, kind):
-        self._plural = plural
-        self._kind = kind
-        self._items = {}
-
-    def __getitem__(self, name):
-        try:
-            return self._items[name]
-        except KeyError:
-            raise _no_such(self._plural, name, self._items) from None
-
-    def __setitem__(self, name, value):
-        if not isinstance(value, self._kind):
-            raise wrong(f"/{self._plural}/{name}", f"found {value!r}", f"a qrx.{self._kind.__name__}")
-        object.__setattr__(value, "_name", name)
-        self._items[name] = value
-
-    def __delitem__(self, name):
-        del self._items[name]
-
-    def __iter__(self):
-        return iter(self._items)
-
-    def __len__(self):
-        return len(self._items)
-
-    def __eq__(self, other):
-        return isinstance(other, _Named) and self._items == other._items
-
-    __hash__ = None
-
-    def __repr__(self):
-        return repr(self._items)
-
-    def _document(self):
-        return self._items
-
-
-class _Datums(_Named):
-    def __init__(self):
-        super().__init__("datums", _records.class_named("odiK_Datum"))
-
-    def __setitem__(self, name, value):
-        if not isinstance(value, self._kind):
-            raise wrong(f"/datums/{name}", f"found {value!r}", "a qrx.Datum")
-        value.name = name
-        self._items[name] = value
-
-    def __eq__(self, other):
-        return isinstance(other, _Datums) and list(self._items.items()) == list(other._items.items())
-
-    __hash__ = None
-
-    def _document(self):
-        return list(self._items.values())
-
-
-class Parameter(NamedTuple):
-    """A short name for places of the model that studies vary together.
-
-    ``pointers`` are JSON pointers into the model file, ``limits`` a text such as "> 0, <= 20" or "0.5 .. 20".
-    """
-
-    pointers: tuple
-    unit: str = ""
-    limits: str = ""
-    description: str = ""
-
-    @classmethod
-    def of(cls, value):
-        """A parameter of pointers, or of what a model file says."""
-        if isinstance(value, dict):
-            fields = dict(value)
-            return cls(_pointers(fields.pop("pointers", ())), **fields)
-        if isinstance(value, Parameter):
-            return cls(_pointers(value.pointers), *value[1:])
-        return cls(_pointers(value))
-
-    def _document(self):
-        texts = {name: text for name, text in zip(self._fields[1:], self[1:]) if text}
-        return {"pointers": list(self.pointers), **texts}
-
-
-def _pointers(value):
-    return (value,) if isinstance(value, str) else tuple(value)
-
-
-class _Parameters(dict):
-    """Parameters by name."""
-
-    def __setitem__(self, name, value):
-        super().__setitem__(name, Parameter.of(value))
-
-    def __missing__(self, name):
-        raise _no_such("parameters", name, self)
-
-
-class HistoryCell(NamedTuple):
-    """What an object is in a step; whether the step writes it, and with op=NEW. None: only the status is known."""
-
-    status: object
-    written: object = None
-    op_new: object = None
-
-
-class HistoryRow(NamedTuple):
-    """An object through all steps."""
-
-    name: str
-    suppressed: bool
-    steps: dict
-
-
-class History(list):
-    """Rows of a history; as a text, the table that the command line prints."""
-
-    def __init__(self, rows, text):
-        super().__init__(rows)
-        self.text = text
-
-    def __str__(self):
-        return self.text
-
-    def _repr_html_(self):
-        return f"<pre>{html.escape(self.text)}</pre>"
-
-
-class Page(str):
-    """A page that shows a model; notebooks show it in a frame."""
-
-    __slots__ = ()
-
-    def _repr_html_(self):
-        return (
-            f'<iframe srcdoc="{html.escape(self)}" style="width:100%;height:640px;border:1px solid #ccc"></iframe>'
-        )
 
 
 class _Data:
@@ -569,7 +21,7 @@ class _Data:
 
     def __init__(self, field):
         self._field = field
-        self.__doc__ = _records.doc_of(field)
+        self.__doc__ = doc_of(field)
 
     def __get__(self, model, kind=None):
         return self if model is None else self._field.__get__(model._data)
@@ -595,7 +47,7 @@ class Model:
         self.assembly = Assembly()
         self.steps = Steps()
         self.parameters = {}
-        for attribute in _repositories():
+        for attribute in repositories():
             setattr(self, attribute, {})
         if heading is not None:
             if "top_level_solver_input" in fields:
@@ -603,10 +55,10 @@ class Model:
             self.heading = heading
 
     def __setattr__(self, name, value):
-        if name in _repositories():
-            value = _filled(Repository(*_repositories()[name]), value)
+        if name in repositories():
+            value = filled(Repository(*repositories()[name]), value)
         elif name in ("parts", "datums", "parameters"):
-            value = _filled({"parts": _parts, "datums": _Datums, "parameters": _Parameters}[name](), value)
+            value = filled({"parts": _parts, "datums": Datums, "parameters": Parameters}[name](), value)
         elif name == "steps" and not isinstance(value, Steps):
             taken = Steps()
             for step in value.values() if isinstance(value, Mapping) else value:
@@ -615,7 +67,7 @@ class Model:
         elif name == "assembly" and not isinstance(value, Assembly):
             raise wrong("/assembly", f"found {value!r}", "a qrx.Assembly")
         elif not hasattr(type(self), name) and name not in _MEMBERS:
-            known = [*_model_data()._fields, *_repositories(), *_MEMBERS, "heading"]
+            known = [*_model_data()._fields, *repositories(), *_MEMBERS, "heading"]
             hint = _qrx.nearest(name, known)
             raise AttributeError(f"Model has no {name!r}" + (f"; {hint}" if hint else ""))
         object.__setattr__(self, name, value)
@@ -673,7 +125,7 @@ class Model:
                 from ._mesh import _facets
 
                 labels, faces = _facets(labels)
-            entries.append((instance, _plain(labels), faces))
+            entries.append((instance, plain(labels), faces))
         self.assembly.sets[name] = AssemblySet(kind, entries, internal)
         return name
 
@@ -699,7 +151,7 @@ class Model:
         if assembly:
             document["assembly"] = assembly
         document["steps"] = self.steps
-        for attribute, row in _repositories().items():
+        for attribute, row in repositories().items():
             repository = getattr(self, attribute)
             if repository:
                 document[row[0]] = repository
@@ -747,17 +199,17 @@ class Model:
     def history(self, kind=None):
         """What the objects of a kind ("loads", ...) are in each step; of all kinds, by kind, when none is given."""
         told = json.loads(self._store().history())
-        kinds = {_names.repository_name(member): member for member in told if member in _texts(told)}
+        kinds = {_names.repository_name(member): member for member in told if member in kinds_of(told)}
         if kind is None:
-            return {name: _history(told, member) for name, member in kinds.items()}
+            return {name: history_of(told, member) for name, member in kinds.items()}
         member = _member_of(kind, kinds)
-        return _history(told, member)
+        return history_of(told, member)
 
     def deck_lines(self, kind, name, step, load_case=""):
         """The lines that an object becomes in a step of the deck, or in a load case of it."""
-        member = _member_of(kind, {each: row[0] for each, row in _repositories().items()})
+        member = _member_of(kind, {"steps": "steps", **{each: row[0] for each, row in repositories().items()}})
         if name not in getattr(self, _names.repository_name(member)):
-            raise _no_such(kind, name, getattr(self, _names.repository_name(member)))
+            raise no_such(kind, name, getattr(self, _names.repository_name(member)))
         lines = self._store().deck_lines(member, name, self.steps[_records.step_name(step)].name)
         found = [text for case, text in lines if case == load_case]
         return "".join(found).splitlines()
@@ -785,7 +237,7 @@ class Model:
         twin.assembly = self.assembly.copy()
         twin.steps._list = [step.copy() for step in self.steps._list]
         twin.parameters = self.parameters
-        for attribute in _repositories():
+        for attribute in repositories():
             for name, record in getattr(self, attribute).items():
                 getattr(twin, attribute)[name] = record.copy()
         return twin
@@ -800,28 +252,22 @@ class Model:
             return NotImplemented
         return all(
             getattr(self, name) == getattr(other, name)
-            for name in ("name", "_data", "datums", "parts", "assembly", "steps", "parameters", *_repositories())
+            for name in ("name", "_data", "datums", "parts", "assembly", "steps", "parameters", *repositories())
         )
 
     __hash__ = None
 
     def __repr__(self):
         counts = [f"{len(self.parts)} parts", f"{len(self.instances)} instances", f"{len(self.steps)} steps"]
-        counts += [f"{len(getattr(self, name))} {name}" for name in _repositories() if getattr(self, name)]
+        counts += [f"{len(getattr(self, name))} {name}" for name in repositories() if getattr(self, name)]
         return f"<qrx.Model {self.heading or self.name!r}: {', '.join(counts)}>"
 
     def _repr_html_(self):
-        return _summary(self)
+        return summary(self)
 
 
 def _parts():
-    return _Named("parts", Part)
-
-
-def _filled(container, value):
-    for name, each in dict(value).items():
-        container[name] = each
-    return container
+    return Named("parts", Part)
 
 
 _MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps", "parameters")
@@ -830,16 +276,6 @@ _MEMBERS = ("name", "_data", "datums", "parts", "assembly", "steps", "parameters
 @functools.cache
 def _model_data():
     return _records.class_named("odiK_ModelData")
-
-
-@functools.cache
-def _repositories():
-    """The rows of the repositories but the steps, by Python's names."""
-    return {
-        _names.repository_name(member): (member, class_name, plural)
-        for member, class_name, plural, _ in _qrx.repositories()
-        if member != "steps"
-    }
 
 
 for _name, _field in _model_data()._fields.items():
@@ -852,22 +288,6 @@ def _member_of(kind, known):
             return member
     hint = _qrx.nearest(str(kind), list(known))
     raise wrong("/", f"found {kind!r}", "one of " + ", ".join(known), hint)
-
-
-def _texts(told):
-    return {member for member in told if member != "failures"}
-
-
-def _history(told, member):
-    statuses = _records.enum_class("mdl_PropagationStatusEnm")
-    rows = []
-    for name, entry in told[member].items():
-        cells = {
-            state["step"]: HistoryCell(statuses(state["status"]), state.get("written"), state.get("opNew"))
-            for state in entry["steps"]
-        }
-        rows.append(HistoryRow(name, entry["suppressed"], cells))
-    return History(rows, _qrx.history_text(json.dumps(told), member))
 
 
 def _file_of(models):
@@ -900,7 +320,7 @@ def load(path, name=None):
     if name is None:
         name = next(iter(models)) if len(models) == 1 else DEFAULT_NAME
     if name not in models:
-        raise _no_such("models", name, models)
+        raise no_such("models", name, models)
     return models[name]
 
 
@@ -937,7 +357,7 @@ def _model_of(name, tree):
     model.assembly.section_assignments = assembly.get("sectionAssignments", [])
     model.assembly.connector_orientations = assembly.get("connectorOrientations", [])
     model.steps._list = tree["steps"]
-    for attribute, row in _repositories().items():
+    for attribute, row in repositories().items():
         getattr(model, attribute)._items.update(tree[row[0]])
     return model
 
@@ -957,40 +377,3 @@ def _assembly_mesh_of(told):
         if controls._values:
             mesh.controls[kind] = controls
     return mesh
-
-
-def _table(head, rows):
-    cells = "".join(f"<th style='text-align:left'>{html.escape(word)}</th>" for word in head)
-    body = "".join(
-        "<tr>" + "".join(f"<td style='text-align:left'>{html.escape(str(cell))}</td>" for cell in row) + "</tr>"
-        for row in rows
-    )
-    return f"<table><thead><tr>{cells}</tr></thead><tbody>{body}</tbody></table>"
-
-
-def _summary(model):
-    """The model as notebooks show it."""
-    title = f"<h4>{html.escape(model.heading or model.name)}</h4>"
-    parts = [
-        (name, part.mesh.num_points if part.mesh else 0, part.mesh.num_cells if part.mesh else 0,
-         ", ".join(sorted({block.type for block in part.mesh.cells})) if part.mesh else "")
-        for name, part in model.parts.items()
-    ]
-    text = title + _table(("part", "nodes", "elements", "types"), parts)
-    text += _table(("instance", "part"), [(name, each.part) for name, each in model.instances.items()])
-    text += _table(("step", "procedure"), [(step.name, type(step).__name__) for step in model.steps._list])
-    rows = [
-        (name.replace("_", " "), len(getattr(model, name)), ", ".join(getattr(model, name)))
-        for name in _repositories()
-        if getattr(model, name)
-    ]
-    text += _table(("kind", "count", "names"), rows)
-    try:
-        model._store()
-    except ModelError as error:
-        text += _table(("errors",), [(str(finding),) for finding in error.findings if finding.is_error])
-    return text
-
-
-__all__ = ["Assembly", "AssemblyMesh", "AssemblySet", "Instance", "Model", "Parameter", "Part", "load", "load_all",
-           "save"]

@@ -1,127 +1,19 @@
 """The classes of records and enumerations, made of the store's own tables when they are first asked for."""
 
-import enum
 import functools
 import os
 
 from . import _names, _qrx
+from ._docs import Doc, SignatureOf, doc_of
 from ._errors import Finding, ModelError, wrong
+from ._values import HELD, enum_class, enum_names, region, shown_value
 
 _MUTABLE = {"List", "Map", "Table", "Record", "Optional", "Variant"}
-_HELD = {"Record", "Optional", "Variant"}
-
-
-class Word(str, enum.Enum):
-    """A word of the store. Members equal their words, and are found by them in any capitals, by number too."""
-
-    @classmethod
-    def _missing_(cls, value):
-        return _word_table(cls.__name__).get(value.lower() if isinstance(value, str) else value)
-
-    @property
-    def number(self):
-        """The number by which model files may call it."""
-        return _word_numbers(type(self).__name__)[self.value]
-
-    def __repr__(self):
-        return f"qrx.{type(self).__name__}.{self.name}"
-
-    def __str__(self):
-        return self.value
-
-    __format__ = str.__format__
-
-
-@functools.cache
-def _enums():
-    """The full name of each enumeration by Python's."""
-    return {_names.enum_name(name): name for name in _qrx.enum_names()}
-
-
-@functools.cache
-def enum_class(full):
-    """The class of an enumeration by its full name."""
-    rows = _qrx.enum_rows(full)
-    name = _names.enum_name(full)
-    return Word(name, [(_names.member_name(row[0]), row[0]) for row in rows], module="qrx", qualname=name)
-
-
-@functools.cache
-def _word_numbers(name):
-    return {row[0]: row[1] for row in _qrx.enum_rows(_enums()[name])}
-
-
-@functools.cache
-def _word_table(name):
-    members = enum_class(_enums()[name])
-    table = {}
-    for word, number, text, deck in _qrx.enum_rows(_enums()[name]):
-        for key in (word.lower(), number, text.lower(), (deck or word).lower()):
-            table.setdefault(key, members._value2member_map_[word])
-    return table
-
-
-def member_of(full, word):
-    return enum_class(full)._value2member_map_[word]
-
-
-class Polar:
-    """A complex number by magnitude and phase, in degrees."""
-
-    __slots__ = ("magnitude", "phase")
-
-    def __init__(self, magnitude, phase):
-        self.magnitude = float(magnitude)
-        self.phase = float(phase)
-
-    def _document(self):
-        return {"form": "POLAR", "real": self.magnitude, "imag": self.phase}
-
-    def __eq__(self, other):
-        if not isinstance(other, Polar):
-            return NotImplemented
-        return (self.magnitude, self.phase) == (other.magnitude, other.phase)
-
-    def __hash__(self):
-        return hash((self.magnitude, self.phase))
-
-    def __repr__(self):
-        return f"qrx.Polar({self.magnitude!r}, {self.phase!r})"
-
-
-def region(value, place="/region"):
-    """A set of the assembly ("SET") or of an instance ("INSTANCE.SET"); as (instance, set) where a name has a dot."""
-    if value is None or isinstance(value, str):
-        return value
-    if isinstance(value, dict) and "set" in value:
-        value = (value.get("instance"), value["set"])
-    if isinstance(value, (tuple, list)) and len(value) == 2:
-        instance, name = (getattr(part, "name", part) for part in value)
-        if isinstance(name, str) and (instance is None or isinstance(instance, str)):
-            if "." in name or (instance and "." in instance):
-                return Region(instance or None, name)
-            return f"{instance}.{name}" if instance else name
-    raise wrong(place, f"found {value!r}", "'SET', 'INSTANCE.SET', (instance, set) or None")
-
-
-class Region(tuple):
-    """A set of an instance, or of the assembly, where a name has a dot."""
-
-    __slots__ = ()
-
-    def __new__(cls, instance, name):
-        return super().__new__(cls, (instance, name))
-
-    def _document(self):
-        return {"instance": self[0], "set": self[1]} if self[0] else {"set": self[1]}
-
-    def __getnewargs__(self):
-        return tuple(self)
 
 
 def _is_special(told):
     """Whether values of the type name sets and datums, or are records: what only Python can hold."""
-    if told["kind"] in _HELD or told["kind"] in ("Region", "Datum"):
+    if told["kind"] in HELD or told["kind"] in ("Region", "Datum"):
         return True
     inner = told.get("item") or told.get("value")
     return inner is not None and _is_special(inner)
@@ -177,7 +69,7 @@ class Field:
             if value is None or isinstance(value, str):
                 return value
             raise wrong(self.place, f"found {value!r}", "the name of a datum, or None")
-        if kind in _HELD:
+        if kind in HELD:
             return self._held(told, value)
         if kind == "Attribute":
             if value is None or (isinstance(value, dict) and "state" in value):
@@ -399,17 +291,6 @@ def _deep(value, memo):
     return value
 
 
-def shown_value(value):
-    """A value as it can be pasted back."""
-    if isinstance(value, Word):
-        return repr(value.value)
-    if isinstance(value, list):
-        return "[" + ", ".join(map(shown_value, value)) + "]"
-    if isinstance(value, dict):
-        return "{" + ", ".join(f"{name!r}: {shown_value(item)}" for name, item in value.items()) + "}"
-    return repr(value)
-
-
 class Step(Record):
     """A step. ``name`` is by what everything else calls it."""
 
@@ -624,83 +505,6 @@ def step_name(step):
     return name
 
 
-class _Doc:
-    """Made when somebody asks for it."""
-
-    def __get__(self, record, owner=None):
-        return class_doc(owner)
-
-
-class _Signature:
-    def __get__(self, record, owner=None):
-        from inspect import Parameter, Signature
-
-        parameters = [
-            Parameter(name, Parameter.POSITIONAL_OR_KEYWORD, default=_default_of(owner, name))
-            for name in owner._positional
-        ]
-        parameters += [
-            Parameter(name, Parameter.KEYWORD_ONLY, default=_default_of(owner, name))
-            for name in owner._fields
-            if name not in owner._positional
-        ]
-        return Signature(parameters)
-
-
-def _default_of(owner, name):
-    from inspect import Parameter
-
-    return owner._fields[name].default() if name in owner._fields else Parameter.empty
-
-
-def type_text(told):
-    """A type in words."""
-    kind = told["kind"]
-    if kind == "Attribute":
-        return type_text(told["value"])
-    if kind == "List":
-        return f"list of {type_text(told['item'])}"
-    if kind == "Map":
-        return f"dict of {type_text(told['item'])} by name"
-    if kind == "Enum":
-        return _names.enum_name(told["enum"])
-    if kind in _HELD:
-        return _names.class_name(told["class"]) + ("" if kind == "Record" else " or None")
-    return {
-        "Bool": "bool", "Int": "int", "Double": "float", "Float": "float", "String": "str", "Triple": "three floats",
-        "Segment": "two points", "Complex": "complex", "Table": "rows of floats", "Region": "region, 'INSTANCE.SET'",
-        "Datum": "name of a datum or None",
-    }[kind]
-
-
-def doc_of(field):
-    text = f"{field.name} : {type_text(field.told)}"
-    if not field.native.required and field.kind != "Attribute":
-        text += f", default {shown_value(field.default())}"
-    text += f"\n    {field.native.doc}"
-    words = list(field.native.words) + [f"{word[1]} ({word[0]})" for word in field.native.meanings]
-    if words:
-        text += "\n    One of: " + ", ".join(words)
-    if field.native.refers_to:
-        text += f"\n    Names: {field.native.refers_to}"
-    if field.native.not_in_deck:
-        text += f"\n    Never in a deck: {field.native.not_in_deck}"
-    return text
-
-
-def class_doc(cls):
-    text = cls._doc[:1].upper() + cls._doc[1:]
-    if not text.endswith("."):
-        text += "."
-    if cls._fields:
-        text += "\n\n" + "\n".join(doc_of(field) for field in cls._fields.values())
-    if issubclass(cls, Propagating) and cls._state_full_name:
-        state = cls._state_class()
-        text += "\n\nIn each step, by at(step, ...):\n\n"
-        text += "\n".join(doc_of(field) for field in state._fields.values())
-    return text
-
-
 def _bases(native):
     if native.base and native.base != "cls_Record":
         base = class_named(native.base)
@@ -730,8 +534,8 @@ def class_named(full):
         "__slots__": (),
         "__module__": "qrx",
         "__qualname__": name,
-        "__doc__": _Doc(),
-        "__signature__": _Signature(),
+        "__doc__": Doc(),
+        "__signature__": SignatureOf(),
         "_doc": native.doc,
         "_full_name": full,
         "_fields": fields,
@@ -790,12 +594,12 @@ def public(name):
     """A class of records or an enumeration, or None."""
     if name in classes():
         return class_named(classes()[name])
-    full = _enums().get(name)
+    full = enum_names().get(name)
     return None if full is None else enum_class(full)
 
 
 def public_names():
-    return [*classes(), *_enums()]
+    return [*classes(), *enum_names()]
 
 
 def record_of(full, values):

@@ -240,3 +240,12 @@ TEST(DeckDiff, ADeckAndItsOtherForm_AreEqual) {
     EXPECT_NE(device.Text(), kDeck);
     EXPECT_EQ(DifferencesOf(kDeck, device.Text()), kNone);
 }
+
+TEST(DeckDiff, ALongKeywordLineWithAParameterOfNoLetter_AndItsOtherForm_AreEqual) {
+    const std::string deck = "*Tie, name=tie, adjust=no, position tolerance=0.01, no rotation, no thickness, "
+                             "type=NODE TO SURFACE, cyclic symmetry, \xe9tendue=0.5, 2d\nA, B\n";
+    const ReadDeckText read(deck);
+    qio_StringDevice device;
+    drd_Reformat(read.deck, device);
+    EXPECT_EQ(DifferencesOf(deck, device.Text()), kNone) << device.Text();
+}

@@ -42,9 +42,9 @@ def test_RecordsOfAModel_ComeBackFromTheirRepr(path):
 
 
 def _repositories():
-    from qrx import _model
+    from qrx import _containers
 
-    return list(_model._repositories())
+    return list(_containers.repositories())
 
 
 # Classes that no field of a model holds, so that no model file can.

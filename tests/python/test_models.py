@@ -199,6 +199,7 @@ def test_DeckLines_AreThoseOfTheDeck():
     assert lines == ["** Name: Force   Type: Concentrated force", "*Cload", "ROD-1.TIP, 1, 1000."]
     assert "\n".join(lines) in rod.DECK
     assert model.deck_lines("loads", "Force", "Initial") == []
+    assert model.deck_lines("steps", "Pull", "Pull")[0].startswith("*Step, name=Pull")
     with pytest.raises(KeyError):
         model.deck_lines("loads", "Forse", "Pull")
     with pytest.raises(KeyError):

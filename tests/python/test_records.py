@@ -6,7 +6,7 @@ import pickle
 import pytest
 
 import qrx
-from qrx import _names, _qrx, _records
+from qrx import _names, _qrx, _records, _values
 
 ALL = [name for name, full in _records.classes().items() if not _qrx.class_of(full).abstract]
 
@@ -27,7 +27,7 @@ def sample(told, field, depth=0):
             return field.native.words[-1]
         return "*Line\n" if field.native.verbatim else "Some name"
     if kind == "Enum":
-        return list(_records.enum_class(told["enum"]))[-1]
+        return list(_values.enum_class(told["enum"]))[-1]
     if kind == "Triple":
         return (0.25, -0.0, 1e-30)
     if kind == "Segment":

@@ -135,6 +135,25 @@ TEST(DeckLines, OfASubmodelBoundary_AreTheSharedLineAndItsOwn) {
     EXPECT_GT(found, 0U);
 }
 
+TEST(DeckLines, OfSteps_AreThoseOfTheirProcedures) {
+    mdf_Report report;
+    const auto odb = mdf_ReadModelText(R"({"format": "qrx-model/1", "models": {"Default Model": {"steps": [
+        {"name": "Initial", "class": "InitialStep"},
+        {"name": "Bend", "class": "StaticStep", "nlgeom": "ON", "description": "Ten degrees"},
+        {"name": "Hold", "class": "StaticStep"}]}}})",
+                                       "m.json", report);
+    ASSERT_NE(odb, nullptr);
+    const oif_DeckLines lines(*odb);
+    EXPECT_TRUE(lines.Of("steps", "Initial", "Initial").empty());
+    ASSERT_EQ(lines.Of("steps", "Bend", "Bend").size(), 1U);
+    EXPECT_EQ(lines.Of("steps", "Bend", "Bend")[0].text,
+              "*Step, name=Bend, nlgeom=YES\nTen degrees\n*Static\n1., 1., 1e-05, 1.\n");
+    // Large displacements stay on.
+    ASSERT_EQ(lines.Of("steps", "Hold", "Hold").size(), 1U);
+    EXPECT_EQ(lines.Of("steps", "Hold", "Hold")[0].text,
+              "*Step, name=Hold, nlgeom=YES\n*Static\n1., 1., 1e-05, 1.\n");
+}
+
 TEST(DeckLines, OfWhatItDoesNotKnow_AreNone) {
     odb_Odb odb;
     odb.AddModel(odb_Odb::DefaultModelName());

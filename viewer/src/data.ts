@@ -127,6 +127,8 @@ export interface Step {
     perturbation: boolean;
     loadCases: string[];
     period?: number;
+    /** Its own in the deck: what begins it, and its procedure. */
+    lines?: string;
 }
 
 export interface Datum {

@@ -226,6 +226,7 @@ export class Page {
         place.append(make("h2", {}, `Step ${step.name}`));
         const facts = [step.procedure, step.perturbation ? "linear perturbation" : "", step.period === undefined ? "" : `time ${step.period}`, step.description];
         place.append(make("p", { class: "soft" }, facts.filter((fact) => fact !== "").join(" · ")));
+        if (step.lines !== undefined) place.append(make("pre", { class: "lines", tabindex: "0", "aria-label": "The step's lines of the deck" }, step.lines));
         if (step.loadCases.length > 0) place.append(make("p", { class: "soft" }, `Load cases: ${step.loadCases.join(", ")}`));
         const wanted = element<HTMLInputElement>("search").value.trim().toLowerCase();
         const resting: HTMLLIElement[] = [];

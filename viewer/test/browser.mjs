@@ -112,13 +112,14 @@ const tests = {
         assert.equal(await tab.value("document.querySelector('#steps [aria-current]').firstChild.textContent"), "Pull");
     },
 
-    async "a load's lines on the page are those of the deck, in every step that writes it"(tab) {
+    async "the lines of steps and loads on the page are those of the deck, in every step that writes them"(tab) {
         for (const name of ["thermo_mechanical", "bolted_joint", "bracket"]) {
             execFileSync(program, ["write", join(project, "examples", name, `${name}.json`), "--output-dir", folder]);
             const deck = readFileSync(join(folder, `${name}.inp`), "utf8");
             await tab.open(pageOf(name));
             const shown = await tab.value(`(() => { const all = []; const { model } = qrxPage;
                 model.header.steps.forEach((step, i) => { qrxPage.goToStep(i);
+                    if (i > 0) all.push([step.name, 'the step', document.querySelector('#happening > pre').textContent]);
                     model.header.objects.forEach((object, k) => { if (object.steps[i][2] < 0 || object.kind !== 'loads') return;
                         qrxPage.select({ kind: 'object', index: k }, false);
                         for (const pre of document.querySelectorAll('#card pre')) all.push([step.name, object.name, pre.textContent]); }); });

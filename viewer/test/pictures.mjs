@@ -120,7 +120,7 @@ function discs(spots, reach) {
     const inside = new Uint8Array(width * height);
     for (const spot of spots) {
         for (let y = Math.max(0, Math.ceil(spot.y - reach)); y < Math.min(height, spot.y + reach); ++y)
-            for (let x = Math.max(0, Math.ceil(spot.x - reach)); x < Math.min(width, spot.x + reach); ++x) if (Math.hypot(x - spot.x, y - spot.y) < reach) inside[y * width + x] = 1;
+            for (let x = Math.max(0, Math.ceil(spot.x - reach)); x < Math.min(width, spot.x + reach); ++x) if ((x - spot.x) ** 2 + (y - spot.y) ** 2 < reach ** 2) inside[y * width + x] = 1;
     }
     return inside;
 }
@@ -218,8 +218,7 @@ class Shooting {
         await this.tab.value(`for (const drawn of qrxPage.marks.group.children) for (const part of drawn.children) if (part.isInstancedMesh) {
             part.visible = drawn.userData.object === ${index};
             part.count = part.instanceMatrix.count - ${less};
-        }
-        qrxPage.stage.draw()`);
+        }`);
         return pictureOf(this.tab);
     }
 

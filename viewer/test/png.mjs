@@ -27,12 +27,17 @@ function unfiltered(raw, width, height, channels) {
     const lines = new Uint8Array(height * stride);
     for (let y = 0; y < height; ++y) {
         const filter = raw[y * (stride + 1)];
+        const from = y * (stride + 1) + 1;
+        const to = y * stride;
         for (let x = 0; x < stride; ++x) {
-            const left = x < channels ? 0 : lines[y * stride + x - channels];
-            const above = y === 0 ? 0 : lines[(y - 1) * stride + x];
-            const corner = y === 0 || x < channels ? 0 : lines[(y - 1) * stride + x - channels];
-            const guess = [0, left, above, (left + above) >> 1, paeth(left, above, corner)][filter];
-            lines[y * stride + x] = raw[y * (stride + 1) + 1 + x] + guess;
+            const left = x < channels ? 0 : lines[to + x - channels];
+            const above = y === 0 ? 0 : lines[to + x - stride];
+            let guess = 0;
+            if (filter === 1) guess = left;
+            else if (filter === 2) guess = above;
+            else if (filter === 3) guess = (left + above) >> 1;
+            else if (filter === 4) guess = paeth(left, above, y === 0 || x < channels ? 0 : lines[to + x - stride - channels]);
+            lines[to + x] = raw[from + x] + guess;
         }
     }
     const rgb = new Uint8Array(width * height * 3);
@@ -41,8 +46,9 @@ function unfiltered(raw, width, height, channels) {
 }
 
 function paeth(a, b, c) {
-    const p = a + b - c;
-    const [pa, pb, pc] = [Math.abs(p - a), Math.abs(p - b), Math.abs(p - c)];
+    const pa = Math.abs(b - c);
+    const pb = Math.abs(a - c);
+    const pc = Math.abs(a + b - 2 * c);
     return pa <= pb && pa <= pc ? a : pb <= pc ? b : c;
 }
 

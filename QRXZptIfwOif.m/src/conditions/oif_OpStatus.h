@@ -75,8 +75,9 @@ protected:
     void SetFlagsWhere(const char* kind, const kprC_PropagatingContainer<T>& objects, const Test& test) {
         for (const auto& [name, object] : objects) {
             const nex_Context context(kind, name);
-            for (const int step : oif_StepsWhere(object, stepNames.Length(),
-                                                 [&](int i) { return test(object, stepNames[i]); })) {
+            for (const int step : oif_StepsWhere(object, stepNames.Length(), [&, &of = object](int i) {
+                     return test(of, stepNames[i]);
+                 })) {
                 SetFlag(Key(object.DynTypeId()), step);
             }
         }

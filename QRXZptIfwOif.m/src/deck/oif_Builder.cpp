@@ -40,7 +40,8 @@ void oif_Builder::WriteInput(qio_ostream& device) {
 
 qkw_FilingLog oif_Builder::BuildLogged() {
     qkw_FilingLog log;
-    qkw_BuilderComponent* const made[] = {&constraint_, &boundaryCondition_, &load_, &field_, &interaction_};
+    qkw_BuilderComponent* const made[] = {&step_, &constraint_, &boundaryCondition_,
+                                          &load_, &field_,      &interaction_};
     for (qkw_BuilderComponent* component : made) component->LogTo(log);
     BuildComponents();
     return log;

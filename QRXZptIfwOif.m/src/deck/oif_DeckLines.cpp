@@ -15,11 +15,9 @@ struct Kind {
     /// What the builders call its objects.
     std::string_view made;
 };
-constexpr Kind kKinds[] = {{"constraints", "constraint"},
-                           {"boundaryConditions", "boundary condition"},
-                           {"loads", "load"},
-                           {"fields", "field"},
-                           {"interactions", "interaction"}};
+constexpr Kind kKinds[] = {
+    {"steps", "step"}, {"constraints", "constraint"}, {"boundaryConditions", "boundary condition"},
+    {"loads", "load"}, {"fields", "field"},           {"interactions", "interaction"}};
 
 const Kind* FindKind(std::string_view repository) {
     const auto* place =

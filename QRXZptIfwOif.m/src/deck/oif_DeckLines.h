@@ -27,11 +27,12 @@ public:
     oif_DeckLines& operator=(const oif_DeckLines&) = delete;
     ~oif_DeckLines();
 
-    /// Whether it knows lines of the objects in a repository, by its name in model files: "constraints",
-    /// "boundaryConditions", "loads", "fields" and "interactions".
+    /// Whether it knows lines of the objects in a repository, by its name in model files: "steps",
+    /// "constraints", "boundaryConditions", "loads", "fields" and "interactions".
     static bool Knows(const std::string& repository);
     /// The object's lines in the step, then in each of its load cases; nothing where a step only carries the
-    /// object on. What stands ahead of all steps (constraints, what contacts begin with) is the first step's.
+    /// object on. A step's own lines are those of its procedure, and its load cases' beginnings. What stands
+    /// ahead of all steps (constraints, what contacts begin with) is the first step's.
     std::vector<oif_ObjectLines> Of(const std::string& repository, const cow_String& name,
                                     const cow_String& step) const;
 

@@ -33,8 +33,8 @@ void oif_TransformBuilder::CollectCsysRegionsList() {
     }
     for (const auto& [key, load] : Model().Loads()) {
         if (load.suppressed) continue;
-        const auto appendSystemOf = [&](const auto* typed) {
-            if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, load.region);
+        const auto appendSystemOf = [&append, &region = load.region](const auto* typed) {
+            if (typed != nullptr && !typed->datum.IsNullRef()) append(typed->datum, region);
         };
         appendSystemOf(nex_canDynamicCastPtr<kloC_ConcentratedForce>(&load));
         appendSystemOf(nex_canDynamicCastPtr<kloC_Moment>(&load));

@@ -13,13 +13,13 @@ void oif_StepBuilder::Build() {
     for (const auto& [stepName, anyStep] : Model().Steps()) {
         // The initial step has no block.
         if (stepName == Model().InitialStepName()) continue;
-        const nex_Context context("step", stepName);
-        const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(anyStep, NEX_HERE);
         AddStepDefinition(
             stepName,
             oif_Comment(
                 cow_String("----------------------------------------------------------------\n\nSTEP: ") +
                 stepName + "\n"));
+        const Making making(*this, "step", stepName);
+        const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(anyStep, NEX_HERE);
         AddStepDefinition(stepName, oif_Step(step, nlgeomInherited, stepName));
         AddProcedure(stepName, step, previousProcedure);
         // What was once on stays on, for explicit steps that turn it off too.
