@@ -431,11 +431,11 @@ private:
             text.append(deck_.DataLine(keyword, i)).append("\n");
     }
     /// The line behind its sets, as the value of a field.
-    static void AddField(std::string_view line, int first, ordered_json& state) {
+    static void AddField(std::string_view line, std::size_t first, ordered_json& state) {
         constexpr std::size_t most = 6;
         std::string values;
-        const auto fields = static_cast<int>(std::ranges::count(line, ',')) + 1;
-        for (int i = first; i < fields; ++i) {
+        const auto fields = static_cast<std::size_t>(std::ranges::count(line, ',')) + 1;
+        for (std::size_t i = first; i < fields; ++i) {
             const std::string_view field = drd_Field(line, i);
             if (!field.empty()) values.append(values.empty() ? "" : ", ").append(field);
         }
@@ -458,7 +458,7 @@ private:
         if (key == "dload" && drd_FoldKey(drd_Field(line, 1)) == "grav") {
             if (!drd_ReadReal(drd_Field(line, 2), value)) return;
             state["components"] = ordered_json::array();
-            for (int i = 3; i < 6; ++i) {
+            for (std::size_t i = 3; i < 6; ++i) {
                 double direction = 0.0;
                 drd_ReadReal(drd_Field(line, i), direction);
                 state["components"].push_back(value * direction);
