@@ -5,11 +5,14 @@ usage: mutate.py [--count N] [--seed N] [--decks-only] [--keep]
 
 Takes a sample of places in the deck writer, each a condition to negate, a text to change, a comparison to turn or
 an "and" to make an "or". All go into one copy of the tree, each asleep until the variable QRX_MUTANT names it, so
-that the copy is built once. Then each is woken alone: the golden decks are run, and where these see nothing, all
-test programs. Prints which tests killed how many, and names every mutant that lives.
+that the copy is built once, without optimising. Then each is woken alone: the golden decks are run, where these see
+nothing the tests of its folder, and then all test programs, the quickest first. Prints which tests killed how many,
+and names every mutant that lives; those in scripts/equivalent.txt, which change nothing that anybody could see, are
+counted apart.
 """
 
 import argparse
+import concurrent.futures
 import os
 import pathlib
 import random
@@ -17,11 +20,13 @@ import re
 import shutil
 import subprocess
 import sys
+import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 COPY = ROOT / "build" / "mutants"
-BUILD = COPY / "build" / "release"
+BUILD = COPY / "build" / "debug"
 WRITER = "QRXZptIfwOif.m/src"
+PRECOMPILED = "mutants.h"
 
 HEADER = """#ifndef QRX_MUTANT_H
 #define QRX_MUTANT_H
@@ -127,11 +132,23 @@ def plant(name, mutants):
     (COPY / name).write_text('#include "foundation/qrx_Mutant.h"\n' + "\n".join(lines) + "\n")
 
 
-def compiles(name):
-    """The lines of the file that the compiler refuses."""
-    run = subprocess.run(["g++", "-std=c++20", "-fsyntax-only", "-I.", f"-I{WRITER}", name], cwd=COPY,
-                         capture_output=True, text=True)
-    return [int(line) - 1 for line in re.findall(re.escape(name) + r":(\d+):\d+: error", run.stderr)], run.returncode
+def refused(name):
+    """The lines of the file that the compiler refuses, and whether it refuses the file."""
+    run = subprocess.run(["g++", "-std=c++20", "-fsyntax-only", "-I.", f"-I{WRITER}", "-include", PRECOMPILED, name],
+                         cwd=COPY, capture_output=True, text=True)
+    # The header of the mutants stands ahead of the first line.
+    return [int(line) - 1 for line in re.findall(re.escape(name) + r":(\d+):\d+: error", run.stderr)], run.returncode != 0
+
+
+def without_refused(name, mutants):
+    """Plants those of the mutants that can be; what has to be a constant can't be put to sleep."""
+    while True:
+        plant(name, mutants)
+        wrong, fails = refused(name)
+        if not fails:
+            return mutants
+        kept = [m for m in mutants if not any(abs(m[1] - line) <= 1 for line in wrong)]
+        mutants = kept if len(kept) < len(mutants) else []
 
 
 def take_sample(count, seed):
@@ -149,15 +166,10 @@ def take_sample(count, seed):
         lines.add((name, line))
         total += 1
         chosen.setdefault(name, []).append((total, line, description, change))
-    # What has to be a constant can't be put to sleep.
-    for name in list(chosen):
-        while True:
-            plant(name, chosen[name])
-            wrong, code = compiles(name)
-            if code == 0:
-                break
-            kept = [m for m in chosen[name] if not any(abs(m[1] - w) <= 1 for w in wrong)]
-            chosen[name] = kept if len(kept) < len(chosen[name]) else []
+    (COPY / PRECOMPILED).write_text(f'#include "foundation/qrx_Mutant.h"\n#include "{WRITER}/base/oif_ModelInfo.h"\n')
+    subprocess.run(["g++", "-std=c++20", "-I.", f"-I{WRITER}", "-x", "c++-header", PRECOMPILED], cwd=COPY, check=True)
+    with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
+        chosen = dict(zip(chosen, pool.map(without_refused, chosen.keys(), chosen.values())))
     mutants = sorted((m[0], name, m[1], m[2]) for name, list_ in chosen.items() for m in list_)
     return mutants[:count]
 
@@ -172,6 +184,52 @@ def run(program, number, *arguments, timeout=300):
         return True
 
 
+def build(decks_only):
+    """Builds the copy; its program of golden decks, and the other test programs with the quickest first."""
+    ccache = shutil.which("ccache") or ""
+    subprocess.run(["cmake", "--preset", "debug", f"-DCMAKE_CXX_COMPILER_LAUNCHER={ccache}", "-DQRX_BUILD_TESTS=ON",
+                    "-DCMAKE_CXX_FLAGS_DEBUG=-O0", "-DQRX_UNITY_BUILD=ON", "-DQRX_BUILD_PYTHON=OFF"],
+                   cwd=COPY, check=True, stdout=subprocess.DEVNULL)
+    target = ["--target", "qrx_deck_tests"] if decks_only else []
+    subprocess.run(["cmake", "--build", str(BUILD), "--parallel", str(os.cpu_count()), *target], check=True,
+                   stdout=subprocess.DEVNULL)
+    decks = BUILD / "tests" / "decks" / "qrx_deck_tests"
+    others = [] if decks_only else sorted(
+        path for path in (BUILD / "tests").glob("*/*") if path.is_file() and os.access(path, os.X_OK)
+        and path.name.endswith(("_test", "_tests")) and path != decks and "long" not in path.name)
+    seconds = {}
+    for program in [decks, *others]:
+        begin = time.monotonic()
+        if run(program, 0):
+            sys.exit(f"mutate.py: {program.name} fails although all mutants sleep")
+        seconds[program] = time.monotonic() - begin
+    return decks, sorted(others, key=seconds.get)
+
+
+def killer_of(mutant, decks, others):
+    """The name of the first program that fails with this mutant awake."""
+    number, name = mutant[:2]
+    # Of the six ways of each deck the plain one sees nearly all.
+    if run(decks, number, "--gtest_filter=*Plainly*"):
+        return decks.name
+    family = name[len(WRITER) + 1:].split("/")[0]
+    near = [program for program in others if program.parent.name == family]
+    far = [program for program in others if program.parent.name != family]
+    return next((program.name for program in [*near, decks, *far] if run(program, number)), None)
+
+
+def equivalent():
+    """Files and changes that nobody could see; a reason stands behind "  -- "."""
+    path = ROOT / "scripts" / "equivalent.txt"
+    known = set()
+    if path.exists():
+        for line in path.read_text().splitlines():
+            if line and not line.startswith("#"):
+                name, _, description = line.split("  -- ")[0].partition(": ")
+                known.add((name, description.strip()))
+    return known
+
+
 def main():
     arguments = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     arguments.add_argument("--count", type=int, default=200)
@@ -183,35 +241,25 @@ def main():
     if not options.keep:
         copy_tree()
     mutants = take_sample(options.count, options.seed)
-    print(f"{len(mutants)} mutants")
-    ccache = shutil.which("ccache") or ""
-    subprocess.run(["cmake", "--preset", "release", f"-DCMAKE_CXX_COMPILER_LAUNCHER={ccache}", "-DQRX_BUILD_TESTS=ON"],
-                   cwd=COPY, check=True, stdout=subprocess.DEVNULL)
-    target = ["--target", "qrx_deck_tests"] if options.decks_only else []
-    subprocess.run(["cmake", "--build", str(BUILD), "--parallel", str(os.cpu_count()), *target], check=True,
-                   stdout=subprocess.DEVNULL)
-    decks = BUILD / "tests" / "decks" / "qrx_deck_tests"
-    others = [] if options.decks_only else sorted(
-        path for path in (BUILD / "tests").glob("*/*") if path.is_file() and os.access(path, os.X_OK)
-        and path.name.endswith(("_test", "_tests")) and path != decks and "long" not in path.name)
-    for program in [decks, *others]:
-        if run(program, 0):
-            sys.exit(f"mutate.py: {program.name} fails although all mutants sleep")
-
+    print(f"{len(mutants)} mutants, seed {options.seed}", flush=True)
+    decks, others = build(options.decks_only)
+    known = equivalent()
     killers = {}
     living = []
-    for number, name, line, description in mutants:
-        # Of the six ways of each deck the plain one sees nearly all.
-        plainly = run(decks, number, "--gtest_filter=*Plainly*")
-        killer = decks.name if plainly else next(
-            (program.name for program in [decks, *others] if run(program, number)), None)
-        if killer is None:
-            living.append(f"{name}:{line}: {description}")
-            print("lives:", living[-1], flush=True)
-        else:
-            killers[killer] = killers.get(killer, 0) + 1
+    same = 0
+    with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
+        for mutant, killer in zip(mutants, pool.map(lambda m: killer_of(m, decks, others), mutants)):
+            _, name, line, description = mutant
+            if killer is not None:
+                killers[killer] = killers.get(killer, 0) + 1
+            elif (name, description) in known:
+                same += 1
+            else:
+                living.append(f"{name}:{line}: {description}")
+                print("lives:", living[-1], flush=True)
     for killer, count in sorted(killers.items(), key=lambda item: -item[1]):
         print(f"{count:4} killed by {killer}")
+    print(f"{same:4} equivalent")
     print(f"{len(living):4} live")
 
 

@@ -334,6 +334,8 @@ TEST(Dload, RotationalLoad_HasNoBlanksOnItsLine) {
     EXPECT_EQ(text(R"("centrifugal": false, "rotaryAcceleration": true)"),
               "*Dload\nA.E,ROTA,50.,1.,2.,3.,0.,0.,1.\n");
     EXPECT_EQ(text(R"("centrifugal": false)"), "*Dload\nA.E,,50.,1.,2.,3.,0.,0.,1.\n");
+    EXPECT_EQ(text(R"("centrifugal": true)", 2), "*Dload\nA.E,CENTRIF,50.,1.,2.,3.,0.,0.,1.\n");
+    EXPECT_EQ(text(R"("centrifugal": true)", 3), "*Dload\nA.E,CENTRIF,50.,1.,2.,3.\n");
     EXPECT_EQ(text(R"("centrifugal": true)", 4), "*Dload\nA.E,CENTRIF,50.,1.,2.,3.,0.0,1.0,0.0\n");
 }
 

@@ -54,6 +54,28 @@ TEST(ProcedureChecks, HeatTransfer_NeedsConductivityAndForATransientHeatCapacity
               Texts{"/materials/M: found no conductivity, which step 'Step-1' needs"});
 }
 
+TEST(ProcedureChecks, MaterialsOfLayers_CountAsOthersDo) {
+    const auto found = [](const std::string& type, const std::string& section) {
+        return FindingsOf<dck_CheckProcedures>(StepsOf({"Frequency"}) + R"(,
+            "parts": {"P": {"mesh": {
+                "nodes": {"labels": [1, 2, 3], "coordinates": [[0, 0, 0], [1, 0, 0], [0, 1, 0]]},
+                "elements": [{"type": ")" + type +
+                                               R"(", "labels": [1], "connectivity": [[1, 2, 3]]}],
+                "sets": [{"name": "ALL", "kind": "element", "labels": [1]}]},
+                "sectionAssignments": [{"region": "ALL", "sectionName": "S"}]}},
+            "assembly": {"instances": {"I": {"part": "P"}}}, "materials": {"M": {}, "N": {}, "Idle": {}},
+            "sections": {"S": )" + section + "}");
+    };
+    const Texts both{"/materials/M: found no density, which step 'Step-1' needs",
+                     "/materials/N: found no density, which step 'Step-1' needs"};
+    EXPECT_EQ(found("S3", R"({"class": "CompositeShellSection", "layers": [{"materialName": "M"},
+                  {"materialName": "N"}]})"),
+              both);
+    EXPECT_EQ(found("CPS3", R"({"class": "CompositeSolidSection", "layers": [{"materialName": "M"},
+                  {"materialName": "N"}]})"),
+              both);
+}
+
 TEST(ProcedureChecks, MaterialOfUserCode_IsTrusted) {
     EXPECT_EQ(Found({"Frequency"}, R"("userMaterial": {"mechanicalConstants": [1]})"), Texts{});
 }

@@ -54,6 +54,19 @@ TEST(ModelChecks, TrussElements_TakeSolidAndTrussSections) {
               Texts{});
 }
 
+TEST(ModelChecks, MembranesAndGaskets_TakeTheirOwnSectionsOnly) {
+    const auto section = [](const std::string& name) {
+        return R"("sections": {"S": {"class": ")" + name + R"(", "materialName": "Steel"}},)";
+    };
+    for (const auto& [type, own] : {std::pair("M3D4", "MembraneSection"), {"GK3D8", "GasketSection"}}) {
+        EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + section(own) + Part(type, kOnAll)), Texts{});
+        EXPECT_EQ(
+            FindingsOf<dck_CheckSections>(kSteel + section("HomogenousShellSection") + Part(type, kOnAll)),
+            Texts{"/parts/P: 4 elements of type '" + std::string(type) +
+                  "' can't take the section 'S' (HomogenousShellSection)"});
+    }
+}
+
 TEST(ModelChecks, UnknownElementType_TakesAnySection) {
     EXPECT_EQ(FindingsOf<dck_CheckSections>(kSteel + kSolid + Part("SPRINGA", kOnAll)), Texts{});
 }

@@ -39,6 +39,31 @@ TEST(StateChecks, AmplitudeOverTheTotalTime_NeedsTheTimesOfTheStepsBefore) {
               "3.0, the end of the step; behind its last point it keeps its last value"});
 }
 
+TEST(StateChecks, AmplitudesOfEveryKindWithPoints_EndAtTheLast) {
+    const std::string force = Force(R"("Step-1": {"component1": 1, "amplitude": "A"})");
+    const std::string expected = ", expected points up to 2.0, the end of the step; behind its last point it "
+                                 "keeps its last value";
+    EXPECT_EQ(Found(R"("amplitudes": {"A": {"class": "SmoothStep", "table": [[0, 0], [1.5, 1]]}}, )" + force),
+              Texts{"/loads/F/states/Step-1/amplitude: found 'A', which ends at 1.5" + expected});
+    // Three values from 0.25 on, each half a second behind the one before.
+    EXPECT_EQ(Found(R"("amplitudes": {"A": {"class": "EquallySpaced", "fixedInterval": 0.5, "begin": 0.25,
+                  "values": [0, 1, 2]}}, )" +
+                    force),
+              Texts{"/loads/F/states/Step-1/amplitude: found 'A', which ends at 1.25" + expected});
+}
+
+TEST(StateChecks, AmplitudesThatEndAtZeroOrHaveNoEnd_AreLeftAlone) {
+    const std::string force = Force(R"("Step-1": {"component1": 1, "amplitude": "A"})");
+    for (const char* amplitude :
+         {R"({"class": "SmoothStep", "table": [[0, 1], [1, 0]]})",
+          R"({"class": "EquallySpaced", "fixedInterval": 0.5, "values": [0, 1, 0]})",
+          R"({"class": "EquallySpaced", "fixedInterval": 0.5})", R"({"class": "Tabular"})",
+          R"({"class": "Decay", "initial": 1, "maximum": 2, "start": 0, "decayTime": 1})"}) {
+        EXPECT_EQ(Found(std::string(R"("amplitudes": {"A": )") + amplitude + "}, " + force), Texts{})
+            << amplitude;
+    }
+}
+
 TEST(StateChecks, LoadWithoutAComponent_HasAKeywordWithoutLines) {
     EXPECT_EQ(Found(Force(R"("Step-1": {})")),
               Texts{"/loads/F/states/Step-1: found no component, so the keyword will have no line"});

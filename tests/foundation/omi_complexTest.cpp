@@ -14,7 +14,7 @@ TEST(Complex, PartsInTheirOwnForm_StayAsTheyAre) {
     const omi_complex value{omi_complex::FormEnm::RECTANGULAR, 3.0, 90.0};
     EXPECT_EQ(value.ConvertedReal(), 3.0);
     EXPECT_EQ(value.ConvertedImag(), 90.0);
-    EXPECT_EQ(omi_complex(), omi_complex(omi_complex::FormEnm::RECTANGULAR, 0.0, 0.0));
+    EXPECT_EQ(omi_complex(), (omi_complex{omi_complex::FormEnm::RECTANGULAR, 0.0, 0.0}));
 }
 
 TEST(Complex, MultiplesOfARightAngle_GiveExactZeros) {
