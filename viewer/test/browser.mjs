@@ -131,7 +131,7 @@ const tests = {
                 // A bolt has lines among the boundary conditions and lines among the loads.
                 const lines = deck.slice(begin, end).split("\n");
                 let from = 0;
-                for (const line of text.trimEnd().split("\n")) {
+                for (const line of text.replace(/\n$/, "").split("\n")) {
                     const found = lines.indexOf(line, from);
                     assert.ok(begin >= 0 && found >= 0, `${name}, ${step}, ${load}:\n${text}`);
                     from = found + 1;
