@@ -28,7 +28,9 @@ endif()
 set(QRX_SYMBOL_VERSION QRX_${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
 configure_file(${CMAKE_CURRENT_LIST_DIR}/QRXZptInputFileWriter.map ${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.map @ONLY)
 include(CheckLinkerFlag)
-check_linker_flag(CXX LINKER:--version-script=${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.map QRX_HAS_VERSION_SCRIPTS)
+# Not as LINKER:, which would take a comma in the folder's name for the end of the word.
+set(qrx_version_script "SHELL:-Xlinker \"--version-script=${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.map\"")
+check_linker_flag(CXX "${qrx_version_script}" QRX_HAS_VERSION_SCRIPTS)
 foreach(library ${qrx_libraries})
     target_include_directories(${library} PUBLIC
         $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>
@@ -41,8 +43,7 @@ foreach(library ${qrx_libraries})
     get_target_property(type ${library} TYPE)
     # Where linkers have no such scripts, everything is shown.
     if(type STREQUAL "SHARED_LIBRARY" AND QRX_HAS_VERSION_SCRIPTS)
-        target_link_options(${library} PRIVATE
-            LINKER:--version-script=${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.map)
+        target_link_options(${library} PRIVATE "${qrx_version_script}")
         set_target_properties(${library} PROPERTIES LINK_DEPENDS ${PROJECT_BINARY_DIR}/QRXZptInputFileWriter.map)
     endif()
 endforeach()
