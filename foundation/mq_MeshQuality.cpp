@@ -48,22 +48,24 @@ Vector AreaOf(const Vector* p, int corners) {
     return corners == 3 ? Cross(p[1] - p[0], p[2] - p[0]) : Cross(p[2] - p[0], p[3] - p[1]);
 }
 
+/// A face of four corners is a fan of triangles around its middle, whose volumes add up to one product.
 double VolumeOf(const cel_Cell& cell, const Vector* p) {
     if (cell.corners == 4) return Dot(Cross(p[1] - p[0], p[2] - p[0]), p[3] - p[0]) / 6.0;
     double volume = 0.0;
     for (const cel_Side& side : cell.sides) {
-        const int corners = cel_CellOf(side.kind).corners;
-        Vector face[4];
-        Vector middle;
-        for (int i = 0; i < corners; ++i) {
-            // From the first corner, so that a cell far from the origin loses no digits.
-            face[i] = p[side.nodes[static_cast<std::size_t>(i)]] - p[0];
-            middle = middle + (1.0 / corners) * face[i];
+        // From the first corner, so that a cell far from the origin loses no digits.
+        const auto corner = [&](std::size_t i) { return p[side.nodes[i]] - p[0]; };
+        const Vector a = corner(0);
+        const Vector b = corner(1);
+        const Vector c = corner(2);
+        if (cel_CellOf(side.kind).corners == 3) {
+            volume += Dot(Cross(a, b), c);
+        } else {
+            const Vector d = corner(3);
+            volume += 0.25 * Dot(Cross(c - a, d - b), a + b + c + d);
         }
-        for (int i = 0; i < corners; ++i)
-            volume += Dot(Cross(face[i], face[(i + 1) % corners]), middle) / 6.0;
     }
-    return volume;
+    return volume / 6.0;
 }
 
 std::uint64_t Mixed(std::uint64_t value) {
@@ -72,32 +74,85 @@ std::uint64_t Mixed(std::uint64_t value) {
     return value ^ value >> 31;
 }
 
-/// One number for a set of nodes, in whatever order they stand.
-template <class Nodes>
-std::uint64_t HashOf(const Nodes& nodes) {
+/// Nodes in whatever order they stand.
+struct NodeSet {
+    int least = 0;
+    /// Sets of one sum may differ.
+    std::uint64_t sum = 0;
+
+    explicit NodeSet(std::span<const int> nodes) : least(nodes.front()) {
+        for (const int node : nodes) {
+            least = std::min(least, node);
+            sum += static_cast<std::uint64_t>(node);
+        }
+    }
+};
+std::uint64_t HashOf(std::span<const int> nodes) {
     std::uint64_t sum = 0;
     for (const int node : nodes) sum += Mixed(static_cast<std::uint64_t>(node) + 0x9E3779B97F4A7C15ULL);
     return Mixed(sum);
 }
 
-/// Finds things that equal an earlier one by their hash, in a table of places.
-class EarlierOnes {
+/// Counts things to three by the word and the hash that they are given, and so tells most of those that have
+/// no equals. What lies near each other should have words that do.
+class Tally {
 public:
-    explicit EarlierOnes(std::size_t count) : table_(std::bit_ceil(2 * count + 2), -1) {}
+    explicit Tally(std::size_t words) : words_(words) {}
 
-    template <class Equal>
-    bool HasEqual(std::uint64_t hash, int place, const Equal& equal) {
-        std::size_t slot = hash & (table_.size() - 1);
-        for (; table_[slot] >= 0; slot = (slot + 1) & (table_.size() - 1)) {
-            if (equal(table_[slot])) return true;
-        }
-        table_[slot] = place;
-        return false;
+    void Add(std::size_t word, std::uint64_t hash) {
+        const int shift = ShiftOf(hash);
+        if (CountAt(word, shift) < 3) words_[word] += std::uint64_t{1} << shift;
     }
+    int CountOf(std::size_t word, std::uint64_t hash) const { return CountAt(word, ShiftOf(hash)); }
 
 private:
-    std::vector<int> table_;
+    static int ShiftOf(std::uint64_t hash) {
+        return static_cast<int>((hash * 0x9E3779B97F4A7C15ULL) >> 59) * 2;
+    }
+    int CountAt(std::size_t word, int shift) const { return static_cast<int>(words_[word] >> shift & 3); }
+
+    std::vector<std::uint64_t> words_;
 };
+
+/// A thing, told by its place or label, that may have equals: they have its hash.
+struct Candidate {
+    std::uint64_t hash;
+    int number;
+};
+
+/// Calls `use` for each run of candidates with one hash, in the order of their numbers.
+template <class F>
+void ForEachRun(std::vector<Candidate>& candidates, const F& use) {
+    std::sort(candidates.begin(), candidates.end(), [](const Candidate& a, const Candidate& b) {
+        return a.hash != b.hash ? a.hash < b.hash : a.number < b.number;
+    });
+    for (auto run = candidates.begin(); run != candidates.end();) {
+        const auto end = std::find_if(run, candidates.end(),
+                                      [run](const Candidate& other) { return other.hash != run->hash; });
+        use(std::span(run, end));
+        run = end;
+    }
+}
+
+/// The numbers of those that equal an earlier one, in order.
+template <class Equal>
+std::vector<int> RepeatedOf(std::vector<Candidate>& candidates, const Equal& equal) {
+    std::vector<int> repeated;
+    std::vector<int> different;
+    ForEachRun(candidates, [&](std::span<const Candidate> run) {
+        different.clear();
+        for (const Candidate& candidate : run) {
+            const int number = candidate.number;
+            if (std::any_of(different.begin(), different.end(),
+                            [&](int known) { return equal(known, number); }))
+                repeated.push_back(number);
+            else
+                different.push_back(number);
+        }
+    });
+    std::sort(repeated.begin(), repeated.end());
+    return repeated;
+}
 
 class Examiner {
 public:
@@ -162,8 +217,12 @@ private:
     }
 
     static bool HasSize(const cel_Cell& cell, const Vector* points, bool plane) {
-        double extent = 0.0;
-        for (int i = 1; i < cell.corners; ++i) extent = std::max(extent, Length(points[i] - points[0]));
+        double square = 0.0;
+        for (int i = 1; i < cell.corners; ++i) {
+            const Vector away = points[i] - points[0];
+            square = std::max(square, Dot(away, away));
+        }
+        const double extent = std::sqrt(square);
         if (cell.dimension == 1) return extent > 0.0;
         if (cell.dimension == 3) return VolumeOf(cell, points) > kNothing * extent * extent * extent;
         const Vector area = AreaOf(points, cell.corners);
@@ -187,38 +246,67 @@ private:
 
     void ExamineRepetitions(const mq_Block& block) {
         const auto width = static_cast<std::size_t>(block.width);
-        EarlierOnes earlier(block.labels.size());
         const auto row = [&](int place) {
             return block.nodes.subspan(static_cast<std::size_t>(place) * width, width);
         };
+        const int count = static_cast<int>(block.labels.size());
+        // Nodes that aren't there share a word.
+        Tally tally(static_cast<std::size_t>(numNodes_) + 1);
+        const auto wordOf = [this](const NodeSet& nodes) {
+            return static_cast<std::size_t>(IsNode(nodes.least) ? nodes.least : numNodes_);
+        };
+        for (int place = 0; place < count; ++place) {
+            const NodeSet nodes(row(place));
+            tally.Add(wordOf(nodes), nodes.sum);
+        }
+        std::vector<Candidate> candidates;
+        for (int place = 0; place < count; ++place) {
+            const NodeSet nodes(row(place));
+            if (tally.CountOf(wordOf(nodes), nodes.sum) > 1)
+                candidates.push_back({HashOf(row(place)), place});
+        }
         std::vector<int> mine;
         std::vector<int> other;
-        for (std::size_t i = 0; i < block.labels.size(); ++i) {
-            const auto place = static_cast<int>(i);
-            const bool repeated = earlier.HasEqual(HashOf(row(place)), place, [&](int known) {
-                mine.assign(row(place).begin(), row(place).end());
-                other.assign(row(known).begin(), row(known).end());
-                std::sort(mine.begin(), mine.end());
-                std::sort(other.begin(), other.end());
-                return mine == other;
-            });
-            if (repeated) quality_.repeatedElements.Add(block.labels[i]);
-        }
+        const auto equal = [&](int a, int b) {
+            mine.assign(row(a).begin(), row(a).end());
+            other.assign(row(b).begin(), row(b).end());
+            std::sort(mine.begin(), mine.end());
+            std::sort(other.begin(), other.end());
+            return mine == other;
+        };
+        for (const int place : RepeatedOf(candidates, equal))
+            quality_.repeatedElements.Add(block.labels[static_cast<std::size_t>(place)]);
     }
 
     void ExamineNodes() {
-        EarlierOnes earlier(static_cast<std::size_t>(numNodes_));
-        const auto at = [&](int node) {
-            return mesh_.coordinates.data() + 3 * static_cast<std::size_t>(node);
+        const auto bits = [this](int node) {
+            const float* at = mesh_.coordinates.data() + 3 * static_cast<std::size_t>(node);
+            // Adding zero makes one of the two zeros.
+            return std::array{std::bit_cast<std::uint32_t>(at[0] + 0.0F),
+                              std::bit_cast<std::uint32_t>(at[1] + 0.0F),
+                              std::bit_cast<std::uint32_t>(at[2] + 0.0F)};
+        };
+        const auto hashOf = [&bits](int node) {
+            std::uint64_t hash = 0;
+            for (const std::uint32_t value : bits(node)) hash = Mixed(hash + value);
+            return hash;
+        };
+        const std::size_t words = std::bit_ceil(static_cast<std::size_t>(numNodes_) / 2 + 1);
+        Tally tally(words);
+        const auto wordOf = [words](std::uint64_t hash) {
+            return static_cast<std::size_t>(hash) & (words - 1);
         };
         for (int node = 0; node < numNodes_; ++node) {
-            std::uint64_t hash = 0;
-            // Adding zero makes one of the two zeros.
-            for (int i = 0; i < 3; ++i) hash = Mixed(hash + std::bit_cast<std::uint32_t>(at(node)[i] + 0.0F));
-            const bool repeated = earlier.HasEqual(
-                hash, node, [&](int known) { return std::equal(at(node), at(node) + 3, at(known)); });
-            if (repeated) quality_.repeatedNodes.Add(mesh_.nodeLabels[static_cast<std::size_t>(node)]);
+            const std::uint64_t hash = hashOf(node);
+            tally.Add(wordOf(hash), hash >> 32);
         }
+        std::vector<Candidate> candidates;
+        for (int node = 0; node < numNodes_; ++node) {
+            const std::uint64_t hash = hashOf(node);
+            if (tally.CountOf(wordOf(hash), hash >> 32) > 1) candidates.push_back({hash, node});
+        }
+        for (const int node : RepeatedOf(candidates, [&](int a, int b) { return bits(a) == bits(b); }))
+            quality_.repeatedNodes.Add(mesh_.nodeLabels[static_cast<std::size_t>(node)]);
     }
 
     template <class F>
@@ -241,37 +329,23 @@ private:
         }
     }
 
-    /// Faces lie in bins by their least corner; in a bin equal ones come side by side.
     void ExamineFaces() {
-        std::vector<std::size_t> bins(static_cast<std::size_t>(numNodes_) + 1);
-        const auto binOf = [](std::span<const int> nodes) {
-            return static_cast<std::size_t>(*std::min_element(nodes.begin(), nodes.end()));
-        };
-        ForEachFace([&](std::span<const int> nodes, int) { ++bins[binOf(nodes) + 1]; });
-        std::partial_sum(bins.begin(), bins.end(), bins.begin());
-        struct Face {
-            std::uint64_t hash;
-            int label;
-        };
-        std::vector<Face> faces(bins.back());
-        std::vector<std::size_t> next(bins.begin(), bins.end() - 1);
+        Tally tally(static_cast<std::size_t>(numNodes_));
+        const auto word = [](const NodeSet& face) { return static_cast<std::size_t>(face.least); };
+        ForEachFace([&](std::span<const int> nodes, int) {
+            const NodeSet face(nodes);
+            tally.Add(word(face), face.sum);
+        });
+        std::vector<Candidate> candidates;
         ForEachFace([&](std::span<const int> nodes, int label) {
-            faces[next[binOf(nodes)]++] = {HashOf(nodes), label};
+            const NodeSet face(nodes);
+            if (tally.CountOf(word(face), face.sum) > 2) candidates.push_back({HashOf(nodes), label});
         });
         std::vector<int> labels;
-        for (std::size_t bin = 0; bin + 1 < bins.size(); ++bin) {
-            const auto begin = faces.begin() + static_cast<std::ptrdiff_t>(bins[bin]);
-            const auto end = faces.begin() + static_cast<std::ptrdiff_t>(bins[bin + 1]);
-            std::sort(begin, end, [](const Face& a, const Face& b) {
-                return a.hash != b.hash ? a.hash < b.hash : a.label < b.label;
-            });
-            for (auto run = begin; run != end;) {
-                const auto stop =
-                    std::find_if(run, end, [run](const Face& face) { return face.hash != run->hash; });
-                for (auto face = run; stop - run > 2 && face != stop; ++face) labels.push_back(face->label);
-                run = stop;
-            }
-        }
+        ForEachRun(candidates, [&](std::span<const Candidate> run) {
+            if (run.size() < 3) return;
+            for (const Candidate& face : run) labels.push_back(face.number);
+        });
         std::sort(labels.begin(), labels.end());
         labels.erase(std::unique(labels.begin(), labels.end()), labels.end());
         for (const int label : labels) quality_.sharedFaces.Add(label);
