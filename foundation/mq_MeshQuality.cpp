@@ -107,7 +107,7 @@ public:
 
 private:
     static int ShiftOf(std::uint64_t hash) {
-        return static_cast<int>((hash * 0x9E3779B97F4A7C15ULL) >> 59) * 2;
+        return static_cast<int>(Mixed(hash) >> 59) * 2;
     }
     int CountAt(std::size_t word, int shift) const { return static_cast<int>(words_[word] >> shift & 3); }
 

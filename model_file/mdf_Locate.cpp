@@ -5,6 +5,7 @@
 #include "platform/plt_Files.h"
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <filesystem>
 #include <map>
@@ -88,12 +89,25 @@ public:
                 if (c == ']' || c == '}') --depth;
                 ++at_;
             }
-            if (depth > 0) at_ = std::min(text_.find_first_of("\"/[]{}", at_), text_.size());
+            if (depth > 0) at_ = NextOfInterest();
         } while (at_ < text_.size() && (depth > 0 || IsInScalar()));
         SkipBlanks();
     }
 
 private:
+    /// Strings, comments, arrays and objects; what lies between is mostly millions of numbers.
+    std::size_t NextOfInterest() const {
+        static constexpr auto kOfInterest = [] {
+            std::array<bool, 256> table{};
+            for (const char c : {'"', '/', '[', ']', '{', '}'}) table[static_cast<unsigned char>(c)] = true;
+            return table;
+        }();
+        const char* const begin = text_.data() + std::min(at_, text_.size());
+        const char* const found = std::find_if(begin, text_.data() + text_.size(), [](char c) {
+            return kOfInterest[static_cast<unsigned char>(c)];
+        });
+        return static_cast<std::size_t>(found - text_.data());
+    }
     bool IsInScalar() const {
         return std::string_view(",]} \t\r\n/").find(Peek()) == std::string_view::npos &&
                std::string_view("]}\"").find(text_[at_ - 1]) == std::string_view::npos;
