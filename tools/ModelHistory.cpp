@@ -39,14 +39,16 @@ ordered_json HistoryOf(const mdl_Repository& objects, const kprC_StepContainer& 
         const auto& object = static_cast<const kprC_PropagatingObject&>(record);
         ordered_json states = ordered_json::array();
         for (const auto& [step, stepRecord] : steps) {
-            ordered_json state = {{"step", Text(step)},
-                                  {"status", omu_EnumTableOf(mdl_PropagationStatusEnm())
-                                                 .Row(static_cast<int>(object.StatusIn(step)))
-                                                 ->name}};
+            ordered_json state = ordered_json::object();
+            AddMember(state, "step", Text(step));
+            AddMember(state, "status",
+                      omu_EnumTableOf(mdl_PropagationStatusEnm())
+                          .Row(static_cast<int>(object.StatusIn(step)))
+                          ->name);
             if (markOf != nullptr) {
                 const Mark mark = markOf(object, name, step);
-                state["written"] = mark.written;
-                state["opNew"] = mark.opNew;
+                AddMember(state, "written", mark.written);
+                AddMember(state, "opNew", mark.opNew);
             }
             states.push_back(std::move(state));
         }
