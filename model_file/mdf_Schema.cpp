@@ -72,6 +72,8 @@ bool RefersToRepository(const cls_Field& field) {
     });
 }
 
+// Arrays of one are said as such: braces around a single value are an array for g++ and that value for clang.
+
 /// What a value in a model file looks like. Whatever several places have is a definition that they share.
 class SchemaMaker {
 public:
@@ -112,14 +114,16 @@ private:
         const Json members = definitions_["MEMBERS"]["properties"];
         for (const char* member : {"labels", "facets"})
             definitions_["SET"]["properties"][member] = members[member];
-        definitions_["SET"]["examples"] = {{{"name", "FIXED"}, {"kind", "node"}, {"labels", {1, 2, 3}}}};
+        definitions_["SET"]["examples"] =
+            Json::array({{{"name", "FIXED"}, {"kind", "node"}, {"labels", {1, 2, 3}}}});
         Json& set = definitions_["ASSEMBLY_SET"];
         set["properties"]["members"] = ArrayOf(Reference("MEMBERS"));
         set["properties"]["members"]["description"] = "its members, instance by instance";
         set["required"].push_back("members");
-        set["examples"] = {{{"name", "FIXED"},
-                            {"kind", "node"},
-                            {"members", {{{"instance", "PART-1"}, {"labels", {1, 2, 3}}}}}}};
+        set["examples"] =
+            Json::array({{{"name", "FIXED"},
+                          {"kind", "node"},
+                          {"members", Json::array({{{"instance", "PART-1"}, {"labels", {1, 2, 3}}}})}}});
     }
 
     /// The states of objects, and what these derive from.
@@ -154,7 +158,7 @@ private:
     Json FrameOf() {
         const T byDefault;
         Json object = ObjectOf(T::Class.doc, T::Fields(), byDefault, Json::object(), Json::array());
-        object["examples"] = {Json::parse(T::Fields().Example())};
+        object["examples"] = Json::array({Json::parse(T::Fields().Example())});
         return object;
     }
 
@@ -222,7 +226,7 @@ private:
                 MapOf(Reference(cls_Classes().Find(state->DynTypeId())->info.name));
             record["properties"]["states"]["description"] = "what it is from a step on, by the step's name";
         }
-        record["examples"] = {mdf_ExampleOf(entry)};
+        record["examples"] = Json::array({mdf_ExampleOf(entry)});
         return record;
     }
 
@@ -234,7 +238,7 @@ private:
             {"description", "true ends the object in this step"}, {"type", "boolean"}, {"default", false}};
         properties["status"] = EnumOf(omu_EnumTableOf(mdl_PropagationStatusEnm()), false);
         properties["status"]["description"] = "takes the place of the status that follows from the states";
-        state["examples"] = {Json::parse(entry.fields().Example())};
+        state["examples"] = Json::array({Json::parse(entry.fields().Example())});
         return state;
     }
 

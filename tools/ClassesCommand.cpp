@@ -157,7 +157,7 @@ private:
             return isObject || target == "COMPLEX" ? std::string() : WordsOf(definitions_[target]);
         }
         std::string words;
-        const ordered_json alone = {schema};
+        const ordered_json alone = ordered_json::array({schema});
         for (const ordered_json& choice : schema.contains("anyOf") ? schema["anyOf"] : alone) {
             if (choice.contains("enum") && choice["enum"][0].is_string()) {
                 for (const ordered_json& word : choice["enum"]) {

@@ -86,17 +86,18 @@ qkw_KeywordList Keywords(const oif_ModelInfo& modelInfo, const cow_String& name,
     return ListOf(oif_ShellSolidCoupling(name, coupling, modelInfo));
 }
 
-template <class R>
+/// A row of the objects that answer with the class R and are at least a Kind.
+template <class R, class Kind = R>
 constexpr oif_ConstraintRow RowOf(std::span<const Rule> regions) {
     return {R::Class.Id(), regions,
             [](const oif_ModelInfo& modelInfo, const cow_String& name, const kcoC_Constraint& constraint) {
-                return Keywords(modelInfo, name, static_cast<const R&>(constraint));
+                return Keywords(modelInfo, name, static_cast<const Kind&>(constraint));
             }};
 }
 
 constexpr oif_ConstraintRow kConstraintRows[] = {
     RowOf<kcoC_Equation>({}),
-    RowOf<odiK_Tie>(kTieRegions),
+    RowOf<odiK_Tie, kcoC_Tie>(kTieRegions),
     RowOf<kcoC_Coupling>(kCouplingRegions),
     RowOf<odiK_Coupling>(kCouplingRegions),
     RowOf<kcoC_RigidBody>(kBodyRegions),
