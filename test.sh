@@ -14,7 +14,7 @@ Presets: release unless given, whose tests also run on libraries built with the 
 which the asan preset always leaves out. --cluster runs studies on Slurm and Snakemake instead, as
 root and in namespaces of its own; it installs both. --packages builds all packages twice, and, as root,
 installs them into a fresh Debian system in a folder. windows builds the program for Windows and runs it
-under Wine; libcxx builds it with clang and libc++. Both compare the golden decks.
+under Wine; libcxx builds it with clang and libc++, and runs its tests. Both compare the golden decks.
 END
 }
 
@@ -55,6 +55,7 @@ case ${presets[*]-} in
         scripts/install-dependencies.sh build libcxx
         scripts/build.sh libcxx all
         build/libcxx/tests/decks/qrx_deck_tests --gtest_brief=1
+        PYTHONDONTWRITEBYTECODE=1 python3 tests/programs/qrxdeck_test.py build/libcxx/tools/qrxdeck
         exec python3 tests/libcxx/golden_decks_test.py . build/libcxx/tools/qrxdeck build/libcxx/examples/two_instances
         ;;
 esac
