@@ -15,9 +15,9 @@ constexpr oif_FieldRow FieldRow(const char* label, oif_FieldFamily family, oif_R
             label,
             family,
             region,
+            inEveryStep,
             oif_MakeKeyword<Initial, R, oif_FieldCard, oif_FieldSetting>,
-            oif_MakeKeyword<Later, R, oif_FieldCard, oif_FieldSetting>,
-            inEveryStep};
+            oif_MakeKeyword<Later, R, oif_FieldCard, oif_FieldSetting>};
 }
 /// An initial condition in whatever step it is given.
 template <class R>

@@ -31,10 +31,10 @@ struct oif_FieldRow {
     const char* label;
     oif_FieldFamily family;
     oif_RegionKind region;
-    Maker makeInitial; ///< in the initial step
-    Maker make;        ///< in all others
     /// Written also in each step that only carries it on.
     bool inEveryStep;
+    Maker makeInitial; ///< in the initial step
+    Maker make;        ///< in all others
 
     /// What the region has to be. A field from a file is that of the whole model.
     oif_RegionKind RegionOf(const kpfC_Field& field) const;
