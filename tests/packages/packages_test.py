@@ -36,11 +36,17 @@ def run(*command, **options):
     return done.stdout
 
 
+@functools.cache
+def commit():
+    """The last one when the tests began: a later one has other sources."""
+    return run("git", "-C", OPTIONS.repository, "rev-parse", "HEAD").strip()
+
+
 def build(folder):
     """Builds the packages of the last commit from an archive of its sources, in a folder of this name."""
     folder.mkdir(parents=True)
     archive = folder / "sources.tar"
-    run("git", "-C", OPTIONS.repository, "archive", "-o", archive, "HEAD")
+    run("git", "-C", OPTIONS.repository, "archive", "-o", archive, commit())
     with tarfile.open(archive) as sources:
         sources.extractall(folder / "sources", filter="tar")
     modules = OPTIONS.repository / "viewer" / "node_modules"
