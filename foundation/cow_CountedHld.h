@@ -56,6 +56,7 @@ public:
         return *this;
     }
     ~cow_CountedHld() {
+        // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDelete): the count isn't seen through
         if (count_ != nullptr && count_->Decrement()) Delete();
     }
 

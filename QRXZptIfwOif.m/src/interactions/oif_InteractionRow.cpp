@@ -41,12 +41,13 @@ void HistoryOf(oif_InteractionBuilder& builder, const cow_String& name, const ki
 
 template <class R, void (*add)(oif_InteractionBuilder&, const cow_String&, const R&)>
 constexpr oif_InteractionRow History(std::span<const Rule> regions = {}) {
-    return {R::Class.Id(), regions, oif_ContactSolver::NONE, HistoryOf<R, add>};
+    return {R::Class.Id(), oif_ContactSolver::NONE, oif_Saying::NEVER, regions, HistoryOf<R, add>};
 }
 
 template <class R, void (*add)(oif_InteractionBuilder&, const cow_String&, const R&)>
 constexpr oif_InteractionRow ContactPair(oif_ContactSolver solver, std::span<const Rule> regions) {
-    return {R::Class.Id(), regions, solver, HistoryOf<R, add>, oif_ContactPair::WriteAs<R>};
+    return {
+        R::Class.Id(), solver, oif_Saying::NEVER, regions, HistoryOf<R, add>, oif_ContactPair::WriteAs<R>};
 }
 
 /// A keyword on the one region of the interaction.
@@ -67,15 +68,14 @@ qkw_KeywordHandle MakeIncidentWave(const qkw_ModelInfo& modelInfo, const oif_Int
 
 template <class R, class Keyword, oif_RegionKind kinds>
 constexpr oif_InteractionRow SaidOnSurface(oif_Saying saying = oif_Saying::CHANGES) {
-    oif_InteractionRow row{R::Class.Id(), kSurfaceOf<R, kinds>};
-    row.saying = saying;
+    oif_InteractionRow row{R::Class.Id(), oif_ContactSolver::NONE, saying, kSurfaceOf<R, kinds>};
     row.make = MakeOnSurface<Keyword, R>;
     return row;
 }
 
 constexpr oif_InteractionRow IncidentWave() {
-    oif_InteractionRow row{kinC_IncidentWave::Class.Id(), kWaveRegions};
-    row.saying = oif_Saying::CREATION;
+    oif_InteractionRow row{kinC_IncidentWave::Class.Id(), oif_ContactSolver::NONE, oif_Saying::CREATION,
+                           kWaveRegions};
     row.make = MakeIncidentWave;
     return row;
 }
@@ -83,7 +83,7 @@ constexpr oif_InteractionRow IncidentWave() {
 /// A class that no deck tells of.
 template <class R>
 constexpr oif_InteractionRow Silent() {
-    return {R::Class.Id(), {}};
+    return {R::Class.Id()};
 }
 
 /// An elastic foundation counts among the pairs, without a line.

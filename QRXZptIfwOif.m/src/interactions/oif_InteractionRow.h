@@ -29,14 +29,14 @@ struct oif_InteractionRow {
     using Held = mdl_ObjCow<kinC_Interaction>;
 
     unsigned typeId;
-    std::span<const oif_RegionRule<kinC_Interaction>> regions;
     oif_ContactSolver solver = oif_ContactSolver::NONE;
+    oif_Saying saying = oif_Saying::NEVER;
+    std::span<const oif_RegionRule<kinC_Interaction>> regions = {};
     void (*history)(oif_InteractionBuilder& builder, const cow_String& name,
                     const kinC_Interaction& interaction) = nullptr;
     /// Writes *Contact Pair.
     void (*pair)(utl_Stream& stream, const oif_ContactPair& keyword,
                  const kinC_Interaction& interaction) = nullptr;
-    oif_Saying saying = oif_Saying::NEVER;
     qkw_KeywordHandle (*make)(const qkw_ModelInfo& modelInfo, const Held& interaction, const cow_String& step,
                               oif_Op op) = nullptr;
 };

@@ -62,19 +62,18 @@ private:
 /// How the sections of a class are made.
 struct oif_PartAttributesBuilder::SectionRow {
     unsigned typeId;
-    void (*create)(oif_PartAttributesBuilder& builder, const ddb_PartInstance& instance,
-                   const kseC_Section& section, const Group& group);
     /// Beams name their profile in the comment too, and write it themselves.
     bool writesComment = true;
+    void (*create)(oif_PartAttributesBuilder& builder, const ddb_PartInstance& instance,
+                   const kseC_Section& section, const Group& group);
 
     template <class R, auto Create>
     static constexpr SectionRow Of(bool writesComment = true) {
-        return {R::Class.Id(),
+        return {R::Class.Id(), writesComment,
                 [](oif_PartAttributesBuilder& builder, const ddb_PartInstance& instance,
                    const kseC_Section& section, const Group& group) {
                     (builder.*Create)(instance, static_cast<const R&>(section), group);
-                },
-                writesComment};
+                }};
     }
 };
 
@@ -180,6 +179,7 @@ void oif_PartAttributesBuilder::ProcessPropertyArray(const ddb_PartInstance& ins
     if (properties_->NumElements() > 0) {
         const auto groups = std::make_shared<bme_MapPropertyArray>(*properties_);
         std::vector<bool> partial;
+        partial.reserve(static_cast<std::size_t>(groups->Count()));
         for (int key = 0; key < groups->Count(); ++key) partial.push_back(IsPartial(*groups, key));
         groups->KeepElements(*properties_, partial);
         properties_.reset();
@@ -202,7 +202,7 @@ cow_String oif_PartAttributesBuilder::GroupSetName(const rgnC_Region& region, in
 }
 
 cow_String oif_PartAttributesBuilder::OrientationName(const ddb_PartInstance& instance, int index) const {
-    const cow_String name = cow_String("Ori-") + cow_String(index + 1);
+    cow_String name = cow_String("Ori-") + cow_String(index + 1);
     if (ModelInfo().V6Format()) return name;
     return qkw_QuorixName(instance.name(), false).Printable() + "_" + name;
 }
