@@ -139,6 +139,7 @@ void drd_Differ::MatchRenamed(Match& match, const Context& context) {
 void drd_Differ::TellMoved(std::vector<Pair> pairs, const Context& context) {
     if (options_.ignoreOrder || pairs.size() < 2) return;
     std::vector<int> places;
+    places.reserve(pairs.size());
     for (const Pair& pair : pairs) places.push_back(pair.second);
     const std::vector<char> stays = drd_LongestGrowing(places);
     for (std::size_t i = 0; i < stays.size(); ++i) {
