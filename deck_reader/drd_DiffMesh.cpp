@@ -105,6 +105,7 @@ void drd_Differ::CompareNodes(const drd_Mesh& first, const drd_Mesh& second, Pai
         // What is equal byte by byte needs no look at each number.
         constexpr std::uint64_t kNodes = 512;
         if (sameLabels && i % kNodes == 0 && i + kNodes <= first.nodes.Size() &&
+            // NOLINTNEXTLINE(bugprone-suspicious-memory-comparison)
             std::memcmp(first.coordinates.Data() + 3 * i, second.coordinates.Data() + 3 * i,
                         3 * kNodes * sizeof(double)) == 0) {
             found += kNodes;

@@ -260,7 +260,7 @@ std::vector<drd_Parameter> Flattener::Parameters(const drd_Keyword& keyword, con
 /// The name or label in the flat deck; the value itself where nothing changes.
 std::string Flattener::FlatReference(drd_RefEnm ref, drd_KindEnm kind, std::string_view value, int block,
                                      int instance) {
-    const std::string same(value);
+    std::string same(value);
     double number = 0.0;
     const bool isNumber = drd_ReadReal(value, number);
     if (isNumber && (ref == drd_RefEnm::NAME_UNLESS_NUMBER || ref == drd_RefEnm::NODES_UNLESS_NUMBER))
