@@ -510,16 +510,40 @@ class WrongDatum(ProgramTest):
 
 
 class Signals(ProgramTest):
+    def caught_writing(self, model):
+        """A run that is stopped while it writes. On a busy machine many are done before they are caught."""
+        others = len(self.scratch_files())
+        for _ in range(100):
+            run = subprocess.Popen([PROGRAM, "write", model], cwd=self.folder, stdout=subprocess.DEVNULL,
+                                   preexec_fn=no_core)
+            self.addCleanup(run.kill)
+            # The file comes when the folder has been locked.
+            while run.poll() is None and len(self.scratch_files()) <= others:
+                time.sleep(0.001)
+            if run.returncode is not None:
+                continue
+            run.send_signal(signal.SIGSTOP)
+            _, status = os.waitpid(run.pid, os.WUNTRACED)
+            if not os.WIFSTOPPED(status):
+                run.returncode = os.waitstatus_to_exitcode(status)
+            elif len(self.scratch_files()) > others:
+                return run
+            else:
+                run.send_signal(signal.SIGCONT)
+                run.wait()
+        self.fail("no run could be caught")
+
+    def scratch_files(self):
+        return list(self.folder.glob(".qrxdeck-*/*"))
+
     def test_RunThatIsEnded_LeavesTheOldDeckAndNoDebris(self):
         self.put("model.json", large_model(300000))
-        (self.folder / "model.inp").write_bytes(OLD_DECK)
         for number in [signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGQUIT, signal.SIGXCPU]:
             with self.subTest(signal=number):
-                run = subprocess.Popen([PROGRAM, "write", "model.json"], cwd=self.folder,
-                                       stdout=subprocess.DEVNULL, preexec_fn=no_core)
-                while run.poll() is None and not any(n.startswith(b".qrxdeck") for n in self.entries()):
-                    time.sleep(0.001)
+                run = self.caught_writing("model.json")
+                (self.folder / "model.inp").write_bytes(OLD_DECK)
                 run.send_signal(number)
+                run.send_signal(signal.SIGCONT)
                 run.wait()
                 self.assertEqual(run.returncode, -number)
                 self.assertEqual((self.folder / "model.inp").read_bytes(), OLD_DECK)
@@ -527,16 +551,7 @@ class Signals(ProgramTest):
 
     def test_RunThatIsKilled_IsClearedUpByTheNextOneAlone(self):
         self.put("large.json", large_model(300000))
-        runs = []
-        for _ in range(2):
-            run = subprocess.Popen([PROGRAM, "write", "large.json"], cwd=self.folder, stdout=subprocess.DEVNULL)
-            self.addCleanup(run.kill)
-            # The file comes when the folder has been locked.
-            while run.poll() is None and len(list(self.folder.glob(".qrxdeck-*/*"))) <= len(runs):
-                time.sleep(0.001)
-            run.send_signal(signal.SIGSTOP)
-            runs.append(run)
-        dead, alive = runs
+        dead, alive = self.caught_writing("large.json"), self.caught_writing("large.json")
         dead.kill()
         dead.wait()
         self.assertEqual(sum(n.startswith(b".qrxdeck") for n in self.entries()), 2)
