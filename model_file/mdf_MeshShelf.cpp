@@ -35,7 +35,7 @@ std::string mdf_MeshShelf::StateOf(const std::filesystem::path& file) {
 
 mdf_MeshShelf::Key mdf_MeshShelf::KeyOf(const mdf_Value& json, const fnd_Path& path,
                                         const std::string& modelFile) const {
-    const std::string place = path.Text();
+    std::string place = path.Text();
     const bool changed =
         std::ranges::any_of(changes_, [&](const std::string& change) { return fnd_IsBelow(change, place); });
     if (!changed) return place;

@@ -1,6 +1,7 @@
 #include "store_interface/model/odiK_Mesh.h"
 
 #include "foundation/nex_Exception.h"
+#include "store_interface/findings/fnd_Text.h"
 
 #include <algorithm>
 
@@ -11,11 +12,7 @@ std::string Number(long long value) {
 }
 
 std::string Count(std::size_t number, const char* thing) {
-    return std::to_string(number) + " " + thing + (number == 1 ? "" : "s");
-}
-
-std::string Quoted(std::string_view text) {
-    return std::string("'").append(text).append("'");
+    return fnd_Counted(static_cast<long long>(number), thing);
 }
 
 std::string Place(const char* array, std::size_t index) {
@@ -165,7 +162,7 @@ int odiK_Mesh::FindSet(const cow_String& name) const {
 
 void odiK_Mesh::AddSet(const odiK_SetInput& input, fnd_Sink& problems) {
     if (FindSet(input.name) >= 0) {
-        problems.Add("duplicate-name", "/name", "found a second set named " + Quoted(input.name.View()),
+        problems.Add("duplicate-name", "/name", "found a second set named " + fnd_Quoted(input.name.View()),
                      "names that are unique in the mesh");
         return;
     }
@@ -223,7 +220,7 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
             member.facet = facet.face.empty() ? facet.id : odiK_FacetOfFace(elements.shape, facet.face);
             if (member.facet < 0 || !odiK_FacetFits(elements.shape, member.facet)) {
                 problems.Add("no-such-face", place + Place("facets", i) + "/1",
-                             "found " + (facet.face.empty() ? Number(facet.id) : Quoted(facet.face)),
+                             "found " + (facet.face.empty() ? Number(facet.id) : fnd_Quoted(facet.face)),
                              "a face of an element of type " + std::string(elements.type.View()));
                 continue;
             }

@@ -291,16 +291,18 @@ TEST(Mesh, BadMembersOfASet_AreNamedAllTogether) {
                                      "/labels/1: found 99, expected the label of an element of the mesh",
                                      "/labels/3: found 0, expected the label of an element of the mesh"}));
     problems.all.clear();
-    const odiK_FacetInput facets[] = {{99, 0, ""},   {10, -1, "SPOS"}, {10, 6, ""}, {20, 2, ""},
-                                      {1, -1, "S1"}, {30, -1, "S1"},   {10, -1, ""}};
+    const odiK_FacetInput facets[] = {{99, 0, ""},   {10, -1, "SPOS"}, {10, 6, ""},  {20, 2, ""},
+                                      {1, -1, "S1"}, {30, -1, "S1"},   {10, -1, ""}, {10, -1, "S\n*Step"}};
     mesh.AddSet({"S", res_SetTypeEnm::FACETS, false, {}, facets}, problems);
-    EXPECT_EQ(problems.all, (Strings{"/facets/0/0: found 99, expected the label of an element of the mesh",
-                                     "/facets/1/1: found 'SPOS', expected a face of an element of type C3D8",
-                                     "/facets/2/1: found 6, expected a face of an element of type C3D8",
-                                     "/facets/3/1: found 2, expected a face of an element of type S4",
-                                     "/facets/4/1: found 'S1', expected a face of an element of type T3D2",
-                                     "/facets/5/1: found 'S1', expected a face of an element of type MASS",
-                                     "/facets/6/1: found -1, expected a face of an element of type C3D8"}));
+    EXPECT_EQ(problems.all,
+              (Strings{"/facets/0/0: found 99, expected the label of an element of the mesh",
+                       "/facets/1/1: found 'SPOS', expected a face of an element of type C3D8",
+                       "/facets/2/1: found 6, expected a face of an element of type C3D8",
+                       "/facets/3/1: found 2, expected a face of an element of type S4",
+                       "/facets/4/1: found 'S1', expected a face of an element of type T3D2",
+                       "/facets/5/1: found 'S1', expected a face of an element of type MASS",
+                       "/facets/6/1: found -1, expected a face of an element of type C3D8",
+                       "/facets/7/1: found 'S\\x0A*Step', expected a face of an element of type C3D8"}));
 }
 
 TEST(Mesh, SecondSetOfAName_IsRefused) {
