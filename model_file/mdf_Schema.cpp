@@ -321,7 +321,9 @@ private:
             return Reference(field != nullptr && field->mayBeSeveral ? "REGIONS" : "REGION");
         case cls_FieldKind::Datum: return {{"type", {"string", "null"}}};
         case cls_FieldKind::Attribute: return AttributeOf(static_cast<const cls_AttributeType&>(type), field);
-        case cls_FieldKind::Tree: return TreeOf(type, *field);
+        case cls_FieldKind::Tree:
+            // Only fields are trees, never items of others.
+            return field == nullptr ? Json() : TreeOf(type, *field);
         }
         return {};
     }

@@ -117,6 +117,7 @@ std::vector<std::size_t> fnd_PlacesOfNearest(const std::vector<std::string>& wor
     // Fast, since a model may have a great many names.
     const std::string lower = fnd_LowerCase(name);
     std::vector<int> unlike;
+    unlike.reserve(words.size());
     for (const std::string& word : words) unlike.push_back(Unlikeness(lower, fnd_LowerCase(word)));
     std::ranges::stable_sort(places, {}, [&unlike](std::size_t i) { return unlike[i]; });
     places.resize(fnd_kListed);
