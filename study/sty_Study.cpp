@@ -263,6 +263,7 @@ private:
             variants.back()->LeaveOut(baseline_);
         }
         std::vector<std::thread> threads;
+        threads.reserve(static_cast<std::size_t>(jobs));
         running_ = jobs;
         for (int job = 0; job < jobs; ++job) {
             threads.emplace_back([&, job] {

@@ -49,6 +49,7 @@ void TakeErrors(const mdf_Report& report, const std::vector<sty_Columns::Change>
 sty_Columns::sty_Columns(const std::vector<std::string>& columns, bool inAllRows,
                          const std::vector<mdf_Parameter>& parameters) {
     std::vector<std::string> names;
+    names.reserve(parameters.size());
     for (const mdf_Parameter& parameter : parameters) names.push_back(parameter.name);
     for (const std::string& name : columns) {
         Column& column = columns_.emplace_back();
@@ -215,6 +216,7 @@ sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
     std::vector<sty_Columns::Change> changes = columns.ChangesOf(row, *template_, result);
     if (!result.IsDone()) return result;
     std::vector<mdf_Change> values;
+    values.reserve(changes.size());
     for (sty_Columns::Change& change : changes) values.push_back(change.change);
     mdf_Report report;
     const std::unique_ptr<odb_Odb> store = template_->Variant(values, report);

@@ -104,7 +104,7 @@ std::string LaidOut(const ordered_json& value, const std::string& indent) {
         return text;
     };
     const char* ends = value.is_object() ? "{}" : "[]";
-    const std::string line = ends[0] + joined(", ", indent) + ends[1];
+    std::string line = ends[0] + joined(", ", indent) + ends[1];
     if (line.find('\n') == std::string::npos && indent.size() + line.size() < TextWidth() - 20) return line;
     const std::string inner = indent + "  ";
     return ends[0] + ("\n" + inner) + joined((",\n" + inner).c_str(), inner) + "\n" + indent + ends[1];
@@ -179,7 +179,7 @@ private:
         if (schema.contains("enum") || schema.contains("const")) return "word";
         if (!schema.contains("type")) return "";
         if (schema["type"].is_array()) return "name or null";
-        const std::string type = schema["type"];
+        std::string type = schema["type"];
         if (type == "array") return "list of " + TypeOf(schema["items"]);
         if (type == "boolean") return "true, false";
         if (type == "string") return "text";
