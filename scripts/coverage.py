@@ -18,6 +18,8 @@ import re
 import subprocess
 import sys
 
+import reasons
+
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 BUILD = ROOT / "build" / "coverage"
 LIBRARY = ["platform", "foundation", "store_interface", "keyword_layer", "QRXZptIfwOif.m", "deck_checks", "whole_file"]
@@ -161,21 +163,8 @@ def table(counts):
               f"{100 * taken / max(branches, 1):7.1f}%")
 
 
-def known_reasons():
-    """Texts of lines by file; a reason stands behind "  -- "."""
-    path = ROOT / "scripts" / "unreached.txt"
-    known = set()
-    if path.exists():
-        for line in path.read_text().splitlines():
-            if line and not line.startswith("#"):
-                place = line.split("  -- ")[0]
-                name, _, text = place.partition(": ")
-                known.add((name, text.strip()))
-    return known
-
-
 def unreached(counts):
-    known = known_reasons()
+    known = reasons.known(ROOT / "scripts" / "unreached.txt")
     left = 0
     for name in sorted({name for name, _ in counts.lines}):
         text = (ROOT / name).read_text().splitlines()
@@ -191,7 +180,7 @@ def unreached(counts):
 
 
 def ways_not_taken(counts):
-    known = known_reasons()
+    known = reasons.known(ROOT / "scripts" / "unreached.txt")
     ways = collections.defaultdict(list)
     for (name, number, *_), count in sorted(counts.branches.items()):
         ways[name, number].append(count)

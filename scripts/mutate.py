@@ -22,6 +22,8 @@ import subprocess
 import sys
 import time
 
+import reasons
+
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 COPY = ROOT / "build" / "mutants"
 BUILD = COPY / "build" / "debug"
@@ -218,18 +220,6 @@ def killer_of(mutant, decks, others):
     return next((program.name for program in [*near, decks, *far] if run(program, number)), None)
 
 
-def equivalent():
-    """Files and changes that nobody could see; a reason stands behind "  -- "."""
-    path = ROOT / "scripts" / "equivalent.txt"
-    known = set()
-    if path.exists():
-        for line in path.read_text().splitlines():
-            if line and not line.startswith("#"):
-                name, _, description = line.split("  -- ")[0].partition(": ")
-                known.add((name, description.strip()))
-    return known
-
-
 def main():
     arguments = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     arguments.add_argument("--count", type=int, default=200)
@@ -243,7 +233,7 @@ def main():
     mutants = take_sample(options.count, options.seed)
     print(f"{len(mutants)} mutants, seed {options.seed}", flush=True)
     decks, others = build(options.decks_only)
-    known = equivalent()
+    known = reasons.known(ROOT / "scripts" / "equivalent.txt")
     killers = {}
     living = []
     same = 0
