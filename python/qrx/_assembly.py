@@ -11,10 +11,9 @@ from ._mesh import Mesh
 class _Attributes:
     """A list of what is assigned to sets."""
 
-    def __init__(self, name, class_name, optional):
+    def __init__(self, name, class_name):
         self.name = name
         self.class_name = class_name
-        self.optional = optional
 
     def __set_name__(self, owner, name):
         self.slot = "_" + name
@@ -23,7 +22,7 @@ class _Attributes:
         return self if owner is None else getattr(owner, self.slot)
 
     def __set__(self, owner, value):
-        if value is None and self.optional:
+        if value is None and owner._optional_lists:
             object.__setattr__(owner, self.slot, None)
             return
         wanted = _records.class_named(self.class_name)
@@ -54,6 +53,10 @@ class _Owner:
     """What parts and instances have: a mesh, and what its sets are assigned."""
 
     __slots__ = ()
+    mesh = _Mesh()
+    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment")
+    material_orientations = _Attributes("materialOrientations", "ptoC_MaterialOrientation")
+    beam_orientations = _Attributes("beamOrientations", "ptoC_BeamOrientation")
 
     def _extras(self):
         return ("mesh", *_LISTS)
@@ -146,10 +149,6 @@ class Part(_Owner, _records.class_named("odiK_Part")):
     __slots__ = (*_SLOTS, "_name")
     _tells_class = False
     _optional_lists = False
-    mesh = _Mesh()
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", False)
-    material_orientations = _Attributes("materialOrientations", "ptoC_MaterialOrientation", False)
-    beam_orientations = _Attributes("beamOrientations", "ptoC_BeamOrientation", False)
 
     def __init__(self, name, mesh=None, **fields):
         object.__setattr__(self, "_name", name)
@@ -165,10 +164,6 @@ class Instance(_Owner, _records.class_named("odiK_Instance")):
     __slots__ = (*_SLOTS, "_name")
     _tells_class = False
     _optional_lists = True
-    mesh = _Mesh()
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", True)
-    material_orientations = _Attributes("materialOrientations", "ptoC_MaterialOrientation", True)
-    beam_orientations = _Attributes("beamOrientations", "ptoC_BeamOrientation", True)
 
     def __init__(self, name, part=None, **fields):
         object.__setattr__(self, "_name", name)
@@ -255,8 +250,9 @@ class Assembly(_records.class_named("odiK_Assembly")):
 
     __slots__ = ("instances", "sets", "_mesh", "_section_assignments", "_connector_orientations")
     _tells_class = False
-    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment", False)
-    connector_orientations = _Attributes("connectorOrientations", "ptoC_ConnectorOrientation", False)
+    _optional_lists = False
+    section_assignments = _Attributes("sectionAssignments", "ptoC_SectionAssignment")
+    connector_orientations = _Attributes("connectorOrientations", "ptoC_ConnectorOrientation")
 
     def __init__(self, **fields):
         object.__setattr__(self, "instances", Named("instances", Instance))
