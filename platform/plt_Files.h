@@ -95,6 +95,9 @@ ssize_t plt_WritePieces(int file, const plt_Piece* pieces, std::size_t count);
 int plt_Truncate(int file, long long bytes);
 /// fsync; EINVAL where there is nothing to sync.
 int plt_Sync(int file);
+/// Lets the system begin to bring written bytes to the disk, without waiting for it; nothing where a system has
+/// no such call.
+void plt_BeginSync(int file, long long from, long long bytes);
 int plt_Close(int file);
 /// fchown and fchmod; no failures where a system has no such thing.
 int plt_SetOwner(int file, plt_Owner owner, plt_Group group);

@@ -113,6 +113,24 @@ int TakeOver(int file, const plt_Status& old, const std::string& oldPath, const 
     return whf_ErrorOf([&] { return system.chmod(file, narrowed); });
 }
 
+/// Writes to a file while the disk already takes what was written before.
+class Device : public qio_ios {
+public:
+    Device(std::FILE* stream, int file) : file_(file) { attach(stream, false); }
+
+    void Write(const char* text, std::size_t bytes) override {
+        constexpr long long kPiece = 16 << 20;
+        qio_ios::Write(text, bytes);
+        if (Bytes() - begun_ < kPiece) return;
+        plt_BeginSync(file_, begun_, Bytes() - begun_);
+        begun_ = Bytes();
+    }
+
+private:
+    int file_;
+    long long begun_ = 0;
+};
+
 struct FileCloser {
     void operator()(std::FILE* file) const { std::fclose(file); }
 };
@@ -174,8 +192,7 @@ long long whf_File::WriteTo(int number, const Write& write) const {
     const std::unique_ptr<std::FILE, FileCloser> stream(plt_StreamOf(number));
     if (stream == nullptr) throw whf_Error("cannot make the file", whf_ErrorNumber());
     std::setvbuf(stream.get(), nullptr, _IONBF, 0);
-    qio_ios device;
-    device.attach(stream.get(), false);
+    Device device(stream.get(), number);
     write(device);
     device.close();
     if (device.Error() != 0) throw whf_Error("cannot write the " + thing_, device.Error());

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include <dirent.h>
+#include <fcntl.h>
 #include <sys/file.h>
 #include <sys/uio.h>
 #include <unistd.h>
@@ -118,6 +119,13 @@ int plt_Truncate(int file, long long bytes) {
 
 int plt_Sync(int file) {
     return ::fsync(file);
+}
+
+void plt_BeginSync([[maybe_unused]] int file, [[maybe_unused]] long long from,
+                   [[maybe_unused]] long long bytes) {
+#ifdef __linux__
+    ::sync_file_range(file, from, bytes, SYNC_FILE_RANGE_WRITE);
+#endif
 }
 
 int plt_Close(int file) {

@@ -234,6 +234,8 @@ int plt_Sync(int file) {
     return FlushFileBuffers(HandleOf(file)) == 0 ? plt_Fail() : 0;
 }
 
+void plt_BeginSync(int, long long, long long) {}
+
 int plt_Close(int file) {
     return _close(file);
 }

@@ -157,6 +157,20 @@ TEST_F(DeckFileTest, NothingFails_ReplacesTheOldDeckAndLeavesNothingElse) {
     EXPECT_EQ(folder_.Entries(), Names({"job.inp"}));
 }
 
+TEST_F(DeckFileTest, FileThatTheDiskTakesInPieces_IsWhole) {
+    std::string whole;
+    whf_File deck(folder_.Path("job.inp"));
+    result_ = deck.Replace([&whole](qio_ostream& device) {
+        for (int i = 0; i < 37; ++i) {
+            const std::string piece(std::size_t{1} << 20, static_cast<char>('A' + i));
+            device.Write(piece.data(), piece.size());
+            whole += piece;
+        }
+    });
+    EXPECT_EQ(result_.bytes, 37LL << 20);
+    EXPECT_TRUE(folder_.Text("job.inp") == whole);
+}
+
 TEST_F(DeckFileTest, EachFileCallFailing_LeavesOneWholeDeckAndNoDebris) {
     constexpr int callsOfARun = 19;
     const std::string whole = WholeDeck();
