@@ -123,15 +123,21 @@ public:
     void Put(int index, T item) { Get(index) = std::move(item); }
 
     void Append(T item) {
-        CopyArray();
-        const int place = first_ + count_;
-        if ((place & Mask()) == 0 || count_ == 0) {
-            AddBlockAt(place >> shift_);
-        } else {
-            OwnBlock(place >> shift_);
-        }
-        new (table_[place >> shift_]->Items() + (place & Mask())) T(std::move(item));
+        new (RoomBehind()) T(std::move(item));
         ++count_;
+    }
+
+    /// Appends make(0) to make(count - 1), block by block.
+    template <class Make>
+    void AppendMany(int count, const Make& make) {
+        static_assert(std::is_trivially_copyable_v<T>);
+        for (int done = 0; done < count;) {
+            T* const room = RoomBehind();
+            const int end = done + std::min(count - done, BlockSize() - ((first_ + count_) & Mask()));
+            const int begin = done;
+            for (; done < end; ++done) new (room + (done - begin)) T(make(done));
+            count_ += end - begin;
+        }
     }
 
     void Prepend(T item) {
@@ -321,6 +327,18 @@ private:
         const int place = first_ + index;
         OwnBlock(place >> shift_);
         return table_[place >> shift_]->Items()[place & Mask()];
+    }
+
+    // Where the next item goes, in a block of this list's own.
+    T* RoomBehind() {
+        CopyArray();
+        const int place = first_ + count_;
+        if ((place & Mask()) == 0 || count_ == 0) {
+            AddBlockAt(place >> shift_);
+        } else {
+            OwnBlock(place >> shift_);
+        }
+        return table_[place >> shift_]->Items() + (place & Mask());
     }
 
     void AddBlockAt(int b) {

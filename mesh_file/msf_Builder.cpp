@@ -1,8 +1,7 @@
 #include "mesh_file/msf_Builder.h"
 
 #include <algorithm>
-#include <cmath>
-#include <limits>
+#include <cstdint>
 
 namespace {
 
@@ -21,12 +20,22 @@ bool IsUtf8(std::string_view text) {
 
 } // namespace
 
-int msf_Builder::Label(const msf_Cursor& at, long long label, const char* thing) {
-    if (label < 1 || label > std::numeric_limits<int>::max()) {
-        at.FailAtWord("found " + std::to_string(label) + " as the label of " + thing,
-                      "a number from 1 to 2147483647");
-    }
-    return static_cast<int>(label);
+void msf_Builder::FailLabel(const msf_Cursor& at, long long label, const char* thing) {
+    at.FailAtWord("found " + std::to_string(label) + " as the label of " + thing,
+                  "a number from 1 to 2147483647");
+}
+
+void msf_Builder::FailCoordinate(const msf_Cursor& at, long long label) {
+    at.FailAtWord("found a coordinate of node " + std::to_string(label) + " that is no number or too large",
+                  "a number of single precision");
+}
+
+void msf_Builder::FailIfTwice(const msf_Cursor& at, const char* thing,
+                              const cel_LabelIndex::Repetitions& twice, const std::vector<int>& labels) {
+    if (twice.empty()) return;
+    at.FailAtWord(std::string("found ") + thing + " label " +
+                      std::to_string(labels[static_cast<std::size_t>(twice.front())]) + " twice",
+                  "labels that differ");
 }
 
 void msf_Builder::ReserveNodes(std::size_t count) {
@@ -36,23 +45,35 @@ void msf_Builder::ReserveNodes(std::size_t count) {
 
 void msf_Builder::AddNode(const msf_Cursor& at, long long label, double x, double y, double z) {
     mesh_.nodeLabels.push_back(Label(at, label, "a node"));
-    for (const double value : {x, y, z}) {
-        const auto coordinate = static_cast<float>(value * scale_);
-        if (!std::isfinite(coordinate)) {
-            at.FailAtWord("found a coordinate of node " + std::to_string(label) +
-                              " that is no number or too large",
-                          "a number of single precision");
+    for (const double value : {x, y, z}) mesh_.coordinates.push_back(Coordinate(at, label, value));
+}
+
+void msf_Builder::AddNodeLabels(const msf_Cursor& at, const char* raw, std::size_t count) {
+    for (std::size_t i = 0; i < count; ++i) {
+        std::int64_t label;
+        std::memcpy(&label, raw + sizeof label * i, sizeof label);
+        mesh_.nodeLabels.push_back(Label(at, label, "a node"));
+    }
+}
+
+void msf_Builder::AddCoordinates(const msf_Cursor& at, const char* raw, std::size_t reals,
+                                 std::size_t count) {
+    constexpr std::size_t kMost = 512;
+    float values[3 * kMost];
+    for (std::size_t begin = 0; begin < count; begin += kMost) {
+        const std::size_t part = std::min(kMost, count - begin);
+        const int* const label = mesh_.nodeLabels.data() + mesh_.coordinates.size() / 3;
+        for (std::size_t i = 0; i < part; ++i) {
+            double point[3];
+            std::memcpy(point, raw + sizeof point[0] * reals * (begin + i), sizeof point);
+            for (std::size_t j = 0; j < 3; ++j) values[3 * i + j] = Coordinate(at, label[i], point[j]);
         }
-        mesh_.coordinates.push_back(coordinate);
+        mesh_.coordinates.insert(mesh_.coordinates.end(), values, values + 3 * part);
     }
 }
 
 void msf_Builder::FinishNodes(const msf_Cursor& at) {
-    const int twice = nodes_.Build(mesh_.nodeLabels);
-    if (twice < 0) return;
-    at.FailAtWord("found node label " + std::to_string(mesh_.nodeLabels[static_cast<std::size_t>(twice)]) +
-                      " twice",
-                  "labels that differ");
+    FailIfTwice(at, "node", nodes_.Build(mesh_.nodeLabels), mesh_.nodeLabels);
 }
 
 void msf_Builder::FailNoNode(const msf_Cursor& at, long long label) const {
@@ -76,17 +97,44 @@ int msf_Builder::AddCell(const msf_Cursor& at, const msf_NodeOrder& order, long 
     return block.NumCells() - 1;
 }
 
+void msf_Builder::AddCells(const msf_Cursor& at, const msf_NodeOrder& order, const char* rows,
+                           std::size_t count) {
+    constexpr std::size_t kMost = 64;
+    std::int64_t raw[kMost * (1 + cel_kMaxNodes)];
+    int own[kMost];
+    int places[kMost * cel_kMaxNodes];
+    const std::size_t width = 1 + static_cast<std::size_t>(order.nodes);
+    const std::span<const std::int8_t> nodes = order.Order();
+    msf_Block& block = mesh_.blocks[static_cast<std::size_t>(BlockOf(order.kind))];
+    for (std::size_t begin = 0; begin < count; begin += kMost) {
+        const std::size_t part = std::min(kMost, count - begin);
+        std::memcpy(raw, rows + sizeof raw[0] * width * begin, sizeof raw[0] * width * part);
+        int* place = places;
+        for (std::size_t i = 0; i < part; ++i) {
+            const std::int64_t* const row = raw + width * i;
+            own[i] = Label(at, row[0], "an element");
+            for (const std::int8_t node : nodes) *place++ = Node(at, row[1 + node]);
+        }
+        block.labels.insert(block.labels.end(), own, own + part);
+        block.nodes.insert(block.nodes.end(), places, place);
+    }
+}
+
 void msf_Builder::FinishCells(const msf_Cursor& at) {
-    std::vector<int> all;
+    mesh_.oneNumbering = true;
     firstCell_.clear();
+    if (mesh_.blocks.size() == 1) {
+        const std::vector<int>& labels = mesh_.blocks.front().labels;
+        firstCell_.push_back(0);
+        FailIfTwice(at, "element", cells_.Build(labels), labels);
+        return;
+    }
+    std::vector<int> all;
     for (const msf_Block& block : mesh_.blocks) {
         firstCell_.push_back(static_cast<int>(all.size()));
         all.insert(all.end(), block.labels.begin(), block.labels.end());
     }
-    const int twice = cells_.Build(all);
-    if (twice < 0) return;
-    at.FailAtWord("found element label " + std::to_string(all[static_cast<std::size_t>(twice)]) + " twice",
-                  "labels that differ");
+    FailIfTwice(at, "element", cells_.Build(all), all);
 }
 
 bool msf_Builder::FindCell(long long label, int& block, int& place) const {

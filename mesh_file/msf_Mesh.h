@@ -52,6 +52,8 @@ struct msf_Mesh {
     std::vector<int> nodeLabels;
     std::vector<float> coordinates;
     std::vector<msf_Block> blocks;
+    /// Whether labels of cells are known to differ from kind to kind too.
+    bool oneNumbering = false;
     std::vector<msf_Group> groups;
     /// What was merged, turned, named or left out while reading, as sentences with counts.
     std::vector<std::string> notes;

@@ -1,9 +1,11 @@
+#include "foundation/thr_InOrder.h"
 #include "mesh_file/msf_Builder.h"
 #include "mesh_file/msf_Readers.h"
 
 #include <algorithm>
 #include <cstdint>
 #include <cstdlib>
+#include <exception>
 #include <set>
 #include <unordered_map>
 
@@ -50,12 +52,19 @@ protected:
     void FinishNames();
 
     // Version 4.1.
+    struct Points { // raw coordinates of a block of nodes
+        msf_Cursor at;
+        const char* raw;
+        std::size_t reals;
+        std::size_t count;
+    };
     void ReadEntities();
     void ReadNodes4();
     void ReadNodesOfBlock(std::size_t count, std::size_t reals);
     void ReserveCells4(std::size_t blocks);
+    void ReadPointsAndCells4();
     void ReadCells4();
-    void ReadCellsOfBlock(const msf_NodeOrder& order, std::size_t count, int block);
+    void ReadCellsOfBlock(const msf_NodeOrder& order, std::size_t count);
     // Version 2.2.
     struct Piece { // cells of one block, physical group and entity
         msf_Run run;
@@ -81,6 +90,7 @@ protected:
     std::map<Entity, std::vector<int>> groupsOfEntity_;
     std::vector<int> row_;
     std::vector<int> tags_;
+    std::vector<Points> points_;
     std::vector<Piece> pieces_;
     long long numParametric_ = 0;
 };
@@ -137,7 +147,7 @@ void MshReader::ReadSection(std::string_view section) {
         if (hasCells_) at_.FailAtWord("found a second section $Elements", "one");
         RequireNodes();
         hasCells_ = true;
-        isFour_ ? ReadCells4() : ReadCells2();
+        isFour_ ? ReadPointsAndCells4() : ReadCells2();
     } else if (name == "PartitionedEntities" || name == "GhostElements") {
         at_.FailAtWord("found a section $" + name, "a mesh in one piece, without partitions and ghost cells");
     } else {
@@ -271,15 +281,10 @@ void MshReader::ReadNodes4() {
 
 void MshReader::ReadNodesOfBlock(std::size_t count, std::size_t reals) {
     if (binary_) {
-        const char* labels = at_.Take(8 * count, "labels of nodes");
-        const char* coordinates = at_.Take(8 * reals * count, "coordinates of nodes");
-        for (std::size_t i = 0; i < count; ++i, labels += 8, coordinates += 8 * reals) {
-            std::int64_t label;
-            double point[3];
-            std::memcpy(&label, labels, sizeof label);
-            std::memcpy(point, coordinates, sizeof point);
-            builder_.AddNode(at_, label, point[0], point[1], point[2]);
-        }
+        const char* const labels = at_.Take(8 * count, "labels of nodes");
+        builder_.AddNodeLabels(at_, labels, count);
+        const char* const raw = at_.Take(8 * reals * count, "coordinates of nodes");
+        points_.push_back({at_, raw, reals, count});
         return;
     }
     std::vector<int> labels(count);
@@ -314,6 +319,31 @@ void MshReader::ReserveCells4(std::size_t blocks) {
     }
 }
 
+/// They fill different arrays, which takes most of the time: so two threads do it.
+void MshReader::ReadPointsAndCells4() {
+    constexpr int kFewNodes = 10000;
+    std::exception_ptr ofPoints;
+    const auto read = [&](std::size_t task) {
+        if (task == 1) {
+            ReadCells4();
+            return;
+        }
+        try {
+            for (const Points& points : points_)
+                builder_.AddCoordinates(points.at, points.raw, points.reals, points.count);
+        } catch (...) {
+            ofPoints = std::current_exception();
+        }
+    };
+    try {
+        thr_ForEach(builder_.Mesh().NumNodes() < kFewNodes ? 1 : thr_NumThreads(0), 2, read);
+    } catch (...) {
+        // What stands first in the file is told.
+        if (!ofPoints) throw;
+    }
+    if (ofPoints) std::rethrow_exception(ofPoints);
+}
+
 void MshReader::ReadCells4() {
     const std::size_t blocks = Count("blocks of elements", 4);
     const std::size_t total = Count("elements", binary_ ? 16 : 4);
@@ -334,7 +364,7 @@ void MshReader::ReadCells4() {
         }
         const int block = builder_.BlockOf(order.kind);
         const int begin = builder_.Mesh().blocks[static_cast<std::size_t>(block)].NumCells();
-        ReadCellsOfBlock(order, count, block);
+        ReadCellsOfBlock(order, count);
         for (const int group : groupsOfEntity_[{dimension, entity}]) {
             msf_Builder::AddRun(builder_.Group(NameOfGroup({dimension, group}), dimension), block, begin,
                                 begin + static_cast<int>(count));
@@ -345,7 +375,7 @@ void MshReader::ReadCells4() {
                        std::to_string(total) + ", as the section begins");
 }
 
-void MshReader::ReadCellsOfBlock(const msf_NodeOrder& order, std::size_t count, int blockPlace) {
+void MshReader::ReadCellsOfBlock(const msf_NodeOrder& order, std::size_t count) {
     const auto width = static_cast<std::size_t>(order.nodes);
     row_.resize(width);
     if (!binary_) {
@@ -356,15 +386,7 @@ void MshReader::ReadCellsOfBlock(const msf_NodeOrder& order, std::size_t count, 
         }
         return;
     }
-    msf_Block& block = builder_.Mesh().blocks[static_cast<std::size_t>(blockPlace)];
-    const std::span<const std::int8_t> places = order.Order();
-    const char* raw = at_.Take(8 * (1 + width) * count, "elements");
-    for (std::size_t i = 0; i < count; ++i, raw += 8 * (1 + width)) {
-        std::int64_t numbers[1 + cel_kMaxNodes];
-        std::memcpy(numbers, raw, 8 * (1 + width));
-        block.labels.push_back(msf_Builder::Label(at_, numbers[0], "an element"));
-        for (const std::int8_t place : places) block.nodes.push_back(builder_.Node(at_, numbers[1 + place]));
-    }
+    builder_.AddCells(at_, order, at_.Take(8 * (1 + width) * count, "elements"), count);
 }
 
 void MshReader::ReadNodes2() {

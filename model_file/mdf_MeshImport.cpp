@@ -1,6 +1,6 @@
 #include "model_file/mdf_MeshImport.h"
 
-#include "mesh_file/msf_LabelIndex.h"
+#include "foundation/cel_LabelIndex.h"
 #include "mesh_file/msf_Source.h"
 #include "store_interface/model/ddb_ElementTypes.h"
 
@@ -212,12 +212,13 @@ int mdf_MeshImport::MostDimension() const {
 
 /// Formats that number each kind of cells anew can't keep these numbers.
 void mdf_MeshImport::RenumberElements() {
+    if (source_.oneNumbering) return;
     std::vector<int> labels;
     for (const Elements& elements : elements_) {
         const std::vector<int>& own = Block(elements.block).labels;
         labels.insert(labels.end(), own.begin(), own.end());
     }
-    if (msf_LabelIndex().Build(labels) < 0) return;
+    if (cel_LabelIndex().Build(labels).empty()) return;
     int next = 1;
     for (const Elements& elements : elements_) {
         std::vector<int>& own = source_.blocks[static_cast<std::size_t>(elements.block)].labels;

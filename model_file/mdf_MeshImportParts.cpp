@@ -31,9 +31,12 @@ void mdf_MeshImport::MarkNodes() {
     isUsed_.assign(static_cast<std::size_t>(source_.NumNodes()), 0);
     for (const Elements& elements : elements_) {
         const msf_Block& block = Block(elements.block);
-        for (int cell = 0; cell < block.NumCells(); ++cell) {
-            const int* row = block.Row(cell);
-            for (int i = 0; i < elements.width; ++i) isUsed_[static_cast<std::size_t>(row[i])] = 1;
+        // Writing chars may change what a member says, as far as the compiler knows.
+        char* const used = isUsed_.data();
+        const int width = block.Width();
+        const int* const end = block.nodes.data() + block.nodes.size();
+        for (const int* row = block.nodes.data(); row != end; row += width) {
+            for (int i = 0; i < elements.width; ++i) used[row[i]] = 1;
         }
     }
     for (const SetPlan& plan : plans_) {
@@ -221,12 +224,15 @@ void mdf_MeshImport::AddSet(odiK_Mesh& mesh, const SetPlan& plan) {
     };
     std::vector<int> labels;
     std::vector<odiK_FacetInput> facets;
+    std::vector<odiK_ElementRun> runs;
+    std::size_t members = 0;
     res_SetTypeEnm type = res_SetTypeEnm::FACETS;
     switch (plan.content) {
     case Content::ELEMENTS:
         type = res_SetTypeEnm::ELEMENTS;
         for (const msf_Run& run : ElementRuns(source_.groups[plan.group])) {
-            for (int cell = run.begin; cell < run.end; ++cell) labels.push_back(labelOf(run.block, cell));
+            runs.push_back({run.block, run.begin, run.end});
+            members += static_cast<std::size_t>(run.end - run.begin);
         }
         break;
     case Content::SHELL_SIDES:
@@ -248,12 +254,12 @@ void mdf_MeshImport::AddSet(odiK_Mesh& mesh, const SetPlan& plan) {
         for (const int place : nodesOfPlans_[plan.name]) labels.push_back(mesh.Nodes().Label(place));
         break;
     }
-    const std::size_t members = type == res_SetTypeEnm::FACETS ? facets.size() : labels.size();
+    members += facets.size() + labels.size();
     if (members == 0) {
         Note("set " + fnd_Quoted(plan.name) + " would have no members and was left out");
         return;
     }
-    mesh.AddSet({cow_String(plan.name), type, false, labels, facets}, problems_);
+    mesh.AddSet({cow_String(plan.name), type, false, labels, facets, runs}, problems_);
     Remember(plan, static_cast<long long>(members));
 }
 
@@ -275,12 +281,11 @@ void mdf_MeshImport::AddAllElements(odiK_Mesh& mesh) {
         }
     }
     if (!twice && covered == mesh.NumElements()) return;
-    std::vector<int> labels;
+    std::vector<odiK_ElementRun> runs;
     for (const odiK_ElementClass& elements : mesh.Classes())
-        labels.insert(labels.end(), elements.labels.begin(), elements.labels.end());
-    mesh.AddSet({cow_String(kAllElements), res_SetTypeEnm::ELEMENTS, false, labels, {}}, problems_);
-    origin_.sets.push_back(
-        {kAllElements, "element", static_cast<long long>(labels.size()), "", MostDimension()});
+        runs.push_back({static_cast<int>(runs.size()), 0, elements.NumElements()});
+    mesh.AddSet({cow_String(kAllElements), res_SetTypeEnm::ELEMENTS, false, {}, {}, runs}, problems_);
+    origin_.sets.push_back({kAllElements, "element", mesh.NumElements(), "", MostDimension()});
 }
 
 void mdf_MeshImport::AddSets(odiK_Mesh& mesh) {

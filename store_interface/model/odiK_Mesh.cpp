@@ -63,8 +63,9 @@ void odiK_Mesh::SetNodes(std::vector<int> labels, std::vector<float> coordinates
                      "node label " + Number(labels[static_cast<std::size_t>(place)]) + " stands twice",
                      "labels that are unique in the mesh");
     }
-    nodes_.labels = cow_List<int>(cow_ListConstruct(static_cast<int>(labels.size())));
-    for (const int label : labels) nodes_.labels.Append(label);
+    const int count = static_cast<int>(labels.size());
+    nodes_.labels = cow_List<int>(cow_ListConstruct(count));
+    nodes_.labels.AppendMany(count, [&](int i) { return labels[static_cast<std::size_t>(i)]; });
     nodes_.coordinates = std::move(coordinates);
 }
 
@@ -121,13 +122,14 @@ void odiK_Mesh::AddElementsByIndex(const cow_String& type, std::vector<int> labe
     classes_.push_back(std::move(added));
 }
 
-odiK_LabelIndex::Repetitions odiK_Mesh::IndexElements() const {
+cel_LabelIndex::Repetitions odiK_Mesh::IndexElements() const {
+    indexedClasses_ = classes_.size();
+    if (classes_.size() == 1) return elementIndex_.Build(classes_.front().labels);
     std::vector<int> all;
     all.reserve(static_cast<std::size_t>(numElements_));
     for (const odiK_ElementClass& elements : classes_) {
         all.insert(all.end(), elements.labels.begin(), elements.labels.end());
     }
-    indexedClasses_ = classes_.size();
     return elementIndex_.Build(all);
 }
 
@@ -197,11 +199,25 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
     const bool facets = input.type == res_SetTypeEnm::FACETS;
     const bool nodes = input.type == res_SetTypeEnm::NODES;
     const std::size_t count = facets ? input.facets.size() : input.labels.size();
+    const std::size_t before = subsets.size();
     struct Member {
         int classIndex;
         int entry;
         int facet;
     };
+    for (const odiK_ElementRun& run : input.runs) {
+        const int numClasses = static_cast<int>(classes_.size());
+        if (run.classIndex < 0 || run.classIndex >= numClasses)
+            cow_RaiseOutOfRange(run.classIndex, numClasses, "odiK_Mesh: class");
+        const int most = classes_[static_cast<std::size_t>(run.classIndex)].NumElements();
+        if (run.begin < 0 || run.begin > run.end || run.end > most)
+            cow_RaiseOutOfRange(run.begin < 0 ? run.begin : run.end, most + 1, "odiK_Mesh: end of a run");
+        const int length = run.end - run.begin;
+        if (length == 0) continue;
+        if (subsets.size() == before || subsets.back().classIndex != run.classIndex)
+            subsets.push_back({meshIndex, run.classIndex, cow_List<int>(cow_ListConstruct(length)), {}});
+        subsets.back().subset.AppendMany(length, [&](int i) { return run.begin + i; });
+    }
     std::vector<Member> members;
     members.reserve(count);
     for (std::size_t i = 0; i < count; ++i) {
@@ -231,14 +247,17 @@ void odiK_Mesh::AppendSubsets(const odiK_SetInput& input, int meshIndex,
     for (std::size_t begin = 0; begin < members.size();) {
         std::size_t end = begin;
         while (end < members.size() && members[end].classIndex == members[begin].classIndex) ++end;
-        const cow_ListConstruct room(static_cast<int>(end - begin));
-        subsets.push_back({meshIndex, members[begin].classIndex, cow_List<int>(room), {}});
+        const int length = static_cast<int>(end - begin);
+        const cow_ListConstruct room(length);
+        const Member* const first = &members[begin];
+        subsets.push_back({meshIndex, first->classIndex, cow_List<int>(room), {}});
         rgnC_SubsetData& subset = subsets.back();
-        if (facets) subset.facetIds = cow_List<int>(room);
-        for (; begin < end; ++begin) {
-            subset.subset.Append(members[begin].entry);
-            if (facets) subset.facetIds.Append(members[begin].facet);
+        subset.subset.AppendMany(length, [first](int i) { return first[i].entry; });
+        if (facets) {
+            subset.facetIds = cow_List<int>(room);
+            subset.facetIds.AppendMany(length, [first](int i) { return first[i].facet; });
         }
+        begin = end;
     }
 }
 

@@ -1,9 +1,9 @@
 #ifndef QRX_STORE_ODIK_MESH_H
 #define QRX_STORE_ODIK_MESH_H
 
+#include "foundation/cel_LabelIndex.h"
 #include "store_interface/findings/fnd_Finding.h"
 #include "store_interface/model/ddb_ElementShape.h"
-#include "store_interface/model/odiK_LabelIndex.h"
 #include "store_interface/records/part_attributes/bme_ElemCtrlParams.h"
 #include "store_interface/regions/rgnC_SetData.h"
 
@@ -22,7 +22,7 @@ struct odiK_NodeData {
     std::vector<float> coordinates;
     /// Only in the assembly's mesh; such a node's index is the number of own nodes plus its place here.
     std::vector<odiK_ForeignNode> foreign;
-    odiK_LabelIndex index;
+    cel_LabelIndex index;
 
     int NumNodes() const { return labels.Length(); }
     /// The label of an own or a foreign node. An index beyond them raises.
@@ -51,6 +51,13 @@ struct odiK_FacetInput {
     std::string_view face; // empty: the id counts
 };
 
+/// The elements `begin` to `end` - 1 of a class.
+struct odiK_ElementRun {
+    int classIndex = 0;
+    int begin = 0;
+    int end = 0;
+};
+
 /// A set on its way into a mesh.
 struct odiK_SetInput {
     cow_String name;
@@ -58,6 +65,8 @@ struct odiK_SetInput {
     bool internal = false;
     std::span<const int> labels;
     std::span<const odiK_FacetInput> facets;
+    /// Elements of the mesh by place, before those of `labels`.
+    std::span<const odiK_ElementRun> runs = {};
 };
 
 /// A mesh: nodes, elements in classes of one type, and named sets. Elements find their nodes and sets their
@@ -110,7 +119,7 @@ public:
                        const std::string& place, fnd_Sink& problems) const;
 
 private:
-    odiK_LabelIndex::Repetitions IndexElements() const;
+    cel_LabelIndex::Repetitions IndexElements() const;
 
     odiK_NodeData nodes_;
     std::vector<odiK_ElementClass> classes_;
@@ -118,7 +127,7 @@ private:
     std::unordered_map<std::string_view, int> setIndex_;
     int numElements_ = 0;
     // Over the labels of all classes, one class behind the other.
-    mutable odiK_LabelIndex elementIndex_;
+    mutable cel_LabelIndex elementIndex_;
     mutable std::size_t indexedClasses_ = 0;
 };
 

@@ -312,6 +312,27 @@ TEST(cow_List, ItemWithoutDefault_CanBeInsertedAndRemoved) {
     EXPECT_TRUE(list.IsEmpty());
 }
 
+TEST(cow_List, AppendedMany_IsAppendedOneByOne) {
+    for (const int before : {0, 1, 7, 8, 9, 100}) {
+        for (const int count : {0, 1, 7, 8, 9, 1000}) {
+            cow_List<int> list = Counting(before);
+            const cow_List<int> copy(list);
+            list.AppendMany(count, [before](int i) { return before + i; });
+            EXPECT_EQ(Items(list), Items(Counting(before + count))) << before << " and " << count;
+            EXPECT_EQ(copy.Length(), before);
+        }
+    }
+}
+
+TEST(cow_List, ManyAppendedBehindPrependedOnes_KeepTheirOrder) {
+    cow_List<int> list = Counting(3);
+    list.Prepend(-1);
+    list.AppendMany(40, [](int i) { return 3 + i; });
+    list.Prepend(-2);
+    for (int i = 0; i < list.Length(); ++i) EXPECT_EQ(list[i], i - 2);
+    EXPECT_EQ(list.Length(), 45);
+}
+
 TEST(cow_List, Concatenated_JoinsAndLeavesTheOther) {
     cow_List<int> list(1, 2);
     const cow_List<int> tail(3, 4);

@@ -42,58 +42,6 @@ std::vector<Subset> SubsetsOf(const odiK_Set& set) {
     return subsets;
 }
 
-TEST(LabelIndex, LabelsThatRunWithoutAGap_AreFound) {
-    odiK_LabelIndex index;
-    EXPECT_TRUE(index.Build({5, 6, 7, 8}).empty());
-    EXPECT_EQ(index.Find(4), -1);
-    EXPECT_EQ(index.Find(5), 0);
-    EXPECT_EQ(index.Find(8), 3);
-    EXPECT_EQ(index.Find(9), -1);
-}
-
-TEST(LabelIndex, DenseLabelsInAnyOrder_AreFound) {
-    odiK_LabelIndex index;
-    EXPECT_TRUE(index.Build({30, 10, 20, 11}).empty());
-    EXPECT_EQ(index.Find(30), 0);
-    EXPECT_EQ(index.Find(10), 1);
-    EXPECT_EQ(index.Find(20), 2);
-    EXPECT_EQ(index.Find(11), 3);
-    for (const int absent : {9, 12, 19, 29, 31, 0, -1}) EXPECT_EQ(index.Find(absent), -1) << absent;
-}
-
-TEST(LabelIndex, SparseLabels_AreFound) {
-    odiK_LabelIndex index;
-    const int largest = std::numeric_limits<int>::max();
-    EXPECT_TRUE(index.Build({largest, 1, 1000000}).empty());
-    EXPECT_EQ(index.Find(largest), 0);
-    EXPECT_EQ(index.Find(1), 1);
-    EXPECT_EQ(index.Find(1000000), 2);
-    for (const int absent : {0, 2, 999999, 1000001, largest - 1, -1})
-        EXPECT_EQ(index.Find(absent), -1) << absent;
-}
-
-TEST(LabelIndex, RepeatedLabels_KeepTheFirstPlace) {
-    odiK_LabelIndex index;
-    EXPECT_EQ(index.Build({7, 8, 7, 9, 8, 7}), (Ints{2, 4, 5}));
-    EXPECT_EQ(index.Find(7), 0);
-    EXPECT_EQ(index.Find(8), 1);
-    EXPECT_EQ(index.Build({1000000, 1, 1000000, 50, 1}), (Ints{2, 4}));
-    EXPECT_EQ(index.Find(1000000), 0);
-    EXPECT_EQ(index.Find(1), 1);
-    EXPECT_EQ(index.Find(50), 3);
-}
-
-TEST(LabelIndex, BuiltAgain_ForgetsTheOldLabels) {
-    odiK_LabelIndex index;
-    EXPECT_EQ(index.Find(0), -1);
-    index.Build({1, 1000000});
-    index.Build({3, 4});
-    EXPECT_EQ(index.Find(1), -1);
-    EXPECT_EQ(index.Find(4), 1);
-    index.Build({});
-    EXPECT_EQ(index.Find(3), -1);
-}
-
 TEST(Mesh, Nodes_KeepOrderLabelsAndSinglePrecision) {
     odiK_Mesh mesh;
     mesh.SetNodes({7, 3}, {0.1F, 1.0F, 2.0F, 3.0F, 4.0F, 5.0F});
@@ -255,6 +203,32 @@ TEST(Mesh, ElementSet_HasASubsetForEachRunOfOneClass) {
               (std::vector<Subset>{{0, {2, 0}, {}}, {1, {0}, {}}, {0, {1}, {}}, {2, {0}, {}}, {3, {0}, {}}}));
     EXPECT_EQ(mesh.Sets()[0]->type, res_SetTypeEnm::ELEMENTS);
     EXPECT_FALSE(mesh.Sets()[0]->internal);
+}
+
+TEST(Mesh, ElementSetOfRuns_IsThatOfTheirLabels) {
+    odiK_Mesh mesh = MeshWithElements();
+    fnd_Raise problems;
+    const odiK_ElementRun runs[] = {{0, 0, 1}, {0, 1, 3}, {1, 0, 0}, {2, 0, 1}, {0, 2, 3}};
+    mesh.AddSet({"RUNS", res_SetTypeEnm::ELEMENTS, false, {}, {}, runs}, problems);
+    EXPECT_EQ(SubsetsOf(*mesh.Sets()[0]),
+              (std::vector<Subset>{{0, {0, 1, 2}, {}}, {2, {0}, {}}, {0, {2}, {}}}));
+    mesh.AddElementSet("LABELS", {1, 2, 3, 20, 3});
+    EXPECT_EQ(SubsetsOf(*mesh.Sets()[1]), SubsetsOf(*mesh.Sets()[0]));
+}
+
+TEST(Mesh, RunBeyondItsClass_Raises) {
+    odiK_Mesh mesh = MeshWithElements();
+    const auto raised = [&mesh](odiK_ElementRun run) {
+        return Raised([&] {
+            fnd_Raise problems;
+            mesh.AddSet({"RUNS", res_SetTypeEnm::ELEMENTS, false, {}, {}, {&run, 1}}, problems);
+        });
+    };
+    EXPECT_EQ(raised({0, 0, 4}), "odiK_Mesh: end of a run 4 is out of range, expected 0 to 3");
+    EXPECT_EQ(raised({0, -1, 2}), "odiK_Mesh: end of a run -1 is out of range, expected 0 to 3");
+    EXPECT_EQ(raised({0, 2, 1}), "odiK_Mesh: end of a run 1 is out of range, expected 0 to 3");
+    EXPECT_EQ(raised({4, 0, 1}), "odiK_Mesh: class 4 is out of range, expected 0 to 3");
+    EXPECT_TRUE(mesh.Sets().empty());
 }
 
 TEST(Mesh, Surface_TakesFaceNamesAndIds) {
