@@ -151,7 +151,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     if (odb == nullptr) return 0;
     for (const auto& [name, model] : odb->Models()) {
         static_cast<void>(TextOfDescription(std::string(name.View()), DescribeModel(*model)));
-        static_cast<void>(TextOfHistory(DescribeHistory(*odb, name)));
+        const ModelHistory history(*odb, name);
+        static_cast<void>(history.Json());
+        static_cast<void>(history.Text());
     }
     return 0;
 }

@@ -92,15 +92,6 @@ void AddDeckChecks(const odb_Odb& odb, fnd_List& list) {
     odiK_IgnoreList(odb).TakeFrom(list.findings);
 }
 
-/// The table of one kind alone.
-std::string HistoryText(const std::string& history, const std::string& kind) {
-    nlohmann::ordered_json told = nlohmann::ordered_json::parse(history);
-    for (auto& [member, objects] : told.items()) {
-        if (member != kind && member != "failures") objects = nlohmann::ordered_json::object();
-    }
-    return TextOfHistory(told);
-}
-
 } // namespace
 
 std::unique_ptr<pyx_Store> pyx_Store::Of(py::handle value) {
@@ -193,10 +184,13 @@ void pyx_Store::SetParameters(const py::list& parameters) {
     }
 }
 
-std::string pyx_Store::History() const {
-    std::string text;
-    pyx_Released([&] { text = DescribeHistory(*odb_, odb_->DeckModelName()).dump(); });
-    return text;
+std::pair<std::string, std::map<std::string, std::string>> pyx_Store::History() const {
+    std::pair<std::string, std::map<std::string, std::string>> told;
+    pyx_Released([&] {
+        const ModelHistory history(*odb_, odb_->DeckModelName());
+        told = {history.Json().dump(), history.TextsByKind()};
+    });
+    return told;
 }
 
 std::string pyx_Store::Description() const {
@@ -238,7 +232,6 @@ void pyx_Store::Add(py::module_& module) {
     module.def("store_of", &pyx_Store::Of);
     module.def("load", &pyx_Store::Load);
     module.def("check", &pyx_Store::Check);
-    module.def("history_text", &HistoryText);
     module.def("replace_file", [](const std::string& path, const std::string& thing, const py::bytes& text) {
         const std::string_view bytes = text;
         return Replace(path, thing.c_str(),

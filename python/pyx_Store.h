@@ -4,6 +4,7 @@
 #include "model_file/mdf_ModelFile.h"
 #include "python/pyx_Errors.h"
 
+#include <map>
 #include <memory>
 
 /// A store made of Python's models, or read from a model file, for as long as a call of Python's needs it.
@@ -27,7 +28,8 @@ public:
     /// [(name, pointers, unit, limits, description)].
     py::list Parameters() const;
     void SetParameters(const py::list& parameters);
-    std::string History() const;
+    /// The history as JSON, and its table by kind.
+    std::pair<std::string, std::map<std::string, std::string>> History() const;
     std::string Description() const;
     /// [(load case, text)].
     py::list DeckLines(const std::string& repository, const std::string& name, const std::string& step) const;

@@ -383,8 +383,9 @@ ExitCode RunInfo(const std::string& model, bool history, RunReport& report) {
         models[key] = DescribeModel(*entry);
         report.Print(TextOfDescription(key, models[key]));
         if (!history) continue;
-        models[key]["history"] = DescribeHistory(*odb, name);
-        report.Print(TextOfHistory(models[key]["history"]));
+        const ModelHistory told(*odb, name);
+        if (report.AsJson()) models[key]["history"] = told.Json();
+        report.Print(told.Text());
     }
     if (!origins.empty()) {
         ordered_json& files = report.Member("meshFiles") = DescribeOrigins(origins);

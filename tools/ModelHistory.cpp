@@ -18,62 +18,56 @@ using nlohmann::ordered_json;
 
 namespace {
 
-struct Mark {
-    bool written;
-    bool opNew;
-};
-/// Whether a step writes the object, and how; empty where only statuses are told.
-using MarkOf = std::function<Mark(const cls_Record& object, const cow_String& name, const cow_String& step)>;
+using Cell = ModelHistory::Cell;
+/// Puts into a cell whether its step writes the object, and how; empty where only statuses are told.
+using MarkOf =
+    std::function<void(const cls_Record& object, const cow_String& name, const cow_String& step, Cell& cell)>;
 
-/// The same by a function of the objects' own class.
-template <class T, class Function>
-MarkOf MarkOfA(const Function& function) {
-    return [function](const cls_Record& object, const cow_String& name, const cow_String& step) {
-        return function(static_cast<const T&>(object), name, step);
-    };
-}
-
-ordered_json HistoryOf(const mdl_Repository& objects, const kprC_StepContainer& steps, const MarkOf& markOf) {
-    ordered_json all = ordered_json::object();
+std::vector<ModelHistory::Row> RowsOf(const mdl_Repository& objects, const kprC_StepContainer& steps,
+                                      const MarkOf& markOf) {
+    std::vector<ModelHistory::Row> rows;
     for (const auto& [name, record] : objects) {
         const auto& object = static_cast<const kprC_PropagatingObject&>(record);
-        ordered_json states = ordered_json::array();
+        ModelHistory::Row& row = rows.emplace_back();
+        row.name = Text(name);
+        row.className = Text(cls_Classes().ShortNameOf(object.DynTypeId()));
+        row.suppressed = object.suppressed;
+        row.cells.reserve(static_cast<std::size_t>(steps.Size()));
         for (const auto& [step, stepRecord] : steps) {
-            ordered_json state = ordered_json::object();
-            AddMember(state, "step", Text(step));
-            AddMember(state, "status",
-                      omu_EnumTableOf(mdl_PropagationStatusEnm())
-                          .Row(static_cast<int>(object.StatusIn(step)))
-                          ->name);
-            if (markOf != nullptr) {
-                const Mark mark = markOf(object, name, step);
-                AddMember(state, "written", mark.written);
-                AddMember(state, "opNew", mark.opNew);
-            }
-            states.push_back(std::move(state));
+            Cell& cell = row.cells.emplace_back();
+            cell.status = object.StatusIn(step);
+            if (markOf != nullptr) markOf(object, name, step, cell);
         }
-        AddMember(all, Text(name),
-                  {{"class", Text(cls_Classes().ShortNameOf(object.DynTypeId()))},
-                   {"suppressed", object.suppressed},
-                   {"steps", std::move(states)}});
     }
-    return all;
+    return rows;
 }
+
+const char* StatusName(mdl_PropagationStatusEnm status) {
+    return omu_EnumTableOf(status).Row(static_cast<int>(status))->name;
+}
+
+constexpr const char* kFootnote =
+    "  (* written in the step, ! with op=NEW; of interactions and output requests only the status)\n";
 
 /// What lives across steps and reaches the deck has a history there.
 bool HasHistory(const odiK_Repository& repository) {
     return repository.IsPropagating() && repository.ReachesDeck();
 }
 
-/// The words of a status; a dash before an object begins.
-std::string StatusText(const std::string& status) {
-    return status == "NOT_YET_ACTIVE" ? "-" : mdl_StatusWords(status);
+/// The words of a status, a dash before an object begins, and the mark of a step that writes it.
+std::string CellText(const Cell& cell) {
+    std::string text =
+        cell.status == mdl_PropagationStatusEnm::NOT_YET_ACTIVE ? "-" : mdl_StatusWords(StatusName(cell.status));
+    if (cell.written) text += cell.opNew ? " !" : " *";
+    return text;
 }
 
 /// The marks of the conditions, by the member of their repository.
 class Marks {
 public:
-    Marks(const oif_ModelInfo& info, ordered_json& root) : info_(info), view_(info.Model()), root_(root) {
+    /// What can't be marked is put into `failures`.
+    Marks(const oif_ModelInfo& info, std::vector<ModelHistory::Failure>& failures)
+        : info_(info), view_(info.Model()), failures_(failures) {
         MarkBoundaryConditions();
         MarkLoads();
         MarkFields();
@@ -92,7 +86,7 @@ private:
             configure(status);
             return status;
         } catch (const QRXBasException& raised) {
-            root_["failures"][member] = raised.what();
+            failures_.push_back({member, raised.what()});
             return std::nullopt;
         }
     }
@@ -121,68 +115,95 @@ private:
         const kprC_StepContainer& steps = view_.Steps();
         const auto status = Configured<Status>(member, configure);
         if (!status) return;
-        marks_[member] =
-            MarkOfA<T>([&steps, status](const T& object, const cow_String& name, const cow_String& step) {
-                Mark mark{false, false};
-                for (const oif_ConditionPlace& place :
-                     Status::Places(steps.ConstGet(step), name, object.Status(step))) {
-                    if (!status->Writes(object, step, place.IsLoadCase())) continue;
-                    mark = {true, status->Op(object, step, place.IsLoadCase()) == oif_Op::NEW};
-                }
-                return mark;
-            });
+        marks_[member] = [&steps, status](const cls_Record& record, const cow_String& name,
+                                          const cow_String& step, Cell& cell) {
+            const auto& object = static_cast<const T&>(record);
+            cell.isMarked = true;
+            for (const oif_ConditionPlace& place :
+                 Status::Places(steps.ConstGet(step), name, object.Status(step))) {
+                if (!status->Writes(object, step, place.IsLoadCase())) continue;
+                cell.written = true;
+                cell.opNew = status->Op(object, step, place.IsLoadCase()) == oif_Op::NEW;
+            }
+        };
     }
 
     const oif_ModelInfo& info_;
     const qkw_Model& view_;
-    ordered_json& root_;
+    std::vector<ModelHistory::Failure>& failures_;
     std::map<std::string, MarkOf, std::less<>> marks_;
 };
 
 } // namespace
 
-ordered_json DescribeHistory(const odb_Odb& odb, const cow_String& modelName) {
+ModelHistory::ModelHistory(const odb_Odb& odb, const cow_String& modelName) {
     const oif_ModelInfo info(odb.ddb().model(modelName));
     const odiK_Model& model = *odb.FindModel(modelName);
-    ordered_json root = ordered_json::object();
-    const Marks marks(info, root);
+    const kprC_StepContainer& steps = info.Model().Steps();
+    for (const auto& [step, record] : steps) steps_.emplace_back(step.View());
+    const Marks marks(info, failures_);
     for (const odiK_Repository& repository : odiK_Repositories()) {
         if (!HasHistory(repository)) continue;
-        root[repository.member] =
-            HistoryOf(repository.In(model), info.Model().Steps(), marks.Of(repository.member));
+        kinds_.push_back({&repository, RowsOf(repository.In(model), steps, marks.Of(repository.member))});
+    }
+}
+
+ordered_json ModelHistory::Json() const {
+    ordered_json root = ordered_json::object();
+    for (const Failure& failure : failures_) root["failures"][failure.member] = failure.text;
+    for (const Kind& kind : kinds_) {
+        ordered_json& objects = root[kind.repository->member] = ordered_json::object();
+        for (const Row& row : kind.rows) {
+            ordered_json states = ordered_json::array();
+            for (std::size_t step = 0; step < steps_.size(); ++step) {
+                const Cell& cell = row.cells[step];
+                ordered_json& state = states.emplace_back(ordered_json::object());
+                AddMember(state, "step", steps_[step]);
+                AddMember(state, "status", StatusName(cell.status));
+                if (!cell.isMarked) continue;
+                AddMember(state, "written", cell.written);
+                AddMember(state, "opNew", cell.opNew);
+            }
+            AddMember(
+                objects, row.name,
+                {{"class", row.className}, {"suppressed", row.suppressed}, {"steps", std::move(states)}});
+        }
     }
     return root;
 }
 
-std::string TextOfHistory(const ordered_json& history) {
-    std::string text;
-    for (const odiK_Repository& kind : odiK_Repositories()) {
-        if (!HasHistory(kind)) continue;
-        const ordered_json& objects = history[kind.member];
-        if (objects.empty()) continue;
-        TextTable table;
-        for (const auto& [name, object] : objects.items()) {
-            if (&object == &objects.front()) {
-                std::vector<std::string> header{""};
-                for (const ordered_json& state : object["steps"]) header.push_back(state["step"]);
-                table.Row(std::move(header));
-            }
-            std::vector<std::string> row{name + (object["suppressed"].get<bool>() ? " (suppressed)" : "")};
-            for (const ordered_json& state : object["steps"]) {
-                std::string cell = StatusText(state["status"]);
-                if (state.value("written", false)) cell += state["opNew"].get<bool>() ? " !" : " *";
-                row.push_back(std::move(cell));
-            }
-            table.Row(std::move(row));
-        }
-        text += std::string("  history of ") + kind.plural + "\n" + table.Text("    ");
-        if (history.contains("failures") && history["failures"].contains(kind.member)) {
-            text +=
-                "    a deck can't tell them: " + history["failures"][kind.member].get<std::string>() + "\n";
-        }
+std::string ModelHistory::TextOf(const Kind& kind) const {
+    if (kind.rows.empty()) return {};
+    TextTable table;
+    std::vector<std::string> header{""};
+    header.insert(header.end(), steps_.begin(), steps_.end());
+    table.Row(std::move(header));
+    for (const Row& row : kind.rows) {
+        std::vector<std::string> cells{row.name + (row.suppressed ? " (suppressed)" : "")};
+        cells.reserve(row.cells.size() + 1);
+        for (const Cell& cell : row.cells) cells.push_back(CellText(cell));
+        table.Row(std::move(cells));
     }
-    if (!text.empty())
-        text +=
-            "  (* written in the step, ! with op=NEW; of interactions and output requests only the status)\n";
+    std::string text = std::string("  history of ") + kind.repository->plural + "\n" + table.Text("    ");
+    for (const Failure& failure : failures_) {
+        if (failure.member == kind.repository->member)
+            text += "    a deck can't tell them: " + failure.text + "\n";
+    }
     return text;
+}
+
+std::string ModelHistory::Text() const {
+    std::string text;
+    for (const Kind& kind : kinds_) text += TextOf(kind);
+    return text.empty() ? text : text + kFootnote;
+}
+
+std::map<std::string, std::string> ModelHistory::TextsByKind() const {
+    std::map<std::string, std::string> texts;
+    for (const Kind& kind : kinds_) {
+        std::string text = TextOf(kind);
+        if (!text.empty()) text += kFootnote;
+        texts.emplace(kind.repository->member, std::move(text));
+    }
+    return texts;
 }

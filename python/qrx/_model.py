@@ -198,12 +198,12 @@ class Model:
 
     def history(self, kind=None):
         """What the objects of a kind ("loads", ...) are in each step; of all kinds, by kind, when none is given."""
-        told = json.loads(self._store().history())
+        text, tables = self._store().history()
+        told = json.loads(text)
         kinds = {_names.repository_name(member): member for member in told if member in kinds_of(told)}
         if kind is None:
-            return {name: history_of(told, member) for name, member in kinds.items()}
-        member = _member_of(kind, kinds)
-        return history_of(told, member)
+            return {name: history_of(told, tables, member) for name, member in kinds.items()}
+        return history_of(told, tables, _member_of(kind, kinds))
 
     def deck_lines(self, kind, name, step, load_case=""):
         """The lines that an object becomes in a step of the deck, or in a load case of it."""

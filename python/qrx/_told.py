@@ -1,10 +1,8 @@
 """What a model tells of itself: histories, pages, summaries."""
 
 import html
-import json
 from typing import NamedTuple
 
-from . import _qrx
 from ._containers import repositories
 from ._errors import ModelError
 from ._values import enum_class
@@ -55,7 +53,7 @@ def kinds_of(told):
     return {member for member in told if member != "failures"}
 
 
-def history_of(told, member):
+def history_of(told, tables, member):
     statuses = enum_class("mdl_PropagationStatusEnm")
     rows = []
     for name, entry in told[member].items():
@@ -64,7 +62,7 @@ def history_of(told, member):
             for state in entry["steps"]
         }
         rows.append(HistoryRow(name, entry["suppressed"], cells))
-    return History(rows, _qrx.history_text(json.dumps(told), member))
+    return History(rows, tables[member])
 
 
 def _table(head, rows):
