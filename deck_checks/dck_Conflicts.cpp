@@ -103,8 +103,9 @@ public:
                                    load.DynTypeId() == kloC_Moment::TypeId();
             if (!load.suppressed && isOnNodes) Add({name, nullptr, &load, DatumOf(load)}, load.region);
         }
-        // Conditions stand ahead of loads at each node.
-        std::ranges::sort(entries_);
+        // Conditions stand ahead of loads at each node. The nodes of each are sorted already, which merging
+        // makes use of.
+        std::ranges::stable_sort(entries_, {}, &std::pair<dck_Nodes::Key, int>::first);
         std::size_t first = 0;
         for (std::size_t i = 0; i < entries_.size(); ++i) {
             if (entries_[i].first != entries_[first].first) first = i;

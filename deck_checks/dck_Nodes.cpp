@@ -77,7 +77,7 @@ std::vector<dck_Nodes::Key> dck_Nodes::Of(const rgnC_Region& region) const {
     const rgnC_SetData& data = region.ConstSet().Data();
     if (data.IsNull()) return nodes;
     for (int i = 0; i < data.NumSubSets(); ++i) Append(data.SubSet(i), data.Kind(), nodes);
-    std::ranges::sort(nodes);
+    if (!std::ranges::is_sorted(nodes)) std::ranges::sort(nodes);
     nodes.erase(std::unique(nodes.begin(), nodes.end()), nodes.end());
     return nodes;
 }

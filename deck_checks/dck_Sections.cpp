@@ -66,8 +66,10 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
         for (const rgnC_SubsetData& subset : mesh.Sets()[static_cast<std::size_t>(set)]->subsets) {
             if (subset.ClassIndex() < 0) continue;
             const int first = mesh.Classes()[static_cast<std::size_t>(subset.ClassIndex())].firstElementIndex;
-            for (int i = 0; i < subset.subset.Length(); ++i) {
-                sectionOf[static_cast<std::size_t>(first + subset.subset[i])] = section;
+            for (int i = 0, length = 0; i < subset.subset.Length(); i += length) {
+                const int* const run = subset.subset.ConstRun(i, length);
+                for (int k = 0; k < length; ++k)
+                    sectionOf[static_cast<std::size_t>(first + run[k])] = section;
             }
         }
     }
@@ -83,19 +85,20 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
     int without = 0;
     for (const odiK_ElementClass& elements : mesh.Classes()) {
         std::map<cow_String, std::pair<const cls_Record*, int>> misfits;
-        // Neighbours mostly have one section.
         const bool needsSection = NeedsSection(elements.type);
-        const cls_Record* last = nullptr;
-        bool lastFits = false;
-        for (int i = 0; i < elements.NumElements(); ++i) {
-            const cls_Record* section = sectionOf[static_cast<std::size_t>(elements.firstElementIndex + i)];
+        const auto end = sectionOf.begin() + elements.firstElementIndex + elements.NumElements();
+        for (auto first = end - elements.NumElements(); first != end;) {
+            // Neighbours mostly have one section.
+            const cls_Record* section = *first;
+            const auto next =
+                std::find_if(first, end, [section](const cls_Record* s) { return s != section; });
+            const int count = static_cast<int>(next - first);
+            first = next;
             if (section == nullptr) {
-                without += needsSection ? 1 : 0;
-                continue;
+                without += needsSection ? count : 0;
+            } else if (!CanTake(elements.type, section->DynTypeId())) {
+                misfits.try_emplace(names[section], section, 0).first->second.second += count;
             }
-            if (section != last) lastFits = CanTake(elements.type, section->DynTypeId());
-            last = section;
-            if (!lastFits) ++misfits.try_emplace(names[section], section, 0).first->second.second;
         }
         for (const auto& [name, misfit] : misfits) {
             const auto& [section, count] = misfit;

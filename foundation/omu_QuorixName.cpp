@@ -59,8 +59,12 @@ cow_List<cow_String> rgx_split(const cow_String& text, const char* pattern) {
     return tokens;
 }
 
+bool omu_QuorixName::NeedsQuotes(std::string_view name) {
+    return !IsWord(name);
+}
+
 cow_String omu_QuorixName::QuoteIfNeeded(const cow_String& name) {
-    if (IsWord(name.View())) return name;
+    if (!NeedsQuotes(name.View())) return name;
     std::string quoted("\"");
     quoted.append(name.View()).append("\"");
     return cow_String(std::string_view(quoted));

@@ -16,6 +16,8 @@ public:
     /// quoted, or plain: letters, digits, "_" and "-", beginning with a letter or "_" (behind the first dot
     /// a digit may begin too). Letters are ASCII; every byte above 127 calls for quotes.
     static cow_String QuoteIfNeeded(const cow_String& name);
+    /// Whether that name isn't bare.
+    static bool NeedsQuotes(std::string_view name);
 };
 
 #endif

@@ -67,17 +67,15 @@ bool oif_OpStatus::OpNew(unsigned int typeId, const cow_String& stepName) const 
 
 void oif_OpStatus::ForceOpNew(int stepIndex) {
     if (stepIndex >= stepNames.Length()) return;
-    for (int key = 0; key < opNewFlags.Count(); ++key) SetFlag(key, stepIndex);
+    for (cow_List<int>& flags : opNewFlags) flags.Put(stepIndex, 1);
 }
 
 void oif_OpStatus::InitializeMembers(const cow_List<cow_String>& steps, int numberOfKeys) {
+    stepNames = steps;
+    for (const cow_String& step : steps) stepIndex_.Append(step);
     cow_List<int> flags;
-    for (const cow_String& step : steps) {
-        stepIndex_.Append(step);
-        stepNames.Append(step);
-        flags.Append(0);
-    }
-    for (int key = 0; key < numberOfKeys; ++key) opNewFlags.Insert(key, flags);
+    flags.Fill(steps.Length(), 0);
+    opNewFlags.assign(static_cast<std::size_t>(numberOfKeys), flags);
 }
 
 void oif_BCOpStatus::Configure(const kprC_PropagatingContainer<kbcC_BC>& bcs,
@@ -179,7 +177,7 @@ void oif_LoadOpStatus::PopulateMembers(const kprC_PropagatingContainer<kloC_Load
 
 void oif_LoadOpStatus::ResolveOverlapRegions(const kprC_PropagatingContainer<kloC_Load>& loads,
                                              const qkw_ModelInfo& modelInfo) {
-    std::vector<std::unordered_set<std::string>> names(static_cast<std::size_t>(opNewFlags.Count()));
+    std::vector<std::unordered_set<std::string>> names(opNewFlags.size());
     std::vector<bool> overlaps(names.size());
     for (const auto& [name, load] : loads) {
         if (load.suppressed) continue;

@@ -2,7 +2,7 @@
 #define QRX_OIF_OPSTATUS_H
 
 #include "base/oif_Op.h"
-#include "foundation/cow_Map.h"
+#include "foundation/cow_List.h"
 #include "keyword_layer/qkw_ModelInfo.h"
 #include "store_interface/records/conditions/kloC_BoltLoad.h"
 
@@ -51,7 +51,9 @@ public:
     /// an unknown step raise.
     bool OpNew(unsigned int typeId, const cow_String& stepName) const;
     /// The flags of the family of the class, step by step. A class without a family raises.
-    const cow_List<int>& Flags(unsigned int typeId) const { return opNewFlags.ConstGet(Key(typeId)); }
+    const cow_List<int>& Flags(unsigned int typeId) const {
+        return opNewFlags[static_cast<std::size_t>(Key(typeId))];
+    }
     /// Whether an object's keyword is, in the step or in a load case of it.
     template <class T>
     oif_Op Op(const T& object, const cow_String& stepName, bool /*inLoadCase*/ = false) const {
@@ -69,7 +71,7 @@ protected:
     bool IsInitialStep(const cow_String& stepName) const {
         return !stepNames.IsEmpty() && stepNames[0] == stepName;
     }
-    void SetFlag(int key, int stepIndex) { opNewFlags.Get(key).Put(stepIndex, 1); }
+    void SetFlag(int key, int stepIndex) { opNewFlags[static_cast<std::size_t>(key)].Put(stepIndex, 1); }
     /// Sets the flag of each object's family at the steps behind the initial one for which `test` holds;
     /// `kind` is what messages call them.
     template <class T, class Test>
@@ -85,7 +87,8 @@ protected:
     }
 
     cow_List<cow_String> stepNames;
-    cow_Map<int, cow_List<int>> opNewFlags;
+    /// By family, step by step.
+    std::vector<cow_List<int>> opNewFlags;
 
 private:
     /// The family of a class of objects.

@@ -27,6 +27,12 @@ class MeshLabels final : public oif_LabelSource {
 public:
     MeshLabels(const rgnC_SetData& setData, const ddb_Mesh& mesh) : setData_(setData), mesh_(mesh) {}
 
+    /// How many labels there are at most: nodes that the mesh doesn't have aren't looked for.
+    long long Most() const {
+        long long most = 0;
+        for (const int i : setData_.SubSetsIn(mesh_.meshIndex())) most += setData_.SubSet(i).subset.Length();
+        return most;
+    }
     void ForEachPiece(const Take& take) const override {
         oif_LabelPieces pieces(take);
         const bool nodes = setData_.Kind() == static_cast<int>(res_SetTypeEnm::NODES);
@@ -132,13 +138,12 @@ void oif_Set::ComputeData(const rgnC_SetData& setData, const ddb_Mesh& mesh) {
         }
     } else {
         const MeshLabels labels(setData, mesh);
-        std::size_t count = 0;
-        labels.ForEachPiece([&count](std::span<const int> piece) { count += piece.size(); });
-        if (count > static_cast<std::size_t>(oif_SetLabels::kLongestList)) {
+        const long long most = labels.Most();
+        if (most > oif_SetLabels::kLongestList) {
             labels_ = oif_SetLabels(std::make_shared<MeshLabels>(labels));
             return;
         }
-        list = oif_ListOf(labels, static_cast<int>(count));
+        list = oif_ListOf(labels, static_cast<int>(most));
     }
     labels_ = oif_SetLabels(list);
     if (setData.LiesInOneMesh()) {

@@ -4,16 +4,13 @@
 #include "foundation/omu_QuorixName.h"
 #include "keyword_layer/qkw_QuorixName.h"
 
+#include <algorithm>
 #include <cstdlib>
 #include <string>
 
 namespace {
 
 constexpr char kMeshOfPath[] = ".mesh[";
-
-cow_String Printable(const cow_String& text) {
-    return qkw_QuorixName(text, false).Printable();
-}
 
 } // namespace
 
@@ -93,17 +90,17 @@ cow_String oif_SetName::UniqueSurfaceName(regionContext context) const {
     return QuoteIfNeeded(text);
 }
 
-cow_String oif_SetName::QuoteIfNeeded(cow_String name) {
-    cow_String prefix;
-    cow_String last;
-    SplitName(name, prefix, last);
-    if (!IsQuoted(last)) last = Printable(last);
-    const cow_List<cow_String> tokens = rgx_split(name, "[\\.]");
-    cow_String quoted;
-    for (int i = 0; i + 1 < tokens.Length(); ++i) {
-        quoted.Append(IsQuoted(tokens[i]) ? tokens[i] : Printable(tokens[i])).Append(".");
+cow_String oif_SetName::QuoteIfNeeded(const cow_String& name) {
+    const std::string_view text = name.View();
+    std::string quoted;
+    for (std::size_t begin = 0; begin <= text.size();) {
+        const std::size_t end = std::min(text.find('.', begin), text.size());
+        const std::string_view piece = text.substr(begin, end - begin);
+        const std::string_view quote = omu_QuorixName::NeedsQuotes(piece) ? "\"" : "";
+        quoted.append(begin > 0 ? "." : "").append(quote).append(piece).append(quote);
+        begin = end + 1;
     }
-    return quoted.Append(last);
+    return quoted.size() == text.size() ? name : cow_String(std::string_view(quoted));
 }
 
 bool oif_SetName::IsQuoted(cow_String text) {

@@ -24,7 +24,7 @@ public:
     cow_String UniqueSurfaceName(regionContext context) const;
 
     /// Quotes each dotted part by itself where it needs it. The split does not know of quotes.
-    static cow_String QuoteIfNeeded(cow_String name);
+    static cow_String QuoteIfNeeded(const cow_String& name);
     /// More than two characters, in double quotes.
     static bool IsQuoted(cow_String text);
     static cow_String Unquote(cow_String text);
