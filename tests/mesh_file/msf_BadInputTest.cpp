@@ -1,3 +1,4 @@
+#include "foundation/thr_InOrder.h"
 #include "mesh_file/MeshTexts.h"
 
 #include <cstdint>
@@ -5,6 +6,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <limits>
 
 namespace {
 
@@ -30,7 +32,86 @@ const char* const kVtu = "<VTKFile type=\"UnstructuredGrid\" byte_order=\"Little
                          "<DataArray type=\"UInt8\" Name=\"types\" "
                          "format=\"ascii\">5</DataArray></Cells></Piece></UnstructuredGrid></VTKFile>";
 
+/// A chain of lines as binary MSH 4.1, of so many nodes that two threads read it, and the places of its
+/// numbers.
+struct Chain {
+    static constexpr std::int64_t kNodes = 20000;
+    std::string bytes;
+    std::size_t labels = 0;
+    std::size_t coordinates = 0;
+    std::size_t cells = 0;
+
+    template <class T>
+    void Add(std::initializer_list<T> values) {
+        for (const T value : values) bytes.append(reinterpret_cast<const char*>(&value), sizeof value);
+    }
+    template <class T>
+    void Put(std::size_t place, T value) {
+        std::memcpy(bytes.data() + place, &value, sizeof value);
+    }
+
+    Chain() {
+        bytes = "$MeshFormat\n4.1 1 8\n";
+        Add<std::int32_t>({1});
+        bytes += "\n$EndMeshFormat\n$Nodes\n";
+        Add<std::int64_t>({1, kNodes, 1, kNodes});
+        Add<std::int32_t>({1, 1, 0});
+        Add<std::int64_t>({kNodes});
+        labels = bytes.size();
+        for (std::int64_t i = 1; i <= kNodes; ++i) Add<std::int64_t>({i});
+        coordinates = bytes.size();
+        for (std::int64_t i = 1; i <= kNodes; ++i) Add<double>({0.5 * static_cast<double>(i), 0.0, -1.0});
+        bytes += "\n$EndNodes\n$Elements\n";
+        Add<std::int64_t>({1, kNodes - 1, 1, kNodes - 1});
+        Add<std::int32_t>({1, 1, 1});
+        Add<std::int64_t>({kNodes - 1});
+        cells = bytes.size();
+        for (std::int64_t i = 1; i < kNodes; ++i) Add<std::int64_t>({i, i, i + 1});
+        bytes += "\n$EndElements\n";
+    }
+};
+
+std::string At(std::size_t offset) {
+    return "offset " + std::to_string(offset) + ": ";
+}
+
 } // namespace
+
+TEST(BinaryMsh, ReadByTwoThreads_IsWhatItIsByOne) {
+    const Chain chain;
+    for (const int threads : {1, 2}) {
+        thr_SetUsualThreads(threads);
+        const msf_Mesh mesh = MeshOf(chain.bytes);
+        ASSERT_EQ(mesh.NumNodes(), Chain::kNodes);
+        ASSERT_EQ(mesh.NumCells(), Chain::kNodes - 1);
+        for (int i = 0; i < mesh.NumNodes(); ++i) {
+            const auto place = static_cast<std::size_t>(i);
+            ASSERT_EQ(mesh.nodeLabels[place], i + 1);
+            ASSERT_EQ(mesh.coordinates[3 * place], 0.5F * static_cast<float>(i + 1));
+            ASSERT_EQ(mesh.coordinates[3 * place + 2], -1.0F);
+        }
+        for (int i = 0; i < mesh.NumCells(); ++i) {
+            ASSERT_EQ(mesh.blocks[0].Row(i)[0], i);
+            ASSERT_EQ(mesh.blocks[0].Row(i)[1], i + 1);
+        }
+    }
+    thr_SetUsualThreads(0);
+}
+
+TEST(BinaryMsh, OfTwoMistakes_TheFirstOfTheFileIsTold) {
+    Chain chain;
+    constexpr std::int64_t least = std::numeric_limits<std::int64_t>::min();
+    chain.Put(chain.cells + 24 * 7 + 8, least);
+    EXPECT_EQ(Refused(chain.bytes), At(chain.cells) + "found node " + std::to_string(least) +
+                                        ", expected the label of a node of the file");
+    chain.Put(chain.coordinates + 24 * 14999, std::numeric_limits<double>::quiet_NaN());
+    EXPECT_EQ(Refused(chain.bytes), At(chain.coordinates) +
+                                        "found a coordinate of node 15000 that is no number or too large, "
+                                        "expected a number of single precision");
+    chain.Put(chain.labels + 8 * 19999, least);
+    EXPECT_EQ(Refused(chain.bytes), At(chain.labels) + "found " + std::to_string(least) +
+                                        " as the label of a node, expected a number from 1 to 2147483647");
+}
 
 TEST(BadInput, FilesThatAreNone_AreRefusedByTheSystemsWords) {
     bool unreadable = false;
@@ -67,7 +148,7 @@ TEST(BadInput, EveryBeginningOfAFile_IsRefusedOrReadWithoutHarm) {
 TEST(BadInput, ChangedBytes_NeverDoHarm) {
     std::uint32_t random = 12345;
     const auto next = [&] { return random = random * 1664525u + 1013904223u; };
-    std::vector<const char*> names = {"tets_41b.msh",    "tets_22b.msh",  "prisms.unv", "prisms_b.vtk",
+    std::vector<const char*> names = {"tets_41b.msh",     "tets_22b.msh",  "prisms.unv", "prisms_b.vtk",
                                       "tets_base64z.vtu", "tets_rawz.vtu", "box_a.stl"};
     if (QRX_READS_MED) names.push_back("tets.med");
     for (const char* name : names) {
