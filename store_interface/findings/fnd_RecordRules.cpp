@@ -19,10 +19,6 @@ void fnd_RecordCheck::NotNegative(const char* field, int value) {
     if (value < 0) Add("negative-number", field, "found " + std::to_string(value), "0 or more");
 }
 
-void fnd_RecordCheck::NotNegative(const char* field, double value) {
-    if (value < 0) Add("negative-number", field, "found " + fnd_Shown(value), "0 or more");
-}
-
 void fnd_RecordCheck::Positive(const char* field, double value) {
     if (!(value > 0)) Add("not-positive", field, "found " + fnd_Shown(value), "more than 0");
 }

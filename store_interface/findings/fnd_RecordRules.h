@@ -25,7 +25,6 @@ public:
                  int fieldVariables = 0);
     /// An error unless the number is 0 or more.
     void NotNegative(const char* field, int value);
-    void NotNegative(const char* field, double value);
     /// A warning unless the number is above 0.
     void Positive(const char* field, double value);
 

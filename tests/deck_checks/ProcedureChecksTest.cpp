@@ -38,6 +38,23 @@ TEST(ProcedureChecks, DynamicsAndFrequencies_NeedTheDensity) {
     EXPECT_EQ(Found({"Frequency"}, kElastic + ", " + kDensity), Texts{});
 }
 
+TEST(ProcedureChecks, AssignmentsOfAnInstance_StandInForThoseOfItsPart) {
+    EXPECT_EQ(FindingsOf<dck_CheckProcedures>(StepsOf({"Frequency"}) + R"(,
+        "parts": {"P": {"mesh": {
+            "nodes": {"labels": {"from": 1, "to": 4},
+                      "coordinates": [[0, 0, 0], [1, 0, 0], [0, 1, 0], [0, 0, 1]]},
+            "elements": [{"type": "C3D4", "labels": [1], "connectivity": [[1, 2, 3, 4]]}],
+            "sets": [{"name": "ALL", "kind": "element", "labels": [1]}]},
+            "sectionAssignments": [{"region": "ALL", "sectionName": "S"}]}},
+        "assembly": {"instances": {"I": {"part": "P",
+            "sectionAssignments": [{"region": "ALL", "sectionName": "T"}]}}},
+        "sections": {"S": {"class": "kseC_HomogenousSolidSection", "materialName": "M"},
+                     "T": {"class": "kseC_HomogenousSolidSection", "materialName": "N"}},
+        "materials": {"M": {)" + kElastic + R"(}, "N": {)" +
+                                              kElastic + "}}"),
+              Texts{"/materials/N: found no density, which step 'Step-1' needs"});
+}
+
 TEST(ProcedureChecks, Gravity_NeedsTheDensityWhereItActs) {
     const std::string gravity = R"(, "loads": {"G": {"class": "kloC_Gravity", "region": "I.ALL",
         "states": {"Step-2": {"component3": -9.81}}}})";

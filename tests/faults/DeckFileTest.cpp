@@ -134,7 +134,10 @@ protected:
     std::string WholeDeck() {
         const TestFolder other;
         whf_File deck(other.Path("job.inp"));
+        EXPECT_EQ(deck.Thing(), "deck");
+        EXPECT_EQ(deck.TemporaryFolder(), "");
         WriteTo(deck);
+        EXPECT_TRUE(deck.TemporaryFolder().starts_with(other.Path("."))) << deck.TemporaryFolder();
         return other.Text("job.inp");
     }
 

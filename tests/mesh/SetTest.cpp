@@ -164,6 +164,28 @@ TEST(SetName, OtherName_IsKeptFromThenOn) {
     EXPECT_EQ(name.UniqueSetName(Context::INSTANCE), "_I1");
 }
 
+TEST(LabelPieces, SpansAndSingleLabels_KeepTheirOrder) {
+    std::vector<int> labels;
+    std::vector<std::size_t> sizes;
+    const oif_LabelSource::Take take = [&](std::span<const int> piece) {
+        labels.insert(labels.end(), piece.begin(), piece.end());
+        sizes.push_back(piece.size());
+    };
+    std::vector<int> all(3000);
+    std::iota(all.begin(), all.end(), 1);
+    oif_LabelPieces pieces(take);
+    const std::span<const int> whole(all);
+    pieces.Add(whole[0]);
+    pieces.Add(whole.subspan(1, 100));
+    // Large ones go on as they are, behind what was gathered.
+    pieces.Add(whole.subspan(101, 2000));
+    pieces.Add(whole.subspan(2101, 100));
+    for (std::size_t i = 2201; i < whole.size(); ++i) pieces.Add(whole[i]);
+    pieces.HandOn();
+    EXPECT_EQ(labels, all);
+    EXPECT_EQ(sizes, (std::vector<std::size_t>{101, 2000, 899}));
+}
+
 TEST(SetName, Quotes_NeedMoreThanTwoCharacters) {
     EXPECT_FALSE(oif_SetName::IsQuoted("\"\""));
     EXPECT_TRUE(oif_SetName::IsQuoted("\"a\""));

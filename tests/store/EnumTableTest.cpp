@@ -1,4 +1,5 @@
 #include "store_interface/model/odiK_Model.h"
+#include "store_interface/records/output/korC_OdbRequestTable.h"
 
 #include "store/StoreTesting.h"
 
@@ -49,6 +50,40 @@ TEST(EnumTable, Propagation_HasItsNumbersAndWords) {
                  {13, "NOT_APPLICABLE"},
                  {14, "FIELD_PROPAGATED"},
                  {15, "FIELD_RESET"}});
+}
+
+TEST(EnumTable, RequestsOnTheirWayToTheDeck_HaveTheirNumbersAndWords) {
+    // Time points have another number than in the model.
+    ExpectTable(omu_EnumTableOf(korC_OdbRequest::TypeEnm()), "korC_OdbRequest::TypeEnm",
+                {{0, "FREQUENCY"},
+                 {1, "NUMBER_INTERVAL", "NUMBER INTERVAL"},
+                 {2, "TIME_INTERVAL", "TIME INTERVAL"},
+                 {3, "MODE_LIST", "MODE LIST"},
+                 {4, "TIME_POINTS", "TIME POINTS"}});
+    ExpectTable(omu_EnumTableOf(korC_DomainTypeEnm()), "korC_DomainTypeEnm",
+                {{0, "WHOLE_MODEL", "WHOLE MODEL"},
+                 {1, "SET"},
+                 {2, "BOLT_LOAD", "BOLT LOAD"},
+                 {3, "LAYUP"},
+                 {4, "SPRINGS"},
+                 {5, "FASTENER"},
+                 {6, "CONTACT_SURFACE", "CONTACT SURFACE"},
+                 {7, "INTEGRATED_SECTION", "INTEGRATED SECTION"},
+                 {8, "INTERACTION"},
+                 {14, "ALL_DOMAINS", "ALL DOMAINS"}});
+    ExpectTable(omu_EnumTableOf(korC_OdbChannel::TypeEnm()), "korC_OdbChannel::TypeEnm",
+                {{1, "FIELD"}, {2, "HISTORY"}});
+    ExpectTable(omu_EnumTableOf(korC_OdbRequestSpec::PrintEnm()), "korC_OdbRequestSpec::PrintEnm",
+                {{-1, "NONE"},
+                 {0, "NODE"},
+                 {1, "ELEMENT"},
+                 {2, "MODAL"},
+                 {4, "CONTACT"},
+                 {5, "RADIATION"},
+                 {6, "INCREMENTATION"},
+                 {7, "ENERGY"},
+                 {8, "ELEMENT_OR_CONTACT", "ELEMENT OR CONTACT"},
+                 {9, "INTEGRATED"}});
 }
 
 TEST(EnumTable, StepsAndJobs_HaveTheirNumbersAndWords) {

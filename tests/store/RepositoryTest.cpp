@@ -254,9 +254,14 @@ TEST(Step, Predicates_HoldForTheirProceduresOnly) {
         EXPECT_EQ(kprC_IsPerturbation(number), last == 0x66 || last == 0x6A || last == 0x6F || last == 0x70 ||
                                                    last == 0x71 || last == 0x75 || last == 0x76 ||
                                                    last == 0x77 || last == 0x7D || last == 0x7E);
+        EXPECT_EQ(kprC_IsNonmechanical(number), last == 0x68 || last == 0x6C || last == 0x6E);
+        EXPECT_EQ(kprC_AdaptiveMeshDomainsAreAllowed(number),
+                  last == 0x67 || last == 0x69 || last == 0x72 || last == 0x73 || last == 0x7B);
     }
     EXPECT_FALSE(kprC_IsExplicit(0));
     EXPECT_FALSE(kprC_IsPerturbation(0));
+    EXPECT_FALSE(kprC_IsNonmechanical(0));
+    EXPECT_FALSE(kprC_AdaptiveMeshDomainsAreAllowed(0));
 }
 
 TEST(Step, SuppressAndResume_SetTheFlag) {

@@ -115,6 +115,19 @@ TEST(Threads, LargeMesh_IsReadAndWrittenAlikeByAnyNumberOfThreads) {
     EXPECT_NE(expected.find("\n      7,         1.25,           1.,       -0.001\n"), std::string::npos);
 }
 
+TEST(Threads, LargeFileOfAMesher_GivesTheDeckOfOneThread) {
+    thr_SetUsualThreads(1);
+    const std::string expected = Deck(*Read("examples/bracket/bracket.json"));
+    for (const int threads : {2, 5}) {
+        thr_SetUsualThreads(threads);
+        const auto odb = Read("examples/bracket/bracket.json");
+        EXPECT_TRUE(Deck(*odb) == expected) << threads;
+        // Smaller files are read by one thread.
+        EXPECT_GT(odb->DeckModel()->Parts().begin()->second->mesh->Nodes().NumNodes(), 10000);
+    }
+    thr_SetUsualThreads(0);
+}
+
 TEST(Threads, StoreThatNobodyHasCompleted_IsCompletedOnce) {
     odb_Odb reference;
     Fill(reference);
