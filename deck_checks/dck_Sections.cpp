@@ -65,11 +65,12 @@ void FindInMesh(const odiK_Model& model, const odiK_Mesh& mesh,
         names[section] = assignment.sectionName;
         for (const rgnC_SubsetData& subset : mesh.Sets()[static_cast<std::size_t>(set)]->subsets) {
             if (subset.ClassIndex() < 0) continue;
-            const int first = mesh.Classes()[static_cast<std::size_t>(subset.ClassIndex())].firstElementIndex;
+            const cls_Record** const ofClass =
+                sectionOf.data() +
+                mesh.Classes()[static_cast<std::size_t>(subset.ClassIndex())].firstElementIndex;
             for (int i = 0, length = 0; i < subset.subset.Length(); i += length) {
                 const int* const run = subset.subset.ConstRun(i, length);
-                for (int k = 0; k < length; ++k)
-                    sectionOf[static_cast<std::size_t>(first + run[k])] = section;
+                for (int k = 0; k < length; ++k) ofClass[run[k]] = section;
             }
         }
     }

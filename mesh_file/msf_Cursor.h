@@ -4,6 +4,7 @@
 #include "mesh_file/msf_Source.h"
 
 #include <cstring>
+#include <utility>
 
 /// Walks over the bytes of a file, as words of text or as raw numbers. What can't be read fails with the
 /// place: the line, or the offset once the file turned out to be binary.
@@ -46,10 +47,12 @@ public:
 
     std::string Place() const { return PlaceAt(at_); }
     std::string PlaceAt(std::size_t at) const;
-    [[noreturn]] void Fail(std::string found, std::string expected) const { FailAt(at_, found, expected); }
+    [[noreturn]] void Fail(std::string found, std::string expected) const {
+        FailAt(at_, std::move(found), std::move(expected));
+    }
     /// At the word that was read last.
     [[noreturn]] void FailAtWord(std::string found, std::string expected) const {
-        FailAt(word_, found, expected);
+        FailAt(word_, std::move(found), std::move(expected));
     }
 
 private:
