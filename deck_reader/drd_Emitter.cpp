@@ -1,5 +1,6 @@
 #include "deck_reader/drd_Emitter.h"
 
+#include "deck_reader/drd_Names.h"
 #include "deck_reader/drd_Text.h"
 #include "foundation/num_RealText.h"
 
@@ -125,7 +126,8 @@ private:
         std::stable_sort(parameters.begin(), parameters.end(),
                          [](const auto& a, const auto& b) { return a.Key() < b.Key(); });
         for (drd_Parameter& parameter : parameters) {
-            if (parameter.HasValue()) parameter.value = values_.Keep(Value(parameter.value));
+            if (parameter.HasValue() && !IsName(keyword, parameter))
+                parameter.value = values_.Keep(Value(parameter.value));
         }
         const std::string name(keyword.Row() != nullptr ? keyword.Row()->name
                                                         : std::string_view(keyword.Name()));
@@ -136,9 +138,26 @@ private:
         }
         const bool isText = keyword.HasText() || keyword.Row() == nullptr;
         for (std::uint64_t i = 0; i < keyword.lines; ++i) {
-            const std::string_view line = deck_.DataLine(keyword, i);
-            emitter_.Line(isText ? std::string(line) : Fields(line));
+            emitter_.Line(isText ? std::string(deck_.DataLine(keyword, i)) : Fields(keyword, i));
         }
+    }
+
+    // Names stay as they stand: "01" is another one than "1".
+    static bool IsByName(drd_RefEnm ref) {
+        return ref != drd_RefEnm::NAME_UNLESS_NUMBER && ref != drd_RefEnm::NODES_UNLESS_NUMBER;
+    }
+    static bool IsName(const drd_Keyword& keyword, const drd_Parameter& parameter) {
+        const std::string_view key = parameter.Key();
+        if (key == "elset" || key == "nset") return true;
+        if (keyword.Row() != nullptr && key == drd_NameParameter(*keyword.Row())) return true;
+        return std::ranges::any_of(parameter.word->parameterRefs, [&](const drd_ParameterRef& ref) {
+            return IsByName(ref.ref) && drd_Applies(ref, keyword);
+        });
+    }
+    static bool IsName(const drd_Keyword& keyword, std::uint64_t line, int column) {
+        return std::ranges::any_of(keyword.word->dataRefs, [&](const drd_DataRef& ref) {
+            return IsByName(ref.ref) && drd_Applies(ref, keyword, line, column);
+        });
     }
 
     static std::string Value(std::string_view value) {
@@ -148,11 +167,13 @@ private:
         return drd_ReadReal(value, number) ? drd_Shown(number) : std::string(value);
     }
 
-    std::string Fields(std::string_view line) {
-        drd_SplitFields(line, fields_);
+    std::string Fields(const drd_Keyword& keyword, std::uint64_t line) {
+        drd_SplitFields(deck_.DataLine(keyword, line), fields_);
         std::string text;
-        for (const std::string_view field : fields_) {
-            text += Value(field) + ", ";
+        for (std::size_t column = 0; column < fields_.size(); ++column) {
+            const std::string_view field = fields_[column];
+            text += IsName(keyword, line, static_cast<int>(column)) ? std::string(field) : Value(field);
+            text += ", ";
         }
         while (!text.empty() && text.back() == ' ') text.pop_back();
         if (fields_.size() > 1 && !text.empty()) text.pop_back();

@@ -305,10 +305,7 @@ std::string Flattener::DataLine(const drd_Keyword& keyword, std::uint64_t line, 
         const std::string_view value = drd_Trim(field);
         std::string flat(value);
         for (const drd_DataRef& ref : refs) {
-            const auto first = static_cast<std::uint64_t>(ref.firstLine);
-            const bool isHere = line >= first && (ref.lineStep > 0 || line == first) &&
-                                (ref.column < 0 || ref.column == column);
-            if (!isHere || value.empty() || !drd_Applies(ref, keyword)) continue;
+            if (value.empty() || !drd_Applies(ref, keyword, line, column)) continue;
             flat = FlatReference(ref.ref, ref.kind, value, keyword.block, place.instance);
         }
         changed = changed || flat != value;

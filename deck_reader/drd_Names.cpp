@@ -440,3 +440,9 @@ bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword) {
     return equals == std::string_view::npos ||
            drd_FoldKey(parameter->value) == drd_FoldKey(ref.onlyWith.substr(equals + 1));
 }
+
+bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword, std::uint64_t line, int column) {
+    const auto first = static_cast<std::uint64_t>(ref.firstLine);
+    return line >= first && (ref.lineStep > 0 || line == first) && (ref.column < 0 || ref.column == column) &&
+           drd_Applies(ref, keyword);
+}

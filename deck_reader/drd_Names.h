@@ -145,6 +145,8 @@ private:
 
 /// Whether a column's rule holds for a keyword: it has the parameter that the rule asks for.
 bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword);
+/// Whether it does, and is about that field of that line, both from 0.
+bool drd_Applies(const drd_DataRef& ref, const drd_Keyword& keyword, std::uint64_t line, int column);
 /// Whether the row of a parameter is about the keyword.
 inline bool drd_Applies(const drd_ParameterRef& ref, const drd_Keyword& keyword) {
     // The amplitude of a step is a word for how its loads come.

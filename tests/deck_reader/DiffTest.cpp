@@ -241,6 +241,19 @@ TEST(DeckDiff, ADeckAndItsOtherForm_AreEqual) {
     EXPECT_EQ(DifferencesOf(kDeck, device.Text()), kNone);
 }
 
+TEST(DeckDiff, NamesThatLookLikeNumbers_StayInTheOtherForm) {
+    const std::string deck = "*Node\n1, 0., 0., 0.\n*Nset, nset=01\n1,\n*Nset, nset=1.50\n1,\n"
+                             "*Amplitude, name=007, value=01\n00, 1.50\n"
+                             "*Boundary, amplitude=007\n01, 02, 02, 0.250\n1.50, 3, 3\n";
+    const ReadDeckText read(deck);
+    qio_StringDevice device;
+    drd_Reformat(read.deck, device);
+    EXPECT_EQ(device.Text(), "*Node\n1, 0., 0., 0.\n*Nset, nset=01\n1,\n*Nset, nset=1.50\n1,\n"
+                             "*Amplitude, name=007, value=1\n0, 1.5\n"
+                             "*Boundary, amplitude=007\n01, 2, 2, 0.25\n1.50, 3, 3\n");
+    EXPECT_EQ(DifferencesOf(deck, device.Text()), kNone);
+}
+
 TEST(DeckDiff, ALongKeywordLineWithAParameterOfNoLetter_AndItsOtherForm_AreEqual) {
     const std::string deck = "*Tie, name=tie, adjust=no, position tolerance=0.01, no rotation, no thickness, "
                              "type=NODE TO SURFACE, cyclic symmetry, \xe9tendue=0.5, 2d\nA, B\n";
