@@ -46,8 +46,12 @@ const char* StatusName(mdl_PropagationStatusEnm status) {
     return omu_EnumTableOf(status).Row(static_cast<int>(status))->name;
 }
 
-constexpr const char* kFootnote =
-    "  (* written in the step, ! with op=NEW; of interactions and output requests only the status)\n";
+std::string WithFootnote(std::string tables) {
+    if (!tables.empty())
+        tables +=
+            "  (* written in the step, ! with op=NEW; of interactions and output requests only the status)\n";
+    return tables;
+}
 
 /// What lives across steps and reaches the deck has a history there.
 bool HasHistory(const odiK_Repository& repository) {
@@ -56,8 +60,9 @@ bool HasHistory(const odiK_Repository& repository) {
 
 /// The words of a status, a dash before an object begins, and the mark of a step that writes it.
 std::string CellText(const Cell& cell) {
-    std::string text =
-        cell.status == mdl_PropagationStatusEnm::NOT_YET_ACTIVE ? "-" : mdl_StatusWords(StatusName(cell.status));
+    std::string text = cell.status == mdl_PropagationStatusEnm::NOT_YET_ACTIVE
+                           ? "-"
+                           : mdl_StatusWords(StatusName(cell.status));
     if (cell.written) text += cell.opNew ? " !" : " *";
     return text;
 }
@@ -195,15 +200,11 @@ std::string ModelHistory::TextOf(const Kind& kind) const {
 std::string ModelHistory::Text() const {
     std::string text;
     for (const Kind& kind : kinds_) text += TextOf(kind);
-    return text.empty() ? text : text + kFootnote;
+    return WithFootnote(std::move(text));
 }
 
 std::map<std::string, std::string> ModelHistory::TextsByKind() const {
     std::map<std::string, std::string> texts;
-    for (const Kind& kind : kinds_) {
-        std::string text = TextOf(kind);
-        if (!text.empty()) text += kFootnote;
-        texts.emplace(kind.repository->member, std::move(text));
-    }
+    for (const Kind& kind : kinds_) texts.emplace(kind.repository->member, WithFootnote(TextOf(kind)));
     return texts;
 }
