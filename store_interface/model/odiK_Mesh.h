@@ -25,6 +25,7 @@ struct odiK_NodeData {
     cel_LabelIndex index;
 
     int NumNodes() const { return labels.Length(); }
+    std::size_t NumWithForeign() const { return static_cast<std::size_t>(NumNodes()) + foreign.size(); }
     /// The label of an own or a foreign node. An index beyond them raises.
     int Label(int index) const;
 };

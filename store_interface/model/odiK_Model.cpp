@@ -89,6 +89,7 @@ void odiK_Assembly::AppendConnectorOrientation(const ptoC_ConnectorOrientation& 
 }
 
 void odiK_Model::Share(const odiK_Model& other) {
+    origin_ = other.origin_;
     static_cast<odiK_ModelData&>(*this) = other;
     steps = other.steps;
     for (const odiK_Repository& repository : odiK_Repositories()) {

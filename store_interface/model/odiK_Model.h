@@ -139,9 +139,11 @@ public:
     odiK_Model& operator=(const odiK_Model&) = delete;
 
     const cow_String& Name() const { return name_; }
-    /// Makes this model, which is empty, a copy of a complete one: it shares parts, instances, meshes, sets
-    /// and records with it. Records may then change, repository by repository; the tree must not.
+    /// Makes this model, which is empty, a copy of a complete one: it shares parts, instances, meshes, sets,
+    /// steps and records with it. Records may then change, repository by repository; all else must not.
     void Share(const odiK_Model& other);
+    /// Whether it came from the other by Share(), or the other from it, or both from a third.
+    bool SharesWith(const odiK_Model& other) const { return origin_ == other.origin_; }
 
     // A repository has a row in odiK_Repositories.cpp too.
     kprC_StepContainer steps;
@@ -231,6 +233,7 @@ private:
                       const char* kind) const;
 
     cow_String name_;
+    std::shared_ptr<const char> origin_ = std::make_shared<const char>(); // of all that shares
     std::vector<odiK_Datum> datums_;
     std::unordered_map<std::string_view, int> datumIndex_; // ids; the names lie in the datums
     std::map<cow_String, cow_CountedHld<odiK_Part>> parts_;

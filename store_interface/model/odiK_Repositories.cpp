@@ -46,8 +46,29 @@ constexpr odiK_Repository kRepositories[] = {
                                      "adaptive mesh constraints", nullptr, "they are not written"),
 };
 
+constexpr std::size_t kNoRepository = std::size(kRepositories);
+static_assert(kNoRepository < odiK_Extent().size());
+
 } // namespace
 
 std::span<const odiK_Repository> odiK_Repositories() {
     return kRepositories;
+}
+
+odiK_Extent odiK_ReadOf(const mdl_ReadNotes& notes) {
+    odiK_Extent read;
+    read.set(kNoRepository);
+    for (std::size_t i = 0; i < kNoRepository; ++i) read.set(i, notes.HasRead(kRepositories[i].ItemTypeId()));
+    return read;
+}
+
+odiK_Extent odiK_Differences(const odiK_Model& a, const odiK_Model& b) {
+    odiK_Extent differences;
+    differences.set(kNoRepository, !a.SharesWith(b));
+    for (std::size_t i = 0; i < kNoRepository; ++i) {
+        const odiK_Repository& each = kRepositories[i];
+        // The steps are shared with all that is no repository.
+        if (!each.IsInOrder()) differences.set(i, !each.In(a).IsSharedWith(each.In(b)));
+    }
+    return differences;
 }

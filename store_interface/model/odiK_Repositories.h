@@ -3,6 +3,8 @@
 
 #include "store_interface/model/odiK_Model.h"
 
+#include <bitset>
+
 /// One of a model's repositories, for code that treats all of them alike.
 struct odiK_Repository {
     const char* member;   ///< in model files, and in odiK_Model
@@ -30,5 +32,13 @@ struct odiK_Repository {
 /// All repositories in the order in which model files hold them: what others refer to comes first, and the
 /// steps before what lives across them.
 std::span<const odiK_Repository> odiK_Repositories();
+
+/// Some of a model: repositories by their rows, and as one all that is none, such as parts, sets and steps.
+using odiK_Extent = std::bitset<32>;
+
+/// What was read meanwhile. What is no repository always counts.
+odiK_Extent odiK_ReadOf(const mdl_ReadNotes& notes);
+/// Where the objects of two models may differ, one of which has been made by sharing the other's.
+odiK_Extent odiK_Differences(const odiK_Model& a, const odiK_Model& b);
 
 #endif

@@ -2,14 +2,14 @@
 
 cow_List<cow_String> mdl_Repository::Keys() const {
     cow_List<cow_String> keys{cow_ListConstruct(Size())};
-    if (!records_.IsNull()) {
+    if (!Read().IsNull()) {
         for (const auto& [name, record] : records_.ConstGet()) keys.Append(name);
     }
     return keys;
 }
 
 const mdl_ObjCow<cls_Record>* mdl_Repository::ConstHolder(const cow_String& name) const {
-    if (records_.IsNull()) return nullptr;
+    if (Read().IsNull()) return nullptr;
     const auto place = records_.ConstGet().find(name);
     return place == records_.ConstGet().end() ? nullptr : &place->second;
 }

@@ -3,6 +3,7 @@
 
 #include "foundation/cow_Range.h"
 #include "store_interface/records/cls_FieldTable.h"
+#include "store_interface/records/mdl_ReadNotes.h"
 
 #include <map>
 
@@ -24,7 +25,7 @@ public:
     const char* ContainerName() const { return name_; }
     cow_List<cow_String> Keys() const;
     bool IsMember(const cow_String& name) const { return FindRecord(name) != nullptr; }
-    int Size() const { return records_.IsNull() ? 0 : static_cast<int>(records_.ConstGet().size()); }
+    int Size() const { return Read().IsNull() ? 0 : static_cast<int>(records_.ConstGet().size()); }
     bool IsEmpty() const { return Size() == 0; }
 
     /// The record, or null.
@@ -39,6 +40,10 @@ public:
     /// The records in key order, for loops that leave the repository as it is.
     mdl_RepositoryPlace<cls_Record> begin() const;
     mdl_RepositoryPlace<cls_Record> end() const;
+    /// Whether neither has been changed since one became a copy of the other.
+    bool IsSharedWith(const mdl_Repository& other) const {
+        return records_.Referent() == other.records_.Referent();
+    }
     /// The holder under the name, or null.
     const mdl_ObjCow<cls_Record>* ConstHolder(const cow_String& name) const;
     /// The holder under the name for writing; an empty one at its first use.
@@ -48,24 +53,32 @@ protected:
     mdl_Repository(const char* name, unsigned itemTypeId) : name_(name), itemTypeId_(itemTypeId) {}
 
     using Records = std::map<cow_String, mdl_ObjCow<cls_Record>>;
+    using RecordsHolder = cow_COW<Records, cow_Direct<Records>>;
     friend class mdl_RepositoryIT;
 
+    /// All reading goes through here.
+    const RecordsHolder& Read() const {
+        mdl_ReadNotes::Note(itemTypeId_);
+        return records_;
+    }
     Records::const_iterator Begin() const {
-        return records_.IsNull() ? Records::const_iterator() : records_.ConstGet().begin();
+        return Read().IsNull() ? Records::const_iterator() : records_.ConstGet().begin();
     }
     Records::const_iterator End() const {
-        return records_.IsNull() ? Records::const_iterator() : records_.ConstGet().end();
+        return Read().IsNull() ? Records::const_iterator() : records_.ConstGet().end();
     }
 
     const char* name_;
     unsigned itemTypeId_;
-    cow_COW<Records, cow_Direct<Records>> records_;
+
+private:
+    RecordsHolder records_;
 };
 
 /// Walks a repository in key order. Keeps the repository's records as they are, also when it changes.
 class mdl_RepositoryIT {
 public:
-    explicit mdl_RepositoryIT(const mdl_Repository& repository) : records_(repository.records_) { First(); }
+    explicit mdl_RepositoryIT(const mdl_Repository& repository) : records_(repository.Read()) { First(); }
     void First() {
         if (!records_.IsNull()) place_ = records_.ConstGet().begin();
     }
@@ -75,7 +88,7 @@ public:
     const cls_Record& CurrentRecord() const { return place_->second.ConstGet(); }
 
 private:
-    cow_COW<mdl_Repository::Records, cow_Direct<mdl_Repository::Records>> records_;
+    mdl_Repository::RecordsHolder records_;
     mdl_Repository::Records::const_iterator place_;
 };
 

@@ -133,6 +133,46 @@ TEST(NamedRecords, Iterator_KeepsTheRecordsOfItsBeginning) {
     EXPECT_TRUE(it.IsDone());
 }
 
+TEST(NamedRecords, EachWayToReadThem_IsNoted) {
+    Map map;
+    map.Insert("A", CaseWith(1.0F));
+    const auto isNoted = [&](const auto& read) {
+        const mdl_ReadNotes notes;
+        read();
+        return notes.HasRead(klcC_LoadCase::TypeId()) && !notes.HasRead(kprC_Step::TypeId());
+    };
+    EXPECT_TRUE(isNoted([&] { (void)map.Size(); }));
+    EXPECT_TRUE(isNoted([&] { (void)map.Keys(); }));
+    EXPECT_TRUE(isNoted([&] { (void)map.FindRecord("B"); }));
+    EXPECT_TRUE(isNoted([&] { (void)map.ConstGet("A"); }));
+    EXPECT_TRUE(isNoted([&] { (void)map.begin(); }));
+    EXPECT_TRUE(isNoted([&] { (void)map.end(); }));
+    EXPECT_TRUE(isNoted([&] { (void)MapIT(map).IsDone(); }));
+    EXPECT_TRUE(isNoted([&] { (void)Map().IsEmpty(); }));
+    EXPECT_FALSE(isNoted([&] { const Map copy = map; }));
+    EXPECT_FALSE(isNoted([&] { (void)map.IsSharedWith(map); }));
+}
+
+TEST(ReadNotes, WhatIsReadWithinOthers_CountsForBoth) {
+    const Map map;
+    const mdl_ReadNotes outer;
+    {
+        const mdl_ReadNotes inner;
+        EXPECT_FALSE(inner.HasRead(map.ItemTypeId()));
+        (void)map.Size();
+        EXPECT_TRUE(inner.HasRead(map.ItemTypeId()));
+        EXPECT_FALSE(outer.HasRead(map.ItemTypeId()));
+    }
+    EXPECT_TRUE(outer.HasRead(map.ItemTypeId()));
+    { const mdl_ReadNotes other; }
+    EXPECT_FALSE(outer.HasRead(kprC_Step::TypeId()));
+    {
+        const mdl_ReadNotes inner;
+        mdl_ReadNotes::NoteUntold();
+    }
+    EXPECT_TRUE(outer.HasRead(kprC_Step::TypeId())); // whatever it was
+}
+
 TEST(PropagatingContainer, DeepCopy_SharesNothing) {
     kprC_PropagatingContainer<kloC_Load> loads;
     Force force;
@@ -296,4 +336,30 @@ TEST(Repositories, Steps_StandInFrontOfWhatLivesAcrossThem) {
         stepsSeen = stepsSeen || row.IsInOrder();
         EXPECT_TRUE(stepsSeen || !row.IsPropagating()) << row.member;
     }
+}
+
+TEST(Repositories, Differences_AreThoseOfSharedModels) {
+    odiK_Model model("m");
+    model.Complete();
+    odiK_Model variant("m");
+    variant.Share(model);
+    EXPECT_TRUE(odiK_Differences(model, variant).none());
+    {
+        const mdl_ReadNotes notes;
+        EXPECT_EQ(odiK_ReadOf(notes).count(), 1u); // what is no repository
+        (void)variant.loads.Size();
+        EXPECT_EQ(odiK_ReadOf(notes).count(), 2u);
+    }
+    kmaC_Material material;
+    variant.materials.Insert("Steel", material);
+    const odiK_Extent differences = odiK_Differences(model, variant);
+    EXPECT_EQ(differences.count(), 1u);
+    const mdl_ReadNotes notes;
+    (void)variant.loads.Size();
+    EXPECT_TRUE((odiK_ReadOf(notes) & differences).none());
+    (void)variant.materials.Size();
+    EXPECT_TRUE((odiK_ReadOf(notes) & differences).any());
+    // Another model may be any other one.
+    const mdl_ReadNotes nothing;
+    EXPECT_TRUE((odiK_ReadOf(nothing) & odiK_Differences(model, odiK_Model("m"))).any());
 }
