@@ -151,8 +151,4 @@ private:
     const Making* making_ = nullptr;
 };
 
-/// Made from a component, it holds a copy of it.
-using qkw_ComponentHandle = cow_ArrayCOW<qkw_BuilderComponent, cow_Virtual<qkw_BuilderComponent>>;
-using qkw_ComponentList = cow_List<qkw_ComponentHandle>;
-
 #endif

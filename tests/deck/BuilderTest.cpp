@@ -1,16 +1,11 @@
 #include "base/oif_Comment.h"
 #include "deck/QRXZptInputFileWriter.h"
 #include "deck/oif_Builder.h"
-#include "deck/oif_MeshTexts.h"
 #include "deck/oif_Writer.h"
-#include "store_interface/records/part_attributes/ptoC_PartAttribute.h"
-#include "store_interface/records/sections/kseC_PointSection.h"
 #include "store_interface/records/steps/kprC_ModalSteps.h"
 #include "store_interface/records/steps/kprC_StaticSteps.h"
 #include "support/DeckTest.h"
 #include "support/TestFolder.h"
-
-#include <map>
 
 namespace {
 
@@ -53,54 +48,7 @@ std::string WrittenDeck(TestStore& store) {
     return text;
 }
 
-/// Keeps the text of each block, and hands it back.
-class KeptTexts final : public oif_MeshTexts {
-public:
-    void Write(const char* text, std::size_t bytes) override { deck.append(text, bytes); }
-    Text Find(const odiK_Mesh&, oif_MeshBlockEnm block) override { return texts[block]; }
-    void Keep(const odiK_Mesh&, oif_MeshBlockEnm block, const Text& text) override {
-        texts[block] = text;
-        ++kept;
-    }
-    void WriteKept(const Text& text) override { deck += *text; }
-
-    std::string deck;
-    std::map<oif_MeshBlockEnm, Text> texts;
-    int kept = 0;
-};
-
 } // namespace
-
-TEST(MeshTexts, NodesElementsAndSetsAreKept_WhatElseAnInstanceHasIsNot) {
-    TestStore store;
-    odiK_Part& part = store.AddPart("P", {1});
-    part.mesh->AddElements("MASS", {1}, 1, {1});
-    part.mesh->AddElementSet("A", {1});
-    ptoC_SectionAssignment assignment;
-    assignment.sectionName = "Heavy";
-    part.attributes.sectionAssignments.push_back({"A", mdl_ObjCow<ptoC_PartAttribute>(assignment)});
-    store.model.AddInstance("I", "P");
-    kseC_PointSection section;
-    section.mass = 5.0;
-    store.model.sections.Insert("Heavy", section);
-
-    KeptTexts device;
-    oif_Writer(store.odb).WriteInput(device);
-    EXPECT_EQ(device.kept, 3);
-    EXPECT_EQ(*device.texts[oif_MeshBlockEnm::NODES],
-              "*Node\n      1,           1.,           0.,           0.");
-    EXPECT_EQ(*device.texts[oif_MeshBlockEnm::ELEMENTS], "*Element, type=MASS\n1, 1");
-    EXPECT_EQ(*device.texts[oif_MeshBlockEnm::SETS], "*Elset, elset=A\n1, ");
-    EXPECT_EQ(device.deck, WrittenDeck(store));
-
-    section.mass = 6.0;
-    store.model.sections.Insert("Heavy", section);
-    device.deck.clear();
-    oif_Writer(store.odb).WriteInput(device);
-    EXPECT_EQ(device.kept, 3);
-    EXPECT_NE(device.deck.find("*Mass, elset=A\n6., \n"), std::string::npos);
-    EXPECT_EQ(device.deck, WrittenDeck(store));
-}
 
 TEST(BuilderComponent, Keywords_AreFiledBySection) {
     TestStore store;

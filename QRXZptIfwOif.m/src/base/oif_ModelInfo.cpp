@@ -27,6 +27,7 @@ int oif_ModelInfo::Numbering::Offset(const cow_String& instance) const {
 }
 
 int oif_ModelInfo::Numbering::GetNew(const cow_String& instance, bool commit, bool v6Format) {
+    mdl_ReadNotes::NoteUntold(); // which labels are free depends on who asked before
     if (!v6Format) {
         const int label = total + 1 + extra;
         if (commit) ++extra;
@@ -39,6 +40,7 @@ int oif_ModelInfo::Numbering::GetNew(const cow_String& instance, bool commit, bo
 }
 
 int oif_ModelInfo::Numbering::Increment(const cow_String& instance, int count, bool v6Format) {
+    mdl_ReadNotes::NoteUntold();
     if (!v6Format) {
         extra += count;
         return total + extra;

@@ -4,12 +4,19 @@
 #include "mesh/oif_Element.h"
 #include "mesh/oif_Node.h"
 
+#include <algorithm>
+
 oif_Builder::oif_Builder(oif_ModelInfo& modelInfo, int threads)
     : jobKeywords_(modelInfo), instance_(modelInfo), amplitude_(modelInfo), material_(modelInfo),
       transform_(modelInfo), boundaryCondition_(modelInfo), step_(modelInfo), load_(modelInfo),
       field_(modelInfo), interaction_(modelInfo), constraint_(modelInfo), outputRequest_(modelInfo),
       part_(modelInfo), partAttributes_(modelInfo), region_(modelInfo), final_(modelInfo),
-      v6Format_(modelInfo.V6Format()), threads_(threads), model_(&modelInfo.Model()) {}
+      v6Format_(modelInfo.V6Format()), threads_(threads),
+      model_(&modelInfo.Model()), components_{
+                                      &jobKeywords_, &part_,           &instance_,          &step_,
+                                      &region_,      &partAttributes_, &amplitude_,         &material_,
+                                      &transform_,   &constraint_,     &boundaryCondition_, &load_,
+                                      &field_,       &interaction_,    &outputRequest_,     &final_} {}
 
 bool oif_Builder::WriteInputFile(const cow_String& fileName) {
     qio_CurrentSystem().remove(fileName.CStr());
@@ -26,15 +33,16 @@ void oif_Builder::WriteInput(qio_ostream& device) {
     // Where the long texts are kept, a large buffer is more work to make than it saves.
     constexpr std::size_t small = std::size_t{16} * 1024;
     utl_Stream stream(device, LineLimit, Precision, Precision, texts_ == nullptr ? 0 : small);
-    stream.SetThreads(threads_);
+    // What another thread reads is not noted.
+    stream.SetThreads(keeping_ == nullptr ? threads_ : 1);
     BuildComponents();
-    qkw_ComponentList components = WriteList();
-    WriteInput(stream, jobKeywords_.ModelDefinition());
-    WritePartDefinitions(stream, components);
-    WritePartInstanceDefinitions(stream, components);
-    WriteAssemblyDefinitions(stream, components);
-    WriteOtherModelDefinitions(stream, components);
-    WriteStepDefinitions(stream, components);
+    WriteSlot(stream, 0, [&] { WriteInput(stream, jobKeywords_.ModelDefinition()); });
+    WritePartDefinitions(stream);
+    WritePartInstanceDefinitions(stream);
+    WriteAssemblyDefinitions(stream);
+    WriteOtherModelDefinitions(stream);
+    WriteStepDefinitions(stream);
+    WriteLeftSlots(stream);
     stream.Flush();
 }
 
@@ -47,36 +55,61 @@ qkw_FilingLog oif_Builder::BuildLogged() {
     return log;
 }
 
+void oif_Builder::GoBy(const oif_KeptDeck& kept, const odiK_Model& model) {
+    static_assert(oif_KeptDeck::kSpeakers == kComponents + 1);
+    kept_ = &kept;
+    isLeft_ = kept.SpeakersLike(model);
+}
+
 // Later components use what earlier ones stored in the model info: labels first, regions behind instances and
 // steps, section assignment behind regions.
 void oif_Builder::BuildComponents() {
-    jobKeywords_.Build();
-    part_.Build();
-    material_.Build();
-    instance_.Build();
-    step_.Build();
-    region_.Build();
-    partAttributes_.Build();
-    amplitude_.Build();
-    transform_.Build();
-    constraint_.Build();
-    boundaryCondition_.Build();
-    load_.Build();
-    field_.Build();
-    interaction_.Build();
-    outputRequest_.Build();
-    final_.Build();
+    qkw_BuilderComponent* const order[kComponents] = {
+        &jobKeywords_,   &part_,      &material_,   &instance_,          &step_, &region_, &partAttributes_,
+        &amplitude_,     &transform_, &constraint_, &boundaryCondition_, &load_, &field_,  &interaction_,
+        &outputRequest_, &final_};
+    for (qkw_BuilderComponent* component : order) {
+        const auto place =
+            static_cast<std::size_t>(std::ranges::find(components_, component) - components_.begin());
+        if (isLeft_[place]) continue;
+        if (keeping_ == nullptr) {
+            component->Build();
+        } else {
+            keeping_->Watch(place, [&] { component->Build(); });
+        }
+    }
 }
 
-// The order of the text within one section; not the order of building.
-qkw_ComponentList oif_Builder::WriteList() const {
-    qkw_ComponentList components;
-    const qkw_BuilderComponent* const order[] = {
-        &part_,      &instance_, &step_,        &region_,        &partAttributes_,
-        &amplitude_, &material_, &transform_,   &constraint_,    &boundaryCondition_,
-        &load_,      &field_,    &interaction_, &outputRequest_, &final_};
-    for (const qkw_BuilderComponent* component : order) components.Append(*component);
-    return components;
+template <class Writing>
+void oif_Builder::WriteSlot(utl_Stream& stream, std::size_t speaker, const Writing& write) {
+    if (keeping_ != nullptr) {
+        keeping_->Watch(speaker, [&] {
+            write();
+            stream.Flush();
+        });
+        return keeping_->EndSlot();
+    }
+    if (kept_ == nullptr) return write();
+    if (!isLeft_[speaker]) {
+        WriteLeftSlots(stream);
+        write();
+        firstLeft_ = slot_ + 1;
+    }
+    ++slot_;
+}
+
+void oif_Builder::WriteLeftSlots(utl_Stream& stream) {
+    if (kept_ == nullptr || firstLeft_ == slot_) return;
+    stream.Flush();
+    kept_->Write(firstLeft_, slot_, *texts_);
+    firstLeft_ = slot_;
+}
+
+template <class KeywordsOf>
+void oif_Builder::WriteSection(utl_Stream& stream, const KeywordsOf& keywordsOf) {
+    // The job's own keywords stand at the head of the deck alone.
+    for (std::size_t i = 1; i < kComponents; ++i)
+        WriteSlot(stream, i, [&] { WriteInput(stream, keywordsOf(*components_[i])); });
 }
 
 void oif_Builder::WriteHeading(utl_Stream& stream, const cow_String& text) const {
@@ -132,54 +165,52 @@ void oif_Builder::WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshB
     stream.LineBreak();
 }
 
-void oif_Builder::WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
-    if (v6Format_) WriteHeading(stream, "PARTS");
+void oif_Builder::WritePartDefinitions(utl_Stream& stream) {
+    if (v6Format_) WriteSlot(stream, kDriver, [&] { WriteHeading(stream, "PARTS"); });
     for (const auto& [name, part] : model_->Parts()) {
-        for (int i = 0; i < components.Length(); ++i) {
-            WriteInput(stream, components.Get(i).Get().PartDefinition(name));
-        }
+        WriteSection(stream, [&key = name](qkw_BuilderComponent& each) { return each.PartDefinition(key); });
     }
 }
 
-void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+void oif_Builder::WritePartInstanceDefinitions(utl_Stream& stream) {
     if (v6Format_) {
-        WriteHeading(stream, "ASSEMBLY");
-        // The assembly's name goes out as it stands, without quotes.
-        stream << "*Assembly, name=" << model_->Model().rootAssembly().name() << endl;
+        WriteSlot(stream, kDriver, [&] {
+            WriteHeading(stream, "ASSEMBLY");
+            // The assembly's name goes out as it stands, without quotes.
+            stream << "*Assembly, name=" << model_->Model().rootAssembly().name() << endl;
+        });
     }
     for (const auto& [name, instance] : model_->Instances()) {
-        for (int i = 0; i < components.Length(); ++i) {
-            qkw_BuilderComponent& component = components.Get(i).Get();
-            WriteOfInstance(stream, component, instance, component.InstanceDefinition(name));
+        for (std::size_t i = 1; i < kComponents; ++i) {
+            WriteSlot(stream, i, [&, &key = name, &of = instance] {
+                WriteOfInstance(stream, *components_[i], of, components_[i]->InstanceDefinition(key));
+            });
         }
     }
 }
 
-void oif_Builder::WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
-    for (int i = 0; i < components.Length(); ++i)
-        WriteInput(stream, components.Get(i).Get().AssemblyDefinition());
+void oif_Builder::WriteAssemblyDefinitions(utl_Stream& stream) {
+    WriteSection(stream, [](qkw_BuilderComponent& each) { return each.AssemblyDefinition(); });
 }
 
-void oif_Builder::WriteOtherModelDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
-    for (int i = 0; i < components.Length(); ++i)
-        WriteInput(stream, components.Get(i).Get().ModelDefinition());
+void oif_Builder::WriteOtherModelDefinitions(utl_Stream& stream) {
+    WriteSection(stream, [](qkw_BuilderComponent& each) { return each.ModelDefinition(); });
 }
 
-void oif_Builder::WriteStepDefinitions(utl_Stream& stream, qkw_ComponentList& components) const {
+void oif_Builder::WriteStepDefinitions(utl_Stream& stream) {
     for (const auto& [stepName, anyStep] : model_->Steps()) {
         const nex_Context context("step", stepName);
-        for (int i = 0; i < components.Length(); ++i) {
-            WriteInput(stream, components.Get(i).Get().StepDefinition(stepName));
-        }
+        const auto write = [&, &step = stepName](const cow_String& secondKey) {
+            WriteSection(stream,
+                         [&](qkw_BuilderComponent& each) { return each.StepDefinition(step, secondKey); });
+        };
+        write({});
         // The initial step has no load cases.
         if (stepName == model_->InitialStepName()) continue;
         const auto& step = nex_canDynamicCastRef<kprC_AnalysisStep>(anyStep, NEX_HERE);
         for (const auto& [loadCaseName, loadCase] : step.loadCases) {
             // The list of the empty key is the body.
-            if (loadCaseName.IsEmpty()) continue;
-            for (int i = 0; i < components.Length(); ++i) {
-                WriteInput(stream, components.Get(i).Get().StepDefinition(stepName, loadCaseName));
-            }
+            if (!loadCaseName.IsEmpty()) write(loadCaseName);
         }
     }
 }

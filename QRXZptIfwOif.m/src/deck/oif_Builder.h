@@ -10,7 +10,7 @@
 #include "constraints/oif_ConstraintBuilder.h"
 #include "deck/oif_FinalBuilder.h"
 #include "deck/oif_JobKeywordsBuilder.h"
-#include "deck/oif_MeshTexts.h"
+#include "deck/oif_KeptDeck.h"
 #include "interactions/oif_InteractionBuilder.h"
 #include "materials/oif_MaterialBuilder.h"
 #include "mesh/oif_RegionBuilder.h"
@@ -35,6 +35,10 @@ public:
     void WriteInput(qio_ostream& device);
     /// From now on texts of meshes come from the device that the deck is written to, where it keeps them.
     void KeepTexts(oif_MeshTexts& texts) { texts_ = &texts; }
+    /// Goes by a kept deck for this model, whose deck must be written to a device that keeps texts.
+    void GoBy(const oif_KeptDeck& kept, const odiK_Model& model);
+    /// Keeps the deck, which must be written to a device that keeps texts.
+    void KeepDeck(oif_KeptDeck& kept) { keeping_ = &kept; }
     /// Builds as for a deck, writes nothing, and gives the keywords of single objects. One of the three may
     /// be called, and once.
     qkw_FilingLog BuildLogged();
@@ -45,7 +49,15 @@ public:
 
 private:
     void BuildComponents();
-    qkw_ComponentList WriteList() const;
+    /// Lets a component write what it says in a section, or the driver (kDriver) lines of its own; leaves it
+    /// to the kept deck where that has the same.
+    template <class Writing>
+    void WriteSlot(utl_Stream& stream, std::size_t speaker, const Writing& write);
+    /// Has each component write what `keywordsOf` gives of it.
+    template <class KeywordsOf>
+    void WriteSection(utl_Stream& stream, const KeywordsOf& keywordsOf);
+    /// Writes the slots that were left to the kept deck.
+    void WriteLeftSlots(utl_Stream& stream);
     void WriteHeading(utl_Stream& stream, const cow_String& text) const;
     void WriteInput(utl_Stream& stream, const qkw_KeywordList& keywords) const;
     void WriteOfInstance(utl_Stream& stream, const qkw_BuilderComponent& component,
@@ -54,11 +66,14 @@ private:
     template <class Writing>
     void WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
                    const Writing& write) const;
-    void WritePartDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
-    void WritePartInstanceDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
-    void WriteAssemblyDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
-    void WriteOtherModelDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
-    void WriteStepDefinitions(utl_Stream& stream, qkw_ComponentList& components) const;
+    void WritePartDefinitions(utl_Stream& stream);
+    void WritePartInstanceDefinitions(utl_Stream& stream);
+    void WriteAssemblyDefinitions(utl_Stream& stream);
+    void WriteOtherModelDefinitions(utl_Stream& stream);
+    void WriteStepDefinitions(utl_Stream& stream);
+
+    static constexpr std::size_t kComponents = 16;
+    static constexpr std::size_t kDriver = kComponents;
 
     oif_JobKeywordsBuilder jobKeywords_;
     oif_InstanceBuilder instance_;
@@ -80,6 +95,14 @@ private:
     int threads_;
     const oif_Model* model_;
     oif_MeshTexts* texts_ = nullptr;
+
+    /// In the order of their text within a section; the order of building is another.
+    std::array<qkw_BuilderComponent*, kComponents> components_;
+    oif_KeptDeck* keeping_ = nullptr;
+    const oif_KeptDeck* kept_ = nullptr;
+    std::array<bool, kComponents + 1> isLeft_{}; ///< to the kept deck
+    std::size_t slot_ = 0;
+    std::size_t firstLeft_ = 0;
 };
 
 #endif

@@ -1,7 +1,7 @@
 #include "deck/oif_Writer.h"
 
 #include "deck/oif_Builder.h"
-#include "deck/oif_MeshTexts.h"
+#include "deck/oif_KeptDeck.h"
 #include "store_interface/model/odb_Odb.h"
 
 void oif_Writer::WriteInputFile(const char* jobName) {
@@ -22,4 +22,23 @@ void oif_Writer::WriteInput(oif_MeshTexts& device) {
     oif_Builder builder(modelInfo);
     builder.KeepTexts(device);
     builder.WriteInput(device);
+}
+
+void oif_Writer::WriteInput(oif_MeshTexts& device, const oif_KeptDeck& kept) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_.DeckModelName()));
+    oif_Builder builder(modelInfo);
+    builder.KeepTexts(device);
+    builder.GoBy(kept, *odb_.DeckModel());
+    builder.WriteInput(device);
+}
+
+std::unique_ptr<const oif_KeptDeck> oif_Writer::Keep(oif_MeshTexts& device) {
+    oif_ModelInfo modelInfo(odb_.ddb().model(odb_.DeckModelName()));
+    auto kept = std::make_unique<oif_KeptDeck>(*odb_.DeckModel());
+    oif_KeptDeck::Recorder recorder(*kept, device);
+    oif_Builder builder(modelInfo);
+    builder.KeepTexts(recorder);
+    builder.KeepDeck(*kept);
+    builder.WriteInput(recorder);
+    return kept;
 }

@@ -1,6 +1,9 @@
 #ifndef QRX_OIF_WRITER_H
 #define QRX_OIF_WRITER_H
 
+#include <memory>
+
+class oif_KeptDeck;
 class oif_MeshTexts;
 class odb_Odb;
 class qio_ostream;
@@ -23,6 +26,10 @@ public:
     void WriteInput(qio_ostream& device);
     /// The same, where texts of meshes that the device keeps are not made again.
     void WriteInput(oif_MeshTexts& device);
+    /// The same, and keeps the deck for those of models that share with this one.
+    std::unique_ptr<const oif_KeptDeck> Keep(oif_MeshTexts& device);
+    /// As without a kept deck, of which nothing is made again that can't differ.
+    void WriteInput(oif_MeshTexts& device, const oif_KeptDeck& kept);
 
 private:
     const odb_Odb& odb_;
