@@ -15,6 +15,7 @@ constexpr std::size_t kFewMeshes = 2;
 constexpr std::size_t kMostMeshBytes = std::size_t{256} << 20;
 constexpr std::size_t kMostSummed = 8;
 constexpr std::size_t kBytesOfMark = std::size_t{2} * 1024;
+constexpr std::size_t kLeastOfMark = 64;
 
 } // namespace
 
@@ -96,38 +97,42 @@ sty_DeckText::Summed& sty_DeckText::SummedLike() {
     return summed_.front();
 }
 
-/// The last mark up to which the decks are the same; those behind it are dropped.
-sty_DeckText::Summed::Mark sty_DeckText::CommonBeginning(Summed& former) const {
-    std::size_t pieces = 0;
-    std::size_t own = 0;
-    for (;; ++pieces) {
-        const bool atEnd = pieces >= pieces_.size() || pieces >= former.pieces.size();
-        const std::size_t end = pieces < pieces_.size() ? pieces_[pieces].ownEnd : own_.size();
+/// Where the decks begin to differ, or one of them ends.
+sty_DeckText::Place sty_DeckText::CommonEnd(const Summed& former) const {
+    Place place = {0, 0};
+    for (;; ++place.pieces) {
+        const bool atEnd = place.pieces >= pieces_.size() || place.pieces >= former.pieces.size();
+        const std::size_t end = place.pieces < pieces_.size() ? pieces_[place.pieces].ownEnd : own_.size();
         const std::size_t formerEnd =
-            pieces < former.pieces.size() ? former.pieces[pieces].ownEnd : former.own.size();
+            place.pieces < former.pieces.size() ? former.pieces[place.pieces].ownEnd : former.own.size();
         const std::size_t least = std::min(end, formerEnd);
-        const auto begin = own_.begin() + static_cast<std::ptrdiff_t>(own);
+        const auto begin = own_.begin() + static_cast<std::ptrdiff_t>(place.own);
         const auto differ = std::mismatch(begin, own_.begin() + static_cast<std::ptrdiff_t>(least),
-                                          former.own.begin() + static_cast<std::ptrdiff_t>(own));
-        own = static_cast<std::size_t>(differ.first - own_.begin());
-        if (atEnd || end != formerEnd || own < least || pieces_[pieces].kept != former.pieces[pieces].kept)
-            break;
+                                          former.own.begin() + static_cast<std::ptrdiff_t>(place.own));
+        place.own = static_cast<std::size_t>(differ.first - own_.begin());
+        if (atEnd || end != formerEnd || place.own < least ||
+            pieces_[place.pieces].kept != former.pieces[place.pieces].kept)
+            return place;
     }
-    while (former.marks.back().pieces > pieces || former.marks.back().own > own) former.marks.pop_back();
-    return former.marks.back();
 }
 
 std::string sty_DeckText::Sha256() {
     Summed& summed = SummedLike();
-    Summed::Mark at = CommonBeginning(summed);
+    const Place common = CommonEnd(summed);
+    while (summed.marks.back().pieces > common.pieces || summed.marks.back().own > common.own)
+        summed.marks.pop_back();
+    Summed::Mark at = summed.marks.back();
     for (;; ++at.pieces) {
         const bool last = at.pieces == pieces_.size();
         const std::size_t end = last ? own_.size() : pieces_[at.pieces].ownEnd;
         while (at.own < end) {
-            const std::size_t step = std::min(end - at.own, kBytesOfMark);
+            std::size_t step = std::min(end - at.own, kBytesOfMark);
+            // The next deck is likely to differ at the same place.
+            const bool reaches = at.pieces == common.pieces && at.own + kLeastOfMark <= common.own;
+            if (reaches) step = std::min(step, common.own - at.own);
             at.sum.Add(std::string_view(own_).substr(at.own, step));
             at.own += step;
-            if (step == kBytesOfMark) summed.marks.push_back(at);
+            if (step == kBytesOfMark || reaches) summed.marks.push_back(at);
         }
         if (last) break;
         at.sum.Add(*pieces_[at.pieces].kept);

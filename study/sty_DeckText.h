@@ -69,8 +69,13 @@ private:
         std::vector<Mark> marks;
     };
 
+    /// A place in a deck.
+    struct Place {
+        std::size_t pieces;
+        std::size_t own;
+    };
     Summed& SummedLike();
-    Summed::Mark CommonBeginning(Summed& former) const;
+    Place CommonEnd(const Summed& former) const;
 
     sty_MeshTexts& meshes_;
     const odb_Odb* store_ = nullptr;
