@@ -4,6 +4,9 @@
 #include "foundation/cow_String.h"
 #include "store_interface/findings/fnd_Finding.h"
 
+#include <memory>
+
+class dck_Kept;
 class odb_Odb;
 class odiK_Mesh;
 struct mq_Quality;
@@ -21,6 +24,11 @@ std::vector<fnd_Finding> dck_Check(const odb_Odb& store);
 void dck_CheckStore(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
 /// The part that only the deck writer's rules tell. To be asked of a model without errors.
 void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, fnd_Sink& sink);
+/// The same, where something is kept of a model that this one shares with (odiK_Model::Share): only those
+/// checks are made that read something in which they differ.
+void dck_CheckDeck(const odb_Odb& store, const cow_String& modelName, const dck_Kept& kept, fnd_Sink& sink);
+/// What is to be kept of a model for that. Raises what checking raises.
+std::unique_ptr<const dck_Kept> dck_KeepChecks(const odb_Odb& store, const cow_String& modelName);
 /// Writes the deck to nowhere: says what is raised, unless it stands among the `told`
 /// ones, and how large a huge deck will be.
 /// `progress`: counts the deck's bytes meanwhile.

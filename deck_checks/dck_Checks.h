@@ -4,6 +4,7 @@
 #include "foundation/cow_String.h"
 #include "store_interface/findings/fnd_Finding.h"
 
+class dck_Subject;
 class odiK_Model;
 class oif_ModelInfo;
 
@@ -18,7 +19,7 @@ struct dck_IdleOption {
 std::vector<dck_IdleOption> dck_IdleGasketOptions(const odiK_Model& model);
 
 // What can be foreseen of a complete model, family by family: what its deck can't say, what raises, what no
-// step writes. Places are below the model.
+// step writes. Places are below the model. A check that takes a subject keeps what takes long to work out.
 
 /// Element types that don't exist, node counts and faces that don't fit a type, names of sets with a dot.
 void dck_CheckElements(const odiK_Model& model, fnd_Sink& sink);
@@ -38,14 +39,18 @@ void dck_CheckRequests(const odiK_Model& model, fnd_Sink& sink);
 
 /// What procedures need of materials and elements; steps of both solvers in one job.
 void dck_CheckProcedures(const odiK_Model& model, fnd_Sink& sink);
-/// What contradicts itself: values of one degree of freedom, loads on held ones, ties and contact pairs whose
-/// two sides are one.
-void dck_CheckConflicts(const odiK_Model& model, fnd_Sink& sink);
+/// Conditions and loads that contradict each other: several values of one degree of freedom, loads on held
+/// ones.
+void dck_CheckMeetings(const dck_Subject& subject, fnd_Sink& sink);
+/// Ties whose sides have nodes in common.
+void dck_CheckTies(const odiK_Model& model, fnd_Sink& sink);
+/// Contact pairs whose two sides are one.
+void dck_CheckContactPairs(const odiK_Model& model, fnd_Sink& sink);
 /// States that say nothing: in steps out of reach, without components, with intervals that don't count, with
 /// amplitudes that end too early.
-void dck_CheckStates(const odiK_Model& model, fnd_Sink& sink);
+void dck_CheckStates(const dck_Subject& subject, fnd_Sink& sink);
 /// What the model holds and no line of the deck carries: fields that decks don't know, nodes of the assembly,
 /// objects that nothing refers to.
-void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink);
+void dck_CheckLoss(const dck_Subject& subject, fnd_Sink& sink);
 
 #endif

@@ -1,4 +1,5 @@
 #include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Kept.h"
 #include "deck_checks/dck_Nodes.h"
 #include "deck_checks/dck_Text.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
@@ -85,27 +86,54 @@ int DatumOf(const kloC_Load& load) {
     return static_cast<const kloC_Moment&>(load).datum.Id();
 }
 
+/// An actor's place among all, at one of its nodes.
+using Entry = std::pair<dck_Nodes::Key, int>;
+
+/// The conditions on displacements, and the nodes that they act on.
+struct Held {
+    static constexpr int kSeveral = -1;
+
+    std::vector<Actor> conditions;
+    dck_Nodes nodes;
+    dck_Nodes::Numbers by; // of each node the condition, counted from 1, or kSeveral
+    std::vector<Entry> several;
+
+    explicit Held(const odiK_Model& model) : nodes(model), by(nodes) {
+        for (const auto& [name, bc] : model.boundaryConditions) {
+            const bool isMotion =
+                bc.DynTypeId() == kbcC_DisplacementBC::TypeId() || bc.DynTypeId() == kbcC_TypeBC::TypeId();
+            if (bc.suppressed || !isMotion) continue;
+            const int index = static_cast<int>(conditions.size());
+            conditions.push_back({name, &bc, nullptr, bc.datum.Id()});
+            for (const dck_Nodes::Key node : nodes.Of(bc.region)) {
+                int& number = by.At(node);
+                if (number > 0) several.emplace_back(node, number - 1);
+                if (number != 0) several.emplace_back(node, index);
+                number = number == 0 ? index + 1 : kSeveral;
+            }
+        }
+    }
+};
+
 /// Conditions and loads that meet at a node. Each is compared with the first few at its node, so that the
 /// work grows with the nodes of the regions alone.
 class Meetings {
 public:
-    Meetings(const odiK_Model& model, const dck_Nodes& nodes, fnd_Sink& sink)
-        : model_(model), nodes_(nodes), sink_(sink) {}
-
-    void Run() {
-        for (const auto& [name, bc] : model_.boundaryConditions) {
-            const bool isMotion =
-                bc.DynTypeId() == kbcC_DisplacementBC::TypeId() || bc.DynTypeId() == kbcC_TypeBC::TypeId();
-            if (!bc.suppressed && isMotion) Add({name, &bc, nullptr, bc.datum.Id()}, bc.region);
-        }
+    Meetings(const dck_Subject& subject, fnd_Sink& sink)
+        : model_(subject.Model()), sink_(sink),
+          held_(subject.Of("held nodes", [&] { return Held(subject.Model()); })), actors_(held_->conditions),
+          entries_(held_->several) {
         for (const auto& [name, load] : model_.loads) {
             const bool isOnNodes = load.DynTypeId() == kloC_ConcentratedForce::TypeId() ||
                                    load.DynTypeId() == kloC_Moment::TypeId();
-            if (!load.suppressed && isOnNodes) Add({name, nullptr, &load, DatumOf(load)}, load.region);
+            if (!load.suppressed && isOnNodes) AddLoad({name, nullptr, &load, DatumOf(load)});
         }
-        // Conditions stand ahead of loads at each node. The nodes of each are sorted already, which merging
-        // makes use of.
-        std::ranges::stable_sort(entries_, {}, &std::pair<dck_Nodes::Key, int>::first);
+    }
+
+    void Run() {
+        // Conditions stand ahead of loads at each node.
+        std::ranges::sort(entries_);
+        entries_.erase(std::unique(entries_.begin(), entries_.end()), entries_.end());
         std::size_t first = 0;
         for (std::size_t i = 0; i < entries_.size(); ++i) {
             if (entries_[i].first != entries_[first].first) first = i;
@@ -118,10 +146,16 @@ public:
 private:
     static constexpr std::size_t kCompared = 8;
 
-    void Add(Actor actor, const rgnC_Region& region) {
+    /// At the nodes that a condition acts on; loads alone don't contradict each other.
+    void AddLoad(Actor actor) {
         const int index = static_cast<int>(actors_.size());
+        for (const dck_Nodes::Key node : held_->nodes.Of(actor.load->region)) {
+            const int holder = held_->by.At(node);
+            if (holder == 0) continue;
+            if (holder > 0) entries_.emplace_back(node, holder - 1);
+            entries_.emplace_back(node, index);
+        }
         actors_.push_back(std::move(actor));
-        for (const dck_Nodes::Key node : nodes_.Of(region)) entries_.emplace_back(node, index);
     }
 
     void Meet(int first, int second, dck_Nodes::Key node) {
@@ -147,7 +181,7 @@ private:
         for (std::size_t i = 0; i < ours.size(); ++i) {
             if (!ours[i] || !theirs[i]) continue;
             const std::string dof =
-                "degree of freedom " + std::to_string(i + 1) + " of node " + nodes_.NameOf(node);
+                "degree of freedom " + std::to_string(i + 1) + " of node " + held_->nodes.NameOf(node);
             if (b.bc == nullptr) {
                 sink_.Add("fixed-and-loaded", b.Where(),
                           "in step " + Quoted(step) + " the load acts on " + dof + ", which the condition " +
@@ -164,27 +198,12 @@ private:
     }
 
     const odiK_Model& model_;
-    const dck_Nodes& nodes_;
     fnd_Sink& sink_;
-    std::vector<Actor> actors_;
-    std::vector<std::pair<dck_Nodes::Key, int>> entries_;
+    std::shared_ptr<const Held> held_;
+    std::vector<Actor> actors_; // the conditions first
+    std::vector<Entry> entries_;
     std::set<std::pair<int, int>> met_;
 };
-
-void FindOnTies(const odiK_Model& model, const dck_Nodes& nodes, fnd_Sink& sink) {
-    for (const auto& [name, constraint] : model.constraints) {
-        const auto* tie = nex_canDynamicCastPtr<kcoC_Tie>(&constraint);
-        if (tie == nullptr) continue;
-        const std::vector<dck_Nodes::Key> master = nodes.Of(tie->master);
-        const std::vector<dck_Nodes::Key> slave = nodes.Of(tie->slave);
-        std::vector<dck_Nodes::Key> both;
-        std::ranges::set_intersection(master, slave, std::back_inserter(both));
-        if (both.empty()) continue;
-        sink.Add("tie-shares-nodes", Place("constraints", name),
-                 "found " + fnd_Counted(static_cast<long long>(both.size()), "node") +
-                     " on both sides, the first " + nodes.NameOf(both.front()));
-    }
-}
 
 /// The same members, under whatever names.
 bool AreEqual(const rgnC_Region& a, const rgnC_Region& b) {
@@ -207,7 +226,29 @@ bool AreEqual(const rgnC_Region& a, const rgnC_Region& b) {
     return true;
 }
 
-void FindOnPairs(const odiK_Model& model, fnd_Sink& sink) {
+} // namespace
+
+void dck_CheckMeetings(const dck_Subject& subject, fnd_Sink& sink) {
+    Meetings(subject, sink).Run();
+}
+
+void dck_CheckTies(const odiK_Model& model, fnd_Sink& sink) {
+    const dck_Nodes nodes(model);
+    for (const auto& [name, constraint] : model.constraints) {
+        const auto* tie = nex_canDynamicCastPtr<kcoC_Tie>(&constraint);
+        if (tie == nullptr) continue;
+        const std::vector<dck_Nodes::Key> master = nodes.Of(tie->master);
+        const std::vector<dck_Nodes::Key> slave = nodes.Of(tie->slave);
+        std::vector<dck_Nodes::Key> both;
+        std::ranges::set_intersection(master, slave, std::back_inserter(both));
+        if (both.empty()) continue;
+        sink.Add("tie-shares-nodes", Place("constraints", name),
+                 "found " + fnd_Counted(static_cast<long long>(both.size()), "node") +
+                     " on both sides, the first " + nodes.NameOf(both.front()));
+    }
+}
+
+void dck_CheckContactPairs(const odiK_Model& model, fnd_Sink& sink) {
     for (const auto& [name, interaction] : model.interactions) {
         if (interaction.suppressed) continue;
         const auto* pair = nex_canDynamicCastPtr<kinC_SurfaceToSurfaceContact>(&interaction);
@@ -217,13 +258,4 @@ void FindOnPairs(const odiK_Model& model, fnd_Sink& sink) {
                      ", which are the same faces",
                  {}, "for a surface that meets itself there is self-contact");
     }
-}
-
-} // namespace
-
-void dck_CheckConflicts(const odiK_Model& model, fnd_Sink& sink) {
-    const dck_Nodes nodes(model);
-    Meetings(model, nodes, sink).Run();
-    FindOnTies(model, nodes, sink);
-    FindOnPairs(model, sink);
 }

@@ -1,10 +1,11 @@
 #include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Kept.h"
 #include "deck_checks/dck_Text.h"
 #include "deck_checks/dck_Walk.h"
 #include "sections/oif_DatumCsys.h"
-#include "store_interface/model/odiK_Repositories.h"
 #include "store_interface/records/cls_ClassRegistrar.h"
 
+#include <algorithm>
 #include <map>
 #include <memory>
 #include <set>
@@ -76,9 +77,10 @@ public:
             Add(*fields[i].type, fields[i].In(record), fields[i].refersTo);
         }
     }
-    bool Has(const char* kind, const cow_String& name) const {
+    /// Those of a kind; null for none.
+    const std::set<cow_String>* NamesOf(const char* kind) const {
         const auto found = names_.find(std::string_view(kind));
-        return found != names_.end() && found->second.count(name) != 0;
+        return found == names_.end() ? nullptr : &found->second;
     }
     /// Whether some text goes into the deck as it stands, which may name anything.
     bool HasVerbatim() const { return hasVerbatim_; }
@@ -128,6 +130,43 @@ private:
     bool hasVerbatim_ = false;
 };
 
+/// What is found of some of the records, and what they refer to.
+struct Part {
+    std::vector<fnd_Finding> findings;
+    Uses uses;
+};
+using Parts = std::vector<std::shared_ptr<const Part>>;
+
+/// `walk` visits the records.
+template <class Walk>
+Part LookAt(const odiK_Model& model, const Walk& walk) {
+    fnd_List list;
+    LostFields lost(list);
+    Uses uses;
+    walk([&](const cls_Record& record, const mdl_GivenState* given, const fnd_Path& place) {
+        lost.Visit(record, given, place);
+        FindWrongDatums(model, record, place, list);
+        uses.Visit(record, given);
+    });
+    return {std::move(list.findings), std::move(uses)};
+}
+
+/// The objects of a kind that records refer to.
+class Used {
+public:
+    Used(const Parts& parts, const char* kind) {
+        for (const auto& part : parts) {
+            if (const auto* names = part->uses.NamesOf(kind)) names_.push_back(names);
+        }
+    }
+    bool Has(const cow_String& name) const {
+        return std::ranges::any_of(names_, [&](const auto* names) { return names->count(name) != 0; });
+    }
+
+private:
+    std::vector<const std::set<cow_String>*> names_;
+};
+
 void TellUnused(const std::vector<cow_String>& names, const char* plural, const std::string& place,
                 fnd_Sink& sink) {
     constexpr std::size_t kShown = 5;
@@ -140,25 +179,27 @@ void TellUnused(const std::vector<cow_String>& names, const char* plural, const 
              "nothing uses " + std::to_string(names.size()) + " of the " + plural + ": " + shown);
 }
 
-void FindUnused(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
+void FindUnused(const odiK_Model& model, const Parts& parts, fnd_Sink& sink) {
     for (const odiK_Repository& repository : odiK_Repositories()) {
         const bool canBeUnused =
             repository.kind != nullptr && !repository.IsInOrder() && !repository.IsPropagating();
         if (!canBeUnused || repository.kind == std::string_view("constraint")) continue;
+        const Used used(parts, repository.kind);
         std::vector<cow_String> names;
         for (const auto& [name, record] : repository.In(model)) {
-            if (!uses.Has(repository.kind, name)) names.push_back(name);
+            if (!used.Has(name)) names.push_back(name);
         }
         TellUnused(names, repository.plural, std::string("/") + repository.member, sink);
     }
 }
 
-void FindUnusedSets(const odiK_Model& model, const Uses& uses, fnd_Sink& sink) {
-    if (uses.HasVerbatim()) return;
+void FindUnusedSets(const odiK_Model& model, const Parts& parts, fnd_Sink& sink) {
+    if (std::ranges::any_of(parts, [](const auto& part) { return part->uses.HasVerbatim(); })) return;
+    const Used used(parts, kSet);
     std::vector<cow_String> names;
     const auto add = [&](const cow_String& owner, const std::vector<cow_CountedHld<odiK_Set>>& sets) {
         for (const auto& set : sets) {
-            if (set->internal || uses.Has(kSet, set->name)) continue;
+            if (set->internal || used.Has(set->name)) continue;
             names.push_back(owner.IsEmpty() ? set->name : owner + "." + set->name);
         }
     };
@@ -192,16 +233,22 @@ void FindAssemblyNodes(const odiK_Model& model, fnd_Sink& sink) {
 
 } // namespace
 
-void dck_CheckLoss(const odiK_Model& model, fnd_Sink& sink) {
-    LostFields lost(sink);
-    Uses uses;
-    dck_ForEachRecord(model,
-                      [&](const cls_Record& record, const mdl_GivenState* given, const fnd_Path& place) {
-                          lost.Visit(record, given, place);
-                          FindWrongDatums(model, record, place, sink);
-                          uses.Visit(record, given);
-                      });
-    FindUnused(model, uses, sink);
-    FindUnusedSets(model, uses, sink);
+void dck_CheckLoss(const dck_Subject& subject, fnd_Sink& sink) {
+    const odiK_Model& model = subject.Model();
+    Parts parts;
+    parts.push_back(subject.Of("loss of the tree", [&] {
+        return LookAt(model, [&](const dck_Visit& visit) { dck_ForEachRecordOfTree(model, visit); });
+    }));
+    for (const odiK_Repository& repository : odiK_Repositories()) {
+        parts.push_back(subject.Of(std::string("loss of ") + repository.member, [&] {
+            return LookAt(model,
+                          [&](const dck_Visit& visit) { dck_ForEachRecordOf(repository, model, visit); });
+        }));
+    }
+    for (const auto& part : parts) {
+        for (const fnd_Finding& finding : part->findings) sink.Take(finding);
+    }
+    FindUnused(model, parts, sink);
+    FindUnusedSets(model, parts, sink);
     FindAssemblyNodes(model, sink);
 }

@@ -54,19 +54,21 @@ void dck_Nodes::Append(const rgnC_SubsetData& subset, int kind, std::vector<Key>
     const bool ofFacets = kind == static_cast<int>(res_SetTypeEnm::FACETS);
     if (ofFacets && cell == nullptr) return;
     const auto width = static_cast<std::size_t>(elements.nodesPerElement);
+    const std::size_t known = mesh->Nodes().NumWithForeign();
+    const auto add = [&](int node) {
+        if (node >= 0 && static_cast<std::size_t>(node) < known)
+            nodes.push_back(KeyOf(subset.meshIndex, node));
+    };
     for (int i = 0; i < subset.subset.Length(); ++i) {
         const std::size_t first = static_cast<std::size_t>(subset.subset[i]) * width;
         std::span<const std::int8_t> places;
         if (ofFacets) places = NodesOfFacet(*cell, elements.shape, subset.facetIds[i]);
         if (places.empty()) {
-            for (std::size_t k = 0; k < width; ++k) {
-                nodes.push_back(KeyOf(subset.meshIndex, elements.connectivity[first + k]));
-            }
+            for (std::size_t k = 0; k < width; ++k) add(elements.connectivity[first + k]);
         }
         for (const std::int8_t place : places) {
             if (static_cast<std::size_t>(place) >= width) continue;
-            const std::size_t at = first + static_cast<std::size_t>(place);
-            nodes.push_back(KeyOf(subset.meshIndex, elements.connectivity[at]));
+            add(elements.connectivity[first + static_cast<std::size_t>(place)]);
         }
     }
 }
@@ -80,6 +82,15 @@ std::vector<dck_Nodes::Key> dck_Nodes::Of(const rgnC_Region& region) const {
     if (!std::ranges::is_sorted(nodes)) std::ranges::sort(nodes);
     nodes.erase(std::unique(nodes.begin(), nodes.end()), nodes.end());
     return nodes;
+}
+
+dck_Nodes::Numbers::Numbers(const dck_Nodes& nodes) {
+    std::size_t all = 0;
+    for (const Entry& entry : nodes.meshes_) {
+        begins_.push_back(all);
+        if (!entry.mesh.IsNull()) all += entry.mesh->Nodes().NumWithForeign();
+    }
+    numbers_.resize(all);
 }
 
 std::string dck_Nodes::NameOf(Key node) const {

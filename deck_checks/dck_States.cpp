@@ -1,4 +1,5 @@
 #include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Kept.h"
 #include "deck_checks/dck_Text.h"
 #include "store_interface/model/odiK_Model.h"
 #include "store_interface/model/odiK_Repositories.h"
@@ -44,18 +45,29 @@ std::optional<double> EndOf(const kamC_Amplitude& amplitude) {
     return std::nullopt;
 }
 
+/// When a step ends, by its own time and by the time of all steps.
+struct Ends {
+    double period;
+    double total;
+};
+
+std::vector<Ends> EndsOf(const kprC_StepContainer& steps) {
+    std::vector<Ends> ends;
+    double total = 0.0;
+    for (int i = 0; i < steps.Size(); ++i) {
+        const kprC_StepTimes times(steps.StepAt(i));
+        const double period = times.period.IsSet() ? times.period.value : 0.0;
+        total += period;
+        ends.push_back({period, total});
+    }
+    return ends;
+}
+
 /// What is found in the states that were given.
 class StateCheck {
 public:
-    StateCheck(const odiK_Model& model, fnd_Sink& sink) : model_(model), sink_(sink) {
-        double total = 0.0;
-        for (int i = 0; i < model.steps.Size(); ++i) {
-            const kprC_StepTimes times(model.steps.StepAt(i));
-            const double period = times.period.IsSet() ? times.period.value : 0.0;
-            total += period;
-            ends_.push_back({period, total});
-        }
-    }
+    StateCheck(const odiK_Model& model, fnd_Sink& sink)
+        : model_(model), sink_(sink), ends_(EndsOf(model.steps)) {}
 
     void Run(const kprC_PropagatingObject& object, const fnd_Path& place) {
         if (object.suppressed) return;
@@ -140,11 +152,6 @@ private:
         }
     }
 
-    struct Ends {
-        double period;
-        double total;
-    };
-
     const odiK_Model& model_;
     fnd_Sink& sink_;
     std::vector<Ends> ends_; // of the steps
@@ -152,14 +159,21 @@ private:
 
 } // namespace
 
-void dck_CheckStates(const odiK_Model& model, fnd_Sink& sink) {
-    StateCheck check(model, sink);
+void dck_CheckStates(const dck_Subject& subject, fnd_Sink& sink) {
+    const odiK_Model& model = subject.Model();
     const fnd_Path root;
     for (const odiK_Repository& repository : odiK_Repositories()) {
         if (!repository.IsPropagating() || !repository.ReachesDeck()) continue;
-        const fnd_Path container(root, std::string_view(repository.member));
-        for (const auto& [name, record] : repository.In(model)) {
-            check.Run(static_cast<const kprC_PropagatingObject&>(record), fnd_Path(container, name.View()));
-        }
+        const auto findings = subject.Of(std::string("states of ") + repository.member, [&] {
+            fnd_List list;
+            StateCheck check(model, list);
+            const fnd_Path container(root, std::string_view(repository.member));
+            for (const auto& [name, record] : repository.In(model)) {
+                check.Run(static_cast<const kprC_PropagatingObject&>(record),
+                          fnd_Path(container, name.View()));
+            }
+            return std::move(list.findings);
+        });
+        for (const fnd_Finding& finding : *findings) sink.Take(finding);
     }
 }

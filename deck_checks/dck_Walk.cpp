@@ -1,7 +1,5 @@
 #include "deck_checks/dck_Walk.h"
 
-#include "store_interface/model/odiK_Repositories.h"
-
 namespace {
 
 class Walk {
@@ -102,28 +100,30 @@ bool dck_IsGiven(const mdl_GivenState* given, std::size_t field) {
            given->marks[field] == mdl_GivenEnm::AS_IT_STANDS;
 }
 
-void dck_ForEachRecord(const odiK_Model& model, const dck_Visit& visit) {
+void dck_ForEachRecordOfTree(const odiK_Model& model, const dck_Visit& visit) {
     Walk walk(visit);
     const fnd_Path root;
     walk.Record(model, nullptr, root);
     WalkTree(model, walk, root);
-    for (const odiK_Repository& repository : odiK_Repositories()) {
-        const fnd_Path container(root, std::string_view(repository.member));
-        if (repository.IsInOrder()) {
-            for (int i = 0; i < model.steps.Size(); ++i) {
-                walk.Record(model.steps.StepAt(i), nullptr, fnd_Path(container, static_cast<std::size_t>(i)));
-            }
-            continue;
+}
+
+void dck_ForEachRecordOf(const odiK_Repository& repository, const odiK_Model& model, const dck_Visit& visit) {
+    Walk walk(visit);
+    const fnd_Path root;
+    const fnd_Path container(root, std::string_view(repository.member));
+    if (repository.IsInOrder()) {
+        for (int i = 0; i < model.steps.Size(); ++i) {
+            walk.Record(model.steps.StepAt(i), nullptr, fnd_Path(container, static_cast<std::size_t>(i)));
         }
-        for (const auto& [name, record] : repository.In(model)) {
-            const fnd_Path place(container, name.View());
-            walk.Record(record, nullptr, place);
-            if (!repository.IsPropagating()) continue;
-            const fnd_Path states(place, "states");
-            for (const mdl_GivenState& given :
-                 static_cast<const kprC_PropagatingObject&>(record).GivenStates()) {
-                walk.Record(given.record.ConstGet(), &given, fnd_Path(states, given.stepName.View()));
-            }
+        return;
+    }
+    for (const auto& [name, record] : repository.In(model)) {
+        const fnd_Path place(container, name.View());
+        walk.Record(record, nullptr, place);
+        if (!repository.IsPropagating()) continue;
+        const fnd_Path states(place, "states");
+        for (const mdl_GivenState& given : static_cast<const kprC_PropagatingObject&>(record).GivenStates()) {
+            walk.Record(given.record.ConstGet(), &given, fnd_Path(states, given.stepName.View()));
         }
     }
 }

@@ -204,11 +204,47 @@ void sty_Variants::CheckMeshes(const odb_Odb& store, fnd_Sink& sink) {
         check(instance->ownMesh, "/assembly/instances", name);
 }
 
+bool sty_Variants::SharesWithBase(const odb_Odb& store) const {
+    return store.DeckModel()->SharesWith(*template_->Store().DeckModel());
+}
+
+template <class Kept, class Work>
+const Kept* sty_Variants::Keep(std::optional<std::unique_ptr<const Kept>>& kept, const odb_Odb& store,
+                               const Work& work) {
+    if (!kept && SharesWithBase(store)) {
+        kept.emplace();
+        try {
+            kept = work(template_->Store());
+        } catch (const QRXBasException&) {
+            // Rows may mend what the template raises; then nothing is kept.
+        }
+    }
+    return kept ? kept->get() : nullptr;
+}
+
 std::vector<fnd_Finding> sty_Variants::CheckDeck(const odb_Odb& store) {
     fnd_List list;
-    dck_CheckDeck(store, store.DeckModelName(), list);
+    const cow_String& name = store.DeckModelName();
+    const dck_Kept* kept = Keep(
+        keptChecks_, store, [&](const odb_Odb& base) { return dck_KeepChecks(base, base.DeckModelName()); });
+    if (kept != nullptr) {
+        dck_CheckDeck(store, name, *kept, list);
+    } else {
+        dck_CheckDeck(store, name, list);
+    }
     CheckMeshes(store, list);
     return std::move(list.findings);
+}
+
+void sty_Variants::WriteDeck(const odb_Odb& store) {
+    const oif_KeptDeck* kept = Keep(keptDeck_, store, [this](const odb_Odb& base) {
+        text_.Begin(base);
+        return oif_Writer(base).Keep(text_);
+    });
+    text_.Begin(store);
+    oif_Writer writer(store);
+    if (kept != nullptr) return writer.WriteInput(text_, *kept);
+    writer.WriteInput(static_cast<oif_MeshTexts&>(text_));
 }
 
 sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
@@ -228,8 +264,7 @@ sty_Result sty_Variants::Make(const sty_Row& row, const sty_Columns& columns) {
     std::vector<fnd_Finding> findings = std::move(report.findings);
     try {
         for (fnd_Finding& finding : CheckDeck(*store)) findings.push_back(std::move(finding));
-        text_.Begin(*store);
-        oif_Writer(*store).WriteInput(static_cast<oif_MeshTexts&>(text_));
+        WriteDeck(*store);
     } catch (const QRXBasException& failure) {
         const std::string context = failure.Context();
         result.errors.push_back({{}, {}, failure.what() + (context.empty() ? "" : " (" + context + ")")});

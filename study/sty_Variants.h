@@ -1,11 +1,15 @@
 #ifndef QRX_STY_VARIANTS_H
 #define QRX_STY_VARIANTS_H
 
+#include "deck/oif_KeptDeck.h"
+#include "deck_checks/dck_Check.h"
+#include "deck_checks/dck_Kept.h"
 #include "model_file/mdf_Template.h"
 #include "study/sty_DeckText.h"
 #include "study/sty_Ledger.h"
 #include "study/sty_Table.h"
 
+#include <optional>
 #include <set>
 
 /// What the columns of a table stand for in a template.
@@ -68,11 +72,21 @@ public:
 private:
     std::vector<fnd_Finding> CheckDeck(const odb_Odb& store);
     void CheckMeshes(const odb_Odb& store, fnd_Sink& sink);
+    void WriteDeck(const odb_Odb& store);
+    bool SharesWithBase(const odb_Odb& store) const;
+    /// What is kept of the template, made when a store that shares with it is the first to want it; null
+    /// where there is nothing.
+    template <class Kept, class Work>
+    const Kept* Keep(std::optional<std::unique_ptr<const Kept>>& kept, const odb_Odb& store,
+                     const Work& work);
     static std::string KeyOf(const fnd_Finding& finding);
 
     std::unique_ptr<mdf_Template> template_;
     sty_MeshTexts& meshes_;
     sty_DeckText text_;
+    /// Null where the template raises.
+    std::optional<std::unique_ptr<const oif_KeptDeck>> keptDeck_;
+    std::optional<std::unique_ptr<const dck_Kept>> keptChecks_;
     std::set<std::string> leftOut_;
     /// What the quality of the last meshes is, by place.
     struct Quality {

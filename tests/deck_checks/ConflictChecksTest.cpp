@@ -2,10 +2,16 @@
 
 namespace {
 
+void CheckConflicts(const odiK_Model& model, fnd_Sink& sink) {
+    dck_CheckMeetings(model, sink);
+    dck_CheckTies(model, sink);
+    dck_CheckContactPairs(model, sink);
+}
+
 /// Two tetrahedra on one face, as the instance I; N12 and N2 are node sets, LOW and HIGH the shared face as
 /// each of them has it, ALSO_LOW is LOW under another name.
 Texts Found(const std::string& members) {
-    return FindingsOf<dck_CheckConflicts>(StepsOf({"Static", "Static"}) + R"(,
+    return FindingsOf<CheckConflicts>(StepsOf({"Static", "Static"}) + R"(,
         "parts": {"P": {"mesh": {
             "nodes": {"labels": {"from": 1, "to": 5},
                       "coordinates": [[0, 0, 0], [1, 0, 0], [0, 1, 0], [0, 0, 1], [0, 0, -1]]},
@@ -18,7 +24,7 @@ Texts Found(const std::string& members) {
                      {"name": "HIGH", "kind": "surface", "facets": [[2, "S1"]]},
                      {"name": "FAR", "kind": "surface", "facets": [[2, "S2"]]}]}}},
         "assembly": {"instances": {"I": {"part": "P"}}}, )" +
-                                          members);
+                                      members);
 }
 
 std::string Moved(const std::string& name, const std::string& region, const std::string& state) {

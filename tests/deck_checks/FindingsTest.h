@@ -3,6 +3,7 @@
 
 #include "deck_checks/dck_Check.h"
 #include "deck_checks/dck_Checks.h"
+#include "deck_checks/dck_Kept.h"
 #include "model_file/mdf_ModelFile.h"
 #include "store_interface/model/odiK_Model.h"
 
@@ -33,7 +34,7 @@ inline Texts FindingsBy(Finder find, const std::string& members, const std::stri
 }
 
 /// The findings of one family of checks.
-template <void (*Check)(const odiK_Model&, fnd_Sink&)>
+template <auto Check>
 Texts FindingsOf(const std::string& members, const std::string& place = {}) {
     return FindingsBy(
         [](const odb_Odb& odb, fnd_Sink& sink) { Check(*odb.FindModel(odb_Odb::DefaultModelName()), sink); },
