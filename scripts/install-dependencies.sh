@@ -21,7 +21,7 @@ usage: install-dependencies.sh [build|test|bench|dev|viewer|cluster|python|docs|
 END
 }
 
-build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libmd-dev)
+build=(g++ cmake ninja-build nlohmann-json3-dev libcli11-dev libpugixml-dev zlib1g-dev libhdf5-dev libssl-dev)
 test=(mold libgtest-dev librapidcheck-dev locales pkg-config python3 python3-jsonschema bash-completion zsh fish groff-base)
 bench=(libbenchmark-dev libfmt-dev libsimdjson-dev gmsh)
 dev=(clang clang-tidy clang-format)

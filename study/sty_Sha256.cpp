@@ -3,15 +3,15 @@
 #include "study/sty_File.h"
 
 #include <cstring>
-#include <sha2.h>
+#include <openssl/sha.h>
 
 namespace {
 
-static_assert(sizeof(SHA2_CTX) <= 208);
+static_assert(sizeof(SHA256_CTX) <= 112);
 
 template <class Action>
-void WithContext(std::array<unsigned char, 208>& bytes, const Action& action) {
-    SHA2_CTX context;
+void WithContext(std::array<unsigned char, 112>& bytes, const Action& action) {
+    SHA256_CTX context;
     std::memcpy(&context, bytes.data(), sizeof context);
     action(context);
     std::memcpy(bytes.data(), &context, sizeof context);
@@ -20,19 +20,17 @@ void WithContext(std::array<unsigned char, 208>& bytes, const Action& action) {
 } // namespace
 
 sty_Sha256::sty_Sha256() : context_{} {
-    WithContext(context_, [](SHA2_CTX& context) { SHA256Init(&context); });
+    WithContext(context_, [](SHA256_CTX& context) { SHA256_Init(&context); });
 }
 
 void sty_Sha256::Add(std::string_view text) {
-    WithContext(context_, [&](SHA2_CTX& context) {
-        SHA256Update(&context, reinterpret_cast<const unsigned char*>(text.data()), text.size());
-    });
+    WithContext(context_, [&](SHA256_CTX& context) { SHA256_Update(&context, text.data(), text.size()); });
 }
 
 std::string sty_Sha256::Hex() const {
     std::array<unsigned char, kBytes> copy = context_;
     unsigned char digest[SHA256_DIGEST_LENGTH];
-    WithContext(copy, [&](SHA2_CTX& context) { SHA256Final(digest, &context); });
+    WithContext(copy, [&](SHA256_CTX& context) { SHA256_Final(digest, &context); });
     constexpr char digits[] = "0123456789abcdef";
     std::string hex;
     for (const unsigned char byte : digest) {

@@ -16,7 +16,7 @@ public:
 
 private:
     // The library's context; its header is not for everybody.
-    static constexpr std::size_t kBytes = 208;
+    static constexpr std::size_t kBytes = 112;
     alignas(8) std::array<unsigned char, kBytes> context_;
 };
 

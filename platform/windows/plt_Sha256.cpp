@@ -1,4 +1,4 @@
-#include "platform/windows/include/sha2.h"
+#include "platform/windows/include/openssl/sha.h"
 
 #include <algorithm>
 #include <array>
@@ -47,14 +47,15 @@ void Take(std::uint32_t (&state)[8], const unsigned char* block) {
 
 } // namespace
 
-void SHA256Init(SHA2_CTX* context) {
+void SHA256_Init(SHA256_CTX* context) {
     *context = {
         {0x6a09e667, 0xbb67ae85, 0x3c6ef372, 0xa54ff53a, 0x510e527f, 0x9b05688c, 0x1f83d9ab, 0x5be0cd19},
         0,
         {}};
 }
 
-void SHA256Update(SHA2_CTX* context, const unsigned char* data, std::size_t bytes) {
+void SHA256_Update(SHA256_CTX* context, const void* text, std::size_t bytes) {
+    const auto* data = static_cast<const unsigned char*>(text);
     while (bytes > 0) {
         const std::size_t held = context->bytes % 64;
         const std::size_t step = std::min(bytes, 64 - held);
@@ -66,15 +67,15 @@ void SHA256Update(SHA2_CTX* context, const unsigned char* data, std::size_t byte
     }
 }
 
-void SHA256Final(unsigned char* digest, SHA2_CTX* context) {
+void SHA256_Final(unsigned char* digest, SHA256_CTX* context) {
     const std::uint64_t bits = 8 * context->bytes;
     const unsigned char one = 0x80;
     const unsigned char zero = 0;
-    SHA256Update(context, &one, 1);
-    while (context->bytes % 64 != 56) SHA256Update(context, &zero, 1);
+    SHA256_Update(context, &one, 1);
+    while (context->bytes % 64 != 56) SHA256_Update(context, &zero, 1);
     unsigned char length[8];
     for (int i = 0; i < 8; ++i) length[i] = static_cast<unsigned char>(bits >> (56 - 8 * i));
-    SHA256Update(context, length, 8);
+    SHA256_Update(context, length, 8);
     for (int i = 0; i < 32; ++i)
         digest[i] = static_cast<unsigned char>(context->state[i / 4] >> (24 - 8 * (i % 4)));
 }

@@ -57,7 +57,7 @@ LIBRARIES = {
     "mesh_file": ["pugixml.hpp", "zlib.h", "hdf5.h"],
     "model_file": ["nlohmann/"],
     "view_page": ["nlohmann/"],
-    "study": ["sha2.h"],
+    "study": ["openssl/sha.h"],
     "tools": ["nlohmann/", "CLI/"],
     "python": ["nlohmann/", "pybind11/"],
 }
