@@ -24,7 +24,7 @@ Json Parsed(const std::uint8_t* data, std::size_t size) {
 
 class TreeMutator {
 public:
-    TreeMutator(Json& root, unsigned seed) : random_(seed), root_(root) { Collect(root, 0); }
+    TreeMutator(Json& root, unsigned seed) : random_(seed) { Collect(root, 0); }
 
     void Change() {
         Json& place = *places_[Upto(places_.size())];
@@ -121,7 +121,6 @@ private:
     }
 
     std::minstd_rand random_;
-    Json& root_;
     std::vector<Json*> places_;
     std::vector<Json*> scalars_;
 };

@@ -75,8 +75,7 @@ constexpr unsigned kMotion =
 constexpr unsigned kAcoustic =
     kDynamic | kHarmonic | kFrequency | kModalDynamic | kComplexFrequency; // steps with acoustic pressure
 constexpr unsigned kContactSteps = kGeneral | kLinearStatic; // steps in which contact variables are computed
-constexpr unsigned kStress = kContactSteps | kModeBased | kEigen | kSteadyStateDirect |
-                             kSteadyStateSubspace; // all steps with displacement
+constexpr unsigned kStress = kGeneral | kPerturbation;       // all steps with displacement
 constexpr unsigned kAll =
     kStress | kAnneal | kThermalElectric | kHeatTransfer | kMassDiffusion; // every procedure
 

@@ -58,7 +58,8 @@ void bme_MapPropertyArray::ForEachRun(int key, const Take& take) const {
             if (byte < 0x80) return number;
         }
     };
-    for (int first = 0; at != end;) {
+    int first = 0;
+    while (at != end) {
         const std::uint64_t head = next();
         const int count = (head & 1) != 0 ? static_cast<int>(next()) : 1;
         first += static_cast<int>(head / 2);
