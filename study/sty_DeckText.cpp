@@ -27,7 +27,8 @@ sty_MeshTexts::Text sty_MeshTexts::Find(const odiK_Mesh& mesh, oif_MeshBlockEnm 
     return entries_.front().texts[static_cast<int>(block)];
 }
 
-void sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text) {
+sty_MeshTexts::Text sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block,
+                                        const Text& text) {
     const std::lock_guard<std::mutex> lock(mutex_);
     auto place =
         std::ranges::find(entries_, mesh.Referent(), [](const Entry& e) { return e.mesh.Referent(); });
@@ -35,7 +36,9 @@ void sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm
         entries_.push_front({mesh, {}});
         place = entries_.begin();
     }
-    place->texts[static_cast<int>(block)] = text;
+    Text& kept = place->texts[static_cast<int>(block)];
+    if (kept != nullptr) return kept;
+    kept = text;
     const auto bytes = [this] {
         std::size_t all = 0;
         for (const Entry& entry : entries_) {
@@ -45,6 +48,7 @@ void sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm
     };
     while (entries_.size() > kMostMeshes || (entries_.size() > kFewMeshes && bytes() > kMostMeshBytes))
         entries_.pop_back();
+    return text;
 }
 
 void sty_DeckText::Begin(const odb_Odb& store) {
@@ -53,12 +57,13 @@ void sty_DeckText::Begin(const odb_Odb& store) {
     pieces_.clear();
 }
 
-void sty_DeckText::Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) {
+sty_DeckText::Text sty_DeckText::Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) {
     const odiK_Model* model = store_->DeckModel();
     for (const auto& [name, instance] : model->Instances()) {
         const cow_CountedHld<odiK_Mesh> held = instance->Mesh();
         if (held.Referent() == &mesh) return meshes_.Keep(held, block, text);
     }
+    return text;
 }
 
 void sty_DeckText::WriteKept(const Text& text) {

@@ -20,7 +20,8 @@ public:
     using Text = oif_MeshTexts::Text;
 
     Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block);
-    void Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text);
+    /// Gives the text that is kept, which another thread may have made.
+    Text Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text);
 
 private:
     struct Entry {
@@ -41,7 +42,7 @@ public:
     void Begin(const odb_Odb& store);
     void Write(const char* text, std::size_t bytes) override { own_.append(text, bytes); }
     Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) override { return meshes_.Find(mesh, block); }
-    void Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override;
+    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override;
     void WriteKept(const Text& text) override;
 
     long long Bytes() const;

@@ -61,6 +61,17 @@ TEST(sty_DeckText, SumsOfDecks_GoOnFromWhereAnotherBeganAlike) {
     }
 }
 
+TEST(sty_MeshTexts, WhoMakesATextThatAnotherHasMadeMeanwhile_GetsTheOthers) {
+    sty_MeshTexts meshes;
+    const cow_CountedHld<odiK_Mesh> mesh(new odiK_Mesh());
+    const auto first = std::make_shared<const std::string>("text");
+    const auto second = std::make_shared<const std::string>("text");
+    EXPECT_EQ(meshes.Keep(mesh, oif_MeshBlockEnm::NODES, first), first);
+    EXPECT_EQ(meshes.Keep(mesh, oif_MeshBlockEnm::NODES, second), first);
+    EXPECT_EQ(meshes.Keep(mesh, oif_MeshBlockEnm::SETS, second), second);
+    EXPECT_EQ(meshes.Find(*mesh, oif_MeshBlockEnm::NODES), first);
+}
+
 TEST(sty_Sha256, KnownTexts_HaveTheirPublishedSums) {
     EXPECT_EQ(SumOf(""), "e3b0c44298fc1c149afbf4c8996fb92427ae41e4649b934ca495991b7852b855");
     EXPECT_EQ(SumOf("abc"), "ba7816bf8f01cfea414140de5dae2223b00361a396177a9cb410ff61f20015ad");

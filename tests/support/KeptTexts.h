@@ -15,9 +15,9 @@ public:
         ++asked;
         return texts[{&mesh, block}];
     }
-    void Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
-        texts[{&mesh, block}] = text;
+    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
         ++kept;
+        return texts[{&mesh, block}] = text;
     }
     void WriteKept(const Text& text) override { deck += *text; }
 

@@ -156,8 +156,7 @@ void oif_Builder::WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshB
         std::string made = device.Text();
         // The line end goes through the stream, which then knows that a line begins.
         if (!made.empty()) made.pop_back();
-        text = std::make_shared<const std::string>(std::move(made));
-        texts_->Keep(mesh, block, text);
+        text = texts_->Keep(mesh, block, std::make_shared<const std::string>(std::move(made)));
     }
     if (text->empty()) return;
     stream.Flush();

@@ -64,8 +64,8 @@ public:
         device_.Write(text, bytes);
     }
     Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) override { return device_.Find(mesh, block); }
-    void Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
-        device_.Keep(mesh, block, text);
+    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
+        return device_.Keep(mesh, block, text);
     }
     void WriteKept(const Text& text) override {
         kept_.texts_.push_back({kept_.own_.size(), text});

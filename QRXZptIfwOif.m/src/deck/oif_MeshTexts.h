@@ -20,8 +20,9 @@ public:
 
     /// The text that was kept for the mesh, or null.
     virtual Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) = 0;
-    /// A text that has just been made for the mesh; whoever keeps it holds the mesh too.
-    virtual void Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) = 0;
+    /// A text that has just been made for the mesh; whoever keeps it holds the mesh too. Gives the one to be
+    /// used, which somebody else may have made meanwhile.
+    virtual Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) = 0;
     /// As Write().
     virtual void WriteKept(const Text& text) = 0;
 };
