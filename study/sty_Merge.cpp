@@ -1,6 +1,7 @@
 #include "platform/plt_Files.h"
 #include "store_interface/findings/fnd_Text.h"
 #include "study/sty_Identity.h"
+#include "study/sty_MeshSums.h"
 #include "study/sty_Study.h"
 
 #include <algorithm>
@@ -43,6 +44,15 @@ void Count(const LinePlace& place, const std::string& line, sty_Merged& merged) 
     ++merged.failed;
     if (merged.failures.size() < sty_Outcome::kMostFailures)
         merged.failures.push_back({place.row, {}, sty_ReasonIn(line)});
+}
+
+/// Shards may have come to a mesh file at different times.
+void Compare(const std::string& line, sty_MeshSums& meshes, sty_Merged& merged) {
+    const std::optional<sty_Entry> entry = sty_EntryOf(line);
+    if (!entry || entry->deck.empty()) return;
+    std::string problem = meshes.ContradictionOf(*entry);
+    if (!problem.empty() && merged.contradictions.size() < sty_Outcome::kMostFailures)
+        merged.contradictions.push_back({entry->row, {}, std::move(problem)});
 }
 
 /// "17, 201-250"; after many ranges "...".
@@ -111,6 +121,7 @@ sty_Merged sty_Merge(const std::string& path) {
     });
 
     sty_Merged merged;
+    sty_MeshSums meshes(identity->templatePath);
     merged.rows = identity->rows;
     const auto write = [&](int file) {
         sty_LineWriter writer(file);
@@ -119,6 +130,7 @@ sty_Merged sty_Merge(const std::string& path) {
             const auto ledger = static_cast<std::size_t>(places[i].ledger);
             const std::string line = LineAt(files[ledger], places[i], ledgers[ledger]);
             Count(places[i], line, merged);
+            Compare(line, meshes, merged);
             writer.Add(line);
         }
         return writer.End();

@@ -42,7 +42,9 @@ std::string sty_MeshSums::Use(const std::string& file, long long row, std::strin
     return known.sum;
 }
 
-std::string sty_MeshSums::ProblemOf(const sty_Entry& entry) {
+/// The first that `problemOf` finds of the files in a line and their sums.
+template <class Visitor>
+std::string sty_MeshSums::FirstProblem(const sty_Entry& entry, const Visitor& problemOf) {
     // Most lines name what others name too.
     if (entry.meshes.empty() || looked_.contains(entry.meshes)) return {};
     looked_.emplace(entry.meshes);
@@ -54,9 +56,22 @@ std::string sty_MeshSums::ProblemOf(const sty_Entry& entry) {
         const mdf_Value* file = mesh.IsObject() ? mesh.Find("file") : nullptr;
         const mdf_Value* sum = mesh.IsObject() ? mesh.Find("sha256") : nullptr;
         if (file == nullptr || sum == nullptr || !file->IsString() || !sum->IsString()) continue;
-        std::string problem = ProblemOf(file->String(), KnownOf(file->String()), entry.row, sum->String());
-        if (problem.empty()) Use(file->String(), entry.row, problem);
+        std::string problem = problemOf(file->String(), sum->String());
         if (!problem.empty()) return problem;
     }
     return {};
+}
+
+std::string sty_MeshSums::ContradictionOf(const sty_Entry& entry) {
+    return FirstProblem(entry, [&](const std::string& file, const std::string& sum) {
+        return ProblemOf(file, KnownOf(file), entry.row, sum);
+    });
+}
+
+std::string sty_MeshSums::ProblemOf(const sty_Entry& entry) {
+    return FirstProblem(entry, [&](const std::string& file, const std::string& sum) {
+        std::string problem = ProblemOf(file, KnownOf(file), entry.row, sum);
+        if (problem.empty()) Use(file, entry.row, problem);
+        return problem;
+    });
 }

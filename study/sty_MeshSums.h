@@ -16,8 +16,11 @@ public:
 
     /// The sum of a file that a row names now. Where another row had another one, `problem` says so.
     std::string Use(const std::string& file, long long row, std::string& problem);
-    /// What is wrong with the files that a ledger's line names; empty for nothing.
+    /// What is wrong with the files that a ledger's line names; empty for nothing. They must be what other
+    /// lines say, and what is there now.
     std::string ProblemOf(const sty_Entry& entry);
+    /// The same without a look at what is there. Of lines that say the same the first is told of.
+    std::string ContradictionOf(const sty_Entry& entry);
 
 private:
     struct Known {
@@ -31,6 +34,8 @@ private:
     Known& KnownOf(const std::string& file);
     std::filesystem::path PathOf(const std::string& file) const;
     std::string ProblemOf(const std::string& file, Known& known, long long row, const std::string& sum) const;
+    template <class Visitor>
+    std::string FirstProblem(const sty_Entry& entry, const Visitor& problemOf);
 
     std::filesystem::path folder_;
     std::mutex mutex_;

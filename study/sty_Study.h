@@ -95,6 +95,8 @@ struct sty_Merged {
     /// "17, 201-250".
     std::string missingRows;
     std::vector<sty_Failure> failures;
+    /// Rows whose mesh files were others than for rows before them, the first ten.
+    std::vector<sty_Failure> contradictions;
 };
 /// Joins the ledgers of a study's shards into one, a line a row in the order of rows. Raises sty_Refused, or
 /// sty_NoStudy when the folder isn't one.

@@ -172,14 +172,18 @@ ExitCode Merge(const std::string& folder, RunReport& report) {
                                   {"failed", merged.failed},
                                   {"missing", merged.missing},
                                   {"missingRows", merged.missingRows},
-                                  {"failures", JsonOf(merged.failures)}};
+                                  {"failures", JsonOf(merged.failures)},
+                                  {"contradictions", JsonOf(merged.contradictions)}};
     }
     report.Print(fnd_Visible(folder) + ": " + std::to_string(merged.done) + " of " +
                  std::to_string(merged.rows) + " decks, " + std::to_string(merged.failed) + " rows failed, " +
                  std::to_string(merged.missing) + " missing\n");
     PrintFailures(merged.failures, merged.failed, report);
     if (merged.missing > 0) report.Print("  missing: rows " + merged.missingRows + "\n");
-    return merged.failed + merged.missing > 0 ? ExitCode::MODEL_IS_WRONG : ExitCode::DONE;
+    for (const sty_Failure& each : merged.contradictions)
+        report.Error(folder, "row " + std::to_string(each.row) + ": " + each.reason);
+    const bool isWhole = merged.failed + merged.missing == 0 && merged.contradictions.empty();
+    return isWhole ? ExitCode::DONE : ExitCode::MODEL_IS_WRONG;
 }
 
 /// The end that the signal would have been, now that all is told.

@@ -261,6 +261,27 @@ class Runs(StudyTest):
         self.study(*study, "--out", "out", "--resume")
         self.assertEqual((self.snapshot("out"), (self.folder / "out/study.jsonl").read_bytes()), before)
 
+    def test_MergeOfShardsThatFoundOtherMeshes_SaysSo(self):
+        study = self.write_plates(["b.unv", "c.unv", "b.unv", "b.unv"])
+        self.study(*study, "--out", "out", "--shard", "1/2")
+        held = (self.folder / "models/b.unv").read_bytes()
+        (self.folder / "models/b.unv").write_bytes(held + b" \n")
+        self.study(*study, "--out", "out", "--shard", "2/2")
+        run = self.study("--merge", "out", code=1)
+        self.assertIn("out: 4 of 4 decks, 0 rows failed, 0 missing", run.stdout)
+        self.assertIn("row 3: the mesh file 'models/b.unv' has changed since row 1 was written", run.stderr)
+        self.assertNotIn("row 4", run.stderr)
+        told = json.loads(self.study("--merge", "out", "--json", code=1).stdout)["study"]["contradictions"]
+        self.assertEqual([each["row"] for each in told], [3])
+        # Done again with the mesh of the others, all is well.
+        (self.folder / "models/b.unv").write_bytes(held)
+        (self.folder / "out/study.2-of-2.jsonl").unlink()
+        for deck in ("3.inp", "4.inp"):
+            (self.folder / "out" / deck).unlink()
+        (self.folder / "out/study.jsonl").unlink()
+        self.study(*study, "--out", "out", "--shard", "2/2")
+        self.study("--merge", "out")
+
     def test_MeshOfRowThatFailed_MayBeMended(self):
         study = self.write_plates(["b.unv", "c.unv"])
         (self.folder / "models/c.unv").write_bytes(b"no mesh")
