@@ -1,7 +1,6 @@
 #include "study/sty_DeckText.h"
 
 #include "platform/plt_Files.h"
-#include "store_interface/model/odb_Odb.h"
 #include "study/sty_File.h"
 
 #include <algorithm>
@@ -51,19 +50,9 @@ sty_MeshTexts::Text sty_MeshTexts::Keep(const cow_CountedHld<odiK_Mesh>& mesh, o
     return text;
 }
 
-void sty_DeckText::Begin(const odb_Odb& store) {
-    store_ = &store;
+void sty_DeckText::Begin() {
     own_.clear();
     pieces_.clear();
-}
-
-sty_DeckText::Text sty_DeckText::Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) {
-    const odiK_Model* model = store_->DeckModel();
-    for (const auto& [name, instance] : model->Instances()) {
-        const cow_CountedHld<odiK_Mesh> held = instance->Mesh();
-        if (held.Referent() == &mesh) return meshes_.Keep(held, block, text);
-    }
-    return text;
 }
 
 void sty_DeckText::WriteKept(const Text& text) {

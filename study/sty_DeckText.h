@@ -12,8 +12,6 @@
 #include <span>
 #include <vector>
 
-class odb_Odb;
-
 /// The texts of the last meshes, which all threads of a study share.
 class sty_MeshTexts {
 public:
@@ -38,11 +36,13 @@ class sty_DeckText final : public oif_MeshTexts {
 public:
     explicit sty_DeckText(sty_MeshTexts& meshes) : meshes_(meshes) {}
 
-    /// Begins the next deck, of this store, which must outlive the writing.
-    void Begin(const odb_Odb& store);
+    /// Begins the next deck.
+    void Begin();
     void Write(const char* text, std::size_t bytes) override { own_.append(text, bytes); }
     Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) override { return meshes_.Find(mesh, block); }
-    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override;
+    Text Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text) override {
+        return meshes_.Keep(mesh, block, text);
+    }
     void WriteKept(const Text& text) override;
 
     long long Bytes() const;
@@ -79,7 +79,6 @@ private:
     Place CommonEnd(const Summed& former) const;
 
     sty_MeshTexts& meshes_;
-    const odb_Odb* store_ = nullptr;
     std::string own_;
     std::vector<Piece> pieces_;
     std::list<Summed> summed_; // the last one used is the first

@@ -238,10 +238,10 @@ std::vector<fnd_Finding> sty_Variants::CheckDeck(const odb_Odb& store) {
 
 void sty_Variants::WriteDeck(const odb_Odb& store) {
     const oif_KeptDeck* kept = Keep(keptDeck_, store, [this](const odb_Odb& base) {
-        text_.Begin(base);
+        text_.Begin();
         return oif_Writer(base).Keep(text_);
     });
-    text_.Begin(store);
+    text_.Begin();
     oif_Writer writer(store);
     if (kept != nullptr) return writer.WriteInput(text_, *kept);
     writer.WriteInput(static_cast<oif_MeshTexts&>(text_));

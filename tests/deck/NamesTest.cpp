@@ -1,5 +1,6 @@
 #include "base/oif_Utils.h"
 #include "keyword_layer/qkw_QuorixName.h"
+#include "mesh/oif_SetName.h"
 #include "support/DeckTest.h"
 
 namespace {
@@ -49,6 +50,14 @@ TEST(QuorixName, SplitName_KeepsThePrefixWithItsDots) {
     cow_String prefix;
     cow_String last;
     qkw_QuorixName::SplitName("A.B.C", prefix, last);
+    EXPECT_EQ(prefix, "A.B.");
+    EXPECT_EQ(last, "C");
+}
+
+TEST(SetName, SplitName_IsThatOfNames) {
+    cow_String prefix;
+    cow_String last;
+    oif_SetName::SplitName("A.B.C", prefix, last);
     EXPECT_EQ(prefix, "A.B.");
     EXPECT_EQ(last, "C");
 }

@@ -1,5 +1,4 @@
 #include "study/sty_DeckText.h"
-#include "store_interface/model/odb_Odb.h"
 
 #include <gtest/gtest.h>
 
@@ -20,7 +19,6 @@ std::string SumOf(std::string_view text) {
 TEST(sty_DeckText, SumsOfDecks_GoOnFromWhereAnotherBeganAlike) {
     sty_MeshTexts meshes;
     sty_DeckText text(meshes);
-    odb_Odb store;
     std::mt19937 random(7);
     const auto upTo = [&](std::size_t most) {
         return std::uniform_int_distribution<std::size_t>(0, most)(random);
@@ -46,7 +44,7 @@ TEST(sty_DeckText, SumsOfDecks_GoOnFromWhereAnotherBeganAlike) {
             if (!own.empty()) own[upTo(own.size() - 1)] = static_cast<char>('A' + upTo(25));
         }
         }
-        text.Begin(store);
+        text.Begin();
         std::string whole;
         for (const auto& [own, which] : pieces) {
             text.Write(own.data(), own.size());

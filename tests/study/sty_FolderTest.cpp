@@ -1,5 +1,4 @@
 #include "study/sty_Folder.h"
-#include "store_interface/model/odb_Odb.h"
 #include "study/sty_DeckText.h"
 #include "study/sty_Ledger.h"
 #include "study/sty_Study.h"
@@ -156,8 +155,6 @@ TEST(sty_Ledger, LinesOfResults_AreReadBack) {
 
 TEST(sty_DeckText, PiecesOfDecks_AreOneTextWithItsSum) {
     const Scratch scratch;
-    odb_Odb store;
-    store.AddModel(odb_Odb::DefaultModelName());
     sty_MeshTexts meshes;
     sty_DeckText deck(meshes);
     // Texts that are long against the distance of the places from which sums go on, and differ early, late,
@@ -196,7 +193,7 @@ TEST(sty_DeckText, PiecesOfDecks_AreOneTextWithItsSum) {
                           {text, elements, "", nodes, text.substr(0, 16'384)},
                           {text, elements, "", nodes, text.substr(0, 16'383)}};
     for (const Deck& each : decks) {
-        deck.Begin(store);
+        deck.Begin();
         std::string whole;
         const auto own = [&](const std::string& piece) {
             deck.Write(piece.data(), piece.size());

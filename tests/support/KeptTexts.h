@@ -15,9 +15,9 @@ public:
         ++asked;
         return texts[{&mesh, block}];
     }
-    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
+    Text Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text) override {
         ++kept;
-        return texts[{&mesh, block}] = text;
+        return texts[{mesh.Referent(), block}] = text;
     }
     void WriteKept(const Text& text) override { deck += *text; }
 

@@ -125,7 +125,7 @@ void oif_Builder::WriteOfInstance(utl_Stream& stream, const qkw_BuilderComponent
                                   const ddb_BaseInstance& instance, const qkw_KeywordList& keywords) const {
     if (texts_ == nullptr || !instance.IsPartInstance()) return WriteInput(stream, keywords);
     const ddb_Mesh view = ddb_PartInstance(instance).mesh();
-    const odiK_Mesh& mesh = view.mesh();
+    const cow_CountedHld<odiK_Mesh>& mesh = view.Handle();
     // All that this component says of an instance are the sets of its mesh, by names and labels.
     if (dynamic_cast<const oif_RegionBuilder*>(&component) != nullptr) {
         WriteKept(stream, mesh, oif_MeshBlockEnm::SETS, [&](utl_Stream& own) { WriteInput(own, keywords); });
@@ -145,9 +145,9 @@ void oif_Builder::WriteOfInstance(utl_Stream& stream, const qkw_BuilderComponent
 }
 
 template <class Writing>
-void oif_Builder::WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
+void oif_Builder::WriteKept(utl_Stream& stream, const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block,
                             const Writing& write) const {
-    oif_MeshTexts::Text text = texts_->Find(mesh, block);
+    oif_MeshTexts::Text text = texts_->Find(*mesh, block);
     if (text == nullptr) {
         qio_StringDevice device;
         utl_Stream own(device, LineLimit, Precision, Precision);

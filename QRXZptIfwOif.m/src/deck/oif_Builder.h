@@ -64,7 +64,7 @@ private:
                          const ddb_BaseInstance& instance, const qkw_KeywordList& keywords) const;
     /// Writes what `write` gives, which the mesh alone decides.
     template <class Writing>
-    void WriteKept(utl_Stream& stream, const odiK_Mesh& mesh, oif_MeshBlockEnm block,
+    void WriteKept(utl_Stream& stream, const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block,
                    const Writing& write) const;
     void WritePartDefinitions(utl_Stream& stream);
     void WritePartInstanceDefinitions(utl_Stream& stream);

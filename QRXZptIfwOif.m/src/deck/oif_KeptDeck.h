@@ -64,7 +64,7 @@ public:
         device_.Write(text, bytes);
     }
     Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) override { return device_.Find(mesh, block); }
-    Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) override {
+    Text Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text) override {
         return device_.Keep(mesh, block, text);
     }
     void WriteKept(const Text& text) override {

@@ -1,6 +1,7 @@
 #ifndef QRX_OIF_MESHTEXTS_H
 #define QRX_OIF_MESHTEXTS_H
 
+#include "foundation/cow_CountedHld.h"
 #include "foundation/qio_Device.h"
 
 #include <memory>
@@ -22,7 +23,7 @@ public:
     virtual Text Find(const odiK_Mesh& mesh, oif_MeshBlockEnm block) = 0;
     /// A text that has just been made for the mesh; whoever keeps it holds the mesh too. Gives the one to be
     /// used, which somebody else may have made meanwhile.
-    virtual Text Keep(const odiK_Mesh& mesh, oif_MeshBlockEnm block, const Text& text) = 0;
+    virtual Text Keep(const cow_CountedHld<odiK_Mesh>& mesh, oif_MeshBlockEnm block, const Text& text) = 0;
     /// As Write().
     virtual void WriteKept(const Text& text) = 0;
 };
