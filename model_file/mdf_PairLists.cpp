@@ -75,8 +75,9 @@ bool mdf_RecordReader::ReadPairs(kprC_PropagatingObject& object, const mdf_PairL
         const bool hasMembers = row.value != nullptr && *row.value == '\0';
         std::vector<std::string> others;
         if (row.value != nullptr && !hasMembers) others.emplace_back(row.value);
-        const auto& holder = static_cast<const cls_HolderType&>(attribute.ValueType());
-        if (hasMembers) others = mdf_MembersOf(cls_Classes().Find(holder.ClassId())->fields());
+        const cls_HolderType* holder =
+            hasMembers ? static_cast<const cls_HolderType*>(&attribute.ValueType()) : nullptr;
+        if (hasMembers) others = mdf_MembersOf(cls_Classes().Find(holder->ClassId())->fields());
         kinC_SurfacePair pair;
         ReadRecord(pair, item, place, others);
         const int index = PlaceOf(pairs, pair);
@@ -84,7 +85,7 @@ bool mdf_RecordReader::ReadPairs(kprC_PropagatingObject& object, const mdf_PairL
         void* entry = type.WritableItem(list, index);
         attribute.SetState(entry, static_cast<int>(mdl_PropAttributeStateEnm::SET));
         if (hasMembers) {
-            ReadRecord(*holder.Writable(attribute.WritableValue(entry)), item, place,
+            ReadRecord(*holder->Writable(attribute.WritableValue(entry)), item, place,
                        mdf_MembersOf(kinC_SurfacePair::Fields()));
         } else if (row.value == nullptr) {
             *static_cast<bool*>(attribute.WritableValue(entry)) = true;
